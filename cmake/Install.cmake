@@ -1,0 +1,1 @@
+# Filled in below the targets: what is installed and under which names.
