@@ -18,6 +18,15 @@ function(_orx_setup target)
   target_precompile_headers(${target} PRIVATE ${PROJECT_SOURCE_DIR}/cmake/Precompiled.h)
 endfunction()
 
+# A folder without sources yet becomes a target that only passes on what it links.
+macro(_orx_skip_empty name)
+  if(NOT "${sources}" MATCHES "\\.cpp")
+    add_library(${name} INTERFACE)
+    target_link_libraries(${name} INTERFACE Qt5::Core ${ARGN})
+    return()
+  endif()
+endmacro()
+
 function(_orx_sources out)
   file(GLOB sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp ${CMAKE_CURRENT_SOURCE_DIR}/*.h)
   set(${out} ${sources} PARENT_SCOPE)
@@ -26,6 +35,7 @@ endfunction()
 # A stand-in for an in-house library: shared, so that the real one can take its place at link time.
 function(orx_platform_library name)
   _orx_sources(sources)
+  _orx_skip_empty(${name} ${ARGN})
   add_library(${name} SHARED ${sources})
   set_target_properties(${name} PROPERTIES VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}
                                            EXPORT_NAME ${name})
@@ -36,7 +46,9 @@ endfunction()
 # One floor of the library: the sources of one folder, made into an archive that knows only the floors below.
 function(orx_floor name)
   _orx_sources(sources)
+  _orx_skip_empty(${name} ${ARGN})
   add_library(${name} STATIC ${sources})
+  set_property(GLOBAL APPEND PROPERTY ORX_FLOORS ${name})
   _orx_setup(${name})
   target_link_libraries(${name} PUBLIC Qt5::Core ${ARGN})
 endfunction()
