@@ -1,0 +1,40 @@
+// The parameter records of one configuration object: one contiguous vector, found by name, in definition
+// order.
+//
+// Copying copies the vector once and shares everything else; the addresses of records stay put while no
+// parameter is added or removed.
+#pragma once
+
+#include <platform/Export.h>
+#include <transform/core/TransformParamCfg.h>
+
+#include <QString>
+#include <QStringList>
+
+#include <memory>
+#include <vector>
+
+class ORX_EXPORT ParameterSet {
+ public:
+  ParameterSet();
+
+  const QStringList& names() const;
+  std::vector<TransformParamCfg>& records() { return m_records; }
+  const std::vector<TransformParamCfg>& records() const { return m_records; }
+
+  // By exact name; -1 when there is none.
+  int indexOf(const QString& name) const;
+  // By exact name, else the first multi-parameter, in name order, that lists it; -1 when there is none.
+  int indexOfMacro(const QString& name) const;
+
+  void append(const TransformParamCfg& record);
+  bool remove(const QString& name);
+  void clear();
+
+ private:
+  struct Index;
+  Index& detach();
+
+  std::vector<TransformParamCfg> m_records;
+  std::shared_ptr<const Index> m_index;  // shared by copies until a parameter is added or removed
+};

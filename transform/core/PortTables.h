@@ -1,0 +1,17 @@
+// What is connected to the ports of one configuration object, and which attributes reach it.
+#pragma once
+
+#include <platform/Export.h>
+
+#include <QHash>
+#include <QString>
+#include <QStringList>
+
+struct ORX_EXPORT PortTables {
+  QHash<QString, QStringList> inputFeatureTypes;
+  QHash<QString, QStringList> inputFilters;
+  QHash<QString, QStringList> inputAttributes;
+  QStringList inputAttributeUnion;  // by input tag order, each name once
+  QHash<QString, QString> outputFeatureTypes;
+  QHash<QString, QStringList> outputFunctions;
+};

@@ -1,0 +1,32 @@
+// What the configuration floor asks of a registry: a new configuration for a name and version, and what
+// validation needs to know about connections and member types.
+#pragma once
+
+#include <platform/Export.h>
+
+#include <QString>
+
+#include <memory>
+#include <vector>
+
+class GUIType;
+class TransformerCfg;
+
+class ORX_EXPORT TransformerSource {
+ public:
+  static constexpr int kNewestVersion = -1;
+  static constexpr int kOldestVersion = -2;
+
+  virtual ~TransformerSource();
+  // A new configuration, or null when name or version is unknown.
+  virtual std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) = 0;
+};
+
+class ORX_EXPORT DefinitionDirectory {
+ public:
+  virtual ~DefinitionDirectory();
+  // `encodedName` is word-encoded.
+  virtual bool isConnectionKnown(const QString& encodedName) const = 0;
+  // The member definitions of a multi-parameter type, by the type's configuration; empty when unknown.
+  virtual std::vector<GUIType> memberDefinitions(const GUIType& type) const = 0;
+};
