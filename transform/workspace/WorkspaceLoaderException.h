@@ -1,0 +1,28 @@
+// Thrown by the reader: one message for the user, and where it is known, the place in the file.
+#pragma once
+
+#include <platform/Export.h>
+
+#include <QByteArray>
+#include <QString>
+
+#include <exception>
+
+class ORX_EXPORT WorkspaceLoaderException : public std::exception {
+ public:
+  explicit WorkspaceLoaderException(const QString& message, int line = 0, int column = 0);
+  ~WorkspaceLoaderException() override;
+
+  const QString& getMessage() const { return m_message; }
+  // The message in UTF-8.
+  const char* what() const noexcept override;
+  // Line of the file and column of the XML, both from 1; 0 when the failure has no place.
+  int line() const { return m_line; }
+  int column() const { return m_column; }
+
+ private:
+  QString m_message;
+  QByteArray m_what;
+  int m_line;
+  int m_column;
+};
