@@ -1,0 +1,81 @@
+#include <platform/orxutil/ResourceDirectories.h>
+#include <platform/qorxcore/Local8Bit.h>
+#include <platform/qorxcore/OrxHome.h>
+
+#include <QDir>
+#include <QDirIterator>
+#include <QFileInfo>
+#include <QSet>
+
+#include <algorithm>
+
+namespace {
+
+QStringList& addedFolders() {
+  static QStringList folders;
+  return folders;
+}
+
+bool isPlainWord(const QString& kind) {
+  return !kind.isEmpty() && std::all_of(kind.cbegin(), kind.cend(), [](QChar character) {
+    return character.unicode() < 0x80 && (character.isLetterOrNumber() || character == QLatin1Char('_'));
+  });
+}
+
+// The user's data folder; a relative $XDG_DATA_HOME counts as unset.
+QString userDataFolder() {
+  const QString set = QORXFromLocal8Bit(qgetenv("XDG_DATA_HOME"));
+  return set.startsWith(QLatin1Char('/')) ? set : QDir::homePath() + QLatin1String("/.local/share");
+}
+
+// The places of one kind in order, whether they exist or not.
+QStringList candidates(const QString& kind) {
+  const QString folderName = kind + QLatin1Char('s');
+  const QString homeFolder = QORXOrxHome() + QLatin1Char('/') + folderName;
+  QStringList places{homeFolder};
+  const QStringList subFolders =
+      QDir(homeFolder).entryList(QDir::Dirs | QDir::NoDotAndDotDot | QDir::Readable, QDir::Name);
+  for (const QString& subFolder : subFolders) {
+    places.append(homeFolder + QLatin1Char('/') + subFolder);
+  }
+  places.append(userDataFolder() + QLatin1String("/orx/") + folderName);
+  const QByteArray variable = "ORX_" + kind.toLatin1().toUpper() + "_PATH";
+  places += QORXFromLocal8Bit(qgetenv(variable.constData())).split(QLatin1Char(':'), Qt::SkipEmptyParts);
+  places += addedFolders();
+  return places;
+}
+
+bool holdsReadableFile(const QString& folder) {
+  const QFileInfo info(folder);
+  return info.isDir() && info.isReadable() && info.isExecutable() &&
+         QDirIterator(folder, QDir::Files).hasNext();
+}
+
+}  // namespace
+
+QStringList ORX_resourceDirectories(const QString& kind) {
+  QStringList folders;
+  if (!isPlainWord(kind)) {
+    return folders;
+  }
+  QSet<QString> seen;
+  const QStringList places = candidates(kind);
+  for (const QString& place : places) {
+    if (!holdsReadableFile(place)) {
+      continue;
+    }
+    const QString canonical = QFileInfo(place).canonicalFilePath();
+    if (!seen.contains(canonical)) {
+      seen.insert(canonical);
+      folders.append(QORXPrettyUpFileName(place));
+    }
+  }
+  return folders;
+}
+
+void ORX_addResourceDirectory(const QString& folder) {
+  const QString name = QORXPrettyUpFileName(folder);
+  if (!name.isEmpty() && !addedFolders().contains(name)) {
+    addedFolders().append(name);
+  }
+}

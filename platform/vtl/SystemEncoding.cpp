@@ -1,0 +1,5 @@
+#include <platform/vtl/SystemEncoding.h>
+
+const char* ORXSystemEncodingName() {
+  return "UTF-8";
+}
