@@ -1,8 +1,8 @@
 // The members of a MULTIPARAMETER or the columns of a GUI_LINE_TABLE.
 //
 // Configuration: the word-encoded separator, a comma, then the word-encoded prompt lines of the members,
-// separated by commas; one token without blanks. A MULTIPARAMETER's value is the list name, value, name, value
-// packed with the separator; a table's value is its cells, row by row, packed with the separator.
+// separated by commas; one token without blanks. A MULTIPARAMETER's value is the list name, value, name,
+// value packed with the separator; a table's value is its cells, row by row, packed with the separator.
 #pragma once
 
 #include <platform/Export.h>

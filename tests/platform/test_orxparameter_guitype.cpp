@@ -1,0 +1,245 @@
+#include <platform/orxparameter/ConfigToken.h>
+#include <platform/orxparameter/GUIType.h>
+#include <platform/orxparameter/GUITypeTable.h>
+
+#include <QElapsedTimer>
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+namespace {
+
+QString u8(const char* text) {
+  return QString::fromUtf8(text);
+}
+
+// Taken while this file's own objects are made, which may be before the library's other objects are.
+const GUIType copiedEarly = GUIType::kNullGuiType;
+const QString typeReadEarly = GUIType::kNullGuiType.getType();
+
+// One way to write a configuration for each shape it may have.
+const char* const kConfigs[] = {
+    "",    "A",       "A%B",      "\"No Parallelism\"%Minimal", "\"say \"\"a b\"\"\"",
+    "a,b", "%%",      "No,<x>%Y", "\"50%, at most\",half",      "5\"%\"\"%\"a\"b",
+    "\"",  "\u00a0é", "NO_EDIT"};
+
+const char* const kPrompts[] = {"",
+                                "Source Attribute:",
+                                "  two blanks before and one behind ",
+                                "\"quoted\" 100%, <Unused> $(X)",
+                                "line\nbreak\r\nand more\n",
+                                "spelt <u000a>, <u000d>, <lessthansign>, <lessthansign>u000a> and <u000A>",
+                                "<",
+                                "<<u000a>\n<",
+                                "\u00dcber \U0001F600 \u2028"};
+
+const char* const kNames[] = {"X",
+                              "A_1",
+                              "",
+                              "two words",
+                              "\"",
+                              "\"quoted\"",
+                              "a\"b",
+                              "NO_EDIT",
+                              "OPTIONAL",
+                              "line\nbreak",
+                              "<u000a>",
+                              "$(N)",
+                              "\u00e9\u00a0\u00e9",
+                              "\"\""};
+
+}  // namespace
+
+// Every type of the table, with and without flags, with every shape of configuration, prompt and name.
+TEST(GUIType, ParsingAndWritingAreInverse) {
+  const unsigned flagSets[] = {0, kGUITypeOptional, kGUITypeOptional | kGUITypeOmittable,
+                               kGUITypeOptional | kGUITypeOmittable | kGUITypeInstanceMacros};
+  int checked = 0;
+  for (const GUITypeEntry& entry : ORX_guiTypes()) {
+    for (const unsigned flags : flagSets) {
+      for (const char* config : kConfigs) {
+        if (*config && !entry.takesConfig) {
+          continue;
+        }
+        GUIType type = GUIType::fromTransformerTypeString(entry.word + QLatin1Char(' ') + u8(config));
+        if (entry.word == QLatin1String("NAMEDGROUP") && u8(config) == QLatin1String("NO_EDIT")) {
+          ASSERT_EQ(type.getType(), QLatin1String("NAMEDGROUP NO_EDIT"));
+          continue;
+        }
+        type.setFlag(flags, true);
+        ASSERT_EQ(type.getType(), QString(entry.word));
+        ASSERT_EQ(GUIType::fromTransformerTypeString(type.getTypeText()), type);
+        for (const char* name : kNames) {
+          for (const char* prompt : kPrompts) {
+            type.setName(u8(name));
+            type.setDescription(u8(prompt));
+            const QString line = type.getAsString();
+            const GUIType read = GUIType::fromGuiLine(line);
+            ASSERT_EQ(read, type) << qPrintable(line);
+            ASSERT_EQ(read.getAsString(), line);
+            ASSERT_FALSE(line.contains(QLatin1Char('\n')) || line.contains(QLatin1Char('\r')));
+            ++checked;
+          }
+        }
+      }
+    }
+  }
+  EXPECT_GT(checked, 50000);
+}
+
+TEST(GUIType, ReadsPromptLines) {
+  struct Case {
+    const char* line;
+    const char* type;
+    const char* name;
+    const char* config;
+    const char* prompt;
+    unsigned flags;
+    const char* written;  // null: the line itself
+  };
+  const Case cases[] = {
+      {"GUI TEXT XFORMER_NAME Name:", "TEXT", "XFORMER_NAME", "", "Name:", 0, nullptr},
+      {"GUI CHOICE MODE \"No Parallelism\"%Minimal Process mode:", "CHOICE", "MODE",
+       "\"No Parallelism\"%Minimal", "Process mode:", 0, nullptr},
+      {"GUI OMITTABLE INSTANCE_MACROS OPTIONAL INT N A number", "INT", "N", "", "A number",
+       kGUITypeOptional | kGUITypeOmittable | kGUITypeInstanceMacros,
+       "GUI OPTIONAL OMITTABLE INSTANCE_MACROS INT N A number"},
+      {"GUI  OPTIONAL\tATTR   A\tALLOW_NEW  Pick one\r\n", "ATTR", "A", "ALLOW_NEW", " Pick one",
+       kGUITypeOptional, "GUI OPTIONAL ATTR A ALLOW_NEW  Pick one"},
+      {"GUI NAMEDGROUP NO_EDIT DYNGROUP_1 A%B Group", "NAMEDGROUP NO_EDIT", "DYNGROUP_1", "A%B", "Group", 0,
+       nullptr},
+      {"GUI NAMEDGROUP G NO_EDIT Group", "NAMEDGROUP", "G", "\"NO_EDIT\"", "Group", 0,
+       "GUI NAMEDGROUP G \"NO_EDIT\" Group"},
+      {"GUI NAMEDGROUP \"NO_EDIT\" \"\" Group", "NAMEDGROUP", "NO_EDIT", "", "Group", 0, nullptr},
+      {"GUI LISTBOX L", "LISTBOX", "L", "", "", 0, "GUI LISTBOX L \"\""},
+      {"GUI CHOICE C \"open%B Prompt", "CHOICE", "C", "\"\"\"open\"%B", "Prompt", 0,
+       "GUI CHOICE C \"\"\"open\"%B Prompt"},
+      {"GUI WIBBLE W a%b Prompt", "WIBBLE", "W", "", "a%b Prompt", 0, nullptr},
+      {"GUI TEXT \"two words\"x Prompt", "TEXT", "\"two", "", "words\"x Prompt", 0,
+       "GUI TEXT \"\"\"two\" words\"x Prompt"},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.line);
+    const GUIType type = GUIType::fromGuiLine(u8(c.line));
+    EXPECT_EQ(type.getType(), u8(c.type));
+    EXPECT_EQ(type.getName(), u8(c.name));
+    EXPECT_EQ(type.getConfigToken(), u8(c.config));
+    EXPECT_EQ(type.getDescription(), u8(c.prompt));
+    EXPECT_EQ(type.getFlags(), c.flags);
+    EXPECT_EQ(type.getAsString(), u8(c.written ? c.written : c.line));
+  }
+  for (const char* line : {"", "GUI", "GUI ", "GUI TEXT", "GUI TEXT  ", "GUI OPTIONAL TEXT", " GUI TEXT A p",
+                           "gui TEXT A p", "GUITEXT A p", "GUI\tTEXT A p", "GUI OPTIONAL OMITTABLE"}) {
+    EXPECT_EQ(GUIType::fromGuiLine(u8(line)), GUIType::kNullGuiType) << line;
+  }
+}
+
+TEST(GUIType, ReadsTypeTexts) {
+  struct Case {
+    const char* text;
+    const char* type;
+    const char* config;
+    const char* written;
+  };
+  const Case cases[] = {
+      {"TEXT", "TEXT", "", "TEXT"},
+      {" OMITTABLE  OPTIONAL FLOAT ", "FLOAT", "", "OPTIONAL OMITTABLE FLOAT"},
+      {"CHOICE \"\"", "CHOICE", "", "CHOICE"},
+      {"CHOICE No Parallelism%Minimal", "CHOICE", "\"No Parallelism\"%Minimal",
+       "CHOICE \"No Parallelism\"%Minimal"},
+      {"LOOKUP_CHOICE Not now,no%Yes,yes", "LOOKUP_CHOICE", "\"Not now\",no%Yes,yes",
+       "LOOKUP_CHOICE \"Not now\",no%Yes,yes"},
+      {"NAMEDGROUP NO_EDIT A%B", "NAMEDGROUP NO_EDIT", "A%B", "NAMEDGROUP NO_EDIT A%B"},
+      {"TEXT stray", "TEXT", "stray", "TEXT stray"},
+      {"WIBBLE a b", "WIBBLE", "\"a b\"", "WIBBLE \"a b\""},
+      {"CHOICE \"a\nb\"", "CHOICE", "\"a<u000a>b\"", "CHOICE \"a<u000a>b\""},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.text);
+    const GUIType type = GUIType::fromTransformerTypeString(u8(c.text), u8("N"), u8("P"));
+    EXPECT_EQ(type.getType(), u8(c.type));
+    EXPECT_EQ(type.getConfigToken(), u8(c.config));
+    EXPECT_EQ(type.getTypeText(), u8(c.written));
+    EXPECT_EQ(type.getName(), u8("N"));
+    EXPECT_EQ(type.getDescription(), u8("P"));
+  }
+  EXPECT_FALSE(GUIType::fromTransformerTypeString(u8("WIBBLE")).isKnown());
+  for (const char* text : {"", "  ", "OPTIONAL", "OPTIONAL OMITTABLE "}) {
+    EXPECT_TRUE(GUIType::fromTransformerTypeString(u8(text), u8("N")).isNull()) << text;
+  }
+}
+
+TEST(GUIType, NullTypeServesDuringStaticInitialisation) {
+  EXPECT_TRUE(copiedEarly.isNull());
+  EXPECT_TRUE(typeReadEarly.isEmpty());
+  EXPECT_EQ(GUIType::kNullGuiType.getAsString(), QString());
+  GUIType changed = copiedEarly;
+  changed.setDescription(u8("P"));
+  EXPECT_TRUE(GUIType::kNullGuiType.getDescription().isEmpty());
+}
+
+TEST(GUIType, CopiesKeepTheirOwnChanges) {
+  const GUIType first = GUIType::fromGuiLine(u8("GUI TEXT A One"));
+  GUIType second = first;
+  second.setName(u8("B"));
+  second.setFlag(kGUITypeOmittable, true);
+  EXPECT_EQ(first.getAsString(), u8("GUI TEXT A One"));
+  EXPECT_EQ(second.getAsString(), u8("GUI OMITTABLE TEXT B One"));
+  EXPECT_EQ(second.getMacroNames(), QStringList(u8("B")));
+  second.setFlag(kGUITypeOmittable, false);
+  second.setName(u8("A"));
+  EXPECT_EQ(first, second);
+}
+
+TEST(GUITypeTable, IsSortedDocumentedAndTellsEncodedTypes) {
+  const std::vector<GUITypeEntry>& types = ORX_guiTypes();
+  for (size_t i = 0; i < types.size(); ++i) {
+    SCOPED_TRACE(types[i].word.latin1());
+    EXPECT_FALSE(types[i].purpose.isEmpty());
+    EXPECT_TRUE(types[i].valueIsEncoded || !QString(types[i].word).endsWith(QLatin1String("_ENCODED")));
+    EXPECT_TRUE(i == 0 || types[i - 1].word < types[i].word);
+    EXPECT_EQ(ORX_findGuiType(types[i].word), &types[i]);
+  }
+  for (const char* word : {"", "A", "TEX", "TEXTX", "text", "ZZZ", "NAMEDGROUP  NO_EDIT"}) {
+    EXPECT_EQ(ORX_findGuiType(u8(word)), nullptr) << word;
+  }
+  const auto encoded = [](const char* text) {
+    return GUIType::fromTransformerTypeString(u8(text)).valueIsEncoded();
+  };
+  EXPECT_TRUE(encoded("TEXT_EDIT_PYTHON_PARM"));
+  EXPECT_TRUE(encoded("WIBBLE_ENCODED"));
+  EXPECT_FALSE(encoded("LOOKUP_CHOICE a,b"));
+}
+
+TEST(ConfigToken, PiecesComeBackUnquoted) {
+  for (const char* text : {"plain", "two words", "50%", "a,b", "\"", "a\"b", "\"a\"", "", "\t"}) {
+    const QString quoted = ORX_quoteConfigPiece(u8(text));
+    EXPECT_EQ(ORX_splitConfig(quoted + QLatin1String("%x"), QLatin1Char('%')),
+              (QStringList{u8(text), u8("x")}))
+        << text;
+  }
+  EXPECT_EQ(ORX_splitConfig(u8("a,b%\"c%d\"e%%\"\"%5\"%"), QLatin1Char('%')),
+            (QStringList{u8("a,b"), u8("c%de"), u8(""), u8("5\"")}));
+}
+
+// Content made to hurt: must end soon, with a result that survives being written and read.
+TEST(GUIType, HostileTextEndsInAResult) {
+  const int size = 1000000;
+  const QString heads[] = {u8("GUI CHOICE C "), u8("GUI "), u8("GUI TEXT "), u8("GUI MULTIPARAMETER M "),
+                           u8("GUI OPTIONAL TEXT N ")};
+  const char* const parts[] = {"\"",           "\"\"", "\",",     "%",         ",",  " ",
+                               "\"a,\"\"b c,", "<",    "<u000a>", "OPTIONAL ", "\n", "\\"};
+  QElapsedTimer timer;
+  timer.start();
+  for (const QString& head : heads) {
+    for (const char* part : parts) {
+      const QString line = head + u8(part).repeated(size / int(qstrlen(part)));
+      const GUIType type = GUIType::fromGuiLine(line);
+      const GUIType again = GUIType::fromGuiLine(type.getAsString());
+      EXPECT_EQ(again, type) << qPrintable(head) << part;
+      const GUIType text = GUIType::fromTransformerTypeString(line.mid(4));
+      EXPECT_EQ(GUIType::fromTransformerTypeString(text.getTypeText()), text) << qPrintable(head) << part;
+    }
+  }
+  EXPECT_LT(timer.elapsed(), 60000);
+}
