@@ -19,10 +19,10 @@ class ORX_EXPORT IMFBuffer {
 
   IMFBuffer& operator=(const IMFBuffer&) { return *this; }
 
-  // A buffer on a file, truncated. The caller owns it and gives it back to destroy(). A file that cannot be
-  // opened is not reported: what is written to such a buffer is lost.
+  // A buffer on a file, truncated; the name is Latin-1. The caller owns it and gives it back to destroy(). A
+  // file that cannot be opened is not reported: what is written to such a buffer is lost.
   static IMFBuffer* create(const char* fileName, bool isMangled);
-  // Does not flush. Sets the pointer to null; a null pointer is fine.
+  // Does not flush: pending lines are lost. Sets the pointer to null; a null pointer is fine.
   static void destroy(IMFBuffer*& buffer);
 
  protected:

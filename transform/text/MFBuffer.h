@@ -1,7 +1,10 @@
-// Collects the logical lines of a mapping-file statement and writes them on flush: continued over physical lines
-// with a backslash in column 72, or (mangled) joined by blanks on one line. Output is UTF-8.
+// Collects the logical lines of a mapping-file statement and writes them on flush: continued over physical
+// lines with a backslash in column 72 (further right behind a longer line), or, mangled, joined by blanks on
+// one line. Every flush writes one more line end, so that an empty line stands behind a continued statement;
+// a flush with nothing pending writes that line end alone. Output is UTF-8.
 //
-// Used by one thread at a time.
+// No operation reports an error: what goes to a device that is missing or not open is lost. Used by one
+// thread at a time.
 #pragma once
 
 #include <transform/text/IMFBuffer.h>
@@ -19,14 +22,20 @@ class ORX_EXPORT MFBuffer : public IMFBuffer {
   void addRaw(const IORXString& text) override;
   void flush() override;
   ~MFBuffer() override;
-  // Writes bytes straight into the output.
+  // Writes bytes unchanged into the output, past the stream and the pending lines.
   virtual void write(const QByteArray& bytes) = 0;
 
-  // One logical text; it is split at line feeds, blank parts are dropped. With deferred macros on, every "$[NAME]"
-  // becomes "$(NAME)". The caller sees to it that every "$[" is closed: one without "]" behind it never ends.
+  // One logical text; it is split at line feeds, empty parts are dropped (a part of blanks alone is kept).
+  // With deferred macros on, every "$[" becomes "$(" and the first "]" behind it ")", whatever stands between
+  // them. The caller sees to it that every "$[" is closed: with one that is not, this does not return.
   void add(const QString& text);
+  // In the system's 8-bit encoding; null is the empty text.
   void add(const char* text);
   void addLines(const QStringList& lines);
+
+  // False when add() would not come to an end with deferred macros on: a "$[" has no "]" of its own behind
+  // it.
+  static bool closesDeferredMacros(const QString& text);
 
   bool getReplaceDeferredMacros() const { return m_replaceDeferredMacros; }
   void setReplaceDeferredMacros(bool replace) { m_replaceDeferredMacros = replace; }
@@ -34,10 +43,13 @@ class ORX_EXPORT MFBuffer : public IMFBuffer {
 
  protected:
   MFBuffer();
-  // Attaches the output; null detaches. The device is not owned.
+  // Attaches the output; null detaches. The device is not owned and outlives the buffer or its detaching.
   void setDevice(QIODevice* device);
 
  private:
+  void append(const QString& text);
+  bool isWritable() const;
+
   QTextStream m_stream;
   QStringList m_lines;
   bool m_isMangled = false;

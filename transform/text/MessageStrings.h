@@ -6,8 +6,8 @@
 #include <QString>
 #include <QStringList>
 
-// Unknown numbers give an empty text. One to five arguments fill the placeholders "%1" to "%5" in one pass; with
-// none, or with more than five, the text is returned with its placeholders as they are.
+// Unknown numbers give an empty text. One to five arguments fill the placeholders "%1" to "%5" in one pass;
+// with none, or with more than five, the text is returned with its placeholders as they are.
 ORX_EXPORT QString TransformResString(long number);
 ORX_EXPORT QString TransformResString(long number, const QString& argument);
 ORX_EXPORT QString TransformResString(long number, const QStringList& arguments);

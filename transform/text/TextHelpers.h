@@ -17,11 +17,14 @@ ORX_EXPORT QString makeColumnString(const QString& left, const QString& right, i
 
 ORX_EXPORT QString quotifyString(const QString& text, const QString& specials);
 
-// Quotes a value for the mapping file when it holds a blank, a tab, a parenthesis, a backslash or a double quote,
-// or is empty. Inner quotes are escaped; a trailing backslash never escapes the closing quote.
+// Quotes a value for the mapping file when it holds a blank, a tab, a parenthesis, a backslash or a double
+// quote, or is empty. Quotes inside are written as backslash and quote; backslashes at the end are doubled,
+// so that none escapes the closing quote. Other backslashes stay as they are.
 ORX_EXPORT QString quotifyStringForMF(const QString& text);
 
-// Quotes an attribute name of a definition line; quotes that belong to the name survive as escaped quotes.
+// Quotes an attribute name of a definition line as quotifyStringForMF does. A name in quotes of its own keeps
+// them as escaped quotes around the quoted text; any other name whose quoted form holds a blank gets one more
+// pair of quotes around it.
 ORX_EXPORT QString quotifyDefAttrName(const QString& name);
 
 // Backslash and the control characters 7 to 13 become escapes: the form in which a text that the user typed
@@ -33,21 +36,41 @@ ORX_EXPORT QString decodeUserString(const QString& text);
 ORX_EXPORT QString encodeUserString(const QString& text);
 
 // Splits at every separator; empty items are dropped. `out` is cleared first.
+ORX_EXPORT void stringToList(const QString& text, QStringList& out, char separator);
 ORX_EXPORT void stringToList(const QString& text, QStringList& out, QChar separator);
 
-// Removes every "orx_basicstring:...:" mark. A mark that no further colon closes loses its own text alone.
+// Removes every "orx_basicstring:...:" mark, also one that joins up when another is removed. A mark that no
+// further colon closes loses its own text alone.
 ORX_EXPORT QString stripBasicStringInfo(const QString& text);
 
-// Reads a port description of a link: "fo N NAME" or "fi N NAME" for feature ports, "ao N M NAME" or "ai N M NAME"
-// for attribute ports, the name word-encoded. Missing trailing pieces leave their arguments as they were.
+// Reads a port description of a link: "fo N NAME" or "fi N NAME" for feature ports, "ao N M NAME" or "ai N M
+// NAME" for attribute ports, the name word-encoded. Missing trailing pieces leave their arguments as they
+// were; a piece that should be a number and is none makes the answer false, which leaves all of them.
 ORX_EXPORT bool decodePortDescription(const QString& description, bool& isFeaturePort, bool& isOutput,
                                       unsigned& first, unsigned& second, QString& name);
 
-// Appends the script block that computes a parameter with a Python function body. `prefix` is the prefix macro of
-// a custom transformer's instance, or empty. `encodedCode` is word-encoded.
+// Appends the script block that computes a parameter with a Python function body. `prefix` is the prefix
+// macro of a custom transformer's instance, or empty; with one, the lookups of ORX_MacroValues read the
+// instance's macros, those of the built-in macros excepted. `encodedCode` is word-encoded. The last line that
+// is neither blank nor a comment gives the value. Whatever is given is written; ask canWritePythonParameter()
+// first.
 ORX_EXPORT void getPythonParameterLines(const QString& prefix, const QString& parameterName,
                                         const QString& encodedCode, QStringList& lines);
 
-// The same for a Tcl procedure body.
+// The same for a Tcl procedure body; every line loses the blanks around it.
 ORX_EXPORT void getTclParameterLines(const QString& prefix, const QString& parameterName,
                                      const QString& encodedCode, QStringList& lines);
+
+// Whether the block that getPythonParameterLines() writes for these arguments means what the script says.
+// False, with a message for the user in `reason`, when a name or the code would break out of the block, or
+// the block would compute something else: an empty script, a text of several lines, a backslash continuation
+// over more than two lines, a last line that is the end of a statement begun above it or no expression. This
+// looks at the line structure; it does not replace Python's own check of the syntax. A caller gives an unset
+// parameter no script.
+ORX_EXPORT bool canWritePythonParameter(const QString& prefix, const QString& parameterName,
+                                        const QString& encodedCode, QString& reason);
+
+// The same for getTclParameterLines(); the code is parsed by the Tcl library. An empty script is fine: its
+// value is empty.
+ORX_EXPORT bool canWriteTclParameter(const QString& prefix, const QString& parameterName,
+                                     const QString& encodedCode, QString& reason);

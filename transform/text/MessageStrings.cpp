@@ -1,0 +1,35 @@
+#include <platform/orxutil/ORXLocalizedMessageDatabase.h>
+#include <transform/text/MessageStrings.h>
+
+QString TransformResString(long number) {
+  return TransformResString(number, QStringList());
+}
+
+QString TransformResString(long number, const QString& argument) {
+  return TransformResString(number, QStringList(argument));
+}
+
+QString TransformResString(long number, const QStringList& arguments) {
+  static const ORXLocalizedMessageDatabase kDatabase;
+  QORXString message;
+  kDatabase.getMessage(number, message);
+  const QString& text = message.toQString();
+  if (text.isEmpty()) {
+    return QString();
+  }
+  const QStringList& a = arguments;
+  switch (a.size()) {
+    case 1:
+      return text.arg(a[0], 0, QLatin1Char(' '));
+    case 2:
+      return text.arg(a[0], a[1]);
+    case 3:
+      return text.arg(a[0], a[1], a[2]);
+    case 4:
+      return text.arg(a[0], a[1], a[2], a[3]);
+    case 5:
+      return text.arg(a[0], a[1], a[2], a[3], a[4]);
+    default:
+      return text;
+  }
+}
