@@ -1,4 +1,5 @@
 #include <platform/orxparameter/ConfigToken.h>
+#include <platform/qorxcore/WordEncoding.h>
 
 #include <algorithm>
 
@@ -104,6 +105,23 @@ QString ORX_readConfig(const QString& text, int& position, ConfigEnd end) {
   }
   keepOnOneLine(config);
   return config == QLatin1String("\"\"") ? QString() : config;
+}
+
+QStringList ORX_readMemberConfig(const QString& config) {
+  QStringList parts;
+  QString part;
+  ConfigPieceReader reader(config);
+  while (reader.next()) {
+    if (reader.before() == QLatin1Char(',')) {
+      parts.append(QORXWwjdDecode(part));
+      part.clear();
+    } else if (!reader.before().isNull()) {
+      part += reader.before();
+    }
+    part += reader.text();
+  }
+  parts.append(QORXWwjdDecode(part));
+  return parts;
 }
 
 bool ConfigPieceReader::next() {

@@ -33,6 +33,10 @@ int ORX_closingQuote(const QString& text, int open);
 
 bool ORX_isBlank(QChar c);
 
+// The configuration of a member list: the separator's text first, then the members' prompt lines, all
+// decoded.
+QStringList ORX_readMemberConfig(const QString& config);
+
 // Walks over the pieces of a configuration, both separators counting.
 class ConfigPieceReader {
  public:

@@ -1,7 +1,6 @@
 #include <platform/orxparameter/ConfigToken.h>
 #include <platform/orxparameter/GUIType.h>
 #include <platform/orxparameter/GUITypeTable.h>
-#include <platform/qorxcore/WordEncoding.h>
 
 #include <algorithm>
 
@@ -200,11 +199,10 @@ void collectMacroNames(GUITypeData& data) {
   if (data.type != kMultiParameter) {
     return;
   }
-  ConfigPieceReader reader(data.config);
-  reader.next();  // the separator
-  while (reader.next()) {
+  const QStringList parts = ORX_readMemberConfig(data.config);
+  for (int i = 1; i < parts.size(); ++i) {
     GUITypeData member;
-    if (readGuiLine(QORXWwjdDecode(reader.text()), member) && !member.name.isEmpty()) {
+    if (readGuiLine(parts.at(i), member) && !member.name.isEmpty()) {
       data.macroNames.append(member.name);
     }
   }

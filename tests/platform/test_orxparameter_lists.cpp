@@ -1,0 +1,219 @@
+#include <platform/orxparameter/ChoiceList.h>
+#include <platform/orxparameter/GUIType.h>
+#include <platform/orxparameter/MemberList.h>
+#include <platform/qorxcore/WordEncoding.h>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+QString u8(const char* text) {
+  return QString::fromUtf8(text);
+}
+
+// `shown=stored` of every entry, separated by "|".
+QString entriesOf(const ChoiceList& choices) {
+  QStringList texts;
+  for (const auto& entry : choices.entries()) {
+    texts << entry.first + QLatin1Char('=') + entry.second;
+  }
+  return texts.join(QLatin1Char('|'));
+}
+
+GUIType typeOf(const QString& text) {
+  return GUIType::fromTransformerTypeString(text);
+}
+
+GUIType multiParameter(QChar separator, const char* line1, const char* line2) {
+  const std::vector<GUIType> members = {GUIType::fromGuiLine(u8(line1)), GUIType::kNullGuiType,
+                                        GUIType::fromGuiLine(u8(line2))};
+  return GUIType::fromTransformerTypeString(
+      QLatin1String("MULTIPARAMETER ") + MemberList::configToken(separator, members), u8("MULTI"),
+      u8("Both"));
+}
+
+}  // namespace
+
+TEST(ChoiceList, ReadsConfigurations) {
+  struct Case {
+    const char* type;
+    const char* entries;
+    bool lookup;
+  };
+  const Case cases[] = {
+      {"CHOICE \"No Parallelism\"%Minimal", "No Parallelism=No Parallelism|Minimal=Minimal", false},
+      {"LISTBOX a,b%\"50%\"%%5\"%\"\"", "a,b=a,b|50%=50%|5\"=5\"|=", false},
+      {"CHOICE a%a%b", "a=a|b=b", false},
+      {"CHOICE <space>", "<space>=<space>", false},
+      {"CHOICE", "", false},
+      {"LOOKUP_CHOICE No,no<space>way%Yes,<quotationmark>", "No=no way|Yes=\"", true},
+      {"LOOKUP_CHOICE \"No, never\",0%\"say \"\"yes\"\"\",1", "No, never=0|say \"yes\"=1", true},
+      {"LOOKUP_LISTBOX_OR_ATTR bare%empty,%a,b,c%,only%<Unused>,<Unused>",
+       "bare=bare|empty=|a=b,c|=only|<Unused>=<Unused>", true},
+      {"LOOKUP_CHOICE", "", false},
+      {"TEXT a%b", "", false},
+      {"ATTR ALLOW_NEW", "", false},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.type);
+    const ChoiceList choices(typeOf(u8(c.type)));
+    EXPECT_EQ(entriesOf(choices), u8(c.entries));
+    EXPECT_EQ(choices.hasLookup(), c.lookup);
+    EXPECT_EQ(choices.isEmpty(), choices.entries().empty());
+  }
+}
+
+TEST(ChoiceList, LookupLinesMapAPlainChoice) {
+  ChoiceList choices(typeOf(u8("CHOICE \"No Parallelism\"%A%B")));
+  const ChoiceList before = choices;
+  choices.addLookup(u8("\"No Parallelism\",NO_PARALLELISM%B,A"));
+  choices.addLookup(u8("A,1%Extra one,two<space>words"));
+  EXPECT_EQ(entriesOf(choices), u8("No Parallelism=NO_PARALLELISM|A=1|B=A|Extra one=two words"));
+  EXPECT_TRUE(choices.hasLookup());
+  EXPECT_FALSE(before.hasLookup());
+  EXPECT_EQ(before.entries().size(), 3u);
+
+  struct Case {
+    const char* value;
+    bool contained;
+    const char* stored;
+    const char* shown;
+  };
+  const Case cases[] = {
+      {"No Parallelism", true, "NO_PARALLELISM", "No Parallelism"},
+      {"NO_PARALLELISM", true, "NO_PARALLELISM", "No Parallelism"},
+      {"A", true, "1", "B"},
+      {"two words", true, "two words", "Extra one"},
+      {"no parallelism", false, "no parallelism", "no parallelism"},
+      {"", false, "", ""},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.value);
+    EXPECT_EQ(choices.contains(u8(c.value)), c.contained);
+    EXPECT_EQ(choices.toStored(u8(c.value)), u8(c.stored));
+    EXPECT_EQ(choices.toShown(u8(c.value)), u8(c.shown));
+  }
+
+  // A new stored side takes the old one out of use; the next entry that stores the same steps in.
+  ChoiceList same(typeOf(u8("LOOKUP_CHOICE A,1%B,1")));
+  EXPECT_EQ(same.toShown(u8("1")), u8("A"));
+  same.addLookup(u8("A,2"));
+  EXPECT_EQ(same.toShown(u8("1")), u8("B"));
+}
+
+TEST(ChoiceList, TellsChoiceTypes) {
+  struct Case {
+    const char* type;
+    bool choice;
+    bool listBox;
+  };
+  const Case cases[] = {{"CHOICE", true, false},
+                        {"LOOKUP_CHOICE_OR_ATTR", true, false},
+                        {"LISTBOX", true, true},
+                        {"LOOKUP_LISTBOX", true, true},
+                        {"LISTBOX_OR_ATTR", true, true},
+                        {"CHOICES", false, false},
+                        {"LOOKUP_", false, false},
+                        {"TEXT", false, false},
+                        {"", false, false}};
+  for (const Case& c : cases) {
+    EXPECT_EQ(ORX_isChoiceType(typeOf(u8(c.type))), c.choice) << c.type;
+    EXPECT_EQ(ORX_isListBoxType(typeOf(u8(c.type))), c.listBox) << c.type;
+  }
+}
+
+TEST(MemberList, ConfigurationIsOneTokenAndComesBack) {
+  for (const char* separator : {",", " ", ";", "\"", "%", "<", "\n"}) {
+    SCOPED_TRACE(separator);
+    const GUIType type =
+        multiParameter(u8(separator).front(), "GUI OPTIONAL CHOICE A \"x y\"%z First, \"100%\"",
+                       "GUI TEXT_ENCODED B Second\nline");
+    EXPECT_FALSE(type.getConfigToken().contains(QLatin1Char(' ')));
+    const GUIType read = GUIType::fromGuiLine(type.getAsString());
+    EXPECT_EQ(read, type);
+    EXPECT_EQ(read.getMacroNames(), (QStringList{u8("MULTI"), u8("A"), u8("B")}));
+
+    const MemberList list(read);
+    EXPECT_EQ(list.separator(), u8(separator).front());
+    ASSERT_EQ(list.members().size(), 2u);
+    EXPECT_EQ(list.members()[0].getConfigToken(), u8("\"x y\"%z"));
+    ASSERT_NE(list.find(u8("B")), nullptr);
+    EXPECT_EQ(list.find(u8("B"))->getDescription(), u8("Second\nline"));
+    EXPECT_EQ(list.find(u8("C")), nullptr);
+    EXPECT_EQ(MemberList::configToken(list.separator(), list.members()), type.getConfigToken());
+  }
+}
+
+TEST(MemberList, FaultyConfigurations) {
+  struct Case {
+    const char* type;
+    QChar separator;
+    int members;
+  };
+  const Case cases[] = {
+      {"MULTIPARAMETER", QLatin1Char(','), 0},
+      {"MULTIPARAMETER ;", QLatin1Char(';'), 0},
+      {"MULTIPARAMETER ;;,GUI<space>TEXT<space>A", QLatin1Char(','), 1},
+      {"GUI_LINE_TABLE ,GUI<space>TEXT<space>A,,rubbish,GUI<space>TEXT<space>A", QLatin1Char(','), 2},
+      {"GUI_LINE_TABLE \",\",GUI<space>TEXT<space>A", QLatin1Char(','), 1},
+      {"GUI_LINE_TABLE <space>,GUI TEXT A 5% each", QLatin1Char(' '), 1},
+      {"CHOICE ;,GUI<space>TEXT<space>A", QLatin1Char(','), 0},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.type);
+    const MemberList list(typeOf(u8(c.type)));
+    EXPECT_EQ(list.separator(), c.separator);
+    EXPECT_EQ(int(list.members().size()), c.members);
+  }
+}
+
+TEST(MemberList, SettingOnePartLeavesTheOthersAlone) {
+  struct Case {
+    const char* value;
+    const char* member;
+    const char* part;
+    const char* result;
+  };
+  const Case cases[] = {
+      {"", "A", "1", "A;1"},
+      {"A;1;B;2", "A", "x;y", "A;\"x;y\";B;2"},
+      {"A;1;B;2", "B", "", "A;1;B;\"\""},
+      {"A;\"1\";B;2", "B", "3", "A;\"1\";B;3"},  // quotes without need stay
+      {"A; \"p;\"\"q\" ;B;2;C;\"\"", "B", "3", "A; \"p;\"\"q\" ;B;3;C;\"\""},
+      {"A; \"p;q\" ;B;2", "A", "3", "A;3;B;2"},
+      {"\"A\";1;A;2", "A", "3", "\"A\";3;A;2"},  // the first of two
+      {"A;B;B;2", "B", "3", "A;B;B;3"},          // a value that looks like the name
+      {"A;1", "B", "2", "A;1;B;2"},
+      {"A;1;B", "B", "2", "A;1;B;2"},  // a name without a value
+      {"A;1;B", "C", "2", "A;1;B;\"\";C;2"},
+      {"A;\"open", "B", "2", "A;open;B;2"},  // would be swallowed
+      {"A;\"open;B;2", "A", "1", "A;1"},
+      {"A;1", "A", " two\nlines\" ", "A;\" two\nlines\"\" \""},
+  };
+  const MemberList list(multiParameter(QLatin1Char(';'), "GUI TEXT A a", "GUI TEXT B b"));
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.value);
+    const QString result = list.withMemberValue(u8(c.value), u8(c.member), u8(c.part));
+    EXPECT_EQ(result, u8(c.result));
+    EXPECT_EQ(list.memberValue(result, u8(c.member)), u8(c.part));
+  }
+  EXPECT_EQ(list.memberValue(u8("A;1;B;2"), u8("1")), QString());
+  EXPECT_EQ(list.memberValue(u8("A;1;B"), u8("B")), QString());
+}
+
+TEST(MemberList, NestingIsReadOneLevelAtATime) {
+  GUIType type = GUIType::fromGuiLine(u8("GUI TEXT INNERMOST x"));
+  for (int depth = 0; depth < 6; ++depth) {
+    type = GUIType::fromTransformerTypeString(
+        QLatin1String("MULTIPARAMETER ") + MemberList::configToken(QLatin1Char(','), {type}),
+        QStringLiteral("M%1").arg(depth), u8("p"));
+  }
+  EXPECT_EQ(GUIType::fromGuiLine(type.getAsString()).getMacroNames(), (QStringList{u8("M5"), u8("M4")}));
+  for (int depth = 5; depth >= 0; --depth) {
+    ASSERT_EQ(type.getName(), QStringLiteral("M%1").arg(depth));
+    const MemberList list(type);
+    ASSERT_EQ(list.members().size(), 1u);
+    type = list.members().front();
+  }
+  EXPECT_EQ(type.getName(), u8("INNERMOST"));
+}
