@@ -1,35 +1,47 @@
 // Output that appears whole or not at all: written beside its place, renamed when complete.
+//
+// A new file gets the permissions that the umask leaves; one that replaces another gets that one's
+// permissions and, where the system allows it, its owner. A symbolic link stays: the file it points to is
+// replaced. A file that may not be written is refused even when its folder would let it be replaced.
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/files/DescriptorDevice.h>
 
+#include <QByteArray>
 #include <QIODevice>
 #include <QString>
 
-#include <memory>
-
-class QFileDevice;
-
 class ORX_EXPORT AtomicFile {
  public:
-  // "-" is standard output. A place that is no regular file (a device, a pipe) is written directly.
+  // "-" is standard output. A place that is no regular file (a device, a pipe, an open descriptor such as
+  // /dev/stdout) is written directly.
   explicit AtomicFile(const QString& fileName);
   ~AtomicFile();
   AtomicFile(const AtomicFile&) = delete;
   AtomicFile& operator=(const AtomicFile&) = delete;
 
-  // False when the place cannot be written; errorString() names the file and the reason.
+  // False when the place cannot be written; errorString() names the file and the reason. An open file that
+  // was not committed is given up first.
   bool open();
   // Valid after open(); owned by this object.
   QIODevice& device();
-  // Puts the file in its place. False when anything written was lost; the file that stood there is then untouched.
-  // Without commit() nothing changes.
+  // Puts the file in its place. False when anything written was lost; the file that stood there is then
+  // untouched. Without commit() nothing changes.
   bool commit();
   QString errorString() const;
 
  private:
+  bool openStandardOutput();
+  bool openReplacement(const struct stat* replaced);
+  bool adopt(int descriptor);
+  void discard();
+  bool fail(int error);
+
   QString m_fileName;
-  std::unique_ptr<QFileDevice> m_device;
-  bool m_replaces = false;
+  DescriptorDevice m_device;
+  int m_folder = -1;           // descriptor of the folder of the place, while a replacement is written
+  QByteArray m_targetName;     // inside that folder
+  QByteArray m_temporaryName;  // inside that folder; empty when the place is written directly
   QString m_error;
 };
