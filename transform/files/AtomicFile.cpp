@@ -25,9 +25,9 @@ bool copyOwnerAndPermissions(int descriptor, const struct stat& from) {
     return false;
   }
   const bool differs = own.st_uid != from.st_uid || own.st_gid != from.st_gid;
-  if (differs && ::fchown(descriptor, from.st_uid, from.st_gid) != 0 &&
-      ::fchown(descriptor, static_cast<uid_t>(-1), from.st_gid) != 0 && errno != EPERM) {
-    return false;
+  if (differs && ::fchown(descriptor, from.st_uid, from.st_gid) != 0) {
+    // An owner that cannot be kept is no reason to refuse; the group alone may still be.
+    [[maybe_unused]] const int kept = ::fchown(descriptor, static_cast<uid_t>(-1), from.st_gid);
   }
   return ::fchmod(descriptor, from.st_mode & 07777) == 0;
 }

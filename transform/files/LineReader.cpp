@@ -1,34 +1,65 @@
 #include <transform/files/LineReader.h>
 
-#include <cstdio>
+#include <algorithm>
+#include <cstring>
 #include <unistd.h>
+
+namespace {
+
+constexpr int kChunk = 64 * 1024;
+
+}  // namespace
 
 LineReader::LineReader(const QString& fileName, qint64 longestLine)
     : m_fileName(fileName), m_file(fileName), m_longestLine(longestLine) {}
 
 bool LineReader::open() {
-  const bool opened = m_fileName == QLatin1String("-") ? m_file.open(STDIN_FILENO, QIODevice::ReadOnly)
-                                                       : m_file.open(QIODevice::ReadOnly);
+  m_line.reserve(kChunk);  // kept from line to line
+  const QIODevice::OpenMode mode = QIODevice::ReadOnly | QIODevice::Unbuffered;
+  const bool opened = m_fileName == QLatin1String("-") ? m_file.open(STDIN_FILENO, mode) : m_file.open(mode);
   return opened || fail(m_file.errorString());
 }
 
 bool LineReader::next() {
+  m_line.resize(0);
   if (failed() || !m_file.isOpen()) {
     return false;
   }
-  // One byte beyond the limit, and one for the line end, tell a line that is too long.
-  m_line = m_file.readLine(m_longestLine + 2);
-  if (m_line.isEmpty()) {
-    return m_file.error() == QFileDevice::NoError ? false : fail(m_file.errorString());
+  m_offset += m_consumed;
+  m_consumed = 0;
+  bool complete = false;
+  while (!complete && (m_start < m_chunk.size() || fill())) {
+    const char* begin = m_chunk.constData() + m_start;
+    const int available = m_chunk.size() - m_start;
+    const auto* end = static_cast<const char*>(std::memchr(begin, '\n', static_cast<std::size_t>(available)));
+    complete = end != nullptr;
+    const int taken = complete ? static_cast<int>(end - begin) + 1 : available;
+    m_line.append(begin, complete ? taken - 1 : taken);
+    m_start += taken;
+    m_consumed += taken;
+    // A carriage return may still turn out to be part of the line end.
+    if (m_line.size() > m_longestLine + 1) {
+      break;
+    }
   }
-  m_offset = m_nextOffset;
-  m_nextOffset += m_line.size();
+  if (failed() || m_consumed == 0) {
+    return false;
+  }
   ++m_number;
-  if (m_line.endsWith('\n')) {
-    m_line.chop(m_line.endsWith("\r\n") ? 2 : 1);
+  if (complete && m_line.endsWith('\r')) {
+    m_line.chop(1);
   }
   return m_line.size() <= m_longestLine ||
          fail(QStringLiteral("line %1 is longer than %2 bytes").arg(m_number).arg(m_longestLine));
+}
+
+// False at the end of the file and after an error.
+bool LineReader::fill() {
+  m_start = 0;
+  m_chunk.resize(kChunk);
+  const qint64 read = m_file.read(m_chunk.data(), kChunk);
+  m_chunk.resize(static_cast<int>(std::max<qint64>(read, 0)));
+  return read > 0 || (read < 0 && fail(m_file.errorString()));
 }
 
 bool LineReader::fail(const QString& reason) {

@@ -31,6 +31,7 @@ class ORX_EXPORT LineReader {
   const QString& errorString() const { return m_error; }
 
  private:
+  bool fill();
   bool fail(const QString& reason);
 
   QString m_fileName;
@@ -39,6 +40,8 @@ class ORX_EXPORT LineReader {
   QByteArray m_line;
   qint64 m_number = 0;
   qint64 m_offset = 0;
-  qint64 m_nextOffset = 0;
+  qint64 m_consumed = 0;  // bytes of the current line with its end
+  QByteArray m_chunk;     // what was read ahead, from m_start on
+  int m_start = 0;
   QString m_error;
 };

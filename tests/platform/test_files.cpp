@@ -1,0 +1,336 @@
+#include <transform/files/AtomicFile.h>
+#include <transform/files/FolderListing.h>
+#include <transform/files/LineReader.h>
+#include <transform/files/TemporaryFile.h>
+
+#include <QDir>
+#include <QFile>
+#include <QTemporaryDir>
+#include <gtest/gtest.h>
+
+#include <cerrno>
+#include <csignal>
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace {
+
+QString text(const char* utf8) {
+  return QString::fromUtf8(utf8);
+}
+
+QByteArray contentOf(const QString& name) {
+  QFile file(name);
+  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(cannot be read)");
+}
+
+void put(const QString& name, const QByteArray& content) {
+  QFile file(name);
+  ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+  ASSERT_EQ(file.write(content), content.size());
+}
+
+unsigned modeOf(const QString& name) {
+  struct stat status {};
+  return ::stat(name.toUtf8().constData(), &status) == 0 ? status.st_mode & 07777 : 0;
+}
+
+// Gives up the rights of the superuser, for whom nothing is unwritable.
+class WithoutRights {
+ public:
+  WithoutRights() : m_user(::geteuid()) { m_given = m_user != 0 || ::seteuid(65534) == 0; }
+  ~WithoutRights() {
+    if (::geteuid() != m_user) {
+      EXPECT_EQ(::seteuid(m_user), 0);
+    }
+  }
+  bool given() const { return m_given; }
+
+ private:
+  uid_t m_user;
+  bool m_given;
+};
+
+// Puts another descriptor in the place of standard output.
+class StandardOutputAs {
+ public:
+  explicit StandardOutputAs(int descriptor) : m_before(::dup(STDOUT_FILENO)) {
+    ::dup2(descriptor, STDOUT_FILENO);
+  }
+  ~StandardOutputAs() {
+    ::dup2(m_before, STDOUT_FILENO);
+    ::close(m_before);
+  }
+
+ private:
+  int m_before;
+};
+
+class AtomicFiles : public testing::Test {
+ protected:
+  QString path(const char* name) const { return m_folder.filePath(QLatin1String(name)); }
+  // What a writer may leave behind is hidden.
+  QStringList entries() const {
+    return QDir(m_folder.path())
+        .entryList(QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot);
+  }
+
+  QTemporaryDir m_folder;
+};
+
+TEST_F(AtomicFiles, AppearsWhenCommitted) {
+  AtomicFile file(path("new.txt"));
+  ASSERT_TRUE(file.open()) << qPrintable(file.errorString());
+  const QByteArray large(300 * 1000, 'x');
+  file.device().write("head\n");
+  file.device().write(large);
+  EXPECT_FALSE(QFile::exists(path("new.txt")));
+  ASSERT_TRUE(file.commit()) << qPrintable(file.errorString());
+  EXPECT_EQ(contentOf(path("new.txt")), "head\n" + large);
+  EXPECT_EQ(entries(), QStringList{text("new.txt")});
+  EXPECT_FALSE(file.commit());
+}
+
+TEST_F(AtomicFiles, LeavesTheOldFileWithoutCommit) {
+  put(path("old.txt"), "old");
+  {
+    AtomicFile file(path("old.txt"));
+    ASSERT_TRUE(file.open());
+    file.device().write(QByteArray(100 * 1000, 'n'));
+    EXPECT_EQ(contentOf(path("old.txt")), "old");
+  }
+  EXPECT_EQ(contentOf(path("old.txt")), "old");
+  EXPECT_EQ(entries(), QStringList{text("old.txt")});
+}
+
+TEST_F(AtomicFiles, KeepsPermissions) {
+  const mode_t umaskBefore = ::umask(027);
+  for (const unsigned mode : {0600u, 0644u, 0666u, 0751u}) {
+    put(path("kept"), "old");
+    ASSERT_EQ(::chmod(path("kept").toUtf8().constData(), mode), 0);
+    AtomicFile file(path("kept"));
+    ASSERT_TRUE(file.open());
+    ASSERT_TRUE(file.commit());
+    EXPECT_EQ(modeOf(path("kept")), mode);
+    EXPECT_EQ(contentOf(path("kept")), "");
+  }
+  AtomicFile fresh(path("fresh"));
+  EXPECT_TRUE(fresh.open() && fresh.commit());
+  EXPECT_EQ(modeOf(path("fresh")), 0640u);
+  ::umask(umaskBefore);
+}
+
+TEST_F(AtomicFiles, FollowsLinksToFilesThatStandAndThatDoNot) {
+  put(path("target"), "old");
+  ASSERT_TRUE(QDir(m_folder.path()).mkdir(text("sub")));
+  ASSERT_TRUE(QFile::link(text("target"), path("link")));
+  ASSERT_TRUE(QFile::link(text("../link"), path("sub/chain")));
+  ASSERT_TRUE(QFile::link(text("missing"), path("dangling")));
+  ASSERT_TRUE(QFile::link(text("loop"), path("loop")));
+  struct {
+    const char* name;
+    const char* target;
+  } const cases[] = {{"link", "target"}, {"sub/chain", "target"}, {"dangling", "missing"}};
+  for (const auto& each : cases) {
+    AtomicFile file(path(each.name));
+    ASSERT_TRUE(file.open()) << each.name;
+    file.device().write(each.name);
+    ASSERT_TRUE(file.commit()) << each.name;
+    EXPECT_TRUE(QFileInfo(path(each.name)).isSymLink());
+    EXPECT_EQ(contentOf(path(each.target)), each.name);
+  }
+  AtomicFile loop(path("loop"));
+  EXPECT_FALSE(loop.open());
+}
+
+TEST_F(AtomicFiles, NamesFileAndReasonWhenThePlaceIsNoGood) {
+  put(path("file"), "x");
+  struct {
+    QString name;
+    int reason;
+  } const cases[] = {{path("missing/out.txt"), ENOENT},
+                     {path("file/out.txt"), ENOTDIR},
+                     {m_folder.path(), EISDIR},
+                     {m_folder.path() + QLatin1Char('/'), EISDIR},
+                     {QString(), ENOENT},
+                     {path("nul") + QChar(0), EINVAL},
+                     {path("") + QString(300, QLatin1Char('n')), ENAMETOOLONG}};
+  for (const auto& each : cases) {
+    AtomicFile file(each.name);
+    EXPECT_FALSE(file.open()) << qPrintable(each.name);
+    EXPECT_EQ(file.errorString(), each.name + QLatin1String(": ") + qt_error_string(each.reason));
+    EXPECT_FALSE(file.commit());
+    EXPECT_EQ(file.device().write("x"), -1);
+  }
+  EXPECT_EQ(entries(), QStringList{text("file")});
+}
+
+TEST_F(AtomicFiles, RefusesWhatMayNotBeWritten) {
+  put(path("readonly"), "old");
+  ASSERT_EQ(::chmod(path("readonly").toUtf8().constData(), 0444), 0);
+  ASSERT_TRUE(QDir(m_folder.path()).mkdir(text("closed")));
+  ASSERT_EQ(::chmod(path("closed").toUtf8().constData(), 0555), 0);
+  ASSERT_EQ(::chmod(m_folder.path().toUtf8().constData(), 0777), 0);
+  {
+    const WithoutRights guard;
+    ASSERT_TRUE(guard.given());
+    for (const char* name : {"readonly", "closed/out.txt"}) {
+      AtomicFile file(path(name));
+      EXPECT_FALSE(file.open()) << name;
+      EXPECT_TRUE(file.errorString().endsWith(qt_error_string(EACCES))) << qPrintable(file.errorString());
+    }
+  }
+  EXPECT_EQ(contentOf(path("readonly")), "old");
+}
+
+TEST_F(AtomicFiles, ReportsAFullDeviceHoweverLittleWasWritten) {
+  for (const int size : {1, 70 * 1000, 300 * 1000}) {
+    AtomicFile file(text("/dev/full"));
+    ASSERT_TRUE(file.open()) << qPrintable(file.errorString());
+    file.device().write(QByteArray(size, 'x'));
+    file.device().write("more");  // a writer that does not look at results
+    EXPECT_FALSE(file.commit()) << size;
+    EXPECT_EQ(file.errorString(), text("/dev/full: ") + qt_error_string(ENOSPC));
+  }
+  AtomicFile sink(text("/dev/null"));
+  EXPECT_TRUE(sink.open() && sink.device().write("x") == 1 && sink.commit());
+  EXPECT_TRUE(QFileInfo(text("/dev/null")).exists());
+}
+
+TEST_F(AtomicFiles, WritesToStandardOutputByEitherName) {
+  put(path("redirected"), "before\n");
+  const int descriptor = ::open(path("redirected").toUtf8().constData(), O_WRONLY | O_APPEND);
+  struct stat before {};
+  ASSERT_EQ(::fstat(descriptor, &before), 0);
+  for (const char* name : {"-", "/dev/stdout", "/dev/fd/1", "/proc/self/fd/1"}) {
+    const StandardOutputAs redirected(descriptor);
+    AtomicFile file(QString::fromLatin1(name));
+    EXPECT_TRUE(file.open() && file.device().write(QByteArray(name) + "\n") > 0 && file.commit());
+  }
+  EXPECT_EQ(contentOf(path("redirected")), "before\n-\n/dev/stdout\n/dev/fd/1\n/proc/self/fd/1\n");
+  struct stat after {};
+  ASSERT_EQ(::stat(path("redirected").toUtf8().constData(), &after), 0);
+  EXPECT_EQ(before.st_ino, after.st_ino);
+  ::close(descriptor);
+}
+
+TEST_F(AtomicFiles, SeesAClosedPipeAndLivesOn) {
+  int ends[2];
+  ASSERT_EQ(::pipe(ends), 0);
+  ::close(ends[0]);
+  AtomicFile file(text("-"));
+  {
+    const StandardOutputAs broken(ends[1]);
+    EXPECT_TRUE(file.open());
+    file.device().write("x");
+  }
+  ::close(ends[1]);
+  EXPECT_FALSE(file.commit());
+  EXPECT_EQ(file.errorString(), text("standard output: ") + qt_error_string(EPIPE));
+  sigset_t pending;
+  ASSERT_EQ(::sigpending(&pending), 0);
+  EXPECT_EQ(::sigismember(&pending, SIGPIPE), 0);
+}
+
+TEST_F(AtomicFiles, FindsItsPlaceAfterAChangeOfFolder) {
+  const QString before = QDir::currentPath();
+  ASSERT_TRUE(QDir::setCurrent(m_folder.path()));
+  AtomicFile file(text("relative.txt"));
+  EXPECT_TRUE(file.open());
+  file.device().write("here");
+  ASSERT_TRUE(QDir::setCurrent(before));
+  EXPECT_TRUE(file.commit()) << qPrintable(file.errorString());
+  EXPECT_EQ(contentOf(path("relative.txt")), "here");
+}
+
+TEST_F(AtomicFiles, ReportsAPlaceThatWasTakenMeanwhile) {
+  AtomicFile file(path("taken"));
+  ASSERT_TRUE(file.open());
+  ASSERT_TRUE(QDir(m_folder.path()).mkdir(text("taken")));
+  EXPECT_FALSE(file.commit());
+  EXPECT_FALSE(file.errorString().isEmpty());
+  EXPECT_EQ(entries(), QStringList{text("taken")});
+}
+
+using FolderListings = AtomicFiles;
+
+TEST_F(FolderListings, SortsByCodeAndTellsFailureFromEmpty) {
+  for (const char* name : {"b.ort", "B.ort", "a.ort", "\xc3\xa4.ort", "a.txt", ".hidden.ort"}) {
+    put(m_folder.filePath(QString::fromUtf8(name)), "x");
+  }
+  ASSERT_TRUE(QDir(m_folder.path()).mkdir(text("sub.ort")));
+  ASSERT_TRUE(QFile::link(text("a.txt"), path("link.ort")));
+  ASSERT_TRUE(QFile::link(text("nowhere"), path("dangling.ort")));
+  EXPECT_EQ(
+      FolderListing::files(m_folder.path(), text(".ort")).names(),
+      (QStringList{text("B.ort"), text("a.ort"), text("b.ort"), text("link.ort"), text("\xc3\xa4.ort")}));
+  EXPECT_EQ(FolderListing::folders(m_folder.path()).names(), QStringList{text("sub.ort")});
+  const FolderListing empty = FolderListing::files(path("sub.ort"));
+  EXPECT_TRUE(empty.names().isEmpty());
+  EXPECT_FALSE(empty.failed());
+  for (const char* name : {"missing", "a.txt"}) {
+    const FolderListing failed = FolderListing::files(path(name));
+    EXPECT_TRUE(failed.failed()) << name;
+    EXPECT_TRUE(failed.errorString().startsWith(path(name) + QLatin1String(": ")));
+  }
+}
+
+using LineReaders = AtomicFiles;
+
+TEST_F(LineReaders, GivesLinesWithTheirPlaces) {
+  put(path("lines"), QByteArray("one\r\n\n\xc3\xa4 \0x\nlast", 16));
+  LineReader reader(path("lines"));
+  ASSERT_TRUE(reader.open());
+  struct {
+    QByteArray line;
+    qint64 offset;
+  } const expected[] = {{"one", 0}, {"", 5}, {QByteArray("\xc3\xa4 \0x", 5), 6}, {"last", 12}};
+  qint64 number = 0;
+  for (const auto& each : expected) {
+    ASSERT_TRUE(reader.next());
+    EXPECT_EQ(reader.line(), each.line);
+    EXPECT_EQ(reader.offset(), each.offset);
+    EXPECT_EQ(reader.number(), ++number);
+  }
+  EXPECT_FALSE(reader.next());
+  EXPECT_FALSE(reader.failed());
+}
+
+TEST_F(LineReaders, BoundsTheLine) {
+  struct {
+    QByteArray content;
+    bool taken;
+  } const cases[] = {{"12345678\n", true},   {"12345678\r\n", true}, {"12345678", true},
+                     {"123456789\n", false}, {"123456789", false},   {"1234567890123\n", false}};
+  for (const auto& each : cases) {
+    put(path("long"), each.content);
+    LineReader reader(path("long"), 8);
+    ASSERT_TRUE(reader.open());
+    EXPECT_EQ(reader.next(), each.taken) << each.content.constData();
+    EXPECT_EQ(reader.failed(), !each.taken);
+    EXPECT_FALSE(reader.next());
+  }
+}
+
+TEST_F(LineReaders, NamesAFileThatCannotBeRead) {
+  for (const QString& name : {path("missing"), m_folder.path()}) {
+    LineReader reader(name);
+    EXPECT_FALSE(reader.open() && !reader.next() && !reader.failed()) << qPrintable(name);
+    EXPECT_TRUE(reader.errorString().startsWith(name + QLatin1String(": ")));
+    EXPECT_FALSE(reader.next());
+  }
+}
+
+TEST(TemporaryFiles, ArePrivateAndGoAway) {
+  QString name;
+  {
+    TemporaryFile file(text("orx-test-XXXXXX"));
+    ASSERT_TRUE(file.open());
+    name = file.fileName();
+    EXPECT_EQ(modeOf(name), 0600u);
+  }
+  EXPECT_FALSE(QFile::exists(name));
+}
+
+}  // namespace
