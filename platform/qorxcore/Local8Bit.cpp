@@ -5,7 +5,8 @@ QByteArray QORXToLocal8Bit(const QString& text) {
 }
 
 QString QORXFromLocal8Bit(const QByteArray& bytes) {
-  return QString::fromUtf8(bytes);
+  // With the size given, null characters do not end the text.
+  return QString::fromUtf8(bytes.constData(), bytes.size());
 }
 
 QString QORXFromLocal8Bit(const char* bytes) {

@@ -181,8 +181,4 @@ TEST(ValueList, HoldsAMillionValues) {
   EXPECT_TRUE(numbers.isEmpty());
 }
 
-TEST(SystemEncoding, IsUtf8) {
-  EXPECT_STREQ(ORXSystemEncodingName(), "UTF-8");
-}
-
 }  // namespace
