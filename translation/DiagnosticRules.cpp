@@ -1,0 +1,28 @@
+#include <translation/DiagnosticRules.h>
+
+const std::vector<DiagnosticRule>& diagnosticRules() {
+  static const std::vector<DiagnosticRule> rules = {
+      {Rule::NoDocument, QLatin1String("no-document"), Severity::Error, 370780},
+      {Rule::UnknownTransformer, QLatin1String("unknown-transformer"), Severity::Error, 370781},
+      {Rule::UnknownVersion, QLatin1String("unknown-version"), Severity::Error, 370782},
+      {Rule::CustomTransformer, QLatin1String("custom-transformer"), Severity::Error, 370783},
+      {Rule::UnknownParameter, QLatin1String("unknown-parameter"), Severity::Error, 370784},
+      {Rule::DuplicateName, QLatin1String("duplicate-name"), Severity::Error, 370785},
+      {Rule::DuplicateNumber, QLatin1String("duplicate-number"), Severity::Error, 370786},
+      {Rule::DanglingLink, QLatin1String("dangling-link"), Severity::Error, 370787},
+      {Rule::BadPort, QLatin1String("bad-port"), Severity::Error, 370788},
+      {Rule::UnknownInput, QLatin1String("unknown-input"), Severity::Error, 370789},
+      {Rule::UnknownOutput, QLatin1String("unknown-output"), Severity::Error, 370790},
+      {Rule::Cycle, QLatin1String("cycle"), Severity::Error, 370791},
+      {Rule::UnwritableValue, QLatin1String("unwritable-value"), Severity::Error, 370792},
+      {Rule::UnclosedReference, QLatin1String("unclosed-reference"), Severity::Error, 370793},
+      {Rule::LineBreak, QLatin1String("line-break"), Severity::Error, 370794},
+      {Rule::UnknownGlobalParameter, QLatin1String("unknown-global-parameter"), Severity::Error, 370795},
+      {Rule::BadPromptLine, QLatin1String("bad-prompt-line"), Severity::Error, 370796},
+      {Rule::UnmetDependency, QLatin1String("unmet-dependency"), Severity::Warning, 370797},
+      {Rule::Upgraded, QLatin1String("upgraded"), Severity::Hint, 370798},
+  };
+  return rules;
+}
+
+const DiagnosticRule& diagnosticRule(Rule rule) { return diagnosticRules()[static_cast<std::size_t>(rule)]; }

@@ -1,0 +1,44 @@
+// Everything that can be wrong with a workspace, as one table: the rule's name, how severe it is by default, and the
+// number of its message.
+#pragma once
+
+#include <platform/Export.h>
+
+#include <QLatin1String>
+
+#include <vector>
+
+enum class Severity { Error, Warning, Hint };
+
+enum class Rule {
+  NoDocument,
+  UnknownTransformer,
+  UnknownVersion,
+  CustomTransformer,
+  UnknownParameter,
+  DuplicateName,
+  DuplicateNumber,
+  DanglingLink,
+  BadPort,
+  UnknownInput,
+  UnknownOutput,
+  Cycle,
+  UnwritableValue,
+  UnclosedReference,
+  LineBreak,
+  UnknownGlobalParameter,
+  BadPromptLine,
+  UnmetDependency,
+  Upgraded,
+};
+
+struct DiagnosticRule {
+  Rule rule;
+  QLatin1String name;
+  Severity severity;
+  long message;
+};
+
+// In the order of the enumeration.
+ORX_EXPORT const std::vector<DiagnosticRule>& diagnosticRules();
+ORX_EXPORT const DiagnosticRule& diagnosticRule(Rule rule);

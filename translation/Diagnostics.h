@@ -1,0 +1,41 @@
+// What was found wrong with a document, in the order in which it was found.
+#pragma once
+
+#include <platform/Export.h>
+#include <translation/DiagnosticRules.h>
+
+#include <QString>
+#include <QStringList>
+
+#include <vector>
+
+struct Diagnostic {
+  Rule rule;
+  Severity severity;
+  QString file;
+  int line = 0;  // of the element in the file, from 1; 0 when the whole file is meant
+  QString node;  // empty when no node is meant
+  QString text;
+};
+
+class ORX_EXPORT Diagnostics {
+ public:
+  explicit Diagnostics(const QString& file) : m_file(file) {}
+
+  const QString& file() const { return m_file; }
+  // The text is the rule's message in the current language with `arguments` (at most five) filled in.
+  void report(Rule rule, int line, const QString& node, const QStringList& arguments = QStringList());
+
+  bool hasErrors() const { return m_errors > 0; }
+  const std::vector<Diagnostic>& all() const { return m_all; }
+
+ private:
+  QString m_file;
+  std::vector<Diagnostic> m_all;
+  int m_errors = 0;
+};
+
+// "error", "warning" or "hint".
+ORX_EXPORT QString severityName(Severity severity);
+// FILE:LINE: error|warning|hint: NODE: text; line and node are left out when there is none.
+ORX_EXPORT QString formatDiagnostic(const Diagnostic& diagnostic);

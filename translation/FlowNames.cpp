@@ -1,0 +1,17 @@
+#include <translation/FlowNames.h>
+
+QString FlowNames::claim(const QString& wanted) {
+  auto taken = m_lastSuffix.find(wanted);
+  if (taken == m_lastSuffix.end()) {
+    m_lastSuffix.insert(wanted, 1);
+    return wanted;
+  }
+  int suffix = taken.value();
+  QString name;
+  do {
+    name = wanted + QLatin1Char('_') + QString::number(++suffix);
+  } while (m_lastSuffix.contains(name));
+  taken.value() = suffix;
+  m_lastSuffix.insert(name, 1);
+  return name;
+}

@@ -1,0 +1,17 @@
+// The names under which features flow through one mapping file: each is given out once, so that no two streams of
+// features mix.
+#pragma once
+
+#include <platform/Export.h>
+
+#include <QHash>
+#include <QString>
+
+class ORX_EXPORT FlowNames {
+ public:
+  // `wanted` itself, or with "_2", "_3" and so on behind when it is taken.
+  QString claim(const QString& wanted);
+
+ private:
+  QHash<QString, int> m_lastSuffix;  // every name given out, with the last suffix tried behind it
+};

@@ -1,0 +1,125 @@
+#include <transform/text/GlobalMacros.h>
+#include <translation/GlobalParameters.h>
+#include <translation/MacroReferences.h>
+
+namespace {
+
+// Values that refer to values that refer to values can grow without end; what goes beyond these stays as it stands.
+constexpr int kMaximumNesting = 32;
+constexpr int kMaximumReplacements = 10000;
+constexpr int kMaximumLength = 1 << 20;
+
+QString referencedName(const QString& reference) {
+  if (!reference.startsWith(QLatin1String("$(")) || !reference.endsWith(QLatin1Char(')')))
+    return QString();
+  return reference.mid(2, reference.size() - 3);
+}
+
+}  // namespace
+
+void GlobalParameters::readHeaderLine(const QString& line, int lineNumber) {
+  for (const QLatin1String keyword : {QLatin1String("DEFAULT_MACRO "), QLatin1String("MACRO ")}) {
+    if (!line.startsWith(keyword))
+      continue;
+    const QString rest = line.mid(keyword.size()).trimmed();
+    const int blank = rest.indexOf(QLatin1Char(' '));
+    const QString name = blank < 0 ? rest : rest.left(blank);
+    if (name.isEmpty())
+      return;
+    const bool isNew = !m_index.contains(name);
+    Parameter& parameter = entry(name);
+    // An earlier setting stands against a default.
+    if (isNew || keyword == QLatin1String("MACRO "))
+      parameter.value = blank < 0 ? QString() : rest.mid(blank + 1).trimmed();
+    parameter.setInHeader = true;
+    parameter.line = lineNumber;
+    return;
+  }
+}
+
+void GlobalParameters::declare(const QString& name, const QString& value, int lineNumber) {
+  Parameter& parameter = entry(name);
+  parameter.isPublished = true;
+  if (!parameter.setInHeader) {
+    parameter.value = value;
+    parameter.line = lineNumber;
+  }
+}
+
+bool GlobalParameters::override(const QString& name, const QString& value) {
+  if (!m_index.contains(name))
+    return false;
+  Parameter& parameter = entry(name);
+  parameter.value = value;
+  parameter.isOverridden = true;
+  return true;
+}
+
+GlobalParameters::Parameter& GlobalParameters::entry(const QString& name) {
+  const auto found = m_index.constFind(name);
+  if (found != m_index.constEnd())
+    return m_parameters[static_cast<std::size_t>(found.value())];
+  m_index.insert(name, static_cast<int>(m_parameters.size()));
+  m_parameters.emplace_back();
+  m_parameters.back().name = name;
+  return m_parameters.back();
+}
+
+const GlobalParameters::Parameter* GlobalParameters::find(const QString& name) const {
+  const auto found = m_index.constFind(name);
+  return found == m_index.constEnd() ? nullptr : &m_parameters[static_cast<std::size_t>(found.value())];
+}
+
+const GlobalParameters::Parameter* GlobalParameters::findReference(const QString& reference) const {
+  return find(referencedName(reference));
+}
+
+bool GlobalParameters::isPublishedParameter(const QString& reference) const {
+  const Parameter* parameter = findReference(reference);
+  return parameter && parameter->isPublished;
+}
+
+bool GlobalParameters::isPrivateParameter(const QString& reference) const {
+  const Parameter* parameter = findReference(reference);
+  return parameter && !parameter->isPublished;
+}
+
+bool GlobalParameters::isBuiltInParameter(const QString& reference) const {
+  return isGlobalMacro(referencedName(reference));
+}
+
+bool GlobalParameters::holdsReference(const QString& text) const {
+  MacroReferences references(text);
+  while (references.next()) {
+    if (m_index.contains(references.name()))
+      return true;
+  }
+  return false;
+}
+
+QString GlobalParameters::resolve(const QString& text) const {
+  QStringList open;
+  int budget = kMaximumReplacements;
+  return resolve(text, open, budget);
+}
+
+QString GlobalParameters::resolve(const QString& text, QStringList& open, int& budget) const {
+  MacroReferences references(text);
+  QString result;
+  int copied = 0;
+  while (references.next()) {
+    const Parameter* parameter = find(references.name());
+    if (!parameter || open.contains(parameter->name) || open.size() >= kMaximumNesting || --budget < 0)
+      continue;
+    result += text.midRef(copied, references.start() - copied);
+    open.append(parameter->name);
+    result += resolve(parameter->value, open, budget);
+    open.removeLast();
+    copied = references.end();
+    if (result.size() > kMaximumLength)
+      return text;
+  }
+  if (copied == 0)
+    return text;
+  return result + text.midRef(copied);
+}

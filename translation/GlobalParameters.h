@@ -1,0 +1,54 @@
+// The global parameters of one workspace: what its header sets, what its document declares, what the caller gives
+// another value.
+#pragma once
+
+#include <platform/Export.h>
+#include <transform/core/WorkspaceParameterDirectory.h>
+
+#include <QHash>
+#include <QString>
+#include <QStringList>
+
+#include <vector>
+
+class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
+ public:
+  struct Parameter {
+    QString name;
+    QString value;             // as stored: encoded where its type is
+    bool setInHeader = false;  // a header line sets it, so no statement of ours does
+    bool isPublished = false;  // declared by a prompt line
+    bool isOverridden = false;
+    int line = 0;
+  };
+
+  // Takes "MACRO NAME VALUE" and "DEFAULT_MACRO NAME VALUE" lines; every other line is passed over.
+  void readHeaderLine(const QString& line, int lineNumber);
+  // A value that the header sets is kept.
+  void declare(const QString& name, const QString& value, int lineNumber);
+  // False when the workspace has no such parameter.
+  bool override(const QString& name, const QString& value);
+
+  // In order of first appearance.
+  const std::vector<Parameter>& all() const { return m_parameters; }
+  // Null when there is none.
+  const Parameter* find(const QString& name) const;
+
+  bool isPublishedParameter(const QString& reference) const override;
+  bool isPrivateParameter(const QString& reference) const override;
+  bool isBuiltInParameter(const QString& reference) const override;
+
+  // Whether the text holds a reference "$(NAME)" to one of these parameters.
+  bool holdsReference(const QString& text) const;
+  // Every reference to one of these parameters replaced by its value, references inside values too. A parameter
+  // that refers to itself keeps its reference as it stands.
+  QString resolve(const QString& text) const;
+
+ private:
+  Parameter& entry(const QString& name);
+  const Parameter* findReference(const QString& reference) const;
+  QString resolve(const QString& text, QStringList& open, int& budget) const;
+
+  std::vector<Parameter> m_parameters;
+  QHash<QString, int> m_index;
+};

@@ -1,0 +1,283 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/text/MFBuffer.h>
+#include <transform/text/TextHelpers.h>
+#include <translation/FlowNames.h>
+#include <translation/FlowOrder.h>
+#include <translation/MappingFileWriter.h>
+#include <translation/ProgramVersion.h>
+
+#include <QSet>
+
+#include <limits>
+
+namespace {
+
+std::size_t at(int number) { return static_cast<std::size_t>(number); }
+
+bool hasUnclosedReference(const QString& text) {
+  int open = text.indexOf(QLatin1String("$["));
+  while (open >= 0) {
+    const int close = text.indexOf(QLatin1Char(']'), open);
+    if (close < 0)
+      return true;
+    // The buffer pairs the first "$[" with the first "]" behind it and starts again; so does this.
+    open = text.indexOf(QLatin1String("$["), open + 2);
+  }
+  return false;
+}
+
+void writeStatement(MFBuffer& buffer, const QString& line) {
+  buffer.add(line);
+  buffer.flush();
+}
+
+}  // namespace
+
+MappingFileWriter::MappingFileWriter(Workspace& workspace, Diagnostics& diagnostics)
+    : m_workspace(workspace), m_diagnostics(diagnostics) {}
+
+bool MappingFileWriter::prepare() {
+  const std::size_t count = m_workspace.nodes.size();
+  m_flows.assign(count, {});
+  m_functions.assign(count, {});
+  m_copies.assign(count, {});
+  m_copiedFlows.assign(count, QString());
+  m_incoming.assign(count, {});
+  if (order()) {
+    nameFlows();
+    connect();
+    pushAttributes();
+  }
+  check();
+  return !m_diagnostics.hasErrors();
+}
+
+bool MappingFileWriter::order() {
+  std::vector<std::pair<int, int>> edges;
+  edges.reserve(m_workspace.links.size());
+  for (const WorkspaceLink& link : m_workspace.links)
+    edges.emplace_back(link.source, link.target);
+  const FlowOrder flow = flowOrder(static_cast<int>(m_workspace.nodes.size()), edges);
+  for (const std::vector<int>& cycle : flow.cycles) {
+    QStringList names;
+    for (const int member : cycle)
+      names.append(m_workspace.nodes[at(member)].name);
+    m_diagnostics.report(Rule::Cycle, m_workspace.nodes[at(cycle.front())].line, names.first(),
+                         {names.join(QLatin1String(", "))});
+  }
+  for (const int node : flow.order) {
+    if (m_workspace.nodes[at(node)].isTransformer())
+      m_order.push_back(node);
+  }
+  return flow.cycles.empty();
+}
+
+void MappingFileWriter::nameFlows() {
+  for (const AttributeLink& link : m_workspace.attributeLinks) {
+    const QString function =
+        QStringLiteral("@CopyAttribute(%1,%2)").arg(QORXWwjdEncode(link.to), QORXWwjdEncode(link.from));
+    QStringList& functions = m_functions[at(link.source)][link.output];
+    if (functions.contains(function))
+      continue;
+    functions.append(function);
+    m_copies[at(link.source)][link.output].append(link.to);
+  }
+
+  std::vector<QSet<QString>> connected(m_workspace.nodes.size());
+  for (const WorkspaceLink& link : m_workspace.links)
+    connected[at(link.source)].insert(link.output);
+
+  FlowNames names;
+  const int count = static_cast<int>(m_workspace.nodes.size());
+  // What a writer takes keeps the writer's own name, so those come first.
+  for (const WorkspaceNode::Kind kind : {WorkspaceNode::Kind::Writer, WorkspaceNode::Kind::Reader}) {
+    for (int node = 0; node < count; ++node) {
+      if (m_workspace.nodes[at(node)].kind == kind)
+        m_flows[at(node)].insert(QString(), names.claim(m_workspace.nodes[at(node)].name));
+    }
+  }
+  for (int node = 0; node < count; ++node) {
+    const WorkspaceNode& place = m_workspace.nodes[at(node)];
+    if (place.kind == WorkspaceNode::Kind::Reader && m_functions[at(node)].contains(QString())) {
+      m_copiedFlows[at(node)] = names.claim(m_flows[at(node)].value(QString()));
+    } else if (place.isTransformer()) {
+      QStringList tags;
+      place.cfg->getOutputTags(tags);
+      for (const QString& tag : tags) {
+        if (connected[at(node)].contains(tag))
+          m_flows[at(node)].insert(tag, names.claim(place.name + QLatin1Char('_') + tag));
+      }
+    }
+  }
+}
+
+const QString& MappingFileWriter::flowOf(int node, const QString& output) const {
+  static const QString none;
+  if (!m_copiedFlows[at(node)].isEmpty())
+    return m_copiedFlows[at(node)];
+  const auto flow = m_flows[at(node)].constFind(output);
+  return flow == m_flows[at(node)].constEnd() ? none : flow.value();
+}
+
+void MappingFileWriter::connect() {
+  for (std::size_t number = 0; number < m_workspace.links.size(); ++number)
+    m_incoming[at(m_workspace.links[number].target)].push_back(static_cast<int>(number));
+
+  for (std::size_t target = 0; target < m_workspace.nodes.size(); ++target) {
+    const WorkspaceNode& node = m_workspace.nodes[target];
+    QHash<QString, QHash<QString, int>> ranks;
+    for (const QStringList& port : node.inputOrder) {
+      for (int position = 1; position < port.size(); ++position)
+        ranks[port.first()].insert(port.at(position), position);
+    }
+    const auto rank = [&](int number) {
+      constexpr int last = std::numeric_limits<int>::max();
+      const WorkspaceLink& link = m_workspace.links[at(number)];
+      const int byOrder = ranks.isEmpty() ? last : ranks.value(link.input).value(flowOf(link.source, link.output), last);
+      return std::make_pair(byOrder, link.executionIndex < 0 ? last : link.executionIndex);
+    };
+    std::stable_sort(m_incoming[target].begin(), m_incoming[target].end(),
+                     [&](int left, int right) { return rank(left) < rank(right); });
+    if (!node.isTransformer())
+      continue;
+    for (const int number : m_incoming[target]) {
+      const WorkspaceLink& link = m_workspace.links[at(number)];
+      node.cfg->addInputFeatureType(link.input, flowOf(link.source, link.output));
+    }
+    for (auto flow = m_flows[target].cbegin(); flow != m_flows[target].cend(); ++flow)
+      node.cfg->setOutputFeatureType(flow.key(), flow.value());
+    for (auto functions = m_functions[target].cbegin(); functions != m_functions[target].cend(); ++functions)
+      node.cfg->setOutputTagFuncs(functions.key(), functions.value());
+  }
+}
+
+void MappingFileWriter::pushAttributes() {
+  // What leaves an output is asked once, however many links take it on.
+  std::vector<QHash<QString, QStringList>> leaving(m_workspace.nodes.size());
+  const auto attributesOf = [&](const WorkspaceLink& link) -> const QStringList& {
+    QHash<QString, QStringList>& known = leaving[at(link.source)];
+    const auto found = known.constFind(link.output);
+    if (found != known.constEnd())
+      return found.value();
+    const WorkspaceNode& source = m_workspace.nodes[at(link.source)];
+    QStringList attributes =
+        source.isTransformer() ? source.cfg->getOutputAttributes(link.output) : source.attributes;
+    attributes += source.exposed.value(link.output);
+    attributes += m_copies[at(link.source)].value(link.output);
+    attributes.removeDuplicates();
+    return known.insert(link.output, attributes).value();
+  };
+
+  for (const int target : m_order) {
+    QHash<QString, QStringList> arriving;
+    for (const int number : m_incoming[at(target)]) {
+      const WorkspaceLink& link = m_workspace.links[at(number)];
+      arriving[link.input] += attributesOf(link);
+    }
+    for (QStringList& attributes : arriving)
+      attributes.removeDuplicates();
+    m_workspace.nodes[at(target)].cfg->setInputAttributes(arriving);
+  }
+}
+
+void MappingFileWriter::checkText(const QString& text, const QString& what, int line, const QString& node) {
+  if (hasUnclosedReference(text))
+    m_diagnostics.report(Rule::UnclosedReference, line, node, {what});
+  if (text.contains(QLatin1Char('\n')) || text.contains(QLatin1Char('\r')))
+    m_diagnostics.report(Rule::LineBreak, line, node, {what});
+}
+
+void MappingFileWriter::check() {
+  for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
+    if (!parameter.setInHeader || parameter.isOverridden)
+      checkText(parameter.value, parameter.name, parameter.line, QString());
+  }
+  for (const WorkspaceNode& node : m_workspace.nodes) {
+    checkText(node.name, node.name, node.line, node.name);
+    if (!node.isTransformer())
+      continue;
+    const QHash<QString, QString> faults = node.cfg->findUnwritableValues();
+    for (const QString& parameter : node.cfg->getParameters()) {
+      const auto fault = faults.constFind(parameter);
+      if (fault != faults.constEnd())
+        m_diagnostics.report(Rule::UnwritableValue, node.line, node.name, {parameter, fault.value()});
+    }
+  }
+}
+
+void MappingFileWriter::write(MFBuffer& buffer) {
+  writeStatement(buffer, QLatin1String("# Written by ") + programVersion());
+  if (!m_workspace.headerLines.isEmpty()) {
+    for (const QString& line : m_workspace.headerLines)
+      buffer.write(line.toUtf8() + '\n');
+    buffer.write(QByteArray(1, '\n'));
+  }
+  writeParameters(buffer);
+  writeFeatureTypes(buffer);
+  for (const int node : m_order)
+    m_workspace.nodes[at(node)].cfg->instantiate(buffer, m_workspace.fileName);
+  writeWriterRoutes(buffer);
+}
+
+void MappingFileWriter::writeParameters(MFBuffer& buffer) const {
+  for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
+    const QString setting = parameter.name + QLatin1Char(' ') + parameter.value;
+    if (!parameter.setInHeader)
+      writeStatement(buffer, QLatin1String("DEFAULT_MACRO ") + setting);
+    if (parameter.isOverridden)
+      writeStatement(buffer, QLatin1String("MACRO ") + setting);
+  }
+}
+
+void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer) const {
+  for (std::size_t node = 0; node < m_workspace.nodes.size(); ++node) {
+    const WorkspaceNode& place = m_workspace.nodes[node];
+    if (place.isTransformer())
+      continue;
+    const QString flow = m_flows[node].value(QString());
+    if (flow != place.name) {
+      const bool isReader = place.kind == WorkspaceNode::Kind::Reader;
+      const QString type = quotifyStringForMF(place.name);
+      const QString shownFlow = quotifyStringForMF(flow);
+      writeStatement(buffer, QLatin1String(isReader ? "READER_FEATURE_TYPE " : "WRITER_FEATURE_TYPE ") +
+                                 quotifyStringForMF(place.keyword) + QLatin1Char(' ') +
+                                 (isReader ? type + QLatin1Char(' ') + shownFlow
+                                           : shownFlow + QLatin1Char(' ') + type));
+    }
+    if (!m_copiedFlows[node].isEmpty()) {
+      buffer.add(QStringLiteral("FACTORY_DEF * TeeFactory"));
+      buffer.add(QLatin1String("  FACTORY_NAME ") +
+                 quotifyStringForMF(place.keyword + QLatin1Char(' ') + place.name +
+                                    QLatin1String(" Attribute Copier")));
+      buffer.add(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(flow));
+      buffer.add(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(m_copiedFlows[node]));
+      for (const QString& function : m_functions[node].value(QString()))
+        buffer.add(QLatin1String("    ") + function);
+      buffer.flush();
+    }
+  }
+}
+
+void MappingFileWriter::writeWriterRoutes(MFBuffer& buffer) const {
+  for (std::size_t node = 0; node < m_workspace.nodes.size(); ++node) {
+    const WorkspaceNode& place = m_workspace.nodes[node];
+    if (place.kind != WorkspaceNode::Kind::Writer || m_incoming[node].empty())
+      continue;
+    buffer.add(QStringLiteral("FACTORY_DEF * TeeFactory"));
+    buffer.add(QLatin1String("  FACTORY_NAME ") +
+               quotifyStringForMF(place.keyword + QLatin1Char(' ') + place.name +
+                                  QLatin1String(" Output Renamer/Nuker")));
+    QSet<QString> named;
+    for (const int number : m_incoming[node]) {
+      const WorkspaceLink& link = m_workspace.links[at(number)];
+      const QString& flow = flowOf(link.source, link.output);
+      if (named.contains(flow))
+        continue;
+      named.insert(flow);
+      buffer.add(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(flow));
+    }
+    buffer.add(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(m_flows[node].value(QString())));
+    buffer.flush();
+  }
+}

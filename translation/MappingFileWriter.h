@@ -1,0 +1,48 @@
+// Writes a workspace as a mapping file. A workspace is written once: writing connects its transformers.
+#pragma once
+
+#include <platform/Export.h>
+#include <translation/Diagnostics.h>
+#include <translation/Workspace.h>
+
+#include <QString>
+#include <QStringList>
+
+#include <vector>
+
+class MFBuffer;
+
+class ORX_EXPORT MappingFileWriter {
+ public:
+  // Neither is owned.
+  MappingFileWriter(Workspace& workspace, Diagnostics& diagnostics);
+
+  // Orders and connects the transformers and pushes attributes through; checks everything that will be written.
+  // False when there are errors, those found before included; nothing may be written then.
+  bool prepare();
+  // The whole mapping file. Call after prepare() answered true.
+  void write(MFBuffer& buffer);
+
+ private:
+  bool order();
+  void nameFlows();
+  void connect();
+  void pushAttributes();
+  void check();
+  void checkText(const QString& text, const QString& what, int line, const QString& node);
+
+  // The flow that leaves a link's source through its port.
+  const QString& flowOf(int node, const QString& output) const;
+  void writeParameters(MFBuffer& buffer) const;
+  void writeFeatureTypes(MFBuffer& buffer) const;
+  void writeWriterRoutes(MFBuffer& buffer) const;
+
+  Workspace& m_workspace;
+  Diagnostics& m_diagnostics;
+  std::vector<int> m_order;                         // transformers, each behind what feeds it
+  std::vector<QHash<QString, QString>> m_flows;     // per node: output tag to flow; "" for feature types
+  std::vector<QHash<QString, QStringList>> m_functions;  // per node: output tag to output functions
+  std::vector<QHash<QString, QStringList>> m_copies;     // per node: output tag to attributes that functions add
+  std::vector<QString> m_copiedFlows;               // per reader with copied attributes: the flow behind the copies
+  std::vector<std::vector<int>> m_incoming;         // per node: its links, in the order of the sources
+};

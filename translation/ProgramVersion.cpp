@@ -1,0 +1,3 @@
+#include <translation/ProgramVersion.h>
+
+QString programVersion() { return QStringLiteral("orxt " ORX_VERSION); }

@@ -1,0 +1,5 @@
+#include <transform/core/TransformerCfg.h>
+#include <translation/Workspace.h>
+
+Workspace::Workspace() = default;
+Workspace::~Workspace() = default;

@@ -1,0 +1,73 @@
+// A workspace as a graph: its feature types and configured transformers, and the links between their ports.
+//
+// Disabled nodes and links are left out. Nodes are numbered from 0: feature types first, then transformers, each in
+// document order.
+#pragma once
+
+#include <platform/Export.h>
+#include <translation/GlobalParameters.h>
+#include <translation/WorkspaceListener.h>
+
+#include <QHash>
+#include <QString>
+#include <QStringList>
+
+#include <memory>
+#include <vector>
+
+class TransformerCfg;
+
+struct WorkspaceNode {
+  enum class Kind { Reader, Writer, Transformer };
+
+  Kind kind = Kind::Transformer;
+  int identifier = -1;  // of the element in the document
+  int line = 0;
+  QString name;  // the transformer's identifier; the feature type's name
+
+  // Feature types.
+  QString keyword;  // of the dataset
+  QStringList attributes;
+
+  // Transformers.
+  std::unique_ptr<TransformerCfg> cfg;
+  QStringList outputs;                          // the record's output ports, in its order
+  std::vector<QStringList> inputOrder;          // per input port of the record: tag, then its sources in order
+  QHash<QString, QStringList> exposed;          // output tag to the attributes that a user added there
+
+  bool isTransformer() const { return kind == Kind::Transformer; }
+};
+
+struct WorkspaceLink {
+  int source = -1;  // node numbers
+  int target = -1;
+  QString output;  // tags; empty for feature types
+  QString input;
+  int executionIndex = -1;
+  int line = 0;
+};
+
+// An attribute of an output that goes on under another name.
+struct AttributeLink {
+  int source = -1;
+  QString output;
+  QString from;
+  QString to;
+};
+
+class ORX_EXPORT Workspace {
+ public:
+  Workspace();
+  ~Workspace();
+  Workspace(const Workspace&) = delete;
+  Workspace& operator=(const Workspace&) = delete;
+
+  QString fileName;
+  QStringList headerLines;
+  int firstHeaderLine = 0;
+  GlobalParameters parameters;
+  WorkspaceListener listener{parameters};
+  std::vector<WorkspaceNode> nodes;
+  std::vector<WorkspaceLink> links;
+  std::vector<AttributeLink> attributeLinks;
+};

@@ -1,0 +1,314 @@
+#include <platform/orxparameter/orxparameter.h>
+#include <platform/qorxcore/qorxcore.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerSource.h>
+#include <transform/text/TextHelpers.h>
+#include <transform/workspace/IXMLComponentReader.h>
+#include <translation/InstanceIdentity.h>
+#include <translation/WorkspaceBuilder.h>
+
+namespace {
+
+QString nodeTitle(const TransformerStruct& record) {
+  return record.name.isEmpty() ? record.type + QLatin1Char('_') + QString::number(record.identifier) : record.name;
+}
+
+// Port orders are lists in a list: per port its tag, behind it the sources in their order.
+std::vector<QStringList> readPortOrder(const QString& text) {
+  std::vector<QStringList> ports;
+  for (const QString& port : QORXSdfStringToList(text, QLatin1Char(',')))
+    ports.push_back(QORXSdfStringToList(port, QLatin1Char(' ')));
+  return ports;
+}
+
+}  // namespace
+
+WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
+                                   const QHash<QString, QString>& parameterValues)
+    : m_source(source), m_diagnostics(diagnostics), m_parameterValues(parameterValues) {}
+
+std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& reader, const QString& fileName,
+                                                   const QStringList& headerLines) {
+  m_workspace = std::make_unique<Workspace>();
+  m_workspace->fileName = fileName;
+  m_workspace->headerLines = headerLines;
+  m_workspace->firstHeaderLine = reader.GetFirstHeaderLineNumber();
+  m_places.clear();
+  m_linesByName.clear();
+
+  const QString mainDocument;
+  addGlobalParameters(reader);
+  for (const FeatureTypeStruct& record : reader.GetFeatureTypeList())
+    addFeatureType(record);
+  for (const TransformerStruct& record : reader.GetTransformerList(mainDocument))
+    addTransformer(record);
+  for (const LinkStruct& record : reader.GetFeatureTypeLinkList(mainDocument))
+    addLink(record);
+  for (const LinkStruct& record : reader.GetAttributeLinkList(mainDocument))
+    addAttributeLink(record);
+  return std::move(m_workspace);
+}
+
+void WorkspaceBuilder::addGlobalParameters(const IXMLComponentReader& reader) {
+  GlobalParameters& parameters = m_workspace->parameters;
+  int lineNumber = m_workspace->firstHeaderLine;
+  for (const QString& line : m_workspace->headerLines)
+    parameters.readHeaderLine(line, lineNumber++);
+  for (const GlobalParameterStruct& record : reader.GetGlobalParameterList(QString())) {
+    const QString name = GUIType::fromGuiLine(record.guiLine).getName();
+    if (name.isEmpty())
+      m_diagnostics.report(Rule::BadPromptLine, record.line, QString(), {record.guiLine});
+    else
+      parameters.declare(name, record.defaultValue, record.line);
+  }
+  QStringList names = m_parameterValues.keys();
+  names.sort();
+  for (const QString& name : names) {
+    if (!parameters.override(name, m_parameterValues.value(name)))
+      m_diagnostics.report(Rule::UnknownGlobalParameter, 0, QString(), {name});
+  }
+}
+
+void WorkspaceBuilder::addFeatureType(const FeatureTypeStruct& record) {
+  WorkspaceNode node;
+  node.kind = record.isSource ? WorkspaceNode::Kind::Reader : WorkspaceNode::Kind::Writer;
+  node.identifier = record.identifier;
+  node.line = record.line;
+  node.name = record.featureTypeName.isEmpty() ? record.nodeName : record.featureTypeName;
+  node.keyword = record.keyword;
+  for (const FeatAttributeStruct& attribute : record.attributes)
+    node.attributes.append(attribute.attrName);
+  if (placeNode(record.identifier, record.line, node.name,
+                record.enabled ? static_cast<int>(m_workspace->nodes.size()) : -1) &&
+      record.enabled)
+    m_workspace->nodes.push_back(std::move(node));
+}
+
+void WorkspaceBuilder::addTransformer(const TransformerStruct& record) {
+  const QString title = nodeTitle(record);
+  if (!record.enabled) {
+    placeNode(record.identifier, record.line, title, -1);
+    return;
+  }
+  const auto sameName = m_linesByName.constFind(title);
+  if (sameName != m_linesByName.constEnd()) {
+    m_diagnostics.report(Rule::DuplicateName, record.line, title, {title, QString::number(sameName.value())});
+  } else {
+    m_linesByName.insert(title, record.line);
+  }
+
+  WorkspaceNode node;
+  node.identifier = record.identifier;
+  node.line = record.line;
+  node.name = title;
+  node.cfg = makeTransformer(record, title);
+  if (!node.cfg) {
+    placeNode(record.identifier, record.line, title, -1);
+    return;
+  }
+  applyRecord(record, node);
+  if (placeNode(record.identifier, record.line, title, static_cast<int>(m_workspace->nodes.size())))
+    m_workspace->nodes.push_back(std::move(node));
+}
+
+std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const TransformerStruct& record,
+                                                                  const QString& nodeName) {
+  if (record.kind == TransformerKind::SubDocument) {
+    m_diagnostics.report(Rule::CustomTransformer, record.line, nodeName);
+    return nullptr;
+  }
+  std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(record.type, record.version);
+  if (cfg)
+    return cfg;
+  const std::unique_ptr<TransformerCfg> newest =
+      m_source.makeTransformer(record.type, TransformerSource::kNewestVersion);
+  if (newest) {
+    m_diagnostics.report(
+        Rule::UnknownVersion, record.line, nodeName,
+        {record.type, QString::number(record.version), QString::number(newest->getVersion())});
+  } else {
+    m_diagnostics.report(Rule::UnknownTransformer, record.line, nodeName, {record.type});
+  }
+  return nullptr;
+}
+
+void WorkspaceBuilder::applyRecord(const TransformerStruct& record, WorkspaceNode& node) {
+  TransformerCfg& cfg = *node.cfg;
+  if (record.lastParmEdit > 0)
+    cfg.setLastParmEditBuild(record.lastParmEdit);
+  cfg.setIdentifier(node.name);
+  cfg.setBaseGuid(instanceStem(QStringList(), record.identifier, node.name));
+  cfg.setParameterDirectory(&m_workspace->parameters);
+  for (const XformParmStruct& parameter : record.parameters) {
+    if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
+      m_diagnostics.report(Rule::UnknownParameter, parameter.line, node.name,
+                           {cfg.getName(), parameter.parmName});
+    }
+  }
+  if (record.name.isEmpty())
+    cfg.setIdentifier(node.name);
+
+  QStringList tags;
+  cfg.getOutputTags(tags);
+  for (const OutputFeatStruct& output : record.outputFeats)
+    node.outputs.append(output.name);
+  node.inputOrder = readPortOrder(record.inputFtOrder);
+  const QStringList& ports = node.outputs.isEmpty() ? tags : node.outputs;
+  for (const XformAttrStruct& attribute : record.attributes) {
+    if (!attribute.isUserCreated || !attribute.attrIsEnabled)
+      continue;
+    if (attribute.featIndex >= 0 && attribute.featIndex < ports.size()) {
+      node.exposed[ports.at(attribute.featIndex)].append(attribute.attrName);
+    } else {
+      for (const QString& tag : ports)
+        node.exposed[tag].append(attribute.attrName);
+    }
+  }
+
+  cfg.autoUpgradeTransformer();
+  if (cfg.isAutoUpgraded())
+    m_diagnostics.report(Rule::Upgraded, record.line, node.name, {cfg.getName()});
+  cfg.setListener(&m_workspace->listener);
+  if (!cfg.dependencyMet())
+    m_diagnostics.report(Rule::UnmetDependency, record.line, node.name, {cfg.getName(), cfg.dependencyMsg()});
+}
+
+bool WorkspaceBuilder::placeNode(int identifier, int line, const QString& name, int node) {
+  const auto earlier = m_places.constFind(identifier);
+  if (earlier != m_places.constEnd()) {
+    m_diagnostics.report(Rule::DuplicateNumber, line, name,
+                         {QString::number(identifier), QString::number(earlier->line)});
+    return false;
+  }
+  m_places.insert(identifier, {node, line});
+  return true;
+}
+
+bool WorkspaceBuilder::findEnds(const LinkStruct& record, int& source, int& target) {
+  for (const int identifier : {record.sourceNode, record.targetNode}) {
+    if (m_places.contains(identifier))
+      continue;
+    m_diagnostics.report(Rule::DanglingLink, record.line, QString(),
+                         {QString::number(record.identifier), QString::number(identifier)});
+    return false;
+  }
+  source = m_places.value(record.sourceNode).node;
+  target = m_places.value(record.targetNode).node;
+  return true;
+}
+
+void WorkspaceBuilder::addLink(const LinkStruct& record) {
+  WorkspaceLink link;
+  if (!record.enabled || !findEnds(record, link.source, link.target) || link.source < 0 || link.target < 0)
+    return;
+  const WorkspaceNode& source = m_workspace->nodes[static_cast<std::size_t>(link.source)];
+  const WorkspaceNode& target = m_workspace->nodes[static_cast<std::size_t>(link.target)];
+  if (source.kind == WorkspaceNode::Kind::Writer || target.kind == WorkspaceNode::Kind::Reader) {
+    const bool isSource = source.kind == WorkspaceNode::Kind::Writer;
+    m_diagnostics.report(Rule::BadPort, record.line, isSource ? source.name : target.name,
+                         {QString::number(record.identifier),
+                          isSource ? record.sourcePortDesc : record.targetPortDesc});
+    return;
+  }
+
+  const auto readPort = [&](const QString& description, bool wantsOutput, unsigned& number, QString& name) {
+    bool isFeaturePort = false;
+    bool isOutput = false;
+    unsigned second = 0;
+    if (decodePortDescription(description, isFeaturePort, isOutput, number, second, name) && isFeaturePort &&
+        isOutput == wantsOutput)
+      return true;
+    m_diagnostics.report(Rule::BadPort, record.line, wantsOutput ? source.name : target.name,
+                         {QString::number(record.identifier), description});
+    return false;
+  };
+  unsigned number = 0;
+  QString name;
+  if (!readPort(record.sourcePortDesc, true, number, name) ||
+      (source.isTransformer() && !findOutput(source, record, number, name, link.output)))
+    return;
+  number = 0;
+  name.clear();
+  if (!readPort(record.targetPortDesc, false, number, name) ||
+      (target.isTransformer() && !findInput(target, record, number, name, link.input)))
+    return;
+  link.executionIndex = record.executionIdx;
+  link.line = record.line;
+  m_workspace->links.push_back(link);
+}
+
+bool WorkspaceBuilder::findOutput(const WorkspaceNode& node, const LinkStruct& record, unsigned number,
+                                  const QString& name, QString& tag) {
+  QStringList tags;
+  node.cfg->getOutputTags(tags);
+  QString wanted = name;
+  if (wanted.isEmpty()) {
+    const QStringList& ports = node.outputs.isEmpty() ? tags : node.outputs;
+    if (number < static_cast<unsigned>(ports.size()))
+      wanted = ports.at(static_cast<int>(number));
+  }
+  if (!tags.contains(wanted))
+    wanted = node.cfg->renamedOutputTags(node.cfg->getVersion(), nullptr).value(wanted, wanted);
+  if (tags.contains(wanted)) {
+    tag = wanted;
+    return true;
+  }
+  m_diagnostics.report(Rule::UnknownOutput, record.line, node.name,
+                       {node.cfg->getName(), name.isEmpty() ? QString::number(number) : name,
+                        tags.join(QLatin1String(", "))});
+  return false;
+}
+
+bool WorkspaceBuilder::findInput(const WorkspaceNode& node, const LinkStruct& record, unsigned number,
+                                 const QString& name, QString& tag) {
+  QStringList tags;
+  node.cfg->getInputTags(tags);
+  QString wanted = name;
+  if (wanted.isEmpty()) {
+    if (number < node.inputOrder.size() && !node.inputOrder[number].isEmpty())
+      wanted = node.inputOrder[number].first();
+    else if (number < static_cast<unsigned>(tags.size()))
+      wanted = tags.at(static_cast<int>(number));
+  }
+  if (!tags.contains(wanted)) {
+    const QString byAlias = node.cfg->getInputTagAliases().key(wanted);
+    wanted = byAlias.isEmpty() ? node.cfg->renamedInputTags(node.cfg->getVersion(), nullptr).value(wanted, wanted)
+                               : byAlias;
+  }
+  if (tags.contains(wanted)) {
+    tag = wanted;
+    return true;
+  }
+  m_diagnostics.report(Rule::UnknownInput, record.line, node.name,
+                       {node.cfg->getName(), name.isEmpty() ? QString::number(number) : name,
+                        tags.join(QLatin1String(", "))});
+  return false;
+}
+
+void WorkspaceBuilder::addAttributeLink(const LinkStruct& record) {
+  AttributeLink link;
+  int target = -1;
+  if (!record.enabled || !findEnds(record, link.source, target) || link.source < 0 || target < 0)
+    return;
+  const WorkspaceNode& source = m_workspace->nodes[static_cast<std::size_t>(link.source)];
+  bool isFeaturePort = false;
+  bool isOutput = false;
+  unsigned port = 0;
+  unsigned ignored = 0;
+  if (!decodePortDescription(record.sourcePortDesc, isFeaturePort, isOutput, port, ignored, link.from) ||
+      isFeaturePort || !isOutput || link.from.isEmpty() || source.kind == WorkspaceNode::Kind::Writer) {
+    m_diagnostics.report(Rule::BadPort, record.line, source.name,
+                         {QString::number(record.identifier), record.sourcePortDesc});
+    return;
+  }
+  if (!decodePortDescription(record.targetPortDesc, isFeaturePort, isOutput, ignored, ignored, link.to) ||
+      isFeaturePort || isOutput || link.to.isEmpty()) {
+    m_diagnostics.report(Rule::BadPort, record.line, m_workspace->nodes[static_cast<std::size_t>(target)].name,
+                         {QString::number(record.identifier), record.targetPortDesc});
+    return;
+  }
+  if (link.from == link.to)
+    return;
+  if (!source.isTransformer() || findOutput(source, record, port, QString(), link.output))
+    m_workspace->attributeLinks.push_back(link);
+}

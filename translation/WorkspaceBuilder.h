@@ -1,0 +1,57 @@
+// Turns the records of a workspace document into a graph of configured transformers. What cannot be placed is a
+// diagnostic; the rest is built all the same, so that one run names every fault.
+#pragma once
+
+#include <platform/Export.h>
+#include <translation/Diagnostics.h>
+#include <translation/Workspace.h>
+
+#include <QHash>
+
+#include <memory>
+
+class IXMLComponentReader;
+class TransformerSource;
+struct FeatureTypeStruct;
+struct LinkStruct;
+struct TransformerStruct;
+
+class ORX_EXPORT WorkspaceBuilder {
+ public:
+  // `source` makes the configurations; `parameterValues` gives global parameters another value, by name. Neither
+  // `source` nor `diagnostics` is owned.
+  WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
+                   const QHash<QString, QString>& parameterValues = {});
+
+  std::unique_ptr<Workspace> build(const IXMLComponentReader& reader, const QString& fileName,
+                                   const QStringList& headerLines);
+
+ private:
+  // What a link may name as its end.
+  struct Place {
+    int node = -1;  // -1: the node is disabled or could not be built, links to it are dropped without a word
+    int line = 0;
+  };
+
+  void addGlobalParameters(const IXMLComponentReader& reader);
+  void addFeatureType(const FeatureTypeStruct& record);
+  void addTransformer(const TransformerStruct& record);
+  std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& nodeName);
+  void applyRecord(const TransformerStruct& record, WorkspaceNode& node);
+  bool placeNode(int identifier, int line, const QString& name, int node);
+  // False when the link cannot be placed; `source` and `target` are -1 when it leads to a node that is left out.
+  bool findEnds(const LinkStruct& record, int& source, int& target);
+  void addLink(const LinkStruct& record);
+  void addAttributeLink(const LinkStruct& record);
+  bool findOutput(const WorkspaceNode& node, const LinkStruct& record, unsigned number, const QString& name,
+                  QString& tag);
+  bool findInput(const WorkspaceNode& node, const LinkStruct& record, unsigned number, const QString& name,
+                 QString& tag);
+
+  TransformerSource& m_source;
+  Diagnostics& m_diagnostics;
+  const QHash<QString, QString> m_parameterValues;
+  std::unique_ptr<Workspace> m_workspace;
+  QHash<int, Place> m_places;           // by identifier in the document
+  QHash<QString, int> m_linesByName;    // of transformers
+};

@@ -1,0 +1,73 @@
+#include <transform/core/TransformerSource.h>
+#include <transform/files/AtomicFile.h>
+#include <transform/workspace/IXMLComponentReader.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+#include <translation/MFDeviceBuffer.h>
+#include <translation/MappingFileWriter.h>
+#include <translation/WorkspaceBuilder.h>
+#include <translation/WorkspaceTranslation.h>
+
+#include <QFile>
+
+std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, TransformerSource& source,
+                                         Diagnostics& diagnostics, QString& error, bool& isUnreadable) {
+  isUnreadable = false;
+  // Asked before the reader is, because its exceptions do not tell a missing file from a malformed one.
+  QFile file(request.workspaceFile);
+  if (!file.open(QIODevice::ReadOnly)) {
+    isUnreadable = true;
+    error = file.errorString();
+    return nullptr;
+  }
+  file.close();
+
+  QStringList headerLines;
+  const std::unique_ptr<IXMLComponentReader> reader = IXMLComponentReader::create();
+  try {
+    reader->ReadInput(request.workspaceFile, headerLines);
+  } catch (const WorkspaceLoaderException& exception) {
+    error = exception.message();
+    return nullptr;
+  }
+  if (!reader->getRootNode()) {
+    diagnostics.report(Rule::NoDocument, 0, QString());
+    return nullptr;
+  }
+  WorkspaceBuilder builder(source, diagnostics, request.parameterValues);
+  return builder.build(*reader, request.workspaceFile, headerLines);
+}
+
+bool writeMappingFile(Workspace& workspace, QIODevice& device, Diagnostics& diagnostics) {
+  MappingFileWriter writer(workspace, diagnostics);
+  if (!writer.prepare())
+    return false;
+  MFDeviceBuffer buffer(device);
+  writer.write(buffer);
+  return true;
+}
+
+TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,
+                                     Diagnostics& diagnostics, QString& error) {
+  bool isUnreadable = false;
+  const std::unique_ptr<Workspace> workspace = readWorkspace(request, source, diagnostics, error, isUnreadable);
+  if (!workspace)
+    return isUnreadable ? TranslationResult::Unreadable : TranslationResult::Refused;
+
+  MappingFileWriter writer(*workspace, diagnostics);
+  if (!writer.prepare())
+    return TranslationResult::Refused;
+  AtomicFile output(request.outputFile);
+  if (!output.open()) {
+    error = output.errorString();
+    return TranslationResult::Unwritable;
+  }
+  {
+    MFDeviceBuffer buffer(output.device());
+    writer.write(buffer);
+  }
+  if (!output.commit()) {
+    error = output.errorString();
+    return TranslationResult::Unwritable;
+  }
+  return TranslationResult::Done;
+}
