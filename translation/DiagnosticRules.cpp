@@ -2,6 +2,8 @@
 
 const std::vector<DiagnosticRule>& diagnosticRules() {
   static const std::vector<DiagnosticRule> rules = {
+      // The reader's own message is the text.
+      {Rule::MalformedDocument, QLatin1String("malformed-document"), Severity::Error, 0},
       {Rule::NoDocument, QLatin1String("no-document"), Severity::Error, 370780},
       {Rule::UnknownTransformer, QLatin1String("unknown-transformer"), Severity::Error, 370781},
       {Rule::UnknownVersion, QLatin1String("unknown-version"), Severity::Error, 370782},

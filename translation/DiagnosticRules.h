@@ -11,6 +11,7 @@
 enum class Severity { Error, Warning, Hint };
 
 enum class Rule {
+  MalformedDocument,
   NoDocument,
   UnknownTransformer,
   UnknownVersion,

@@ -2,9 +2,13 @@
 #include <translation/Diagnostics.h>
 
 void Diagnostics::report(Rule rule, int line, const QString& node, const QStringList& arguments) {
-  const DiagnosticRule& entry = diagnosticRule(rule);
-  m_all.push_back({rule, entry.severity, m_file, line, node, TransformResString(entry.message, arguments)});
-  if (entry.severity == Severity::Error)
+  reportText(rule, line, node, TransformResString(diagnosticRule(rule).message, arguments));
+}
+
+void Diagnostics::reportText(Rule rule, int line, const QString& node, const QString& text) {
+  const Severity severity = diagnosticRule(rule).severity;
+  m_all.push_back({rule, severity, m_file, line, node, text});
+  if (severity == Severity::Error)
     ++m_errors;
 }
 

@@ -26,6 +26,9 @@ class ORX_EXPORT Diagnostics {
   // The text is the rule's message in the current language with `arguments` (at most five) filled in.
   void report(Rule rule, int line, const QString& node, const QStringList& arguments = QStringList());
 
+  // With a text that another part of the system has put together.
+  void reportText(Rule rule, int line, const QString& node, const QString& text);
+
   bool hasErrors() const { return m_errors > 0; }
   const std::vector<Diagnostic>& all() const { return m_all; }
 

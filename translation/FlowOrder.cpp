@@ -2,6 +2,7 @@
 
 #include <boost/graph/compressed_sparse_row_graph.hpp>
 #include <boost/graph/strong_components.hpp>
+#include <boost/range/iterator_range.hpp>
 
 #include <algorithm>
 #include <functional>

@@ -16,13 +16,12 @@ namespace {
 std::size_t at(int number) { return static_cast<std::size_t>(number); }
 
 bool hasUnclosedReference(const QString& text) {
-  int open = text.indexOf(QLatin1String("$["));
-  while (open >= 0) {
-    const int close = text.indexOf(QLatin1Char(']'), open);
+  // As the buffer does it, each "$[" takes the first "]" behind it that no earlier one took.
+  int close = -1;
+  for (int open = text.indexOf(QLatin1String("$[")); open >= 0; open = text.indexOf(QLatin1String("$["), open + 2)) {
+    close = text.indexOf(QLatin1Char(']'), std::max(open, close + 1));
     if (close < 0)
       return true;
-    // The buffer pairs the first "$[" with the first "]" behind it and starts again; so does this.
-    open = text.indexOf(QLatin1String("$["), open + 2);
   }
   return false;
 }

@@ -10,12 +10,10 @@
 #include <QFile>
 
 std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, TransformerSource& source,
-                                         Diagnostics& diagnostics, QString& error, bool& isUnreadable) {
-  isUnreadable = false;
+                                         Diagnostics& diagnostics, QString& error) {
   // Asked before the reader is, because its exceptions do not tell a missing file from a malformed one.
   QFile file(request.workspaceFile);
   if (!file.open(QIODevice::ReadOnly)) {
-    isUnreadable = true;
     error = file.errorString();
     return nullptr;
   }
@@ -26,7 +24,7 @@ std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, Tran
   try {
     reader->ReadInput(request.workspaceFile, headerLines);
   } catch (const WorkspaceLoaderException& exception) {
-    error = exception.message();
+    diagnostics.reportText(Rule::MalformedDocument, exception.line(), QString(), exception.getMessage());
     return nullptr;
   }
   if (!reader->getRootNode()) {
@@ -48,10 +46,9 @@ bool writeMappingFile(Workspace& workspace, QIODevice& device, Diagnostics& diag
 
 TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,
                                      Diagnostics& diagnostics, QString& error) {
-  bool isUnreadable = false;
-  const std::unique_ptr<Workspace> workspace = readWorkspace(request, source, diagnostics, error, isUnreadable);
+  const std::unique_ptr<Workspace> workspace = readWorkspace(request, source, diagnostics, error);
   if (!workspace)
-    return isUnreadable ? TranslationResult::Unreadable : TranslationResult::Refused;
+    return error.isEmpty() ? TranslationResult::Refused : TranslationResult::Unreadable;
 
   MappingFileWriter writer(*workspace, diagnostics);
   if (!writer.prepare())
