@@ -1,8 +1,9 @@
 // Texts by number, in the current language, with English as the base.
 //
 // The texts stand in UTF-8 files messages/<language>.msg below the product's home, one line each:
-// number, tab, text. In a text "\n" stands for a line break and "\\" for a backslash. Empty lines and lines that
-// begin with "#" are skipped.
+// number, tab, text. In a text "\n" stands for a line break and "\\" for a backslash. Empty lines and lines
+// that begin with "#" are skipped, and so are lines without a text: a missing translation shows the English
+// text. Of two lines with one number the later holds.
 #pragma once
 
 #include <platform/Export.h>

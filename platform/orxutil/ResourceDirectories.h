@@ -6,11 +6,12 @@
 #include <QString>
 #include <QStringList>
 
-// Folders of kind "transformer", in loading order: the home's transformers folder and its sub-folders by name,
-// the user's data folder ($XDG_DATA_HOME/orx/transformers, by default ~/.local/share/orx/transformers), the
-// folders of $ORX_TRANSFORMER_PATH (separated by ":"), and the folders added by the call below. Only folders
-// that can be read and hold a file are returned, each once. Another kind names the folder of the same name
-// followed by "s" in each of these places.
+// Folders of kind "transformer", in loading order: the home's transformers folder and its sub-folders by
+// name, the user's data folder ($XDG_DATA_HOME/orx/transformers, by default ~/.local/share/orx/transformers),
+// the folders of $ORX_TRANSFORMER_PATH (separated by ":"), and the folders added by the call below. Only
+// folders that can be read and hold a file are returned, each once. Another kind names the folder of the same
+// name followed by "s" in the home and the user's data folder, and a variable of its own ($ORX_FORMAT_PATH
+// for "format"). A kind is a word of ASCII letters, digits and underscores; any other has no folders.
 ORX_EXPORT QStringList ORX_resourceDirectories(const QString& kind);
 
 // Adds a folder behind all others of every kind, for the rest of the process.

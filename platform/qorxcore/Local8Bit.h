@@ -1,4 +1,5 @@
-// The one place that turns Unicode text into the system's 8-bit encoding and back: UTF-8, whatever the locale.
+// The one place that turns Unicode text into the system's 8-bit encoding and back: UTF-8, whatever the
+// locale.
 #pragma once
 
 #include <platform/Export.h>

@@ -10,4 +10,6 @@
 ORX_EXPORT QString QORXOrxHome();
 
 // Absolute where possible, forward slashes, no "." and ".." steps, no doubled slashes, no trailing slash.
+// Backslashes count as separators unless the name begins with a slash or names an existing file. A name with
+// a drive letter is absolute already. Symbolic links are not followed.
 ORX_EXPORT QString QORXPrettyUpFileName(const QString& fileName);

@@ -5,6 +5,6 @@
 
 #include <QString>
 
-// Wraps a text that is empty or holds any of the characters of `specials` in double quotes; nothing inside the
-// text is changed.
+// Wraps a text that is empty or holds any of the characters of `specials` in double quotes; nothing inside
+// the text is changed.
 ORX_EXPORT QString QORXQuotifyString(const QString& text, const QString& specials);
