@@ -1,0 +1,57 @@
+#include <transform/text/MessageStrings.h>
+#include <transform/text/ScriptRefusal.h>
+
+namespace {
+
+constexpr long kCannotWrite = 370613;
+
+bool isBrokenSurrogate(const QString& text, int index) {
+  const QChar character = text[index];
+  if (character.isHighSurrogate()) {
+    return index + 1 >= text.size() || !text[index + 1].isLowSurrogate();
+  }
+  return character.isLowSurrogate() && (index == 0 || !text[index - 1].isHighSurrogate());
+}
+
+}  // namespace
+
+bool isFreeOf(const QString& text, const QString& specials) {
+  for (int i = 0; i < text.size(); ++i) {
+    const ushort code = text[i].unicode();
+    if (code < 0x20 || code == 0x7f || specials.contains(text[i]) || isBrokenSurrogate(text, i)) {
+      return false;
+    }
+  }
+  return true;
+}
+
+bool isScriptableName(const QString& name) {
+  static const QString kSpecials = QStringLiteral(" '\"\\$[](){}");
+  return !name.isEmpty() && isFreeOf(name, kSpecials);
+}
+
+ScriptRefusal refuseUnwritableLines(const QStringList& codeLines) {
+  for (int number = 1; number <= codeLines.size(); ++number) {
+    const QString& line = codeLines[number - 1];
+    for (int i = 0; i < line.size(); ++i) {
+      if (line[i].isNull() || line[i] == QLatin1Char('\r') || isBrokenSurrogate(line, i)) {
+        return {script_refusal::kCharacter, number};
+      }
+    }
+    if (line.trimmed() == QLatin1String("END_INCLUDE")) {
+      return {script_refusal::kBlockEnd, number};
+    }
+  }
+  return {};
+}
+
+QString scriptRefusalText(const QString& parameterName, const ScriptRefusal& refusal) {
+  const QString why = refusal.line > 0 ? TransformResString(refusal.message, QString::number(refusal.line))
+                                       : TransformResString(refusal.message);
+  return TransformResString(kCannotWrite, {parameterName, why});
+}
+
+QString scriptNameRefusalText(const QString& parameterName, const QString& badName) {
+  return TransformResString(kCannotWrite,
+                            {parameterName, TransformResString(script_refusal::kName, badName)});
+}

@@ -1,0 +1,241 @@
+#include <transform/text/ScriptBlocks.h>
+#include <transform/text/ScriptRefusal.h>
+#include <transform/text/TextHelpers.h>
+
+#include <QByteArray>
+#include <QSet>
+#include <tcl.h>
+
+#include <algorithm>
+
+namespace {
+
+using namespace script_refusal;
+
+// What is put in front of the line that gives the value.
+constexpr int kReturnSize = sizeof("return ") - 1;
+
+// One command of a script, parsed by the Tcl library. The script outlives it.
+class TclCommand {
+ public:
+  TclCommand(const char* script, int size) {
+    static const bool kInitialised = (Tcl_FindExecutable(nullptr), true);
+    (void)kInitialised;
+    m_isComplete = Tcl_ParseCommand(nullptr, script, size, 0, &m_parse) == TCL_OK;
+  }
+  ~TclCommand() {
+    if (m_isComplete) {
+      Tcl_FreeParse(&m_parse);
+    }
+  }
+  TclCommand(const TclCommand&) = delete;
+  TclCommand& operator=(const TclCommand&) = delete;
+
+  bool isComplete() const { return m_isComplete; }
+  // Where the parser stopped over a fault.
+  const char* fault() const { return m_parse.term; }
+  const char* begin() const { return m_parse.commandStart; }
+  const char* end() const { return m_parse.commandStart + m_parse.commandSize; }
+  int wordCount() const { return m_parse.numWords; }
+
+  QVector<Tcl_Token> words() const {
+    QVector<Tcl_Token> words;
+    words.reserve(m_parse.numWords);
+    for (int i = 0; i < m_parse.numTokens; i += m_parse.tokenPtr[i].numComponents + 1) {
+      words.append(m_parse.tokenPtr[i]);
+    }
+    return words;
+  }
+
+ private:
+  Tcl_Parse m_parse;
+  bool m_isComplete;
+};
+
+QByteArray wordText(const Tcl_Token& word) {
+  return QByteArray(word.start, word.size);
+}
+
+bool isBracedWord(const Tcl_Token& word) {
+  return word.type == TCL_TOKEN_SIMPLE_WORD && word.size >= 2 && *word.start == '{';
+}
+
+bool hasSeveralLines(const Tcl_Token& word) {
+  return std::find(word.start, word.start + word.size, '\n') != word.start + word.size;
+}
+
+// Lines of a text lose the blanks around them and get empty lines between them when they are written.
+bool holdsTextOfSeveralLines(const TclCommand& command) {
+  static const QSet<QByteArray> kTakeData = {"append", "lappend", "list", "return", "set"};
+  const QVector<Tcl_Token> words = command.words();
+  return std::any_of(words.begin(), words.end(), [&words](const Tcl_Token& word) {
+    return hasSeveralLines(word) &&
+           (*word.start == '"' || (isBracedWord(word) && kTakeData.contains(wordText(words.first()))));
+  });
+}
+
+// Whether the commands from `script` up to `end` finish with one that leaves the procedure.
+bool endsInReturn(const char* script, const char* end) {
+  QByteArray last;
+  while (script < end) {
+    const TclCommand command(script, static_cast<int>(end - script));
+    if (!command.isComplete()) {
+      return false;
+    }
+    if (command.wordCount() > 0) {
+      last = wordText(command.words().first());
+    }
+    script = command.end();
+  }
+  return last == "return" || last == "error";
+}
+
+// A "return " inside a command does no harm when it stands alone at the end of a nested script that has
+// returned before it.
+bool isHarmlessInside(const TclCommand& command, const char* inserted) {
+  static const QSet<QByteArray> kTakeScripts = {"if", "while", "for", "foreach"};
+  const QVector<Tcl_Token> words = command.words();
+  if (!kTakeScripts.contains(wordText(words.first()))) {
+    return false;
+  }
+  return std::any_of(words.begin(), words.end(), [inserted](const Tcl_Token& word) {
+    return isBracedWord(word) && inserted + kReturnSize == word.start + word.size - 1 &&
+           inserted > word.start && endsInReturn(word.start + 1, inserted);
+  });
+}
+
+// The Tcl library parses brackets within brackets, and indices within indices, by calling itself. Their
+// number bounds how deep; scripts that people write stay far below.
+bool exceedsParserDepth(const QString& code) {
+  constexpr int kMostBrackets = 5000;
+  int brackets = 0;
+  bool inName = false;
+  for (const QChar character : code) {
+    if (character == QLatin1Char('[') || (inName && character == QLatin1Char('('))) {
+      ++brackets;
+    }
+    inName = character == QLatin1Char('$') ||
+             (inName && (character.isLetterOrNumber() || character == QLatin1Char('_') ||
+                         character == QLatin1Char(':')));
+  }
+  return brackets > kMostBrackets;
+}
+
+class TclBody {
+ public:
+  TclBody(const QStringList& written, const QStringList& code)
+      : m_text(written.join(QLatin1Char('\n')).toUtf8()), m_result(scriptResultLine(code)) {
+    if (m_result >= 0) {
+      const int at =
+          written.mid(0, m_result).join(QLatin1Char('\n')).toUtf8().size() + (m_result > 0 ? 1 : 0);
+      m_resultStart = m_text.constData() + at;
+      m_isReturnInserted = written[m_result] != code[m_result].trimmed() &&
+                           !code[m_result].trimmed().startsWith(QLatin1String("return"));
+    }
+  }
+
+  ScriptRefusal refuse() const {
+    const char* at = m_text.constData();
+    const char* const end = at + m_text.size();
+    while (at < end) {
+      const TclCommand command(at, static_cast<int>(end - at));
+      if (!command.isComplete()) {
+        return {kUnbalanced, lineOf(std::min(command.fault(), end))};
+      }
+      if (command.wordCount() > 0) {
+        if (const ScriptRefusal refusal = refuseCommand(command)) {
+          return refusal;
+        }
+      }
+      at = command.end();
+    }
+    return refuseEscape();
+  }
+
+ private:
+  ScriptRefusal refuseCommand(const TclCommand& command) const {
+    if (holdsTextOfSeveralLines(command)) {
+      return {kTextOfSeveralLines, lineOf(command.begin()) + 1};
+    }
+    if (!m_isReturnInserted || command.end() <= m_resultStart) {
+      return {};
+    }
+    if (command.begin() < m_resultStart) {
+      return isHarmlessInside(command, m_resultStart) ? ScriptRefusal()
+                                                      : ScriptRefusal{kResultInsideStatement, m_result + 1};
+    }
+    // The inserted "return" takes one value; a second word would become an option, a second command would
+    // never be reached.
+    const bool isOneValue = command.begin() == m_resultStart && command.wordCount() == 2;
+    return isOneValue ? ScriptRefusal() : ScriptRefusal{kResultNoValue, m_result + 1};
+  }
+
+  // Within the braces of the procedure, braces in comments and texts count as well.
+  ScriptRefusal refuseEscape() const {
+    const QByteArray head = "proc ParamFunc {} {\n";
+    const QByteArray block = head + m_text + "\n}";
+    const TclCommand command(block.constData(), block.size());
+    const char* const end = block.constData() + block.size();
+    if (command.isComplete() && command.end() == end && command.wordCount() == 4) {
+      return {};
+    }
+    const char* const fault = command.isComplete() ? command.end() : command.fault();
+    const auto offset = std::min<std::ptrdiff_t>(fault - block.constData() - head.size(), m_text.size());
+    return {kUnbalanced, lineOf(m_text.constData() + std::max<std::ptrdiff_t>(offset, 0))};
+  }
+
+  int lineOf(const char* at) const { return 1 + static_cast<int>(std::count(m_text.constData(), at, '\n')); }
+
+  QByteArray m_text;
+  int m_result;
+  const char* m_resultStart = nullptr;
+  bool m_isReturnInserted = false;
+};
+
+ScriptRefusal refuseTcl(const QString& prefix, const QString& encodedCode) {
+  const QStringList code = scriptCodeLines(encodedCode);
+  if (const ScriptRefusal refusal = refuseUnwritableLines(code)) {
+    return refusal;
+  }
+  for (int i = 0; i < code.size(); ++i) {
+    const QString line = code[i].trimmed();
+    if (line.endsWith(QLatin1Char('\\'))) {
+      return {kContinuation, i + 1};
+    }
+    if (prefix.isEmpty()) {
+      continue;
+    }
+    // A name in braces is taken letter by letter: nothing in it can be looked up.
+    static const QLatin1String kBracedLookup("${ORX_MacroValues(");
+    for (const ScriptKey& key : redirectedTclKeys(line)) {
+      const int start = key.position - kBracedLookup.size();
+      if (start >= 0 && line.midRef(start).startsWith(kBracedLookup)) {
+        return {kLookup, i + 1};
+      }
+    }
+  }
+  const QStringList written = tclBodyLines(prefix, encodedCode);
+  if (exceedsParserDepth(written.join(QLatin1Char('\n')))) {
+    return {kTooManyBrackets, 0};
+  }
+  return TclBody(written, code).refuse();
+}
+
+}  // namespace
+
+bool canWriteTclParameter(const QString& prefix, const QString& parameterName, const QString& encodedCode,
+                          QString& reason) {
+  if (!isScriptableName(parameterName)) {
+    reason = scriptNameRefusalText(parameterName, parameterName);
+    return false;
+  }
+  if (!isFreeOf(prefix, QStringLiteral(" \"\\$[](){}"))) {
+    reason = scriptNameRefusalText(parameterName, prefix);
+    return false;
+  }
+  const ScriptRefusal refusal = refuseTcl(prefix, encodedCode);
+  if (refusal) {
+    reason = scriptRefusalText(parameterName, refusal);
+  }
+  return !refusal;
+}
