@@ -27,14 +27,16 @@ class ORX_EXPORT ParameterSet {
   // By exact name, else the first multi-parameter, in name order, that lists it; -1 when there is none.
   int indexOfMacro(const QString& name) const;
 
+  // The record's name must be new.
   void append(const TransformParamCfg& record);
+  // False when there is no such parameter.
   bool remove(const QString& name);
   void clear();
 
  private:
   struct Index;
-  Index& detach();
+  void reindex();
 
   std::vector<TransformParamCfg> m_records;
-  std::shared_ptr<const Index> m_index;  // shared by copies until a parameter is added or removed
+  std::shared_ptr<Index> m_index;  // never null; not changed while copies share it
 };

@@ -3,14 +3,12 @@
 
 #include <platform/Export.h>
 #include <platform/orxparameter/orxparameter.h>
+#include <transform/core/Keywords.h>
 
 #include <QString>
 #include <QStringList>
 
 #include <memory>
-
-// The value of a parameter that has none.
-ORX_EXPORT extern const QString kUnusedValue;  // "<Unused>"
 
 class ORX_EXPORT TransformParamCfg : public GUIType {
  public:
@@ -36,6 +34,8 @@ class ORX_EXPORT TransformParamCfg : public GUIType {
   // The members of a multi-parameter or the columns of a table type; empty for any other. Shared by all
   // copies.
   const MemberList& members() const;
+  bool isMultiParameter() const;
+  bool isTable() const;
 
  private:
   struct LookupData;

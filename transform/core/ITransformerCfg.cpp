@@ -1,0 +1,3 @@
+#include <transform/core/ITransformerCfg.h>
+
+ITransformerCfg::~ITransformerCfg() = default;

@@ -1,0 +1,64 @@
+#include <transform/core/TransformParamCfg.h>
+
+struct TransformParamCfg::LookupData {
+  ChoiceList choices;
+  MemberList members;
+};
+
+TransformParamCfg::TransformParamCfg(const GUIType& type, const QStringList& lookupLines)
+    : GUIType(type), m_lookupLines(lookupLines) {
+  rebuildLookupData();
+}
+
+void TransformParamCfg::setValue(const QString& value) {
+  m_value = value.startsWith(QLatin1Char('&')) && getType().startsWith(kAttributeType) ? value.mid(1) : value;
+}
+
+QString TransformParamCfg::getTypeWithConfig() const {
+  const QString& config = getConfigToken();
+  if (config.isEmpty() || config == QLatin1String("\"\"")) {
+    return getType();
+  }
+  return getType() + QLatin1Char(' ') + config;
+}
+
+void TransformParamCfg::setTypeFromGUILine(const QString& line) {
+  GUIType::operator=(GUIType::fromTransformerTypeString(line, getName(), getDescription()));
+  rebuildLookupData();
+}
+
+const ChoiceList& TransformParamCfg::choices() const {
+  static const ChoiceList none;
+  return m_lookupData ? m_lookupData->choices : none;
+}
+
+const MemberList& TransformParamCfg::members() const {
+  static const MemberList none;
+  return m_lookupData ? m_lookupData->members : none;
+}
+
+bool TransformParamCfg::isMultiParameter() const {
+  return getType().startsWith(kMultiParameterType);
+}
+
+bool TransformParamCfg::isTable() const {
+  return getType().startsWith(kTableType);
+}
+
+void TransformParamCfg::rebuildLookupData() {
+  const bool isChoice = ORX_isChoiceType(*this);
+  if (!isChoice && !isMultiParameter() && !isTable()) {
+    m_lookupData.reset();
+    return;
+  }
+  auto data = std::make_shared<LookupData>();
+  if (isChoice) {
+    data->choices = ChoiceList(*this);
+    for (const QString& line : std::as_const(m_lookupLines)) {
+      data->choices.addLookup(line);
+    }
+  } else {
+    data->members = MemberList(*this);
+  }
+  m_lookupData = std::move(data);
+}

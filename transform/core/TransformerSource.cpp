@@ -1,0 +1,7 @@
+#include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerSource.h>
+#include <transform/core/WorkspaceParameterDirectory.h>
+
+TransformerSource::~TransformerSource() = default;
+DefinitionDirectory::~DefinitionDirectory() = default;
+WorkspaceParameterDirectory::~WorkspaceParameterDirectory() = default;
