@@ -6,67 +6,65 @@
 #include <algorithm>
 #include <array>
 #include <iterator>
+#include <string_view>
 
 namespace {
 
 struct NamedCharacter {
   ushort code;
-  QLatin1String name;
-};
+  std::string_view name;
 
-template <int Size>
-constexpr QLatin1String latin1(const char (&text)[Size]) {
-  return QLatin1String(text, Size - 1);
-}
+  QLatin1String latin1Name() const { return QLatin1String(name.data(), static_cast<int>(name.size())); }
+};
 
 // The one table of both directions: every named character that does not stand for itself, by code.
 constexpr NamedCharacter kNamed[] = {
-    {0x0020, latin1("space")},
-    {0x0022, latin1("quotationmark")},
-    {0x0024, latin1("dollarsign")},
-    {0x0025, latin1("percentsign")},
-    {0x0026, latin1("ampersand")},
-    {0x0027, latin1("apostrophe")},
-    {0x0028, latin1("leftparenthesis")},
-    {0x0029, latin1("rightparenthesis")},
-    {0x002c, latin1("comma")},
-    {0x002f, latin1("solidus")},
-    {0x003b, latin1("semicolon")},
-    {0x003c, latin1("lessthansign")},
-    {0x003e, latin1("greaterthansign")},
-    {0x0040, latin1("commercialat")},
-    {0x005b, latin1("leftsquarebracket")},
-    {0x005c, latin1("reversesolidus")},
-    {0x005d, latin1("rightsquarebracket")},
-    {0x0060, latin1("graveaccent")},
-    {0x007b, latin1("leftcurlybracket")},
-    {0x007d, latin1("rightcurlybracket")},
-    {0x00a0, latin1("nobreakspace")},
-    {0x1680, latin1("oghamspacemark")},
-    {0x2000, latin1("enquad")},
-    {0x2001, latin1("emquad")},
-    {0x2002, latin1("enspace")},
-    {0x2003, latin1("emspace")},
-    {0x2004, latin1("threeperemspace")},
-    {0x2005, latin1("fourperemspace")},
-    {0x2006, latin1("sixperemspace")},
-    {0x2007, latin1("figurespace")},
-    {0x2008, latin1("punctuationspace")},
-    {0x2009, latin1("thinspace")},
-    {0x200a, latin1("hairspace")},
-    {0x2028, latin1("lineseparator")},
-    {0x2029, latin1("paragraphseparator")},
-    {0x202f, latin1("narrownobreakspace")},
-    {0x205f, latin1("mediummathematicalspace")},
-    {0x3000, latin1("ideographicspace")},
+    {0x0020, "space"},
+    {0x0022, "quotationmark"},
+    {0x0024, "dollarsign"},
+    {0x0025, "percentsign"},
+    {0x0026, "ampersand"},
+    {0x0027, "apostrophe"},
+    {0x0028, "leftparenthesis"},
+    {0x0029, "rightparenthesis"},
+    {0x002c, "comma"},
+    {0x002f, "solidus"},
+    {0x003b, "semicolon"},
+    {0x003c, "lessthansign"},
+    {0x003e, "greaterthansign"},
+    {0x0040, "commercialat"},
+    {0x005b, "leftsquarebracket"},
+    {0x005c, "reversesolidus"},
+    {0x005d, "rightsquarebracket"},
+    {0x0060, "graveaccent"},
+    {0x007b, "leftcurlybracket"},
+    {0x007d, "rightcurlybracket"},
+    {0x00a0, "nobreakspace"},
+    {0x1680, "oghamspacemark"},
+    {0x2000, "enquad"},
+    {0x2001, "emquad"},
+    {0x2002, "enspace"},
+    {0x2003, "emspace"},
+    {0x2004, "threeperemspace"},
+    {0x2005, "fourperemspace"},
+    {0x2006, "sixperemspace"},
+    {0x2007, "figurespace"},
+    {0x2008, "punctuationspace"},
+    {0x2009, "thinspace"},
+    {0x200a, "hairspace"},
+    {0x2028, "lineseparator"},
+    {0x2029, "paragraphseparator"},
+    {0x202f, "narrownobreakspace"},
+    {0x205f, "mediummathematicalspace"},
+    {0x3000, "ideographicspace"},
 };
 
 constexpr int longestName() {
-  int longest = 0;
+  std::size_t longest = 0;
   for (const NamedCharacter& entry : kNamed) {
     longest = entry.name.size() > longest ? entry.name.size() : longest;
   }
-  return longest;
+  return static_cast<int>(longest);
 }
 constexpr int kLongestName = longestName();
 
@@ -87,10 +85,10 @@ const NamedCharacter* findByName(QStringView name) {
     std::sort(index.begin(), index.end(), [](const auto* a, const auto* b) { return a->name < b->name; });
     return index;
   }();
-  const auto found =
-      std::lower_bound(byName.begin(), byName.end(), name,
-                       [](const auto* entry, QStringView wanted) { return wanted.compare(entry->name) > 0; });
-  return found != byName.end() && name.compare((*found)->name) == 0 ? *found : nullptr;
+  const auto found = std::lower_bound(
+      byName.begin(), byName.end(), name,
+      [](const auto* entry, QStringView wanted) { return wanted.compare(entry->latin1Name()) > 0; });
+  return found != byName.end() && name.compare((*found)->latin1Name()) == 0 ? *found : nullptr;
 }
 
 bool isAsciiLetterOrDigit(ushort code) {
@@ -153,7 +151,7 @@ int firstToEncode(const QString& text) {
 void appendEncoded(QString& out, ushort code) {
   out += QLatin1Char('<');
   if (const NamedCharacter* entry = findByCode(code)) {
-    out += entry->name;
+    out += entry->latin1Name();
   } else {
     static const char kDigits[] = "0123456789abcdef";
     out += QLatin1Char('u');
