@@ -179,7 +179,7 @@ class ORXTValSlist {
   allocator_type get_allocator() const { return allocator_type(m_allocator); }
 
   friend bool operator==(const ORXTValSlist& a, const ORXTValSlist& b) {
-    return a.m_size == b.m_size && std::equal(a.begin(), a.end(), b.begin());
+    return a.m_size == b.m_size && std::equal(a.begin(), a.end(), b.begin(), b.end());
   }
   friend bool operator!=(const ORXTValSlist& a, const ORXTValSlist& b) { return !(a == b); }
 
