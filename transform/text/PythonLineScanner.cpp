@@ -30,7 +30,7 @@ bool isFormattedPrefix(const QString& line, int quoteAt) {
 // The prefix is put in front of the key with "+", so an operator in the key that binds less would take it
 // apart.
 bool isSafeBehindPlus(const QString& key) {
-  constexpr int kLongestKey = 1000;
+  constexpr int kLongestKey = 300;
   if (key.size() > kLongestKey) {
     return false;
   }

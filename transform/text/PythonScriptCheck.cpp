@@ -108,14 +108,14 @@ ScriptRefusal refusePython(const QStringList& codeLines, bool redirectsLookups) 
     if (i < result) {
       continue;
     }
-    if (!startsStatement) {
-      return {kResultInsideStatement, first + 1};
-    }
     if (scanner.isInsideBrackets()) {
       return {kUnbalanced, scanner.openBracketLine()};
     }
     if (scanner.lineEnd() == PythonLineScanner::LineEnd::TextOfSeveralLines) {
       return {kUnbalanced, i + 1};
+    }
+    if (!startsStatement) {
+      return {kResultInsideStatement, first + 1};
     }
     if (i == result && !givesValue(codeLines[first].trimmed(), hasStatementMark)) {
       return {kResultNoValue, first + 1};

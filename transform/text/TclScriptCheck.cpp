@@ -60,18 +60,20 @@ bool isBracedWord(const Tcl_Token& word) {
   return word.type == TCL_TOKEN_SIMPLE_WORD && word.size >= 2 && *word.start == '{';
 }
 
-bool hasSeveralLines(const Tcl_Token& word) {
-  return std::find(word.start, word.start + word.size, '\n') != word.start + word.size;
-}
-
-// Lines of a text lose the blanks around them and get empty lines between them when they are written.
-bool holdsTextOfSeveralLines(const TclCommand& command) {
+// Lines of a text lose the blanks around them and get empty lines between them when they are written. Answers
+// where the first line of such a text ends, or null.
+const char* findTextOfSeveralLines(const TclCommand& command) {
   static const QSet<QByteArray> kTakeData = {"append", "lappend", "list", "return", "set"};
   const QVector<Tcl_Token> words = command.words();
-  return std::any_of(words.begin(), words.end(), [&words](const Tcl_Token& word) {
-    return hasSeveralLines(word) &&
-           (*word.start == '"' || (isBracedWord(word) && kTakeData.contains(wordText(words.first()))));
-  });
+  const bool takesData = kTakeData.contains(wordText(words.first()));
+  for (const Tcl_Token& word : words) {
+    const char* const end = word.start + word.size;
+    const char* const lineEnd = std::find(word.start, end, '\n');
+    if (lineEnd != end && (*word.start == '"' || (takesData && isBracedWord(word)))) {
+      return lineEnd;
+    }
+  }
+  return nullptr;
 }
 
 // Whether the commands from `script` up to `end` finish with one that leaves the procedure.
@@ -135,6 +137,18 @@ class TclBody {
   }
 
   ScriptRefusal refuse() const {
+    if (const ScriptRefusal refusal = forEachCommand([](const TclCommand&) { return ScriptRefusal(); })) {
+      return refusal;
+    }
+    if (const ScriptRefusal refusal = refuseEscape()) {
+      return refusal;
+    }
+    return forEachCommand([this](const TclCommand& command) { return refuseCommand(command); });
+  }
+
+ private:
+  template <typename Refuse>
+  ScriptRefusal forEachCommand(Refuse refuse) const {
     const char* at = m_text.constData();
     const char* const end = at + m_text.size();
     while (at < end) {
@@ -143,19 +157,18 @@ class TclBody {
         return {kUnbalanced, lineOf(std::min(command.fault(), end))};
       }
       if (command.wordCount() > 0) {
-        if (const ScriptRefusal refusal = refuseCommand(command)) {
+        if (const ScriptRefusal refusal = refuse(command)) {
           return refusal;
         }
       }
       at = command.end();
     }
-    return refuseEscape();
+    return {};
   }
 
- private:
   ScriptRefusal refuseCommand(const TclCommand& command) const {
-    if (holdsTextOfSeveralLines(command)) {
-      return {kTextOfSeveralLines, lineOf(command.begin()) + 1};
+    if (const char* lineEnd = findTextOfSeveralLines(command)) {
+      return {kTextOfSeveralLines, lineOf(lineEnd) + 1};
     }
     if (!m_isReturnInserted || command.end() <= m_resultStart) {
       return {};
@@ -175,13 +188,24 @@ class TclBody {
     const QByteArray head = "proc ParamFunc {} {\n";
     const QByteArray block = head + m_text + "\n}";
     const TclCommand command(block.constData(), block.size());
-    const char* const end = block.constData() + block.size();
-    if (command.isComplete() && command.end() == end && command.wordCount() == 4) {
+    if (!command.isComplete()) {
+      return {kUnbalanced, braceCommentLine()};
+    }
+    if (command.end() == block.constData() + block.size() && command.wordCount() == 4) {
       return {};
     }
-    const char* const fault = command.isComplete() ? command.end() : command.fault();
-    const auto offset = std::min<std::ptrdiff_t>(fault - block.constData() - head.size(), m_text.size());
+    // The command reaches over its line end.
+    const auto offset = command.end() - 1 - block.constData() - head.size();
     return {kUnbalanced, lineOf(m_text.constData() + std::max<std::ptrdiff_t>(offset, 0))};
+  }
+
+  // The code by itself is complete, so it is a comment that holds the brace; without one, the last line.
+  int braceCommentLine() const {
+    const QList<QByteArray> lines = m_text.split('\n');
+    const auto found = std::find_if(lines.begin(), lines.end(), [](const QByteArray& line) {
+      return line.startsWith('#') && line.count('{') != line.count('}');
+    });
+    return found != lines.end() ? 1 + static_cast<int>(found - lines.begin()) : lines.size();
   }
 
   int lineOf(const char* at) const { return 1 + static_cast<int>(std::count(m_text.constData(), at, '\n')); }
