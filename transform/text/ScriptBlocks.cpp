@@ -31,7 +31,7 @@ void joinContinuations(QStringList& lines) {
 
 // A key names a macro directly when it is a plain string literal.
 QString literalPythonKey(const QString& key) {
-  const QString trimmed = key.trimmed();
+  QString trimmed = key.trimmed();
   if (trimmed.size() >= 2 && (trimmed[0] == QLatin1Char('\'') || trimmed[0] == QLatin1Char('"')) &&
       trimmed[0] == trimmed[trimmed.size() - 1]) {
     return trimmed.mid(1, trimmed.size() - 2);

@@ -82,7 +82,7 @@ QString quotifyString(const QString& text, const QString& specials) {
 
 QString quotifyStringForMF(const QString& text) {
   static const QString kSpecials = QStringLiteral(" \t()\\\"");
-  const QString quoted = QORXQuotifyString(text, kSpecials);
+  QString quoted = QORXQuotifyString(text, kSpecials);
   if (quoted.size() < 3 || !isWrappedInQuotes(quoted)) {
     return quoted;
   }
