@@ -27,4 +27,6 @@ const std::vector<DiagnosticRule>& diagnosticRules() {
   return rules;
 }
 
-const DiagnosticRule& diagnosticRule(Rule rule) { return diagnosticRules()[static_cast<std::size_t>(rule)]; }
+const DiagnosticRule& diagnosticRule(Rule rule) {
+  return diagnosticRules()[static_cast<std::size_t>(rule)];
+}

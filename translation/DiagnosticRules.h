@@ -1,5 +1,5 @@
-// Everything that can be wrong with a workspace, as one table: the rule's name, how severe it is by default, and the
-// number of its message.
+// Everything that can be wrong with a workspace, as one table: the rule's name, how severe it is by default,
+// and the number of its message.
 #pragma once
 
 #include <platform/Export.h>

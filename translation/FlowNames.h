@@ -1,5 +1,5 @@
-// The names under which features flow through one mapping file: each is given out once, so that no two streams of
-// features mix.
+// The names under which features flow through one mapping file: each is given out once, so that no two
+// streams of features mix.
 #pragma once
 
 #include <platform/Export.h>

@@ -3,10 +3,10 @@
 #include <boost/graph/compressed_sparse_row_graph.hpp>
 #include <boost/graph/strong_components.hpp>
 #include <boost/range/iterator_range.hpp>
+#include <queue>
 
 #include <algorithm>
 #include <functional>
-#include <queue>
 
 namespace {
 
@@ -46,7 +46,8 @@ FlowOrder flowOrder(int nodeCount, const std::vector<std::pair<int, int>>& edges
   for (const auto& edge : edges)
     ++feeders[static_cast<std::size_t>(edge.second)];
 
-  // The library's own topological sort settles ties by its walk; document order needs the smallest ready node.
+  // The library's own topological sort settles ties by its walk; document order needs the smallest ready
+  // node.
   std::priority_queue<int, std::vector<int>, std::greater<>> ready;
   for (int node = 0; node < nodeCount; ++node) {
     if (feeders[static_cast<std::size_t>(node)] == 0)
@@ -58,7 +59,8 @@ FlowOrder flowOrder(int nodeCount, const std::vector<std::pair<int, int>>& edges
     const int node = ready.top();
     ready.pop();
     result.order.push_back(node);
-    for (const auto& edge : boost::make_iterator_range(boost::out_edges(static_cast<std::size_t>(node), graph))) {
+    for (const auto& edge :
+         boost::make_iterator_range(boost::out_edges(static_cast<std::size_t>(node), graph))) {
       const std::size_t target = boost::target(edge, graph);
       if (--feeders[target] == 0)
         ready.push(static_cast<int>(target));

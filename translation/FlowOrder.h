@@ -11,7 +11,7 @@ struct FlowOrder {
   std::vector<std::vector<int>> cycles;  // groups of nodes that feed each other, members ascending
 };
 
-// Nodes are numbered from 0 in document order; an edge leads from a feeding node to the node that it feeds. Among
-// nodes that could come next, the one first in the document does. Time and memory grow with nodes and edges; no
-// recursion.
+// Nodes are numbered from 0 in document order; an edge leads from a feeding node to the node that it feeds.
+// Among nodes that could come next, the one first in the document does. Time and memory grow with nodes and
+// edges; no recursion.
 ORX_EXPORT FlowOrder flowOrder(int nodeCount, const std::vector<std::pair<int, int>>& edges);

@@ -4,7 +4,8 @@
 
 namespace {
 
-// Values that refer to values that refer to values can grow without end; what goes beyond these stays as it stands.
+// Values that refer to values that refer to values can grow without end; what goes beyond these stays as it
+// stands.
 constexpr int kMaximumNesting = 32;
 constexpr int kMaximumReplacements = 10000;
 constexpr int kMaximumLength = 1 << 20;

@@ -1,5 +1,5 @@
-// The global parameters of one workspace: what its header sets, what its document declares, what the caller gives
-// another value.
+// The global parameters of one workspace: what its header sets, what its document declares, what the caller
+// gives another value.
 #pragma once
 
 #include <platform/Export.h>
@@ -40,8 +40,8 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
 
   // Whether the text holds a reference "$(NAME)" to one of these parameters.
   bool holdsReference(const QString& text) const;
-  // Every reference to one of these parameters replaced by its value, references inside values too. A parameter
-  // that refers to itself keeps its reference as it stands.
+  // Every reference to one of these parameters replaced by its value, references inside values too. A
+  // parameter that refers to itself keeps its reference as it stands.
   QString resolve(const QString& text) const;
 
  private:

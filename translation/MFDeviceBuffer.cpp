@@ -2,9 +2,13 @@
 
 #include <QIODevice>
 
-MFDeviceBuffer::MFDeviceBuffer(QIODevice& device) : m_device(device) { setDevice(&device); }
+MFDeviceBuffer::MFDeviceBuffer(QIODevice& device) : m_device(device) {
+  setDevice(&device);
+}
 
-MFDeviceBuffer::~MFDeviceBuffer() { setDevice(nullptr); }
+MFDeviceBuffer::~MFDeviceBuffer() {
+  setDevice(nullptr);
+}
 
 void MFDeviceBuffer::write(const QByteArray& bytes) {
   if (m_device.write(bytes) != bytes.size())

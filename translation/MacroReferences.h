@@ -1,5 +1,5 @@
-// Walks over the references "$(NAME)" of a text, from left to right. In nested references such as "$($(A)_B)" the
-// innermost is found.
+// Walks over the references "$(NAME)" of a text, from left to right. In nested references such as "$($(A)_B)"
+// the innermost is found.
 #pragma once
 
 #include <QString>

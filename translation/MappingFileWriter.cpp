@@ -13,17 +13,8 @@
 
 namespace {
 
-std::size_t at(int number) { return static_cast<std::size_t>(number); }
-
-bool hasUnclosedReference(const QString& text) {
-  // As the buffer does it, each "$[" takes the first "]" behind it that no earlier one took.
-  int close = -1;
-  for (int open = text.indexOf(QLatin1String("$[")); open >= 0; open = text.indexOf(QLatin1String("$["), open + 2)) {
-    close = text.indexOf(QLatin1Char(']'), std::max(open, close + 1));
-    if (close < 0)
-      return true;
-  }
-  return false;
+std::size_t at(int number) {
+  return static_cast<std::size_t>(number);
 }
 
 void writeStatement(MFBuffer& buffer, const QString& line) {
@@ -133,7 +124,8 @@ void MappingFileWriter::connect() {
     const auto rank = [&](int number) {
       constexpr int last = std::numeric_limits<int>::max();
       const WorkspaceLink& link = m_workspace.links[at(number)];
-      const int byOrder = ranks.isEmpty() ? last : ranks.value(link.input).value(flowOf(link.source, link.output), last);
+      const int byOrder =
+          ranks.isEmpty() ? last : ranks.value(link.input).value(flowOf(link.source, link.output), last);
       return std::make_pair(byOrder, link.executionIndex < 0 ? last : link.executionIndex);
     };
     std::stable_sort(m_incoming[target].begin(), m_incoming[target].end(),
@@ -181,7 +173,7 @@ void MappingFileWriter::pushAttributes() {
 }
 
 void MappingFileWriter::checkText(const QString& text, const QString& what, int line, const QString& node) {
-  if (hasUnclosedReference(text))
+  if (!MFBuffer::closesDeferredMacros(text))
     m_diagnostics.report(Rule::UnclosedReference, line, node, {what});
   if (text.contains(QLatin1Char('\n')) || text.contains(QLatin1Char('\r')))
     m_diagnostics.report(Rule::LineBreak, line, node, {what});
@@ -239,10 +231,10 @@ void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer) const {
       const bool isReader = place.kind == WorkspaceNode::Kind::Reader;
       const QString type = quotifyStringForMF(place.name);
       const QString shownFlow = quotifyStringForMF(flow);
-      writeStatement(buffer, QLatin1String(isReader ? "READER_FEATURE_TYPE " : "WRITER_FEATURE_TYPE ") +
-                                 quotifyStringForMF(place.keyword) + QLatin1Char(' ') +
-                                 (isReader ? type + QLatin1Char(' ') + shownFlow
-                                           : shownFlow + QLatin1Char(' ') + type));
+      writeStatement(
+          buffer, QLatin1String(isReader ? "READER_FEATURE_TYPE " : "WRITER_FEATURE_TYPE ") +
+                      quotifyStringForMF(place.keyword) + QLatin1Char(' ') +
+                      (isReader ? type + QLatin1Char(' ') + shownFlow : shownFlow + QLatin1Char(' ') + type));
     }
     if (!m_copiedFlows[node].isEmpty()) {
       buffer.add(QStringLiteral("FACTORY_DEF * TeeFactory"));

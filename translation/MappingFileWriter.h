@@ -17,8 +17,8 @@ class ORX_EXPORT MappingFileWriter {
   // Neither is owned.
   MappingFileWriter(Workspace& workspace, Diagnostics& diagnostics);
 
-  // Orders and connects the transformers and pushes attributes through; checks everything that will be written.
-  // False when there are errors, those found before included; nothing may be written then.
+  // Orders and connects the transformers and pushes attributes through; checks everything that will be
+  // written. False when there are errors, those found before included; nothing may be written then.
   bool prepare();
   // The whole mapping file. Call after prepare() answered true.
   void write(MFBuffer& buffer);
@@ -39,10 +39,10 @@ class ORX_EXPORT MappingFileWriter {
 
   Workspace& m_workspace;
   Diagnostics& m_diagnostics;
-  std::vector<int> m_order;                         // transformers, each behind what feeds it
-  std::vector<QHash<QString, QString>> m_flows;     // per node: output tag to flow; "" for feature types
+  std::vector<int> m_order;                              // transformers, each behind what feeds it
+  std::vector<QHash<QString, QString>> m_flows;          // per node: output tag to flow; "" for feature types
   std::vector<QHash<QString, QStringList>> m_functions;  // per node: output tag to output functions
-  std::vector<QHash<QString, QStringList>> m_copies;     // per node: output tag to attributes that functions add
-  std::vector<QString> m_copiedFlows;               // per reader with copied attributes: the flow behind the copies
-  std::vector<std::vector<int>> m_incoming;         // per node: its links, in the order of the sources
+  std::vector<QHash<QString, QStringList>> m_copies;  // per node: output tag to attributes that functions add
+  std::vector<QString> m_copiedFlows;        // per reader with copied attributes: the flow behind the copies
+  std::vector<std::vector<int>> m_incoming;  // per node: its links, in the order of the sources
 };

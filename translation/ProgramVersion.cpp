@@ -1,3 +1,5 @@
 #include <translation/ProgramVersion.h>
 
-QString programVersion() { return QStringLiteral("orxt " ORX_VERSION); }
+QString programVersion() {
+  return QStringLiteral("orxt " ORX_VERSION);
+}

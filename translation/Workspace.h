@@ -1,7 +1,7 @@
 // A workspace as a graph: its feature types and configured transformers, and the links between their ports.
 //
-// Disabled nodes and links are left out. Nodes are numbered from 0: feature types first, then transformers, each in
-// document order.
+// Disabled nodes and links are left out. Nodes are numbered from 0: feature types first, then transformers,
+// each in document order.
 #pragma once
 
 #include <platform/Export.h>
@@ -31,9 +31,9 @@ struct WorkspaceNode {
 
   // Transformers.
   std::unique_ptr<TransformerCfg> cfg;
-  QStringList outputs;                          // the record's output ports, in its order
-  std::vector<QStringList> inputOrder;          // per input port of the record: tag, then its sources in order
-  QHash<QString, QStringList> exposed;          // output tag to the attributes that a user added there
+  QStringList outputs;                  // the record's output ports, in its order
+  std::vector<QStringList> inputOrder;  // per input port of the record: tag, then its sources in order
+  QHash<QString, QStringList> exposed;  // output tag to the attributes that a user added there
 
   bool isTransformer() const { return kind == Kind::Transformer; }
 };

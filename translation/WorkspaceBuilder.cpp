@@ -10,7 +10,8 @@
 namespace {
 
 QString nodeTitle(const TransformerStruct& record) {
-  return record.name.isEmpty() ? record.type + QLatin1Char('_') + QString::number(record.identifier) : record.name;
+  return record.name.isEmpty() ? record.type + QLatin1Char('_') + QString::number(record.identifier)
+                               : record.name;
 }
 
 // Port orders are lists in a list: per port its tag, behind it the sources in their order.
@@ -205,9 +206,9 @@ void WorkspaceBuilder::addLink(const LinkStruct& record) {
   const WorkspaceNode& target = m_workspace->nodes[static_cast<std::size_t>(link.target)];
   if (source.kind == WorkspaceNode::Kind::Writer || target.kind == WorkspaceNode::Kind::Reader) {
     const bool isSource = source.kind == WorkspaceNode::Kind::Writer;
-    m_diagnostics.report(Rule::BadPort, record.line, isSource ? source.name : target.name,
-                         {QString::number(record.identifier),
-                          isSource ? record.sourcePortDesc : record.targetPortDesc});
+    m_diagnostics.report(
+        Rule::BadPort, record.line, isSource ? source.name : target.name,
+        {QString::number(record.identifier), isSource ? record.sourcePortDesc : record.targetPortDesc});
     return;
   }
 
@@ -253,9 +254,9 @@ bool WorkspaceBuilder::findOutput(const WorkspaceNode& node, const LinkStruct& r
     tag = wanted;
     return true;
   }
-  m_diagnostics.report(Rule::UnknownOutput, record.line, node.name,
-                       {node.cfg->getName(), name.isEmpty() ? QString::number(number) : name,
-                        tags.join(QLatin1String(", "))});
+  m_diagnostics.report(
+      Rule::UnknownOutput, record.line, node.name,
+      {node.cfg->getName(), name.isEmpty() ? QString::number(number) : name, tags.join(QLatin1String(", "))});
   return false;
 }
 
@@ -272,16 +273,17 @@ bool WorkspaceBuilder::findInput(const WorkspaceNode& node, const LinkStruct& re
   }
   if (!tags.contains(wanted)) {
     const QString byAlias = node.cfg->getInputTagAliases().key(wanted);
-    wanted = byAlias.isEmpty() ? node.cfg->renamedInputTags(node.cfg->getVersion(), nullptr).value(wanted, wanted)
-                               : byAlias;
+    wanted = byAlias.isEmpty()
+                 ? node.cfg->renamedInputTags(node.cfg->getVersion(), nullptr).value(wanted, wanted)
+                 : byAlias;
   }
   if (tags.contains(wanted)) {
     tag = wanted;
     return true;
   }
-  m_diagnostics.report(Rule::UnknownInput, record.line, node.name,
-                       {node.cfg->getName(), name.isEmpty() ? QString::number(number) : name,
-                        tags.join(QLatin1String(", "))});
+  m_diagnostics.report(
+      Rule::UnknownInput, record.line, node.name,
+      {node.cfg->getName(), name.isEmpty() ? QString::number(number) : name, tags.join(QLatin1String(", "))});
   return false;
 }
 
@@ -303,7 +305,8 @@ void WorkspaceBuilder::addAttributeLink(const LinkStruct& record) {
   }
   if (!decodePortDescription(record.targetPortDesc, isFeaturePort, isOutput, ignored, ignored, link.to) ||
       isFeaturePort || isOutput || link.to.isEmpty()) {
-    m_diagnostics.report(Rule::BadPort, record.line, m_workspace->nodes[static_cast<std::size_t>(target)].name,
+    m_diagnostics.report(Rule::BadPort, record.line,
+                         m_workspace->nodes[static_cast<std::size_t>(target)].name,
                          {QString::number(record.identifier), record.targetPortDesc});
     return;
   }

@@ -1,5 +1,5 @@
-// Turns the records of a workspace document into a graph of configured transformers. What cannot be placed is a
-// diagnostic; the rest is built all the same, so that one run names every fault.
+// Turns the records of a workspace document into a graph of configured transformers. What cannot be placed is
+// a diagnostic; the rest is built all the same, so that one run names every fault.
 #pragma once
 
 #include <platform/Export.h>
@@ -18,8 +18,8 @@ struct TransformerStruct;
 
 class ORX_EXPORT WorkspaceBuilder {
  public:
-  // `source` makes the configurations; `parameterValues` gives global parameters another value, by name. Neither
-  // `source` nor `diagnostics` is owned.
+  // `source` makes the configurations; `parameterValues` gives global parameters another value, by name.
+  // Neither `source` nor `diagnostics` is owned.
   WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
                    const QHash<QString, QString>& parameterValues = {});
 
@@ -39,7 +39,8 @@ class ORX_EXPORT WorkspaceBuilder {
   std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& nodeName);
   void applyRecord(const TransformerStruct& record, WorkspaceNode& node);
   bool placeNode(int identifier, int line, const QString& name, int node);
-  // False when the link cannot be placed; `source` and `target` are -1 when it leads to a node that is left out.
+  // False when the link cannot be placed; `source` and `target` are -1 when it leads to a node that is left
+  // out.
   bool findEnds(const LinkStruct& record, int& source, int& target);
   void addLink(const LinkStruct& record);
   void addAttributeLink(const LinkStruct& record);
@@ -52,6 +53,6 @@ class ORX_EXPORT WorkspaceBuilder {
   Diagnostics& m_diagnostics;
   const QHash<QString, QString> m_parameterValues;
   std::unique_ptr<Workspace> m_workspace;
-  QHash<int, Place> m_places;           // by identifier in the document
-  QHash<QString, int> m_linesByName;    // of transformers
+  QHash<int, Place> m_places;         // by identifier in the document
+  QHash<QString, int> m_linesByName;  // of transformers
 };

@@ -29,7 +29,8 @@ bool WorkspaceListener::acceptsValue(const TransformerCfg& cfg, const QString&, 
   return isRunTimeValue(cfg, value);
 }
 
-QString WorkspaceListener::resolveUserTypedMacro(const TransformerCfg&, const QString& value, UnpackLevel) const {
+QString WorkspaceListener::resolveUserTypedMacro(const TransformerCfg&, const QString& value,
+                                                 UnpackLevel) const {
   return m_parameters.resolve(value);
 }
 

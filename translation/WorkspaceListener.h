@@ -18,7 +18,8 @@ class ORX_EXPORT WorkspaceListener : public TransformerCfgListener {
   // A value that refers to a parameter of the same transformer is substituted again.
   bool isDeferredValue(const TransformerCfg& cfg, const QString& value) const override;
   bool acceptsValue(const TransformerCfg& cfg, const QString& parameter, const QString& value) const override;
-  QString resolveUserTypedMacro(const TransformerCfg& cfg, const QString& value, UnpackLevel level) const override;
+  QString resolveUserTypedMacro(const TransformerCfg& cfg, const QString& value,
+                                UnpackLevel level) const override;
   QString resolveDefaultValue(const TransformerCfg& cfg, const QString& value) const override;
 
  private:

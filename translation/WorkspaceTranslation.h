@@ -26,13 +26,14 @@ struct TranslationRequest {
   QHash<QString, QString> parameterValues;  // other values for global parameters, by name
 };
 
-// Reads a workspace file into a graph of configured transformers. Null when there is no document to build from:
-// `error` says why the file cannot be read, and is empty when diagnostics say what is wrong inside.
-ORX_EXPORT std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, TransformerSource& source,
-                                                    Diagnostics& diagnostics, QString& error);
+// Reads a workspace file into a graph of configured transformers. Null when there is no document to build
+// from: `error` says why the file cannot be read, and is empty when diagnostics say what is wrong inside.
+ORX_EXPORT std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request,
+                                                    TransformerSource& source, Diagnostics& diagnostics,
+                                                    QString& error);
 
-// Writes the mapping file to a device that is open for writing. False when the workspace was refused; nothing has
-// been written then. Failures of the device show in the device.
+// Writes the mapping file to a device that is open for writing. False when the workspace was refused; nothing
+// has been written then. Failures of the device show in the device.
 ORX_EXPORT bool writeMappingFile(Workspace& workspace, QIODevice& device, Diagnostics& diagnostics);
 
 // The whole job. Output appears whole or not at all. `error` receives why a file could not be read or
