@@ -1,0 +1,127 @@
+#include <transform/workspace/DocumentGuard.h>
+#include <transform/workspace/DocumentLimits.h>
+
+bool DocumentGuard::refuse(const QString& message) {
+  m_refusal = message;
+  return false;
+}
+
+bool DocumentGuard::enter(State state) {
+  m_state = state;
+  m_runLength = 0;
+  m_previous = 0;
+  m_beforePrevious = 0;
+  return true;
+}
+
+int DocumentGuard::check(const ushort* units, int size) {
+  if (hasRefused())
+    return 0;
+  for (int i = 0; i < size; ++i) {
+    const ushort unit = units[i];
+    if (unit == 0 || (m_replacement != 0 && unit == m_replacement)) {
+      refuse(QStringLiteral("A null character, or bytes that are not valid in the document's encoding"));
+      return i;
+    }
+    if (++m_runLength > limits::kValueLength) {
+      refuse(QStringLiteral("A single value is longer than %1 characters").arg(limits::kValueLength));
+      return i;
+    }
+    if (!take(unit))
+      return i;
+    if (unit == '\n') {
+      // The line feed of a pair was counted with its carriage return.
+      if (!m_afterReturn)
+        ++m_line;
+      m_column = 1;
+    } else if (unit == '\r') {
+      ++m_line;
+      m_column = 1;
+    } else if (!QChar::isLowSurrogate(unit)) {
+      ++m_column;
+    }
+    m_afterReturn = unit == '\r';
+  }
+  return size;
+}
+
+bool DocumentGuard::take(ushort unit) {
+  switch (m_state) {
+    case State::Text:
+      return unit == '<' ? enter(State::Open) : true;
+    case State::DoubleQuoted:
+      return unit == '"' ? enter(State::Tag) : true;
+    case State::SingleQuoted:
+      return unit == '\'' ? enter(State::Tag) : true;
+    case State::Tag:
+      return takeTag(unit);
+    case State::EndTag:
+      if (unit == '>') {
+        --m_depth;
+        return enter(State::Text);
+      }
+      return true;
+    case State::Open:
+      return takeOpen(unit);
+    case State::Bang:
+      return takeBang(unit);
+    case State::Comment:
+      if (unit == '>' && m_previous == '-' && m_beforePrevious == '-')
+        return enter(State::Text);
+      break;
+    case State::CharacterData:
+      if (unit == '>' && m_previous == ']' && m_beforePrevious == ']')
+        return enter(State::Text);
+      break;
+    case State::Instruction:
+      if (unit == '>' && m_previous == '?')
+        return enter(State::Text);
+      break;
+  }
+  m_beforePrevious = m_previous;
+  m_previous = unit;
+  return true;
+}
+
+bool DocumentGuard::takeOpen(ushort unit) {
+  if (unit == '/')
+    return enter(State::EndTag);
+  if (unit == '?')
+    return enter(State::Instruction);
+  if (unit == '!') {
+    m_bang.clear();
+    return enter(State::Bang);
+  }
+  m_elementLines.push_back(m_line);
+  m_attributes = 0;
+  if (++m_depth > limits::kNesting)
+    return refuse(QStringLiteral("Elements are nested more than %1 deep").arg(limits::kNesting));
+  return enter(State::Tag) && takeTag(unit);
+}
+
+bool DocumentGuard::takeTag(ushort unit) {
+  if (unit == '"' || unit == '\'') {
+    if (++m_attributes > limits::kAttributesPerElement)
+      return refuse(
+          QStringLiteral("An element has more than %1 attributes").arg(limits::kAttributesPerElement));
+    return enter(unit == '"' ? State::DoubleQuoted : State::SingleQuoted);
+  }
+  if (unit == '>') {
+    if (m_previous == '/')
+      --m_depth;
+    return enter(State::Text);
+  }
+  m_previous = unit;
+  return true;
+}
+
+bool DocumentGuard::takeBang(ushort unit) {
+  m_bang += QChar(unit);
+  if (m_bang == QLatin1String("--"))
+    return enter(State::Comment);
+  if (m_bang == QLatin1String("[CDATA["))
+    return enter(State::CharacterData);
+  if (m_bang.size() >= 7)
+    return refuse(QStringLiteral("A document type declaration is not allowed"));
+  return true;
+}

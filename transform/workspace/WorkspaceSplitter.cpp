@@ -1,0 +1,174 @@
+#include <platform/orxparameter/GUIType.h>
+#include <platform/vtl/SystemEncoding.h>
+#include <transform/workspace/DocumentLimits.h>
+#include <transform/workspace/FileLines.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/WorkspaceSplitter.h>
+
+#include <QRegularExpression>
+#include <QTextCodec>
+
+const char* const WorkspaceSplitter::kStartHeader = "START_HEADER";
+const char* const WorkspaceSplitter::kEndHeader = "END_HEADER";
+const char* const WorkspaceSplitter::kPrefix = "#! ";
+
+namespace {
+
+constexpr int kDeclarationLength = 1024;
+
+[[noreturn]] void fail(const QString& text, const QString& fileName) {
+  throw WorkspaceLoaderException(QStringLiteral("File Error!\n%1: %2").arg(text, fileName));
+}
+
+bool isValid(const QTextCodec& codec, const QList<QByteArray>& lines) {
+  for (const QByteArray& line : lines) {
+    QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
+    codec.toUnicode(line.constData(), line.size(), &state);
+    if (state.invalidChars > 0 || state.remainingChars > 0)
+      return false;
+  }
+  return true;
+}
+
+}  // namespace
+
+QByteArray declaredEncoding(const QByteArray& xmlStart) {
+  static const QRegularExpression pattern(
+      QStringLiteral("^\\s*<\\?xml\\s[^>]*encoding\\s*=\\s*[\"']([A-Za-z][A-Za-z0-9._-]*)[\"']"));
+  const auto match = pattern.match(QString::fromLatin1(xmlStart.left(kDeclarationLength)));
+  return match.captured(1).toLatin1();
+}
+
+void WorkspaceSplitter::split(QIODevice& input, QIODevice& xml, const QString& fileName) {
+  m_rawHeader.clear();
+  m_headerLines.clear();
+  m_xmlStart.clear();
+  m_firstHeaderLine = 0;
+  m_lineMap = LineMap();
+  FileLines lines(input);
+  readXml(lines, xml, fileName);
+  if (m_firstHeaderLine > 0) {
+    readHeader(lines);
+    decodeHeader(lines);
+  }
+  if (lines.hasFailed())
+    fail(QStringLiteral("Could not read file"), fileName);
+}
+
+void WorkspaceSplitter::readXml(FileLines& lines, QIODevice& xml, const QString& fileName) {
+  int xmlLine = 0;
+  bool inXml = false;
+  bool isFirst = true;
+  const auto write = [&](const char* bytes, int size) {
+    if (m_xmlStart.size() < kDeclarationLength)
+      m_xmlStart.append(bytes, std::min(size, kDeclarationLength));
+    if (xml.write(bytes, size) != size)
+      fail(QStringLiteral("Could not write a temporary copy of the file"), fileName);
+  };
+  while (lines.next()) {
+    if (isFirst)
+      write(lines.byteOrderMark().constData(), lines.byteOrderMark().size());
+    int prefix = 0;
+    if (lines.startsLine()) {
+      if (m_stopBefore && !isFirst && lines.startsWith(m_stopBefore))
+        return;
+      if (lines.matchComment(kStartHeader) > 0) {
+        m_firstHeaderLine = m_firstLine + lines.lineNumber();
+        return;
+      }
+      prefix = lines.matchComment("");
+      inXml = prefix > 0;
+      if (inXml)
+        m_lineMap.add(++xmlLine, m_firstLine + lines.lineNumber() - 1);
+    }
+    isFirst = false;
+    if (!inXml)
+      continue;
+    const int skipped = prefix * lines.unitSize();
+    write(lines.data() + skipped, lines.size() - skipped);
+    if (lines.endsLine() && (lines.unitCount() == 0 || lines.unit(lines.unitCount() - 1) != '\n')) {
+      const QByteArray lineEnd = lines.encoded('\n');
+      write(lineEnd.constData(), lineEnd.size());
+    }
+  }
+}
+
+void WorkspaceSplitter::readHeader(FileLines& lines) {
+  // The rest of an over-long marker line.
+  while (!lines.endsLine() && lines.next()) {
+  }
+  const QByteArray lineEnd = lines.encoded('\n');
+  const QByteArray lineReturn = lines.encoded('\r');
+  while (lines.next()) {
+    if (!lines.startsLine()) {
+      m_rawHeader.last().append(lines.data(), lines.size());
+    } else {
+      if (lines.matchComment(kEndHeader) > 0)
+        return;
+      m_rawHeader.append(QByteArray(lines.data(), lines.size()));
+    }
+    QByteArray& line = m_rawHeader.last();
+    if (line.size() / lines.unitSize() > limits::kValueLength) {
+      throw WorkspaceLoaderException(
+          QStringLiteral("A header line is longer than %1 characters").arg(limits::kValueLength),
+          m_firstLine + lines.lineNumber() - 1);
+    }
+    if (lines.endsLine()) {
+      if (line.endsWith(lineEnd))
+        line.chop(lineEnd.size());
+      if (line.endsWith(lineReturn))
+        line.chop(lineReturn.size());
+    }
+  }
+}
+
+void WorkspaceSplitter::decodeHeader(const FileLines& lines) {
+  QTextCodec* codec = nullptr;
+  if (lines.byteOrder()) {
+    codec = QTextCodec::codecForName(lines.byteOrder() == 'L' ? "UTF-16LE" : "UTF-16BE");
+  } else {
+    codec = QTextCodec::codecForName(ORXSystemEncodingName());
+    if (!isValid(*codec, m_rawHeader)) {
+      if (QTextCodec* const declared = QTextCodec::codecForName(declaredEncoding(m_xmlStart)))
+        codec = declared;
+    }
+  }
+  for (const QByteArray& line : qAsConst(m_rawHeader)) {
+    QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
+    m_headerLines.append(codec->toUnicode(line.constData(), line.size(), &state));
+  }
+  m_rawHeader.clear();
+}
+
+void WorkspaceSplitter::collectPrompts(const QStringList& headerLines, QHash<QString, QString>& prompts) {
+  for (const QString& line : headerLines) {
+    if (!line.startsWith(QLatin1String("GUI ")))
+      continue;
+    const GUIType type = GUIType::fromGuiLine(line);
+    if (!type.isNull())
+      prompts.insert(type.getName(), line);
+  }
+}
+
+void WorkspaceSplitter::collectMacros(const QStringList& headerLines, QHash<QString, QString>& macros) {
+  for (const QString& line : headerLines) {
+    int at = 0;
+    for (const QLatin1String keyword : {QLatin1String("DEFAULT_MACRO "), QLatin1String("MACRO ")}) {
+      if (line.startsWith(keyword))
+        at = keyword.size();
+    }
+    if (at == 0)
+      continue;
+    const auto skip = [&](bool blanks) {
+      while (at < line.size() && (line[at] == QLatin1Char(' ')) == blanks)
+        ++at;
+    };
+    skip(true);
+    const int nameStart = at;
+    skip(false);
+    const QString name = line.mid(nameStart, at - nameStart);
+    skip(true);
+    if (!name.isEmpty())
+      macros.insert(name, line.mid(at));
+  }
+}

@@ -1,0 +1,77 @@
+#include <transform/workspace/XORXDOMParser.h>
+
+#include <xercesc/dom/DOMElement.hpp>
+#include <xercesc/internal/XMLScanner.hpp>
+#include <xercesc/util/XMLString.hpp>
+#include <xercesc/util/XMLUni.hpp>
+
+using namespace XERCES_CPP_NAMESPACE;
+
+namespace {
+constexpr std::size_t kLeftOutEntries = 10000;
+}
+
+XORXDOMParser::XORXDOMParser() {
+  // The scanner that knows nothing of document types, schemas and entities: the quickest, and nothing that a
+  // document says can make it open anything.
+  useScanner(XMLUni::fgWFXMLScanner);
+  setValidationScheme(Val_Never);
+  setDoNamespaces(false);
+  setDoSchema(false);
+  setLoadExternalDTD(false);
+  setDisableDefaultEntityResolution(true);
+  setCreateEntityReferenceNodes(false);
+  setCreateCommentNodes(false);
+  setCalculateSrcOfs(false);
+}
+
+XORXDOMParser::~XORXDOMParser() {
+  XMLString::release(&m_encodingName);
+}
+
+void XORXDOMParser::forget() {
+  XMLString::release(&m_encodingName);
+  m_encodingName = nullptr;
+  m_elements.clear();
+  m_leftOut.clear();
+}
+
+void XORXDOMParser::XMLDecl(const XMLCh* const version, const XMLCh* const encoding,
+                            const XMLCh* const standalone, const XMLCh* const actualEncoding) {
+  XMLString::release(&m_encodingName);
+  const bool isDeclared = encoding && *encoding;
+  m_encodingName = XMLString::replicate(isDeclared ? encoding : actualEncoding);
+  XercesDOMParser::XMLDecl(version, encoding, standalone, actualEncoding);
+}
+
+void XORXDOMParser::startElement(const XMLElementDecl& declaration, const unsigned int uriId,
+                                 const XMLCh* const prefix, const RefVectorOf<XMLAttr>& attributes,
+                                 const XMLSize_t attributeCount, const bool isEmpty, const bool isRoot) {
+  XercesDOMParser::startElement(declaration, uriId, prefix, attributes, attributeCount, isEmpty, isRoot);
+  m_elements.push_back(static_cast<const DOMElement*>(fCurrentNode));
+}
+
+void XORXDOMParser::docCharacters(const XMLCh* const text, const XMLSize_t length, const bool) {
+  for (XMLSize_t i = 0; i < length; ++i) {
+    const XMLCh unit = text[i];
+    if (unit != u' ' && unit != u'\n' && unit != u'\r' && unit != u'\t') {
+      noteLeftOut(Content::Text);
+      return;
+    }
+  }
+}
+
+void XORXDOMParser::ignorableWhitespace(const XMLCh* const, const XMLSize_t, const bool) {}
+
+void XORXDOMParser::docComment(const XMLCh* const) {
+  noteLeftOut(Content::Comment);
+}
+
+void XORXDOMParser::docPI(const XMLCh* const, const XMLCh* const) {
+  noteLeftOut(Content::Instruction);
+}
+
+void XORXDOMParser::noteLeftOut(Content content) {
+  if (m_leftOut.size() < kLeftOutEntries)
+    m_leftOut.push_back({content, static_cast<int>(getScanner()->getLocator()->getLineNumber())});
+}

@@ -1,0 +1,52 @@
+// The DOM parser of workspace documents. It keeps the encoding's name, and for the sake of memory it leaves
+// out of the tree what the vocabulary gives no meaning to (text, comments, processing instructions), noting
+// where such content stood.
+#pragma once
+
+#include <platform/Export.h>
+
+#include <xercesc/parsers/XercesDOMParser.hpp>
+
+#include <vector>
+
+class ORX_EXPORT XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
+ public:
+  enum class Content { Text, Comment, Instruction };
+  struct LeftOut {
+    Content content;
+    int line;  // where it ends, in the text that was parsed
+  };
+
+  XORXDOMParser();
+  ~XORXDOMParser() override;
+
+  // The encoding that the last declaration names, else the one that the scanner detected behind it; null
+  // without a declaration. Owned by the parser, valid until the next declaration.
+  const XMLCh* getEncodingName() const { return m_encodingName; }
+  // Forgets encoding, elements and left-out content.
+  void forget();
+
+  // Every element of the last parse, in document order.
+  const std::vector<const XERCES_CPP_NAMESPACE::DOMElement*>& elements() const { return m_elements; }
+  // Text only when it is not blank; at most some thousand entries are noted.
+  const std::vector<LeftOut>& leftOut() const { return m_leftOut; }
+
+  void XMLDecl(const XMLCh* const version, const XMLCh* const encoding, const XMLCh* const standalone,
+               const XMLCh* const actualEncoding) override;
+  void startElement(const XERCES_CPP_NAMESPACE::XMLElementDecl& declaration, const unsigned int uriId,
+                    const XMLCh* const prefix,
+                    const XERCES_CPP_NAMESPACE::RefVectorOf<XERCES_CPP_NAMESPACE::XMLAttr>& attributes,
+                    const XMLSize_t attributeCount, const bool isEmpty, const bool isRoot) override;
+  void docCharacters(const XMLCh* const text, const XMLSize_t length, const bool isCharacterData) override;
+  void ignorableWhitespace(const XMLCh* const text, const XMLSize_t length,
+                           const bool isCharacterData) override;
+  void docComment(const XMLCh* const text) override;
+  void docPI(const XMLCh* const target, const XMLCh* const data) override;
+
+ private:
+  void noteLeftOut(Content content);
+
+  XMLCh* m_encodingName = nullptr;
+  std::vector<const XERCES_CPP_NAMESPACE::DOMElement*> m_elements;
+  std::vector<LeftOut> m_leftOut;
+};

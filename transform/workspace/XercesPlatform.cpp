@@ -1,0 +1,12 @@
+#include <transform/workspace/XercesPlatform.h>
+
+#include <QtGlobal>
+#include <xercesc/util/PlatformUtils.hpp>
+
+void ensureXercesPlatform() {
+  static const bool ready = [] {
+    XERCES_CPP_NAMESPACE::XMLPlatformUtils::Initialize();
+    return true;
+  }();
+  Q_UNUSED(ready)
+}
