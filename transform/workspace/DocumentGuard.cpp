@@ -23,7 +23,8 @@ int DocumentGuard::check(const ushort* units, int size) {
       refuse(QStringLiteral("A null character, or bytes that are not valid in the document's encoding"));
       return i;
     }
-    if (++m_runLength > limits::kValueLength) {
+    // What ends a value is counted with it.
+    if (++m_runLength > limits::kValueLength + 1) {
       refuse(QStringLiteral("A single value is longer than %1 characters").arg(limits::kValueLength));
       return i;
     }

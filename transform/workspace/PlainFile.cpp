@@ -1,0 +1,25 @@
+#include <platform/orxutil/Decipher.h>
+#include <transform/workspace/PlainFile.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+
+#include <QFileInfo>
+
+QString couldNotOpenMessage(const QString& fileName) {
+  return QStringLiteral("File Error!\nCould not open file: %1").arg(fileName);
+}
+
+PlainFile::PlainFile(const QString& fileName, const QString& copyTemplate) : m_file(fileName) {
+  // Without a registered routine no copy can come about, and no temporary file is needed to find that out.
+  if (ORW_hasDecipherRoutine()) {
+    auto copy = std::make_unique<TemporaryFile>(copyTemplate);
+    if (copy->open()) {
+      copy->close();
+      if (ORW_decryptWorkspace(fileName, copy->fileName())) {
+        m_copy = std::move(copy);
+        m_file.setFileName(m_copy->fileName());
+      }
+    }
+  }
+  if (QFileInfo(m_file.fileName()).isDir() || !m_file.open(QIODevice::ReadOnly | QIODevice::Unbuffered))
+    throw WorkspaceLoaderException(couldNotOpenMessage(fileName));
+}

@@ -1,0 +1,24 @@
+// A file opened for reading; when it is enciphered, a plain temporary copy of it, deleted with this object.
+#pragma once
+
+#include <transform/files/TemporaryFile.h>
+
+#include <QFile>
+#include <QString>
+
+#include <memory>
+
+class PlainFile {
+ public:
+  // Throws WorkspaceLoaderException when the file cannot be opened. `copyTemplate` names the plain copy.
+  PlainFile(const QString& fileName, const QString& copyTemplate);
+
+  QIODevice& device() { return m_file; }
+
+ private:
+  std::unique_ptr<TemporaryFile> m_copy;
+  QFile m_file;
+};
+
+// The message for a file that cannot be opened.
+QString couldNotOpenMessage(const QString& fileName);

@@ -1,0 +1,132 @@
+// Builds records from elements, as their tables say.
+#pragma once
+
+#include <transform/workspace/ElementLines.h>
+#include <transform/workspace/IXMLComponentReader.h>
+#include <transform/workspace/RecordTables.h>
+#include <transform/workspace/ValueText.h>
+#include <transform/workspace/XmlText.h>
+
+#include <xercesc/dom/DOMAttr.hpp>
+#include <xercesc/dom/DOMNamedNodeMap.hpp>
+
+// The rules of a table in ascending order of name, which is the order in which the DOM keeps attributes.
+template <class Table>
+class SortedRules {
+ public:
+  using Rule = AttributeRule<typename Table::Record>;
+  static constexpr std::size_t kCount = Table::attributes.size();
+
+  static const SortedRules& get() {
+    static const SortedRules rules;
+    return rules;
+  }
+
+  // The rule of that name, or null. `hint` is where the search begins: behind the rule found last.
+  const Rule* find(const XMLCh* name, std::size_t& hint) const {
+    for (std::size_t tried = 0; tried < kCount; ++tried) {
+      if (hint >= kCount)
+        hint = 0;
+      const Rule* const rule = m_rules[hint++];
+      if (XERCES_CPP_NAMESPACE::XMLString::equals(name, rule->name.text))
+        return rule;
+    }
+    return nullptr;
+  }
+
+ private:
+  SortedRules() {
+    for (std::size_t i = 0; i < kCount; ++i)
+      m_rules[i] = &Table::attributes[i];
+    std::sort(m_rules.begin(), m_rules.end(),
+              [](const Rule* left, const Rule* right) { return left->name.view() < right->name.view(); });
+  }
+
+  std::array<const Rule*, kCount> m_rules{};
+};
+
+class RecordReader {
+ public:
+  using Element = XERCES_CPP_NAMESPACE::DOMElement;
+
+  // Reads forward from the element at `cursor` in document order. Lines and source outlive the reader.
+  RecordReader(const ElementLines& lines, std::size_t cursor, const PromptDefinitionSource& prompts)
+      : m_lines(lines), m_cursor(cursor), m_prompts(prompts) {}
+
+  template <class Table>
+  typename Table::Record read(const Element& element) {
+    typename Table::Record record;
+    record.line = m_lines.lineOf(&element, m_cursor);
+    readAttributes<Table>(element, record);
+    for (const Element* child = element.getFirstElementChild(); child; child = child->getNextElementSibling())
+      readChild<Table>(*child, record);
+    finish(record);
+    return record;
+  }
+
+  // One attribute; false when the text is not well formed and the default stands.
+  template <class R>
+  static bool readValue(const AttributeRule<R>& rule, R& record, const XMLCh* text) {
+    if (rule.text) {
+      record.*rule.text = fromXml(text);
+      return true;
+    }
+    if (rule.read)
+      return rule.read(record, fromXml(text));
+    bool wellFormed = true;
+    visitField(rule, [&](auto field) {
+      if constexpr (!std::is_same_v<decltype(field), QString R::*>)
+        wellFormed = valuetext::read(QStringView(text), record.*field);
+    });
+    return wellFormed;
+  }
+
+ private:
+  template <class Table>
+  static void readAttributes(const Element& element, typename Table::Record& record) {
+    const auto& rules = SortedRules<Table>::get();
+    const XERCES_CPP_NAMESPACE::DOMNamedNodeMap* const attributes = element.getAttributes();
+    const XMLSize_t count = attributes->getLength();
+    std::size_t hint = 0;
+    for (XMLSize_t i = 0; i < count; ++i) {
+      const auto* const attribute = static_cast<const XERCES_CPP_NAMESPACE::DOMAttr*>(attributes->item(i));
+      if (const auto* const rule = rules.find(attribute->getName(), hint))
+        readValue(*rule, record, attribute->getValue());
+    }
+  }
+
+  template <class Table>
+  void readChild(const Element& child, typename Table::Record& record) {
+    std::apply([&](const auto&... rule) { static_cast<void>((readInto(rule, child, record) || ...)); },
+               Table::children);
+  }
+
+  // Whether the element is one of that kind, or the wrapper of that kind.
+  template <class R, class Table>
+  bool readInto(const ChildRule<R, Table>& rule, const Element& child, R& record) {
+    using XERCES_CPP_NAMESPACE::XMLString;
+    const XMLCh* const name = rule.wrapper ? rule.wrapper->text : Table::element.text;
+    if (!XMLString::equals(child.getTagName(), name))
+      return false;
+    if (!rule.wrapper) {
+      (record.*rule.list).append(read<Table>(child));
+      return true;
+    }
+    for (const Element* inner = child.getFirstElementChild(); inner; inner = inner->getNextElementSibling()) {
+      if (XMLString::equals(inner->getTagName(), Table::element.text))
+        (record.*rule.list).append(read<Table>(*inner));
+    }
+    return true;
+  }
+
+  template <class R>
+  static void finish(R&) {}
+  static void finish(DatasetStruct& record);
+  static void finish(XformAttrStruct& record);
+  static void finish(XformParmStruct& record);
+  void finish(TransformerStruct& record) const;
+
+  const ElementLines& m_lines;
+  std::size_t m_cursor;
+  const PromptDefinitionSource& m_prompts;
+};

@@ -1,0 +1,234 @@
+#include <transform/files/AtomicFile.h>
+#include <transform/workspace/FileLines.h>
+#include <transform/workspace/PlainFile.h>
+#include <transform/workspace/VersionStore.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+
+#include <QBuffer>
+#include <QFile>
+#include <QFileInfo>
+
+const char* const VersionStore::kFirstLine = "# ORW custom transformers";
+const char* const VersionStore::kBegin = "# TRANSFORMER_BEGIN ";
+const char* const VersionStore::kEnd = "# TRANSFORMER_END";
+const char* const VersionStore::kDocument = "#! <?xml version";
+
+namespace {
+
+constexpr int kNeededFields = 3;
+const char* const kDefinitionPrefix = "# ";
+const char* const kDocumentPrefix = "#! ";
+
+QByteArray currentLine(const FileLines& lines) {
+  QByteArray line(lines.data(), lines.size());
+  while (line.endsWith('\n') || line.endsWith('\r'))
+    line.chop(1);
+  return line;
+}
+
+// False for a line with too few fields.
+bool readOpeningLine(const QByteArray& line, VersionInfo& info) {
+  QStringList fields =
+      QString::fromUtf8(line.mid(static_cast<int>(qstrlen(VersionStore::kBegin)))).split(QLatin1Char(','));
+  for (QString& field : fields)
+    field = field.trimmed();
+  if (fields.size() < kNeededFields)
+    return false;
+  info.name = fields[0];
+  info.version = fields[1].toInt();
+  if (info.version == 0)
+    info.version = 1;
+  info.category = fields[2];
+  info.guid = fields.value(3).remove(QLatin1Char('{')).remove(QLatin1Char('}'));
+  return true;
+}
+
+QList<VersionInfo> scan(QIODevice& device) {
+  QList<VersionInfo> found;
+  FileLines lines(device);
+  bool inBlock = false;
+  const auto close = [&](qint64 end) {
+    if (!found.isEmpty() && found.last().byteLength == 0)
+      found.last().byteLength = end - found.last().byteOffset;
+  };
+  qint64 end = 0;
+  while (lines.next()) {
+    end = lines.position() + lines.size();
+    if (!lines.startsLine())
+      continue;
+    if (inBlock) {
+      inBlock = !lines.startsWith(VersionStore::kEnd);
+      found.last().startLine = lines.lineNumber();
+      continue;
+    }
+    VersionInfo info;
+    if (!lines.startsWith(VersionStore::kBegin) || !readOpeningLine(currentLine(lines), info))
+      continue;
+    close(lines.position());
+    info.byteOffset = lines.position();
+    info.startLine = lines.lineNumber();
+    found.append(info);
+    inBlock = true;
+  }
+  close(end);
+  return found;
+}
+
+// The definition's lines between the two marks; with the comment prefix of a document, should they lack it.
+QByteArray definitionLines(const QByteArray& version) {
+  QBuffer buffer;
+  buffer.setData(version);
+  buffer.open(QIODevice::ReadOnly);
+  FileLines lines(buffer);
+  QList<QByteArray> kept;
+  bool isPrefixed = false;
+  lines.next();  // the opening line
+  while (lines.next() && !lines.startsWith(VersionStore::kEnd)) {
+    QByteArray line(lines.data(), lines.size());
+    if (lines.startsLine() && line.startsWith(kDefinitionPrefix))
+      line.remove(0, static_cast<int>(qstrlen(kDefinitionPrefix)));
+    isPrefixed = isPrefixed || line.startsWith(kDocumentPrefix);
+    kept.append(line);
+  }
+  QByteArray text;
+  for (const QByteArray& line : qAsConst(kept))
+    text += isPrefixed ? line : kDocumentPrefix + line;
+  return text;
+}
+
+}  // namespace
+
+QList<VersionInfo> VersionStore::versions(QString& error) const {
+  error.clear();
+  QFile file(m_fileName);
+  if (QFileInfo(m_fileName).isDir() || !file.open(QIODevice::ReadOnly)) {
+    error = couldNotOpenMessage(m_fileName);
+    return {};
+  }
+  return scan(file);
+}
+
+VersionStore::Piece VersionStore::read(qint64 offset, qint64 length) const {
+  PlainFile plain(m_fileName, QStringLiteral("kx-in-XXXXXX"));
+  const QByteArray all = plain.device().readAll();
+  if (offset < 0 || length <= 0 || offset > all.size() || length > all.size() - offset) {
+    throw WorkspaceLoaderException(QStringLiteral("File Error!\nThere is no version at byte %1 of file: %2")
+                                       .arg(offset)
+                                       .arg(m_fileName));
+  }
+  Piece piece;
+  piece.before = all.left(static_cast<int>(offset));
+  piece.behind = all.mid(static_cast<int>(offset + length));
+  const QByteArray version = all.mid(static_cast<int>(offset), static_cast<int>(length));
+  const int firstLine = piece.before.count('\n') + 1;
+  int start = version.startsWith(kDocument) ? 0 : version.indexOf(QByteArray("\n") + kDocument) + 1;
+  if (start > 0 || version.startsWith(kDocument)) {
+    piece.document = version.mid(start);
+    piece.documentLine = firstLine + version.left(start).count('\n');
+  } else {
+    piece.document = definitionLines(version);
+    piece.documentLine = firstLine + 1;
+  }
+  if (piece.document.isEmpty()) {
+    throw WorkspaceLoaderException(
+        QStringLiteral("File Error!\nThe version at byte %1 holds no document, in file: %2")
+            .arg(offset)
+            .arg(m_fileName));
+  }
+  return piece;
+}
+
+namespace {
+
+bool hasLineBreak(const QString& text) {
+  return text.contains(QLatin1Char('\n')) || text.contains(QLatin1Char('\r'));
+}
+
+// Why these cannot become a version; empty when they can.
+QString refusal(const QStringList& fields, const QStringList& definition, const QByteArray& document) {
+  if (fields.size() < kNeededFields || fields[0].trimmed().isEmpty())
+    return QStringLiteral("a version needs a name, a version number and a category");
+  bool isNumber = false;
+  if (fields[1].trimmed().toInt(&isNumber) < 1 || !isNumber)
+    return QStringLiteral("\"%1\" is no version number").arg(fields[1]);
+  for (const QString& field : fields) {
+    if (field.contains(QLatin1Char(',')) || hasLineBreak(field))
+      return QStringLiteral("\"%1\" holds a comma or a line break").arg(field);
+  }
+  for (const QString& line : definition) {
+    if (hasLineBreak(line))
+      return QStringLiteral("a line of the definition holds a line break");
+    if ((QLatin1String(kDefinitionPrefix) + line).startsWith(QLatin1String(VersionStore::kEnd)))
+      return QStringLiteral("a line of the definition is the mark of its end");
+  }
+  if (!(kDocumentPrefix + document).startsWith(VersionStore::kDocument))
+    return QStringLiteral("the document has no XML declaration");
+  return QString();
+}
+
+QByteArray versionText(const QStringList& fields, const QStringList& definition, const QByteArray& document,
+                       const QByteArray& lineEnd) {
+  QByteArray text = VersionStore::kBegin + fields.join(QLatin1Char(',')).toUtf8() + lineEnd;
+  for (const QString& line : definition)
+    text += kDefinitionPrefix + line.toUtf8() + lineEnd;
+  text += VersionStore::kEnd + lineEnd;
+  for (int at = 0; at < document.size();) {
+    int end = document.indexOf('\n', at);
+    if (end < 0)
+      end = document.size();
+    QByteArray line = document.mid(at, end - at);
+    if (line.endsWith('\r'))
+      line.chop(1);
+    text += kDocumentPrefix + line + lineEnd;
+    at = end + 1;
+  }
+  return text;
+}
+
+}  // namespace
+
+bool VersionStore::insert(const QStringList& fields, const QStringList& definition,
+                          const QByteArray& document, QString& error) const {
+  const auto refuse = [&](const QString& reason) {
+    error = QStringLiteral("Could not write a version into file %1: %2").arg(m_fileName, reason);
+    return false;
+  };
+  error = refusal(fields, definition, document);
+  if (!error.isEmpty())
+    return refuse(error);
+
+  QByteArray old;
+  QFile file(m_fileName);
+  if (file.exists()) {
+    if (!file.open(QIODevice::ReadOnly))
+      return refuse(file.errorString());
+    old = file.readAll();
+    if (file.error() != QFileDevice::NoError)
+      return refuse(file.errorString());
+    QBuffer buffer(&old);
+    buffer.open(QIODevice::ReadOnly);
+    VersionInfo wanted;
+    readOpeningLine(kBegin + fields.join(QLatin1Char(',')).toUtf8(), wanted);
+    for (const VersionInfo& info : scan(buffer)) {
+      if (info.name == wanted.name && info.version == wanted.version)
+        return refuse(QStringLiteral("version %1 is there already").arg(info.version));
+    }
+  }
+  const bool hasFirstLine = old.startsWith(kFirstLine);
+  if (!old.isEmpty() && !hasFirstLine && !old.startsWith(kBegin))
+    return refuse(QStringLiteral("it is no file of custom transformers"));
+
+  const int firstEnd = old.indexOf('\n');
+  const QByteArray lineEnd = firstEnd > 0 && old[firstEnd - 1] == '\r' ? "\r\n" : "\n";
+  QByteArray head = hasFirstLine ? old.left(firstEnd < 0 ? old.size() : firstEnd + 1) : kFirstLine + lineEnd;
+  const QByteArray rest = hasFirstLine ? old.mid(head.size()) : old;
+  if (!head.endsWith('\n'))
+    head += lineEnd;
+  AtomicFile output(m_fileName);
+  if (!output.open())
+    return refuse(output.errorString());
+  output.device().write(head);
+  output.device().write(versionText(fields, definition, document, lineEnd));
+  output.device().write(rest);
+  return output.commit() || refuse(output.errorString());
+}

@@ -1,0 +1,287 @@
+#include <transform/files/TemporaryFile.h>
+#include <transform/workspace/PlainFile.h>
+#include <transform/workspace/RecordReader.h>
+#include <transform/workspace/VersionStore.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/WorkspaceSplitter.h>
+#include <transform/workspace/XMLComponentReader.h>
+
+#include <QBuffer>
+#include <QFile>
+
+namespace {
+
+const QString kTemporaryName = QStringLiteral("kx-in-XXXXXX");
+constexpr int kRecognisedBytes = 100;
+
+bool isNamed(const ElementLines::Element& element, const Word& name) {
+  return XERCES_CPP_NAMESPACE::XMLString::equals(element.getTagName(), name.text);
+}
+
+const ElementLines::Element* firstChild(const ElementLines::Element& element) {
+  return element.getFirstElementChild();
+}
+
+}  // namespace
+
+IXMLComponentReader::~IXMLComponentReader() = default;
+
+std::unique_ptr<IXMLComponentReader> IXMLComponentReader::create() {
+  return std::make_unique<XMLComponentReader>();
+}
+
+XMLComponentReader::XMLComponentReader() = default;
+XMLComponentReader::~XMLComponentReader() = default;
+
+bool XMLComponentReader::IsFileXMLWorkspace(const QString& fileName) {
+  QFile file(fileName);
+  if (!file.open(QIODevice::ReadOnly | QIODevice::Unbuffered))
+    return false;
+  const QByteArray start = file.read(kRecognisedBytes);
+  for (const char* const tag : {"<WORKSPACE", "<DATASOURCE", "<ETL_TOOL", "<TRANSFORMER", "ORW"}) {
+    if (start.contains(tag))
+      return true;
+  }
+  return false;
+}
+
+QString XMLComponentReader::SplitWorkspace(const QString& fileName, QStringList& headerLines,
+                                           QHash<QString, QString>* prompts,
+                                           QHash<QString, QString>* macros) {
+  PlainFile plain(fileName, kTemporaryName);
+  TemporaryFile xml(kTemporaryName);
+  if (!xml.open())
+    throw WorkspaceLoaderException(couldNotOpenMessage(xml.fileTemplate()));
+  WorkspaceSplitter splitter;
+  splitter.split(plain.device(), xml, fileName);
+  if (!xml.flush())
+    throw WorkspaceLoaderException(couldNotOpenMessage(xml.fileName()));
+  headerLines += splitter.headerLines();
+  if (prompts)
+    WorkspaceSplitter::collectPrompts(splitter.headerLines(), *prompts);
+  if (macros)
+    WorkspaceSplitter::collectMacros(splitter.headerLines(), *macros);
+  xml.setAutoRemove(false);
+  return xml.fileName();
+}
+
+QList<VersionInfo> XMLComponentReader::getVersions(const QString& fileName, QString& error) {
+  return VersionStore(fileName).versions(error);
+}
+
+void XMLComponentReader::ReadInput(const QString& fileName) {
+  XMLComponentParser::ReadInput(fileName);
+}
+void XMLComponentReader::ReadInput(const IORXString& fileName) {
+  XMLComponentParser::ReadInput(fileName);
+}
+
+void XMLComponentReader::ReadInput(const QString& fileName, QStringList& headerLines) {
+  forgetDocument();
+  PlainFile plain(fileName, kTemporaryName);
+  WorkspaceSplitter splitter;
+  splitAndParse(splitter, plain.device(), fileName, kTemporaryName);
+  headerLines += splitter.headerLines();
+  m_firstHeaderLine = splitter.firstHeaderLine();
+}
+
+void XMLComponentReader::ReadVersionedInput(const QString& fileName, qint64 offset, qint64 length,
+                                            bool withHeader, QStringList& headerLines, QByteArray& before,
+                                            QByteArray& behind) {
+  forgetDocument();
+  VersionStore::Piece piece = VersionStore(fileName).read(offset, length);
+  QBuffer buffer(&piece.document);
+  buffer.open(QIODevice::ReadOnly);
+  WorkspaceSplitter splitter;
+  splitter.setFirstLine(piece.documentLine);
+  splitAndParse(splitter, buffer, fileName, kTemporaryName);
+  if (withHeader)
+    headerLines += splitter.headerLines();
+  m_firstHeaderLine = splitter.firstHeaderLine();
+  before = piece.before;
+  behind = piece.behind;
+}
+
+void XMLComponentReader::documentForgotten() {
+  m_documents.clear();
+  m_subDocuments.clear();
+  m_serverParameters = ServerParameterStruct();
+  m_visualizersDisabled = false;
+  m_firstHeaderLine = 0;
+}
+
+void XMLComponentReader::indexDocument(const ElementLines::Element& element, const QString& name,
+                                       std::size_t& cursor) {
+  Document document;
+  document.line = getElementLines().lineOf(&element, cursor);
+  const auto* const attributes = element.getAttributes();
+  for (XMLSize_t i = 0; i < attributes->getLength(); ++i) {
+    const auto* const attribute = attributes->item(i);
+    document.parameters.insert(fromXml(attribute->getNodeName()), fromXml(attribute->getNodeValue()));
+  }
+  for (const auto* child = firstChild(element); child; child = child->getNextElementSibling()) {
+    getElementLines().lineOf(child, cursor);
+    document.sections[fromXml(child->getTagName())].append({child, cursor});
+  }
+  m_documents.insert(name, document);
+}
+
+void XMLComponentReader::documentParsed() {
+  const auto* const root = static_cast<const ElementLines::Element*>(getRootNode());
+  if (!root)
+    return;
+  std::size_t cursor = 0;
+  indexDocument(*root, QString(), cursor);
+  const Document& main = m_documents[QString()];
+  m_visualizersDisabled =
+      main.parameters.value(words::kDisableVisualizers.toQString()) == words::kTrue.view();
+  const QVector<Section> servers = main.sections.value(words::kOrxserver.toQString());
+  if (!servers.isEmpty()) {
+    RecordReader reader(getElementLines(), servers.first().ordinal, m_prompts);
+    m_serverParameters = reader.read<tables::ServerParameter>(*servers.first().element);
+  }
+  const QVector<Section> holders = main.sections.value(words::kSubdocuments.toQString());
+  for (const Section& holder : holders) {
+    cursor = holder.ordinal;
+    for (const auto* child = firstChild(*holder.element); child; child = child->getNextElementSibling()) {
+      if (!isNamed(*child, words::kSubdocument))
+        continue;
+      const QString name = fromXml(child->getAttribute(words::kName.text));
+      m_subDocuments.append(name);
+      if (!m_documents.contains(name))
+        indexDocument(*child, name, cursor);
+    }
+  }
+}
+
+DocumentType XMLComponentReader::GetDocumentType() const {
+  const Node* const root = getRootNode();
+  if (!root || root->getNodeType() != Node::ELEMENT_NODE)
+    return kUnknownDocument;
+  const auto& element = *static_cast<const ElementLines::Element*>(root);
+  for (const auto& [name, type] : {std::make_pair(words::kWorkspace, kWorkspaceDocument),
+                                   std::make_pair(words::kDatasource, kDataSourceDocument),
+                                   std::make_pair(words::kEtlTool, kToolDocument),
+                                   std::make_pair(words::kTransformer, kTransformerDocument)}) {
+    if (isNamed(element, name))
+      return type;
+  }
+  return kUnknownDocument;
+}
+
+QString XMLComponentReader::GetMiscParm(const QString& name, const QString& defaultValue) const {
+  return m_documents.value(QString()).parameters.value(name, defaultValue);
+}
+
+bool XMLComponentReader::HasMiscParm(const QString& name) const {
+  return m_documents.value(QString()).parameters.contains(name);
+}
+
+QStringList XMLComponentReader::GetSubDocList() const {
+  return m_subDocuments;
+}
+
+QHash<QString, QString> XMLComponentReader::GetSubDocParms(const QString& document) const {
+  return m_documents.value(document).parameters;
+}
+
+ServerParameterStruct XMLComponentReader::GetServerParameters() const {
+  return m_serverParameters;
+}
+
+template <class Table>
+ORXTValSlist<typename Table::Record> XMLComponentReader::readSection(const QString& document,
+                                                                     const Word& section) const {
+  ORXTValSlist<typename Table::Record> records;
+  const auto found = m_documents.constFind(document);
+  if (found == m_documents.constEnd())
+    return records;
+  const QVector<Section> parts = found->sections.value(section.toQString());
+  for (const Section& part : parts) {
+    RecordReader reader(getElementLines(), part.ordinal, m_prompts);
+    for (const auto* child = firstChild(*part.element); child; child = child->getNextElementSibling()) {
+      if (isNamed(*child, Table::element))
+        records.append(reader.read<Table>(*child));
+    }
+  }
+  return records;
+}
+
+ORXTValSlist<DatasetStruct> XMLComponentReader::GetDatasetList() const {
+  return readSection<tables::Dataset>(QString(), words::kDatasets);
+}
+
+ORXTValSlist<DataTypeStruct> XMLComponentReader::GetDataTypeList() const {
+  return readSection<tables::DataType>(QString(), words::kDataTypes);
+}
+
+ORXTValSlist<GeomTypeStruct> XMLComponentReader::GetGeomTypeList() const {
+  return readSection<tables::GeomType>(QString(), words::kGeomTypes);
+}
+
+ORXTValSlist<FeatureTypeStruct> XMLComponentReader::GetFeatureTypeList() const {
+  return readSection<tables::FeatureType>(QString(), words::kFeatureTypes);
+}
+
+ORXTValSlist<GlobalParameterStruct> XMLComponentReader::GetGlobalParameterList(
+    const QString& document) const {
+  return readSection<tables::GlobalParameter>(document, words::kGlobalParameters);
+}
+
+ORXTValSlist<TransformerStruct> XMLComponentReader::GetTransformerList(const QString& document) const {
+  return readSection<tables::Transformer>(document, words::kTransformers);
+}
+
+ORXTValSlist<LinkStruct> XMLComponentReader::GetFeatureTypeLinkList(const QString& document) const {
+  return readSection<tables::FeatLink>(document, words::kFeatLinks);
+}
+
+ORXTValSlist<LinkStruct> XMLComponentReader::GetAttributeLinkList(const QString& document) const {
+  return readSection<tables::AttrLink>(document, words::kAttrLinks);
+}
+
+ORXTValSlist<BookmarkStruct> XMLComponentReader::GetBookmarkList(const QString& document) const {
+  return readSection<tables::Bookmark>(document, words::kBookmarks);
+}
+
+ORXTValSlist<BreakpointStruct> XMLComponentReader::GetBreakpointList(const QString& document) const {
+  return readSection<tables::Breakpoint>(document, words::kBreakpoints);
+}
+
+ORXTValSlist<CommentStruct> XMLComponentReader::GetCommentList(const QString& document) const {
+  return readSection<tables::Comment>(document, words::kComments);
+}
+
+ORXTValSlist<ConstantStruct> XMLComponentReader::GetConstantList(const QString& document,
+                                                                 bool parameterConstants) const {
+  return parameterConstants ? readSection<tables::ParameterConstant>(document, words::kConstants)
+                            : readSection<tables::Constant>(document, words::kConstants);
+}
+
+ORXTValSlist<SubDocumentIOStruct> XMLComponentReader::GetSubDocumentIOList(const QString& document) const {
+  return readSection<tables::SubDocumentIO>(document, words::kSubdocumentIos);
+}
+
+OrderedObjectList XMLComponentReader::GetOrderedSubDocumentIOs(const QString& document) const {
+  OrderedObjectList ports;
+  for (const SubDocumentIOStruct& port : GetSubDocumentIOList(document))
+    ports.push_back({port.identifier, port});
+  std::stable_sort(
+      ports.begin(), ports.end(),
+      [](const OrderedObjectStruct& left, const OrderedObjectStruct& right) { return left.key < right.key; });
+  return ports;
+}
+
+bool XMLComponentReader::AreVisualizersDisabled() const {
+  return m_visualizersDisabled;
+}
+int XMLComponentReader::GetFirstHeaderLineNumber() const {
+  return m_firstHeaderLine;
+}
+int XMLComponentReader::GetDocumentLine(const QString& document) const {
+  return m_documents.value(document).line;
+}
+
+void XMLComponentReader::SetPromptDefinitionSource(PromptDefinitionSource source) {
+  m_prompts = std::move(source);
+}
