@@ -32,14 +32,22 @@ function(_orx_sources out)
   set(${out} ${sources} PARENT_SCOPE)
 endfunction()
 
+# What all shared libraries have in common: a versioned name, the name users link by, only marked symbols visible.
+function(_orx_shared_library target export_name)
+  set_target_properties(${target} PROPERTIES
+    VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR} EXPORT_NAME ${export_name}
+    LINK_DEPENDS ${PROJECT_SOURCE_DIR}/cmake/exports.map)
+  target_compile_features(${target} PUBLIC cxx_std_17)
+  target_link_options(${target} PRIVATE LINKER:--version-script=${PROJECT_SOURCE_DIR}/cmake/exports.map)
+endfunction()
+
 # A stand-in for an in-house library: shared, so that the real one can take its place at link time.
 function(orx_platform_library name)
   _orx_sources(sources)
   _orx_skip_empty(${name} ${ARGN})
   add_library(${name} SHARED ${sources})
-  set_target_properties(${name} PROPERTIES VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}
-                                           EXPORT_NAME ${name})
   _orx_setup(${name})
+  _orx_shared_library(${name} ${name})
   target_link_libraries(${name} PUBLIC Qt5::Core ${ARGN})
 endfunction()
 
