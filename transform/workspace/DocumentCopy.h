@@ -1,0 +1,9 @@
+// Hands every record of a read document to a writer.
+#pragma once
+
+#include <transform/workspace/IXMLComponentReader.h>
+#include <transform/workspace/XMLComponentWriter.h>
+
+// Sub-documents keep their order. What a document holds beyond the writer's vocabulary is not copied:
+// WorkspaceLossReport tells.
+ORX_EXPORT void copyDocument(const IXMLComponentReader& reader, XMLComponentWriter& writer);
