@@ -4,6 +4,8 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/core/AttributeRules.h>
+#include <transform/core/RenameMapping.h>
 #include <transform/core/TransformerDefinition.h>
 
 #include <QHash>
@@ -31,6 +33,11 @@ class ORX_EXPORT ConfiguredDefinition {
   TagList dynamicInputTags;
   TagList outputTags;
   QStringList categoryTags;
+  AttributeRules attributeRules;
+  QHash<QString, QString> inputTagAliases;  // of all kinds of input tags
+  RenameMapping renamedParameters;
+  RenameMapping renamedInputTags;
+  RenameMapping renamedOutputTags;
   QString localizedName;
   bool dependencyMet = true;
   QString dependencyMessage;

@@ -66,6 +66,16 @@ bool ParameterSet::remove(const QString& name) {
   return true;
 }
 
+void ParameterSet::remove(const QSet<QString>& names) {
+  const auto end =
+      std::remove_if(m_records.begin(), m_records.end(),
+                     [&names](const TransformParamCfg& record) { return names.contains(record.getName()); });
+  if (end != m_records.end()) {
+    m_records.erase(end, m_records.end());
+    reindex();
+  }
+}
+
 void ParameterSet::clear() {
   m_records.clear();
   m_index = ParameterSet().m_index;

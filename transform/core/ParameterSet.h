@@ -8,6 +8,7 @@
 #include <platform/Export.h>
 #include <transform/core/TransformParamCfg.h>
 
+#include <QSet>
 #include <QString>
 #include <QStringList>
 
@@ -31,6 +32,7 @@ class ORX_EXPORT ParameterSet {
   void append(const TransformParamCfg& record);
   // False when there is no such parameter.
   bool remove(const QString& name);
+  void remove(const QSet<QString>& names);
   void clear();
 
  private:

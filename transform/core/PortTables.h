@@ -10,8 +10,7 @@
 struct ORX_EXPORT PortTables {
   QHash<QString, QStringList> inputFeatureTypes;
   QHash<QString, QStringList> inputFilters;
-  QHash<QString, QStringList> inputAttributes;
-  QStringList inputAttributeUnion;  // by input tag order, each name once
+  QHash<QString, QStringList> inputAttributes;  // changed by TransformerCfg::setInputAttributes() alone
   QHash<QString, QString> outputFeatureTypes;
   QHash<QString, QStringList> outputFunctions;
 };

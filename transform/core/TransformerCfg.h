@@ -26,6 +26,9 @@
 #include <memory>
 #include <vector>
 
+class AttributePassage;
+class AttributeReferences;
+class AttributeUnion;
 class ConfiguredDefinition;
 class DefinitionDirectory;
 class IORXSession;
@@ -34,12 +37,13 @@ class QTextStream;
 class TransformerCfgListener;
 class TransformerSource;
 class WorkspaceParameterDirectory;
+struct PreservedAttributes;
 struct TransformerDefinition;
 
 // What addAttributesToList() adds: attributes that a parameter's value names.
 struct AddAttributesInfo {
   QString parameter;       // the parameter whose value lists the attributes; may be empty
-  QStringList attributes;  // attributes named outright
+  QStringList attributes;  // attributes named outright, behind those of the parameter
   QString listName;        // when not empty, the attributes become members of this list ("LIST{}.NAME")
 };
 
@@ -91,9 +95,11 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
 
   // A new object of the same class with the same definition and values; owned by the caller.
   virtual TransformerCfg* getCopy() const;
-  // Takes over the definition side and the values of `other`.
+  // Takes over the definition side and the values of `other`. Not taken over: the identity stem, which every
+  // instance has for itself, and the listener, which watches one object.
   virtual void assign(const TransformerCfg* other);
-  // Takes over values and instance data alone; parameters that this object does not have are left out.
+  // Takes over values and what is connected to the ports alone; parameters that this object does not have are
+  // left out.
   virtual void copyValues(const TransformerCfg* other);
   virtual int getVersion() const;
   virtual QString getFileName() const;
@@ -125,6 +131,8 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   virtual QStringList getChangeLog() const;
   // The tooltip with its parameters filled in; `asHtml` escapes values for HTML.
   virtual void getTooltipLines(QStringList& lines, bool asHtml) const;
+  // What a class has to say in its tooltip: texts for tokens "$(NAME)" of the tooltip that are no parameters,
+  // lines to stand behind it and a title above it. All plain text; nothing by default.
   virtual void tooltipCustomizations(QHash<QString, QString>& tokens, QStringList& lines,
                                      QString& title) const;
   virtual QString getLocalizedName() const;
@@ -183,9 +191,14 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   virtual QString serialize() const;
   virtual void deserialize(QHash<QString, QString>& fields);
   virtual bool containsPython() const;
+  // Puts these tokens in the place of what the definition says is preserved, for this object alone.
   virtual void updatePreservesAttributes(const QStringList& preserves);
+
+ protected:
   virtual bool validateTableValues(const QString& parameter, const std::vector<TransformParamCfg>& columns,
                                    const QStringList& cells, QString& message) const;
+
+ public:
   // What becomes of one incoming attribute on the way to an output; appends nothing when it does not pass.
   virtual void transformAttr(const QString& attribute, QStringList& result, const QString& inputTag,
                              const QString& outputTag) const;
@@ -291,7 +304,10 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   void setOutputTagFuncs(const QString& tag, const QStringList& functions);
   QStringList getOutputTagFuncs(const QString& tag) const;
   QHash<QString, QStringList> getInputAttributes() const;
+  // By the order of the inputs, each name once.
   QStringList getInputAttributeUnion() const;
+  // The attribute names that the parameter's value lists, decoded; none that is only known at run time.
+  QStringList attributesListedBy(const QString& parameter) const;
 
   // --- parameters ------------------------------------------------------------------------------------------
 
@@ -316,12 +332,17 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   // Whether a person may edit the parameter: it has a prompt and its type is no mere label.
   bool canEditParm(const QString& name) const;
   bool isValueEncoded(const QString& name) const;
+  // A stored value as people read it: decoded, choices by their shown side, members and rows separated,
+  // passwords hidden, an unset value empty; `withPrompt` puts the prompt and ": " before it.
   QString formatParamDisplayString(const QString& name, const QString& value, bool withPrompt) const;
   // The cells of a table-valued parameter, row by row.
   QStringList getParameterTableValuesAsParts(const QString& name, UnpackLevel level) const;
   // Adds a parameter behind the others, or replaces the type of one that is there (its value stays).
   void addParameter(const TransformParamCfg& parameter);
   bool removeParameter(const QString& name);
+  // Parameters whose value lists the names of groups. Of each value V of such a parameter P, "," separating
+  // the word-encoded names, a group parameter DYNGROUP_P_n is kept, n from 1: its value is V, decoded, and it
+  // frames the parameters whose names begin with V, encoded, and "_".
   const QStringList& getDynparamsParameters() const { return m_dynamicParameterNames; }
   void setDynparamsParameters(const QStringList& names);
 
@@ -376,20 +397,42 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   PortTables& ports() { return m_ports; }
   const PortTables& ports() const { return m_ports; }
   // The definition for writing: detached from other objects first.
+  // The reference is good until the object is copied or configured.
   ConfiguredDefinition& detachDefinition();
   void setName(const QString& name);
   void setVersion(int version);
 
  private:
-  void checkDependencies(QTextStream* log);
+  // The type of the values of the name: for a member of a multi-parameter the member's own.
+  const GUIType& typeOfValue(const QString& name) const;
+  QString displayString(const QString& name, const QString& value, bool withPrompt, bool isDecoded) const;
+  QString tooltipValue(const QString& parameter) const;
+  bool validateFile(const TransformParamCfg& record, const QString& parameter, QString& message) const;
+  void addDefinedParameters(const TransformerDefinition& fields, QTextStream* log);
+  void parseTagAliases(ConfiguredDefinition& definition);
+  void initListActionDictionary(ConfiguredDefinition& definition, QTextStream* log);
+  void setupPreservesAttributes(ConfiguredDefinition& definition, QTextStream* log);
+  void checkDependencies(ConfiguredDefinition& definition, QTextStream* log);
+  QStringList allInputTags() const;
+  QStringList attributeTags() const;
+  const AttributeUnion& attributeUnion() const;
+  const PreservedAttributes& preservedAttributes() const;
+  void collectReferences(const QString& parameter, AttributeReferences& references) const;
+  // The definition, or an empty one before configure().
+  const ConfiguredDefinition& configured() const;
   void ensureBaseGuid();
 
-  std::shared_ptr<const ConfiguredDefinition> m_definition;
+  std::shared_ptr<const ConfiguredDefinition> m_definition;  // null before configure()
+  std::shared_ptr<const PreservedAttributes> m_preserved;    // null: what the definition says
   QString m_baseGuid;
   QString m_savedName;
   QString m_requestedAlias;
   ParameterSet m_parameters;
   PortTables m_ports;
+  mutable std::shared_ptr<const AttributeUnion> m_attributeUnion;  // null until asked for
+  mutable const AttributePassage* m_passage = nullptr;             // while attributes are on their way
+  mutable bool m_tooltipAsHtml = false;                            // while a tooltip is filled in
+  bool m_tellListener = true;                                      // clear while values are restored
   QString m_bannerImageName;
   bool m_showInNavigator = true;
   QStringList m_dynamicParameterNames;
@@ -400,9 +443,7 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   IORXSession* m_session = nullptr;
   int m_insertState = 2;  // carried for callers that read it; nothing here depends on it
   bool m_strictParameterValidation = true;
-  int m_editDepth = 0;
   int m_instantiationCounter = 0;
-  bool m_multiProcessingOff = false;
   bool m_autoUpgraded = false;
   int m_lastParmEditBuild = kThisBuild;
   TransformerType m_transformerType = kOrdinary;

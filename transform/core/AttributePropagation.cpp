@@ -1,0 +1,226 @@
+// The part of TransformerCfg that answers for attributes: what reaches the inputs, what leaves the outputs.
+#include <transform/core/AttributePassage.h>
+#include <transform/core/AttributeReferences.h>
+#include <transform/core/ConfiguredDefinition.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/TransformerCfg.h>
+
+#include <QScopedValueRollback>
+#include <QSet>
+
+#include <algorithm>
+
+namespace {
+
+QStringList eachOnce(const QStringList& names) {
+  QStringList result = names;
+  result.removeDuplicates();
+  return result;
+}
+
+}  // namespace
+
+void TransformerCfg::setInputAttributes(const QString& tag, const QStringList& attributes) {
+  m_ports.inputAttributes.insert(tag, eachOnce(attributes));
+  m_attributeUnion.reset();
+}
+
+void TransformerCfg::setInputAttributes(const QHash<QString, QStringList>& attributes) {
+  m_ports.inputAttributes = attributes;
+  m_attributeUnion.reset();
+}
+
+QHash<QString, QStringList> TransformerCfg::getInputAttributes() const {
+  return m_ports.inputAttributes;
+}
+
+QStringList TransformerCfg::getInputAttributeUnion() const {
+  return attributeUnion().names();
+}
+
+// The tags on which attributes arrive, in the order of the ports; tags that are no ports come last, by name.
+QStringList TransformerCfg::attributeTags() const {
+  QStringList tags = allInputTags();
+  QSet<QString> known(tags.begin(), tags.end());
+  QStringList others;
+  for (auto at = m_ports.inputAttributes.keyBegin(); at != m_ports.inputAttributes.keyEnd(); ++at) {
+    if (!known.contains(*at)) {
+      others.append(*at);
+    }
+  }
+  others.sort();
+  return tags + others;
+}
+
+const AttributeUnion& TransformerCfg::attributeUnion() const {
+  if (!m_attributeUnion) {
+    auto all = std::make_shared<AttributeUnion>();
+    const QStringList tags = attributeTags();
+    for (const QString& tag : tags) {
+      all->add(m_ports.inputAttributes.value(tag));
+    }
+    m_attributeUnion = std::move(all);
+  }
+  return *m_attributeUnion;
+}
+
+const PreservedAttributes& TransformerCfg::preservedAttributes() const {
+  return m_preserved ? *m_preserved : configured().attributeRules.preserved;
+}
+
+void TransformerCfg::updatePreservesAttributes(const QStringList& preserves) {
+  m_preserved = std::make_shared<PreservedAttributes>(PreservedAttributes::parse(preserves));
+}
+
+QStringList TransformerCfg::getOutputAttributes(const QString& tag) const {
+  QStringList result;
+  const QStringList inputTags = attributeTags();
+  for (const QString& inputTag : inputTags) {
+    QStringList incoming = m_ports.inputAttributes.value(inputTag);
+    transformAllAttrs(incoming, result, inputTag, tag);
+  }
+  addAdditionalAttrs(result, tag);
+  result.removeDuplicates();
+  return result;
+}
+
+void TransformerCfg::transformAllAttrs(QStringList& incoming, QStringList& result, const QString& inputTag,
+                                       const QString& outputTag) const {
+  const AttributePassage passage(*this, preservedAttributes(), configured().attributeRules, inputTag,
+                                 outputTag);
+  const QScopedValueRollback<const AttributePassage*> scope(m_passage, &passage);
+  for (const QString& attribute : std::as_const(incoming)) {
+    transformAttr(attribute, result, inputTag, outputTag);
+  }
+}
+
+void TransformerCfg::transformAttr(const QString& attribute, QStringList& result, const QString& inputTag,
+                                   const QString& outputTag) const {
+  if (m_passage && m_passage->isBetween(inputTag, outputTag)) {
+    m_passage->pass(attribute, result);
+  } else {
+    AttributePassage(*this, preservedAttributes(), configured().attributeRules, inputTag, outputTag)
+        .pass(attribute, result);
+  }
+}
+
+void TransformerCfg::addAdditionalAttrs(QStringList& result, const QString& outputTag) const {
+  for (const AddedAttribute& attribute : configured().attributeRules.added) {
+    if (!attribute.outputTag.isEmpty() && attribute.outputTag != outputTag) {
+      continue;
+    }
+    const QString parameter = attribute.name.onlyParameter();
+    const QStringList lists =
+        attribute.list.isEmpty() ? QStringList(QString()) : expandParameterText(*this, attribute.list);
+    for (const QString& list : lists) {
+      if (!parameter.isEmpty()) {
+        addAdditionalAttrsFromParameter(parameter, list, outputTag, result);
+      } else {
+        addAttributesToList({QString(), expandParameterText(*this, attribute.name), list}, result);
+      }
+    }
+  }
+}
+
+void TransformerCfg::addAdditionalAttrsFromParameter(const QString& parameter, const QString& listName,
+                                                     const QString&, QStringList& result) const {
+  addAttributesToList({parameter, QStringList(), listName}, result);
+}
+
+void TransformerCfg::addAttributesToList(const AddAttributesInfo& info, QStringList& result) const {
+  const QString list = info.listName.isEmpty() || info.listName.endsWith(kListMark)
+                           ? info.listName
+                           : info.listName + kListMark;
+  const QString prefix = list.isEmpty() ? QString() : list + QLatin1Char('.');
+  const QStringList listed = info.parameter.isEmpty() ? QStringList() : attributesListedBy(info.parameter);
+  for (const QString& name : listed + info.attributes) {
+    result.append(prefix + name);
+  }
+}
+
+QStringList TransformerCfg::attributesListedBy(const QString& parameter) const {
+  return listedAttributeNames(typeOfValue(parameter), getParameterValue(parameter, UnpackLevel::Resolved));
+}
+
+bool TransformerCfg::parmValueAffectsOutputAttrs(const QString& parameter) const {
+  const QSet<QString>& parameters = configured().attributeRules.parameters;
+  if (parameters.contains(parameter)) {
+    return true;
+  }
+  // A multi-parameter takes part through its members, a member through its multi-parameter.
+  const TransformParamCfg* record = getParameterByMacroName(parameter);
+  if (!record || !record->isMultiParameter()) {
+    return false;
+  }
+  if (record->getName() != parameter) {
+    return parameters.contains(record->getName());
+  }
+  const QStringList& names = record->getMacroNames();
+  return std::any_of(names.begin(), names.end(),
+                     [&parameters](const QString& name) { return parameters.contains(name); });
+}
+
+QStringList TransformerCfg::getAttributeNamesInValue(const QString& parameter) const {
+  AttributeReferences references;
+  collectReferences(parameter, references);
+  return references.names();
+}
+
+void TransformerCfg::collectReferences(const QString& parameter, AttributeReferences& references) const {
+  const TransformParamCfg* record = getParameterByMacroName(parameter);
+  if (!record) {
+    return;
+  }
+  const QString value = getParameterValue(parameter, UnpackLevel::Resolved);
+  if (value == kUnusedGroupBy && parameter == configured().fields.multiProcess) {
+    return;
+  }
+  if (record->getName() == parameter) {
+    references.addParameter(*record, value);
+  } else {
+    references.addValue(typeOfValue(parameter), value);
+  }
+}
+
+void TransformerCfg::getMissingAttributeReferences(const QString& parameter, QStringList& missing,
+                                                   bool& hasReferences) const {
+  missing.clear();
+  const QStringList names = getAttributeNamesInValue(parameter);
+  hasReferences = !names.isEmpty();
+  if (!hasReferences) {
+    return;
+  }
+  AttributeReferences references;
+  collectReferences(parameter, references);
+  const AttributeUnion& reaching = attributeUnion();
+  for (const QString& name : names) {
+    if (!reaching.contains(name) && !references.mayBeNew(name)) {
+      missing.append(name);
+    }
+  }
+}
+
+void TransformerCfg::getAttributesByType(const QString& type, QStringList& attributes,
+                                         bool onlyInputs) const {
+  attributes.clear();
+  const auto add = [&](const GUIType& valueType, const QString& value) {
+    if (valueType.getType().startsWith(type)) {
+      const QStringList references = valueReferences(value);
+      attributes += references.isEmpty() ? listedAttributeNames(valueType, value) : references;
+    }
+  };
+  for (const TransformParamCfg& record : m_parameters.records()) {
+    const QString value = getParameterValue(record.getName(), UnpackLevel::Resolved);
+    if (value == kUnusedGroupBy && record.getName() == configured().fields.multiProcess) {
+      continue;
+    }
+    forEachPart(record, value, add);
+  }
+  attributes.removeDuplicates();
+  if (onlyInputs) {
+    const AttributeUnion& reaching = attributeUnion();
+    attributes.erase(std::remove_if(attributes.begin(), attributes.end(),
+                                    [&](const QString& name) { return !reaching.contains(name); }),
+                     attributes.end());
+  }
+}

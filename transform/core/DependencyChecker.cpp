@@ -1,0 +1,16 @@
+#include <transform/core/DependencyChecker.h>
+#include <transform/core/SafeTclInterpreter.h>
+
+DependencyChecker::Verdict DependencyChecker::check(const QStringList& scripts) {
+  for (const QString& script : scripts) {
+    SafeTclInterpreter interpreter;
+    QString result;
+    if (!interpreter.evaluate(script, result)) {
+      return {false, QString::asprintf("Tcl error: %s\n", result.toUtf8().constData())};
+    }
+    if (!result.isEmpty()) {
+      return {false, result};
+    }
+  }
+  return {};
+}

@@ -1,0 +1,30 @@
+// A Tcl interpreter for scripts from strangers: no way to the system but a few questions, and bounds on
+// commands, time, memory and whatever a single command could blow up.
+#pragma once
+
+#include <QString>
+
+#include <cstddef>
+
+struct Tcl_Interp;
+
+class SafeTclInterpreter {
+ public:
+  SafeTclInterpreter();
+  ~SafeTclInterpreter();
+  SafeTclInterpreter(const SafeTclInterpreter&) = delete;
+  SafeTclInterpreter& operator=(const SafeTclInterpreter&) = delete;
+
+  // Runs the script once. False when it failed or was stopped; `result` is then the error.
+  bool evaluate(const QString& script, QString& result);
+
+  // Called before each command; null when it may run, otherwise why not.
+  const char* refusal(int wordCount, void* const* words) const;
+
+ private:
+  void removeUnlistedCommands();
+  void addCommands();
+
+  Tcl_Interp* m_interp;
+  std::size_t m_memoryAtStart = 0;
+};

@@ -1,0 +1,46 @@
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/StoredValue.h>
+#include <transform/core/TransformParamCfg.h>
+
+namespace {
+
+const QLatin1Char kAttributeMark('&');
+const QLatin1String kExpressionType("EXPRESSION");
+
+}  // namespace
+
+bool isMemberOf(const TransformParamCfg& record, const QString& name) {
+  return record.isMultiParameter() && record.getName() != name;
+}
+
+QString storedValue(const TransformParamCfg& record, const QString& name) {
+  return isMemberOf(record, name) ? record.members().memberValue(record.getValue(), name) : record.getValue();
+}
+
+void storeValue(TransformParamCfg& record, const QString& name, const QString& value) {
+  if (!isMemberOf(record, name)) {
+    record.setValue(value);
+    return;
+  }
+  const GUIType* member = record.members().find(name);
+  const bool isBareName =
+      member && member->getType().startsWith(kAttributeType) && value.startsWith(kAttributeMark);
+  const QString part = isBareName ? value.mid(1) : value;
+  record.setValue(
+      record.members().withMemberValue(record.isUnset() ? QString() : record.getValue(), name, part));
+}
+
+QString withAttributeReference(const GUIType& type, const QString& value) {
+  const QString& word = type.getType();
+  if (!value.startsWith(kAttributeMark) ||
+      !(word.endsWith(kOrAttributeEncodedSuffix) ||
+        (word.startsWith(kTextEditType) && word.endsWith(kOrAttributeSuffix)))) {
+    return value;
+  }
+  return kValueReferenceEncoded + value.mid(1) + kEncodedRightParenthesis;
+}
+
+bool takesAttributeReference(const GUIType& type) {
+  return type.mayHoldAttributeReference() || type.getType().startsWith(kExpressionType);
+}

@@ -1,0 +1,240 @@
+// The part of TransformerCfg that judges parameter values.
+#include <platform/qorxcore/Lists.h>
+#include <platform/qorxcore/Local8Bit.h>
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/ConfiguredDefinition.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerCfgListener.h>
+#include <transform/core/TransformerSource.h>
+#include <transform/text/MessageStrings.h>
+
+#include <QUrlQuery>
+
+#include <sys/stat.h>
+
+namespace {
+
+constexpr long kMissingAttributesMessage = 370607;
+constexpr long kMissingValueMessage = 370608;
+constexpr long kNoFileMessage = 370612;
+constexpr long kNoConnectionMessage = 370636;
+constexpr int kLongestMissingText = 100;
+
+const QLatin1String kConnectionScheme("orx://");
+const QLatin1String kConnectionSchemeEncoded("orx:<solidus><solidus>");
+const QLatin1String kConnectionItem("connection");
+const QLatin1String kFilenameMustExist("FILENAME_MUSTEXIST");
+const QLatin1String kFileMustExist("FILEMUSTEXIST");
+const QLatin1String kNamedConnection("NAMED_CONNECTION");
+const QLatin1String kNamedDatabaseConnection("NAMED_DB_CONNECTION");
+
+QString quotedNames(const QStringList& names) {
+  const QLatin1Char quote('\'');
+  QString text;
+  for (const QString& name : names) {
+    if (!text.isEmpty()) {
+      text += QLatin1Char(' ');
+    }
+    text += quote + name + quote;
+    if (text.size() > kLongestMissingText) {
+      return text.left(kLongestMissingText);
+    }
+  }
+  return text;
+}
+
+// The connection that a reference orx://...?connection=NAME names.
+QString connectionName(const QString& reference) {
+  QString url = reference;
+  if (url.startsWith(kConnectionSchemeEncoded)) {
+    url = QORXWwjdDecode(url);
+  }
+  const int mark = url.indexOf(QLatin1Char('?'));
+  const int end = url.indexOf(QLatin1Char('#'));
+  const int start = mark < 0 ? kConnectionScheme.size() : mark + 1;
+  const QUrlQuery query(url.mid(start, end < 0 ? -1 : std::max(0, end - start)));
+  return query.queryItemValue(kConnectionItem, QUrl::FullyDecoded);
+}
+
+bool isPlainFile(const QString& path) {
+  if (path.contains(QChar(QChar::Null))) {
+    return false;
+  }
+  struct stat status;
+  return ::stat(QORXToLocal8Bit(path).constData(), &status) == 0 && !S_ISDIR(status.st_mode);
+}
+
+std::vector<TransformParamCfg> columnRecords(const MemberList& columns) {
+  std::vector<TransformParamCfg> records;
+  records.reserve(columns.members().size());
+  for (const GUIType& column : columns.members()) {
+    records.emplace_back(column);
+  }
+  return records;
+}
+
+}  // namespace
+
+bool TransformerCfg::validateParameter(const QString& parameter, QString& message) const {
+  const TransformParamCfg* record = getParameterByMacroName(parameter);
+  if (!record) {
+    return false;
+  }
+  const QString value = getParameterValue(parameter, UnpackLevel::Stored);
+  const QString& prompt = record->getDescription();
+  if (prompt.isEmpty()) {
+    return true;
+  }
+  if (value.isEmpty()) {
+    if (record->getFlag(kGUITypeOptional)) {
+      return true;
+    }
+    message = TransformResString(kMissingValueMessage, prompt);
+    return false;
+  }
+  if (value == kUnusedValue) {
+    return true;
+  }
+  const QString type = record->getTypeWithConfig();
+  if (type.startsWith(kAttributeType) && type.contains(kAllowNew)) {
+    return true;
+  }
+  if (type.startsWith(kMultiParameterType)) {
+    QString missingPrompt;
+    if (!checkMultiParameterForMissingValues(value, type, missingPrompt)) {
+      message = TransformResString(kMissingValueMessage, missingPrompt);
+      return false;
+    }
+  }
+  QStringList missing;
+  bool hasReferences = false;
+  getMissingAttributeReferences(parameter, missing, hasReferences);
+  if (!missing.isEmpty()) {
+    message = TransformResString(kMissingAttributesMessage, quotedNames(missing));
+    return false;
+  }
+  const bool isTable = type.startsWith(kTableType);
+  if (hasReferences && !isTable) {
+    return true;
+  }
+  if (m_listener && m_listener->acceptsValue(*this, parameter, value)) {
+    return true;
+  }
+  // Without a directory nobody knows which connections there are.
+  if (m_definitionDirectory &&
+      (value.startsWith(kConnectionScheme) || value.startsWith(kConnectionSchemeEncoded))) {
+    const QString name = connectionName(value);
+    if (!m_definitionDirectory->isConnectionKnown(QORXWwjdEncode(name))) {
+      message = TransformResString(kNoConnectionMessage, name);
+      return false;
+    }
+  }
+  const bool isConditional = value.startsWith(kConditionalPrefix);
+  if (type.startsWith(kFilenameMustExist) || (type.startsWith(kFileMustExist) && !isConditional)) {
+    return validateFile(*record, parameter, message);
+  }
+  if (type == kTextEncodedType) {
+    return QORXWwjdIsWellFormed(value);
+  }
+  if (m_listener && m_definitionDirectory && !isConditional &&
+      (type.startsWith(kNamedConnection) || type.startsWith(kNamedDatabaseConnection))) {
+    const QString resolved = getParameterValue(parameter, UnpackLevel::Resolved);
+    const QString encoded = record->valueIsEncoded() ? resolved : QORXWwjdEncode(resolved);
+    if (m_definitionDirectory->isConnectionKnown(encoded)) {
+      return true;
+    }
+    message = TransformResString(kNoConnectionMessage, QORXWwjdDecode(encoded));
+    return false;
+  }
+  return !isTable ||
+         validateTableValues(parameter, columnRecords(record->members()),
+                             getParameterTableValuesAsParts(parameter, UnpackLevel::Stored), message);
+}
+
+bool TransformerCfg::validateFile(const TransformParamCfg& record, const QString& parameter,
+                                  QString& message) const {
+  QString path = getParameterValue(parameter, UnpackLevel::Resolved);
+  if (record.valueIsEncoded()) {
+    path = QORXWwjdDecode(path);
+  }
+  path = resolveUserTypedMacro(path, UnpackLevel::Resolved);
+  if (isPlainFile(path)) {
+    return true;
+  }
+  message = TransformResString(kNoFileMessage, path);
+  return false;
+}
+
+bool TransformerCfg::validateParameters(QString& message) const {
+  const QStringList names = getParameters();
+  for (const QString& name : names) {
+    if (!validateParameter(name, message)) {
+      return false;
+    }
+  }
+  return true;
+}
+
+bool TransformerCfg::validateParameters(QStringList& names, QHash<QString, QString>& messages) const {
+  bool isValid = true;
+  for (const QString& name : std::as_const(names)) {
+    QString message;
+    if (!validateParameter(name, message)) {
+      messages.insert(name, message);
+      isValid = false;
+    }
+  }
+  return isValid;
+}
+
+bool TransformerCfg::checkMultiParameterForMissingValues(const QString& value, const QString& type,
+                                                         QString& missingPrompt) const {
+  if (value.isEmpty()) {
+    return true;
+  }
+  const GUIType parsed = GUIType::fromTransformerTypeString(type);
+  const MemberList own(parsed);
+  const QStringList parts = QORXSdfStringToList(value, own.separator());
+  if (parts.isEmpty()) {
+    return true;
+  }
+  std::vector<GUIType> definitions;
+  if (m_definitionDirectory) {
+    definitions = m_definitionDirectory->memberDefinitions(parsed);
+  }
+  if (definitions.empty()) {
+    definitions = own.members();
+  }
+  QHash<QString, const GUIType*> byName;
+  for (auto member = definitions.rbegin(); member != definitions.rend(); ++member) {
+    byName.insert(member->getName(), &*member);
+  }
+  for (int i = 0; i < parts.size() - 1; i += 2) {
+    const GUIType* member = byName.value(parts[i]);
+    if (!member || parts[i] == kControllerQueryFile) {
+      continue;
+    }
+    missingPrompt = member->getDescription();
+    if (!member->getFlag(kGUITypeOptional) && parts[i + 1].isEmpty()) {
+      return false;
+    }
+  }
+  return true;
+}
+
+bool TransformerCfg::validateTableValues(const QString& parameter,
+                                         const std::vector<TransformParamCfg>& columns,
+                                         const QStringList& cells, QString& message) const {
+  if (columns.empty()) {
+    return true;
+  }
+  for (int i = 0; i < cells.size(); ++i) {
+    const TransformParamCfg& column = columns[static_cast<std::size_t>(i) % columns.size()];
+    if (cells[i].isEmpty() && !column.getFlag(kGUITypeOptional)) {
+      message = TransformResString(kMissingValueMessage, getParameterPrompt(parameter));
+      return false;
+    }
+  }
+  return true;
+}
