@@ -14,6 +14,8 @@ class PlainFile {
   PlainFile(const QString& fileName, const QString& copyTemplate);
 
   QIODevice& device() { return m_file; }
+  // Of the file that is really read.
+  QString fileName() const { return m_file.fileName(); }
 
  private:
   std::unique_ptr<TemporaryFile> m_copy;

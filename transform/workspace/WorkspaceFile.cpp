@@ -1,0 +1,273 @@
+#include <platform/vtl/SystemEncoding.h>
+#include <transform/files/AtomicFile.h>
+#include <transform/workspace/CommentLineDevice.h>
+#include <transform/workspace/DecodedInputSource.h>
+#include <transform/workspace/FileLines.h>
+#include <transform/workspace/PlainFile.h>
+#include <transform/workspace/VersionStore.h>
+#include <transform/workspace/WorkspaceFile.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/WorkspaceSplitter.h>
+#include <transform/workspace/XMLComponentReader.h>
+
+#include <QBuffer>
+#include <QTextCodec>
+
+namespace {
+
+constexpr int kFirstBytes = 4096;
+const QString kCopyName = QStringLiteral("kx-in-XXXXXX");
+
+// The first bytes as 8-bit text, without a byte order mark.
+QByteArray narrowed(const QByteArray& bytes) {
+  const char order = utf16ByteOrder(bytes);
+  if (order == 0)
+    return bytes.startsWith("\xef\xbb\xbf") ? bytes.mid(3) : bytes;
+  QByteArray text;
+  const int first = static_cast<unsigned char>(bytes[0]) >= 0xfe ? 2 : 0;
+  for (int i = first + (order == 'L' ? 0 : 1); i < bytes.size(); i += 2)
+    text += bytes[i];
+  return text;
+}
+
+WorkspaceFile::Form formOf(const QByteArray& firstBytes) {
+  const QByteArray text = narrowed(firstBytes);
+  int at = 0;
+  while (at < text.size() && isspace(static_cast<unsigned char>(text[at])))
+    ++at;
+  if (at < text.size() && text[at] == '<')
+    return WorkspaceFile::Form::PlainXml;
+  QBuffer buffer;
+  buffer.setData(text);
+  buffer.open(QIODevice::ReadOnly);
+  FileLines lines(buffer);
+  while (lines.next()) {
+    if (lines.startsWith(VersionStore::kBegin))
+      return WorkspaceFile::Form::Versioned;
+    if (lines.matchComment("") > 0)
+      return WorkspaceFile::Form::Workspace;
+  }
+  return text.startsWith(VersionStore::kFirstLine) ? WorkspaceFile::Form::Versioned
+                                                   : WorkspaceFile::Form::Unknown;
+}
+
+// The codec for a file's text: one that contains ASCII, or UTF-16 in a stated byte order; null for all else.
+const QTextCodec* fileCodec(const QByteArray& name) {
+  const bool isUtf16 = name.toUpper() == "UTF-16";
+  const QTextCodec* const codec = QTextCodec::codecForName(isUtf16 ? QByteArray("UTF-16LE") : name);
+  if (!codec || codec->name() == "UTF-16LE" || codec->name() == "UTF-16BE")
+    return codec;
+  const QString ascii = QStringLiteral("#! <?xml \"\n");
+  QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
+  return codec->fromUnicode(ascii.constData(), ascii.size(), &state) == ascii.toLatin1() ? codec : nullptr;
+}
+
+}  // namespace
+
+WorkspaceFile::Form WorkspaceFile::recognise(const QString& fileName) {
+  QFile file(fileName);
+  return file.open(QIODevice::ReadOnly) ? formOf(file.read(kFirstBytes)) : Form::Unknown;
+}
+
+void WorkspaceFile::read(IXMLComponentReader& reader, const QString& fileName, QStringList& headerLines) {
+  // An enciphered file shows its form only when deciphered.
+  PlainFile plain(fileName, kCopyName);
+  switch (formOf(plain.device().peek(kFirstBytes))) {
+    case Form::Workspace:
+      reader.ReadInput(fileName, headerLines);
+      return;
+    case Form::PlainXml:
+      reader.ReadInput(plain.fileName());
+      return;
+    case Form::Versioned: {
+      QString error;
+      const QList<VersionInfo> versions = VersionStore(plain.fileName()).versions(error);
+      if (versions.isEmpty())
+        break;
+      QByteArray before;
+      QByteArray behind;
+      reader.ReadVersionedInput(fileName, versions.first().byteOffset, versions.first().byteLength, true,
+                                headerLines, before, behind);
+      return;
+    }
+    case Form::Unknown:
+      break;
+  }
+  throw WorkspaceLoaderException(QStringLiteral("File Error!\nThis is no workspace file: %1").arg(fileName));
+}
+
+WorkspaceFile::WorkspaceFile(const QString& fileName) {
+  PlainFile plain(fileName, kCopyName);
+  const QByteArray firstBytes = plain.device().peek(kFirstBytes);
+  m_form = formOf(firstBytes);
+  if (m_form != Form::Workspace && m_form != Form::PlainXml)
+    throw WorkspaceLoaderException(
+        QStringLiteral("File Error!\nThis is no workspace file: %1").arg(fileName));
+  QByteArray declaration;
+  FileLines lines(plain.device());
+  bool hasXml = m_form == Form::PlainXml;
+  bool hasHeaderEnded = false;
+  bool isFirst = true;
+  bool inXml = false;
+  while (lines.next()) {
+    if (isFirst) {
+      isFirst = false;
+      m_mark = lines.byteOrderMark();
+      const int count = lines.unitCount();
+      if (lines.endsLine() && count >= 2 && lines.unit(count - 2) == '\r' && lines.unit(count - 1) == '\n')
+        m_lineEnd = "\r\n";
+      if (m_form == Form::PlainXml)
+        break;
+    }
+    if (lines.startsLine()) {
+      if (m_hasHeader && !hasHeaderEnded) {
+        hasHeaderEnded = lines.matchComment(WorkspaceSplitter::kEndHeader) > 0;
+        continue;
+      }
+      if (!m_hasHeader && lines.matchComment(WorkspaceSplitter::kStartHeader) > 0) {
+        m_hasHeader = true;
+        continue;
+      }
+      inXml = !m_hasHeader && lines.matchComment("") > 0;
+      hasXml = hasXml || inXml;
+    } else if (m_hasHeader && !hasHeaderEnded) {
+      continue;
+    }
+    if (inXml)
+      continue;
+    QByteArray& part = hasHeaderEnded ? m_behind : hasXml ? m_between : m_before;
+    part.append(lines.data(), lines.size());
+  }
+  if (lines.byteOrder()) {
+    m_encoding = lines.byteOrder() == 'L' ? "UTF-16LE" : "UTF-16BE";
+  } else {
+    QByteArray start = narrowed(firstBytes);
+    const int xml = start.indexOf("<?xml");
+    const QTextCodec* const codec = xml < 0 ? nullptr : fileCodec(declaredEncoding(start.mid(xml)));
+    m_encoding = codec ? codec->name() : QByteArray();
+    if (m_encoding.isEmpty() || isWide())
+      m_encoding = ORXSystemEncodingName();
+  }
+  if (m_hasHeader) {
+    plain.device().seek(0);
+    QBuffer xml;
+    xml.open(QIODevice::WriteOnly);
+    WorkspaceSplitter splitter;
+    splitter.split(plain.device(), xml, fileName);
+    m_headerLines = splitter.headerLines();
+  }
+}
+
+bool WorkspaceFile::setEncoding(const QByteArray& name) {
+  const QTextCodec* const codec = fileCodec(name);
+  if (!codec)
+    return false;
+  m_encoding = codec->name();
+  m_mark =
+      isWide() ? (m_encoding == "UTF-16BE" ? QByteArray("\xfe\xff") : QByteArray("\xff\xfe")) : QByteArray();
+  return true;
+}
+
+void WorkspaceFile::setHeaderLines(const QStringList& lines) {
+  m_headerLines = lines;
+  m_hasHeader = true;
+}
+
+bool WorkspaceFile::isWide() const {
+  return m_encoding.startsWith("UTF-16");
+}
+
+QByteArray WorkspaceFile::encodedAscii(const QByteArray& ascii) const {
+  if (!isWide())
+    return ascii;
+  QByteArray wide;
+  for (const char character : ascii) {
+    if (m_encoding == "UTF-16BE")
+      wide.append('\0').append(character);
+    else
+      wide.append(character).append('\0');
+  }
+  return wide;
+}
+
+QByteArray WorkspaceFile::encodedHeader(QString& error) const {
+  static const QByteArray prefix = WorkspaceSplitter::kPrefix;
+  QString text;
+  for (const QString& line : m_headerLines) {
+    QBuffer buffer;
+    buffer.setData(line.toUtf8());
+    buffer.open(QIODevice::ReadOnly);
+    FileLines lines(buffer);
+    const bool isEnd = lines.next() && lines.matchComment(WorkspaceSplitter::kEndHeader) > 0;
+    if (isEnd || line.contains(QLatin1Char('\n')) || line.endsWith(QLatin1Char('\r')))
+      error = QStringLiteral("a header line holds a line break or ends the header: %1").arg(line);
+    text += line + QString::fromLatin1(m_lineEnd);
+  }
+  const auto encode = [&](const QTextCodec& codec) {
+    QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
+    return codec.fromUnicode(text.constData(), text.size(), &state);
+  };
+  const QTextCodec& codec = *QTextCodec::codecForName(m_encoding);
+  QByteArray bytes = encode(codec);
+  if (!isWide() && m_encoding != "UTF-8") {
+    // The reader takes a header for UTF-8 whenever it can be that.
+    QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
+    const QTextCodec& utf8 = *QTextCodec::codecForName("UTF-8");
+    utf8.toUnicode(bytes.constData(), bytes.size(), &state);
+    if (!codec.canEncode(text) || (state.invalidChars == 0 && state.remainingChars == 0))
+      bytes = encode(utf8);
+  }
+  return encodedAscii(prefix + WorkspaceSplitter::kStartHeader + m_lineEnd) + bytes +
+         encodedAscii(prefix + WorkspaceSplitter::kEndHeader + m_lineEnd);
+}
+
+bool WorkspaceFile::writeXml(QIODevice& device, DocumentType type,
+                             const std::function<void(XMLComponentWriter&)>& fill, QString& error) const {
+  const QByteArray prefix = m_form == Form::PlainXml ? QByteArray() : QByteArray(WorkspaceSplitter::kPrefix);
+  CommentLineDevice lines(device, encodedAscii(prefix), encodedAscii("\n"), encodedAscii(m_lineEnd));
+  XMLComponentWriter writer(&lines, type);
+  writer.setEncoding(m_encoding);
+  writer.setByteOrderMark(false);
+  fill(writer);
+  if (!writer.getRefusal().isEmpty()) {
+    error = writer.getRefusal();
+    return false;
+  }
+  writer.writeDocument();
+  if (writer.stream().status() != QTextStream::Ok) {
+    error = lines.errorString();
+    return false;
+  }
+  return true;
+}
+
+bool WorkspaceFile::save(const QString& fileName, DocumentType type,
+                         const std::function<void(XMLComponentWriter&)>& fill, QString& error) const {
+  error.clear();
+  const auto fail = [&](const QString& reason) {
+    error = QStringLiteral("Could not write workspace file %1: %2").arg(fileName, reason);
+    return false;
+  };
+  QByteArray header;
+  if (m_hasHeader) {
+    if (m_form == Form::PlainXml)
+      return fail(QStringLiteral("a file of plain XML has no header"));
+    header = encodedHeader(error);
+    if (!error.isEmpty())
+      return fail(error);
+  }
+  AtomicFile file(fileName);
+  if (!file.open())
+    return fail(file.errorString());
+  QIODevice& device = file.device();
+  device.write(m_mark);
+  device.write(m_before);
+  if (!writeXml(device, type, fill, error))
+    return fail(error);
+  device.write(m_between);
+  if (!m_between.isEmpty() && !m_between.endsWith(encodedAscii("\n")) && m_hasHeader)
+    device.write(encodedAscii(m_lineEnd));
+  device.write(header);
+  device.write(m_behind);
+  return file.commit() || fail(file.errorString());
+}
