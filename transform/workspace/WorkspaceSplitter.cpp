@@ -35,7 +35,8 @@ bool isValid(const QTextCodec& codec, const QList<QByteArray>& lines) {
 QByteArray declaredEncoding(const QByteArray& xmlStart) {
   static const QRegularExpression pattern(
       QStringLiteral("^\\s*<\\?xml\\s[^>]*encoding\\s*=\\s*[\"']([A-Za-z][A-Za-z0-9._-]*)[\"']"));
-  const auto match = pattern.match(QString::fromLatin1(xmlStart.left(kDeclarationLength)));
+  const int mark = xmlStart.startsWith("\xef\xbb\xbf") ? 3 : 0;
+  const auto match = pattern.match(QString::fromLatin1(xmlStart.mid(mark, kDeclarationLength)));
   return match.captured(1).toLatin1();
 }
 
