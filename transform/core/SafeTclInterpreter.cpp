@@ -9,27 +9,28 @@
 #include <algorithm>
 #include <cstring>
 #include <iterator>
-#include <malloc.h>
-
 namespace {
 
 constexpr int kMostCommands = 10000;
 constexpr int kMostSeconds = 1;
 constexpr int kDeepestCalls = 60;
-constexpr int kLongestScript = 16 * 1024;
 constexpr int kDeepestBrackets = 100;
-constexpr int kLongestWord = 1024;
 constexpr int kMostStars = 3;
-constexpr std::size_t kMostMemory = 4 * 1024 * 1024;
+// Texts grow by what a script writes into one word, times the length of variables: without procedures both
+// are bounded by these.
+constexpr int kLongestScript = 16 * 1024;
+constexpr int kLongestWord = 1024;
+constexpr int kMostWords = 64;
+constexpr int kLongestVariable = 8 * 1024;
+constexpr int kLongestList = 1024;
 
 // All that scripts may call; every other command is taken away.
-constexpr const char* kCommands[] = {
-    "append",  "break",  "catch",    "concat",  "continue", "error",    "expr",   "for",
-    "foreach", "global", "if",       "incr",    "join",     "lappend",  "lindex", "list",
-    "llength", "lrange", "lreverse", "lsearch", "lsort",    "proc",     "return", "set",
-    "split",   "string", "switch",   "unset",   "upvar",    "variable", "while"};
+constexpr const char* kCommands[] = {"append",  "break",  "concat",   "continue", "error",   "expr",   "for",
+                                     "foreach", "if",     "incr",     "join",     "lappend", "lindex", "list",
+                                     "llength", "lrange", "lreverse", "lsearch",  "lsort",   "return", "set",
+                                     "split",   "string", "switch",   "unset",    "while"};
 
-// What of "string" and of the functions below it can grow without bound, or call commands by other names.
+// What of "string" grows a text without bound.
 constexpr const char* kRemovedParts[] = {"::tcl::string::repeat"};
 
 QString textOf(Tcl_Obj* object) {
@@ -41,11 +42,6 @@ QString textOf(Tcl_Obj* object) {
 void setResult(Tcl_Interp* interp, const QString& text) {
   const QByteArray bytes = text.toUtf8();
   Tcl_SetObjResult(interp, Tcl_NewStringObj(bytes.constData(), bytes.size()));
-}
-
-std::size_t memoryInUse() {
-  const struct mallinfo2 info = mallinfo2();
-  return info.uordblks + info.hblkhd;
 }
 
 struct TextCommand {
@@ -76,16 +72,6 @@ int runTextCommand(ClientData data, Tcl_Interp* interp, int count, Tcl_Obj* cons
   return TCL_OK;
 }
 
-int watchCommand(ClientData data, Tcl_Interp* interp, int, const char*, Tcl_Command, int count,
-                 Tcl_Obj* const words[]) {
-  const auto* watched = static_cast<const SafeTclInterpreter*>(data);
-  if (const char* why = watched->refusal(count, reinterpret_cast<void* const*>(words))) {
-    Tcl_SetObjResult(interp, Tcl_NewStringObj(why, -1));
-    return TCL_ERROR;
-  }
-  return TCL_OK;
-}
-
 bool usesPatterns(const char* command) {
   return std::strstr(command, "string") || std::strstr(command, "switch") || std::strstr(command, "lsearch");
 }
@@ -103,6 +89,99 @@ bool isTooDeep(const char* text) {
     }
   }
   return false;
+}
+
+// Null when a text may be passed on, otherwise why not.
+const char* refusalOfWord(Tcl_Obj* word) {
+  // A large number is refused before it is turned into digits, which may take very long.
+  if (!word->bytes && word->typePtr && std::strcmp(word->typePtr->name, "bignum") == 0) {
+    return "a number is too large";
+  }
+  int length = 0;
+  const char* text = Tcl_GetStringFromObj(word, &length);
+  if (length > kLongestWord) {
+    return "a word is too long";
+  }
+  if (isTooDeep(text)) {
+    return "brackets are nested too deeply";
+  }
+  if (std::strstr(text, "**") || std::strstr(text, "<<")) {
+    return "powers and shifts are not available";
+  }
+  return nullptr;
+}
+
+// Whether a variable that is about to grow is long enough already.
+bool isFull(Tcl_Interp* interp, Tcl_Obj* name, bool isList) {
+  Tcl_Obj* value = Tcl_ObjGetVar2(interp, name, nullptr, 0);
+  if (!value) {
+    return false;
+  }
+  int length = 0;
+  if (isList) {
+    return Tcl_ListObjLength(nullptr, value, &length) == TCL_OK && length > kLongestList;
+  }
+  Tcl_GetStringFromObj(value, &length);
+  return length > kLongestVariable;
+}
+
+const char* refusal(Tcl_Interp* interp, int count, Tcl_Obj* const words[]) {
+  if (count > kMostWords) {
+    return "a command has too many words";
+  }
+  for (int i = 0; i < count; ++i) {
+    if (const char* why = refusalOfWord(words[i])) {
+      return why;
+    }
+  }
+  const char* command = Tcl_GetString(words[0]);
+  if (count > 1 && std::strstr(command, "append") &&
+      isFull(interp, words[1], std::strstr(command, "lappend"))) {
+    return "a variable is too long";
+  }
+  if (usesPatterns(command)) {
+    for (int i = 1; i < count; ++i) {
+      const char* text = Tcl_GetString(words[i]);
+      if (std::count(text, text + std::strlen(text), '*') > kMostStars) {
+        return "a pattern has too many \"*\"";
+      }
+      if (std::strncmp(text, "-r", 2) == 0) {
+        return "regular expressions are not available";
+      }
+    }
+  }
+  return nullptr;
+}
+
+// "catch" that stores no text longer than a word.
+int runCatch(ClientData, Tcl_Interp* interp, int count, Tcl_Obj* const words[]) {
+  if (count != 2 && count != 3) {
+    Tcl_WrongNumArgs(interp, 1, words, "script ?resultVarName?");
+    return TCL_ERROR;
+  }
+  const int code = Tcl_EvalObjEx(interp, words[1], 0);
+  if (Tcl_LimitExceeded(interp)) {
+    return TCL_ERROR;
+  }
+  if (count == 3) {
+    Tcl_Obj* result = Tcl_GetObjResult(interp);
+    const char* why = refusalOfWord(result);
+    Tcl_Obj* kept = why ? Tcl_NewStringObj(why, -1) : result;
+    if (!Tcl_ObjSetVar2(interp, words[2], nullptr, kept, TCL_LEAVE_ERR_MSG)) {
+      return TCL_ERROR;
+    }
+  }
+  Tcl_SetObjResult(interp, Tcl_NewIntObj(code));
+  return TCL_OK;
+}
+
+int watchCommand(ClientData, Tcl_Interp* interp, int, const char*, Tcl_Command, int count,
+                 Tcl_Obj* const words[]) {
+  if (const char* why = refusal(interp, count, words)) {
+    Tcl_SetObjResult(interp, Tcl_NewStringObj(why, -1));
+    return TCL_ERROR;
+  }
+  return TCL_OK;
 }
 
 }  // namespace
@@ -126,76 +205,48 @@ SafeTclInterpreter::~SafeTclInterpreter() {
 }
 
 void SafeTclInterpreter::removeUnlistedCommands() {
-  Tcl_Eval(m_interp, "info commands ::*");
-  int count = 0;
-  const char** names = nullptr;
-  if (Tcl_SplitList(m_interp, Tcl_GetStringResult(m_interp), &count, &names) != TCL_OK) {
-    return;
+  const QByteArrayList commands = listOf("info commands ::*");
+  // Commands in namespaces go with these; what "string" and expressions are made of stays.
+  const QByteArrayList namespaces = listOf("concat [namespace children ::] [namespace children ::tcl]");
+  for (const QByteArray& name : namespaces) {
+    const bool isNeeded = name == "::tcl" || name == "::tcl::string" || name == "::tcl::mathfunc";
+    Tcl_Namespace* unneeded =
+        isNeeded ? nullptr : Tcl_FindNamespace(m_interp, name.constData(), nullptr, TCL_GLOBAL_ONLY);
+    if (unneeded) {
+      Tcl_DeleteNamespace(unneeded);
+    }
   }
-  // Functions of expressions, and the parts of the ensembles that go, stay out of reach with their
-  // namespaces.
-  Tcl_Eval(m_interp,
-           "foreach ns [namespace children ::tcl] {"
-           "  if {$ns ne {::tcl::string} && $ns ne {::tcl::mathfunc}} {namespace delete $ns}"
-           "}");
   for (const char* part : kRemovedParts) {
     Tcl_DeleteCommand(m_interp, part);
   }
-  for (int i = 0; i < count; ++i) {
-    const char* name = names[i] + (std::strncmp(names[i], "::", 2) == 0 ? 2 : 0);
-    const bool isListed = std::any_of(std::begin(kCommands), std::end(kCommands),
-                                      [name](const char* listed) { return std::strcmp(name, listed) == 0; });
-    if (!isListed) {
-      Tcl_DeleteCommand(m_interp, name);
+  for (const QByteArray& command : commands) {
+    const QByteArray name = command.startsWith("::") ? command.mid(2) : command;
+    if (std::find(std::begin(kCommands), std::end(kCommands), name) == std::end(kCommands)) {
+      Tcl_DeleteCommand(m_interp, command.constData());
     }
   }
-  Tcl_Free(reinterpret_cast<char*>(names));
   Tcl_ResetResult(m_interp);
+}
+
+QByteArrayList SafeTclInterpreter::listOf(const char* script) {
+  QByteArrayList elements;
+  int count = 0;
+  const char** names = nullptr;
+  Tcl_Eval(m_interp, script);
+  if (Tcl_SplitList(m_interp, Tcl_GetStringResult(m_interp), &count, &names) == TCL_OK) {
+    for (int i = 0; i < count; ++i) {
+      elements.append(names[i]);
+    }
+    Tcl_Free(reinterpret_cast<char*>(names));
+  }
+  return elements;
 }
 
 void SafeTclInterpreter::addCommands() {
   for (const TextCommand& command : kTextCommands) {
     Tcl_CreateObjCommand(m_interp, command.name, runTextCommand, const_cast<TextCommand*>(&command), nullptr);
   }
-}
-
-const char* SafeTclInterpreter::refusal(int wordCount, void* const* words) const {
-  static const Tcl_ObjType* const bigNumber = Tcl_GetObjType("bignum");
-  const std::size_t memory = memoryInUse();
-  if (memory > m_memoryAtStart + kMostMemory) {
-    return "the script needs too much memory";
-  }
-  bool checksPattern = false;
-  for (int i = 0; i < wordCount; ++i) {
-    auto* word = static_cast<Tcl_Obj*>(words[i]);
-    // Such a number is refused before it is turned into digits, which may take very long.
-    if (!word->bytes && word->typePtr &&
-        (word->typePtr == bigNumber || !std::strcmp(word->typePtr->name, "bignum"))) {
-      return "a number is too large";
-    }
-    int length = 0;
-    const char* text = Tcl_GetStringFromObj(word, &length);
-    if (length > kLongestWord) {
-      return "a word is too long";
-    }
-    if (isTooDeep(text)) {
-      return "brackets are nested too deeply";
-    }
-    if (std::strstr(text, "**") || std::strstr(text, "<<")) {
-      return "powers and shifts are not available";
-    }
-    if (i == 0) {
-      checksPattern = usesPatterns(text);
-    } else if (checksPattern) {
-      if (std::count(text, text + length, '*') > kMostStars) {
-        return "a pattern has too many \"*\"";
-      }
-      if (std::strncmp(text, "-re", 3) == 0) {
-        return "regular expressions are not available";
-      }
-    }
-  }
-  return nullptr;
+  Tcl_CreateObjCommand(m_interp, "catch", runCatch, nullptr, nullptr);
 }
 
 bool SafeTclInterpreter::evaluate(const QString& script, QString& result) {
@@ -208,7 +259,6 @@ bool SafeTclInterpreter::evaluate(const QString& script, QString& result) {
     result = QStringLiteral("brackets are nested too deeply");
     return false;
   }
-  m_memoryAtStart = memoryInUse();
   Tcl_SetRecursionLimit(m_interp, kDeepestCalls);
   Tcl_LimitSetCommands(m_interp, kMostCommands);
   Tcl_LimitTypeSet(m_interp, TCL_LIMIT_COMMANDS);
@@ -218,12 +268,11 @@ bool SafeTclInterpreter::evaluate(const QString& script, QString& result) {
   Tcl_LimitSetTime(m_interp, &deadline);
   Tcl_LimitTypeSet(m_interp, TCL_LIMIT_TIME);
   // Without flags every command is seen, also those that would be compiled in place.
-  Tcl_CreateObjTrace(m_interp, 0, 0, watchCommand, this, nullptr);
+  Tcl_CreateObjTrace(m_interp, 0, 0, watchCommand, nullptr, nullptr);
 
   const int code = Tcl_EvalEx(m_interp, bytes.constData(), bytes.size(), TCL_EVAL_GLOBAL);
   Tcl_Obj* answer = Tcl_GetObjResult(m_interp);
-  void* word = answer;
-  if (const char* why = code == TCL_OK ? refusal(1, &word) : nullptr) {
+  if (const char* why = code == TCL_OK ? refusalOfWord(answer) : nullptr) {
     result = QString::fromLatin1(why);
     return false;
   }

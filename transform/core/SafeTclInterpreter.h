@@ -2,9 +2,8 @@
 // commands, time, memory and whatever a single command could blow up.
 #pragma once
 
+#include <QByteArrayList>
 #include <QString>
-
-#include <cstddef>
 
 struct Tcl_Interp;
 
@@ -18,13 +17,10 @@ class SafeTclInterpreter {
   // Runs the script once. False when it failed or was stopped; `result` is then the error.
   bool evaluate(const QString& script, QString& result);
 
-  // Called before each command; null when it may run, otherwise why not.
-  const char* refusal(int wordCount, void* const* words) const;
-
  private:
   void removeUnlistedCommands();
+  QByteArrayList listOf(const char* script);
   void addCommands();
 
   Tcl_Interp* m_interp;
-  std::size_t m_memoryAtStart = 0;
 };

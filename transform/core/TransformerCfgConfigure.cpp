@@ -2,6 +2,7 @@
 #include <platform/qorxcore/OrxHome.h>
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/AttributeReferences.h>
+#include <transform/core/CompiledTemplate.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/DependencyChecker.h>
 #include <transform/core/Keywords.h>
@@ -101,6 +102,9 @@ void TransformerCfg::configure(const TransformerDefinition& definition, IORXSess
     if (token != QLatin1String(":") && !addTagMapping(*own, token)) {
       note(log, definition, QLatin1String("TAG_MAPPING: no renaming: ") + token);
     }
+  }
+  if (!definition.templateLines.isEmpty()) {
+    own->compiledTemplate = std::make_shared<CompiledTemplate>(definition.templateLines);
   }
   checkDependencies(*own, log);
 
