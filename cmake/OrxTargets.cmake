@@ -9,6 +9,12 @@ if(ORX_SANITIZE)
     -Wno-null-dereference -fsanitize=address,undefined -fno-sanitize-recover=undefined -fno-omit-frame-pointer)
   target_link_options(orx_build_options INTERFACE -fsanitize=address,undefined)
 endif()
+if(ORX_BUILD_FUZZ)
+  if(NOT CMAKE_CXX_COMPILER_ID MATCHES "Clang")
+    message(FATAL_ERROR "ORX_BUILD_FUZZ needs clang; take the preset fuzz")
+  endif()
+  target_compile_options(orx_build_options INTERFACE -fsanitize=fuzzer-no-link)
+endif()
 target_compile_definitions(orx_build_options INTERFACE
   QT_NO_CAST_TO_ASCII QT_NO_CAST_FROM_BYTEARRAY QT_NO_KEYWORDS QT_NO_URL_CAST_FROM_STRING QT_DEPRECATED_WARNINGS)
 
