@@ -6,13 +6,18 @@
 
 class ChangeLogPage {
  public:
+  // In the current language. Plain texts; they are escaped here, as are those below.
   explicit ChangeLogPage(const QString& title);
 
-  // One version with its entries; texts are escaped here.
+  // One version with its entries; a version without entries is left out.
   void addVersion(const QString& heading, const QStringList& entries);
+  // A sentence on its own.
+  void addText(const QString& text);
+  bool isEmpty() const { return m_body.isEmpty(); }
+
   QStringList lines() const;
 
  private:
-  QStringList m_head;
+  QString m_title;  // escaped
   QStringList m_body;
 };

@@ -1,69 +1,102 @@
 #include <transform/registry/CompanionFileParser.h>
-#include <transform/registry/DefinitionFileParser.h>
 #include <transform/registry/DefinitionKeywords.h>
-#include <transform/registry/DefinitionLines.h>
 
-namespace {
-
-bool takeKeyword(const QString& line, QLatin1String keyword, QString& value) {
-  if (!line.startsWith(keyword))
+bool CompanionFileParser::parse(QIODevice& device) {
+  *this = CompanionFileParser();
+  DefinitionLines lines;
+  if (!lines.open(device)) {
+    m_error = lines.errorString();
     return false;
-  value = line.mid(keyword.size()).trimmed();
+  }
+  while (lines.next()) {
+    if (lines.isSkipped()) {
+      continue;
+    }
+    const QString line = lines.trimmed();
+    const int number = lines.number();
+    if (line.startsWith(kCategoryDescriptionStart)) {
+      CategoryText category{line.mid(kCategoryDescriptionStart.size()).trimmed(), {}, number};
+      if (!lines.readBlock(kCategoryDescriptionEnd, category.lines)) {
+        m_openBlockLine = number;
+      }
+      m_categoryDescriptions.push_back(std::move(category));
+      continue;
+    }
+    QStringList CompanionEntry::*block = line == kDescriptionStart ? &CompanionEntry::descriptionLines
+                                         : line == kTooltipStart   ? &CompanionEntry::tooltipLines
+                                         : line == kChangeLogStart ? &CompanionEntry::changeLog
+                                                                   : nullptr;
+    if (!block) {
+      if (!takeLine(line, number)) {
+        m_strayLines.push_back({line, number});
+      }
+      continue;
+    }
+    std::vector<DefinitionLine> texts;
+    if (!lines.readBlock(line == kDescriptionStart ? kDescriptionEnd
+                         : line == kTooltipStart   ? kTooltipEnd
+                                                   : kChangeLogEnd,
+                         texts)) {
+      m_openBlockLine = number;
+    }
+    if (m_entries.empty()) {
+      m_strayLines.push_back({line, number});
+      continue;
+    }
+    for (DefinitionLine& text : texts) {
+      (m_entries.back().*block).append(std::move(text.text));
+    }
+  }
+  m_isSoundUtf8 = lines.isSoundUtf8();
   return true;
 }
 
-}  // namespace
-
-CompanionFileParser::CompanionFileParser(Handlers handlers) : m_handlers(std::move(handlers)) {}
-
-void CompanionFileParser::parse(QIODevice& device) {
-  DefinitionLines lines(device);
-  CompanionEntry entry;
-  const auto finish = [&] {
-    if (!entry.name.isEmpty())
-      m_handlers.entry(entry);
-    entry = CompanionEntry();
-  };
-  while (lines.next()) {
-    if (lines.isSkipped())
-      continue;
-    const QString line = lines.trimmed();
-    QString value;
-    if (line.startsWith(kCategoryDescriptionStart)) {
-      QStringList description;
-      lines.readBlock(kCategoryDescriptionEnd, description);
-      m_handlers.categoryDescription(line.mid(kCategoryDescriptionStart.size()).trimmed(), description);
-    } else if (line == kDescriptionStart) {
-      lines.readBlock(kDescriptionEnd, entry.descriptionLines);
-    } else if (line == kTooltipStart) {
-      lines.readBlock(kTooltipEnd, entry.tooltipLines);
-    } else if (line == kChangeLogStart) {
-      lines.readBlock(kChangeLogEnd, entry.changeLog);
-    } else if (takeKeyword(line, kCategoryName, value)) {
-      const int comma = value.indexOf(QLatin1Char(','));
-      if (comma > 0)
-        m_handlers.categoryName(value.left(comma).trimmed(), value.mid(comma + 1).trimmed());
-    } else if (takeKeyword(line, kTransformerName, value)) {
-      finish();
-      entry.name = value;
-      entry.line = lines.number();
-    } else if (takeKeyword(line, kVersion, value)) {
-      entry.version = value.toInt();
-      entry.hasVersion = true;
-    } else if (takeKeyword(line, kLocalizedName, value)) {
-      entry.localizedName = value;
-    } else if (takeKeyword(line, kParameterName, value)) {
-      entry.prompts.emplace_back(value, QString());
-    } else if (takeKeyword(line, kParameterPrompt, value)) {
-      if (!entry.prompts.empty())
-        entry.prompts.back().second = value;
-    } else if (takeKeyword(line, kTagDescription, value)) {
-      TransformerDefinition texts;
-      if (DefinitionFileParser::takeHeaderLine(line, texts)) {
-        for (auto text = texts.tagDescriptions.cbegin(); text != texts.tagDescriptions.cend(); ++text)
-          entry.tagDescriptions.emplace_back(text.key(), text.value());
-      }
-    }
+// False when the line means nothing.
+bool CompanionFileParser::takeLine(const QString& line, int number) {
+  const DefinitionKeyword* keyword = findDefinitionKeyword(line, DefinitionKeyword::kCompanion);
+  if (!keyword) {
+    return false;
   }
-  finish();
+  const QString value = keywordValue(*keyword, line);
+  if (keyword->word == kCategoryName) {
+    const int comma = value.indexOf(QLatin1Char(','));
+    const QString name = value.left(comma).trimmed();
+    const QString localized = comma < 0 ? QString() : value.mid(comma + 1).trimmed();
+    if (name.isEmpty() || localized.isEmpty()) {
+      return false;
+    }
+    m_categoryNames.push_back({name, localized, number});
+    return true;
+  }
+  if (keyword->word == kTransformerName) {
+    m_entries.emplace_back();
+    m_entries.back().name = value;
+    m_entries.back().line = number;
+    return true;
+  }
+  if (m_entries.empty()) {
+    return false;
+  }
+  CompanionEntry& entry = m_entries.back();
+  if (keyword->word == kVersion) {
+    entry.version = value.toInt();
+    entry.hasVersion = true;
+  } else if (keyword->word == kLocalizedName) {
+    entry.localizedName = value;
+  } else if (keyword->word == kParameterName) {
+    entry.prompts.push_back({value, QString(), number});
+  } else if (keyword->word == kParameterPrompt) {
+    if (entry.prompts.empty()) {
+      return false;
+    }
+    entry.prompts.back().text = value;
+  } else {
+    CompanionEntry::Text description;
+    description.line = number;
+    if (!splitTagDescription(value, description.name, description.text)) {
+      return false;
+    }
+    entry.tagDescriptions.push_back(std::move(description));
+  }
+  return true;
 }

@@ -1,7 +1,6 @@
-#include <platform/qorxcore/qorxcore.h>
+#include <platform/qorxcore/WordEncoding.h>
 #include <transform/registry/DefinitionFileParser.h>
 #include <transform/registry/DefinitionKeywords.h>
-#include <transform/registry/DefinitionLines.h>
 
 namespace {
 
@@ -14,103 +13,128 @@ void takeValue(const DefinitionKeyword& keyword, const QString& value, Transform
       definition.*keyword.number = value.toInt();
       break;
     case KeywordKind::Flag: {
-      const QString word = value.toLower();
-      if (word == QLatin1String("yes") || word == QLatin1String("true"))
-        definition.*keyword.flag = true;
-      else if (word == QLatin1String("no") || word == QLatin1String("false"))
-        definition.*keyword.flag = false;
+      const int flag = flagValue(value);
+      if (flag >= 0) {
+        definition.*keyword.flag = flag != 0;
+      }
       break;
     }
     case KeywordKind::List:
       definition.*keyword.list += splitDefinitionList(value);
       break;
     case KeywordKind::EncodedList:
-      for (const QString& entry : splitDefinitionList(value))
+      for (const QString& entry : splitDefinitionList(value)) {
         (definition.*keyword.list).append(QORXWwjdDecode(entry));
+      }
       break;
     case KeywordKind::InputList:
       definition.*keyword.list += splitDefinitionList(value);
-      (definition.*keyword.list).removeAll(QStringLiteral("<NO_INPUT>"));
+      (definition.*keyword.list).removeAll(kNoInput);
       break;
     case KeywordKind::Modes:
       for (const QString& mode : splitDefinitionList(value)) {
-        if (mode == QLatin1String("NONE"))
-          definition.*keyword.number |= 1;
-        else if (mode == QLatin1String("GROUPED"))
-          definition.*keyword.number |= 2;
-        else if (mode == QLatin1String("ALL"))
-          definition.*keyword.number |= 4;
+        definition.*keyword.number |= featureHoldingBit(mode);
       }
       break;
     case KeywordKind::ParallelList:
       (definition.*keyword.list).append(value);
       break;
     case KeywordKind::Lookup:
-      if (!definition.parameterNames.isEmpty())
+      if (!definition.parameterNames.isEmpty()) {
         definition.parameterLookups[definition.parameterNames.last()].append(value);
+      }
       break;
     case KeywordKind::TagDescription: {
-      QStringList pieces = value.split(QLatin1Char(' '), Qt::SkipEmptyParts);
-      if (pieces.size() < 2)
-        break;
-      QString tag = pieces.takeFirst();
-      if (tag.endsWith(QLatin1Char(':')))
-        tag.chop(1);
-      definition.tagDescriptions.insert(tag, pieces.join(QLatin1Char(' ')));
+      QString tag;
+      QString description;
+      if (splitTagDescription(value, tag, description)) {
+        definition.tagDescriptions.insert(tag, description);
+      }
       break;
     }
+    case KeywordKind::NamePair:
+      break;
   }
 }
 
 void pad(QStringList& list, int size) {
-  while (list.size() < size)
+  while (list.size() < size) {
     list.append(QString());
+  }
 }
 
 }  // namespace
 
-DefinitionFileParser::DefinitionFileParser(DefinitionHandler onDefinition, CategoryHandler onCategory)
-    : m_onDefinition(std::move(onDefinition)), m_onCategory(std::move(onCategory)) {}
-
-bool DefinitionFileParser::takeHeaderLine(const QString& line, TransformerDefinition& definition) {
-  bool matched = false;
-  for (const DefinitionKeyword& keyword : definitionKeywords()) {
-    if (!line.startsWith(keyword.word))
-      continue;
-    takeValue(keyword, line.mid(keyword.word.size()).trimmed(), definition);
-    matched = true;
+QStringList textsOf(const std::vector<DefinitionLine>& lines) {
+  QStringList result;
+  result.reserve(static_cast<int>(lines.size()));
+  for (const DefinitionLine& line : lines) {
+    result.append(line.text);
   }
-  return matched;
+  return result;
 }
 
-void DefinitionFileParser::parse(QIODevice& device, const QString& path) {
-  DefinitionLines lines(device);
+TransformerDefinition DefinitionFileParser::interpret(const DefinitionText& text) {
   TransformerDefinition definition;
-  while (lines.next()) {
-    if (lines.isSkipped())
-      continue;
-    const QString& line = lines.trimmed();
-    if (line.startsWith(kCategoryDescriptionStart)) {
-      const QString category = line.mid(kCategoryDescriptionStart.size()).trimmed();
-      QStringList description;
-      lines.readBlock(kCategoryDescriptionEnd, description);
-      m_onCategory(category, description);
-    } else if (line == kTemplateStart) {
-      if (!lines.readTemplate(definition.templateLines))
-        return;  // without an end there is no definition
-      pad(definition.parameterDefaults, definition.parameterNames.size());
-      pad(definition.parameterPrompts, definition.parameterNames.size());
-      definition.filePath = path;
-      m_onDefinition(std::move(definition));
-      definition = TransformerDefinition();
-    } else if (line == kDescriptionStart) {
-      lines.readBlock(kDescriptionEnd, definition.descriptionLines);
-    } else if (line == kTooltipStart) {
-      lines.readBlock(kTooltipEnd, definition.tooltipLines);
-    } else if (line == kChangeLogStart) {
-      lines.readBlock(kChangeLogEnd, definition.changeLog);
-    } else {
-      takeHeaderLine(line, definition);
+  definition.filePath = text.filePath;
+  for (const DefinitionLine& line : text.header) {
+    if (const DefinitionKeyword* keyword = findDefinitionKeyword(line.text, DefinitionKeyword::kDefinition)) {
+      takeValue(*keyword, keywordValue(*keyword, line.text), definition);
     }
   }
+  pad(definition.parameterDefaults, definition.parameterNames.size());
+  pad(definition.parameterPrompts, definition.parameterNames.size());
+  definition.templateLines = textsOf(text.templateLines);
+  definition.descriptionLines = textsOf(text.description);
+  definition.tooltipLines = textsOf(text.tooltip);
+  definition.changeLog = textsOf(text.changeLog);
+  return definition;
+}
+
+bool DefinitionFileParser::parse(QIODevice& device, const QString& path) {
+  *this = DefinitionFileParser();
+  DefinitionLines lines;
+  if (!lines.open(device)) {
+    m_error = lines.errorString();
+    return false;
+  }
+  DefinitionText& current = m_unfinished;
+  current.filePath = path;
+  while (lines.next()) {
+    if (lines.isSkipped()) {
+      continue;
+    }
+    const QString line = lines.trimmed();
+    const int number = lines.number();
+    if (current.isEmpty()) {
+      current.offset = lines.offset();
+    }
+    bool isClosed = true;
+    if (line.startsWith(kCategoryDescriptionStart)) {
+      CategoryText category{line.mid(kCategoryDescriptionStart.size()).trimmed(), {}, number};
+      isClosed = lines.readBlock(kCategoryDescriptionEnd, category.lines);
+      m_categories.push_back(std::move(category));
+    } else if (line == kTemplateStart) {
+      isClosed = lines.readTemplate(kTemplateEnd, current.templateLines);
+      if (isClosed) {
+        current.size = lines.endOffset() - current.offset;
+        m_definitions.push_back(std::move(current));
+        current = DefinitionText();
+        current.filePath = path;
+      }
+    } else if (line == kDescriptionStart) {
+      isClosed = lines.readBlock(kDescriptionEnd, current.description);
+    } else if (line == kTooltipStart) {
+      isClosed = lines.readBlock(kTooltipEnd, current.tooltip);
+    } else if (line == kChangeLogStart) {
+      isClosed = lines.readBlock(kChangeLogEnd, current.changeLog);
+    } else {
+      current.header.push_back({line, number});
+    }
+    if (!isClosed) {
+      m_openBlockLine = number;
+    }
+  }
+  m_isSoundUtf8 = lines.isSoundUtf8();
+  return true;
 }

@@ -1,33 +1,41 @@
-// Reads definition files: UTF-8 text of keyword lines, text blocks and templates, any number of definitions
-// in one file. Any content ends in a result: what is no definition is passed over.
+// Reads definition files: keyword lines, text blocks and templates, any number of definitions in one file.
+// Any content ends in a result: what is no definition is passed over, and told by unfinished().
 #pragma once
 
 #include <platform/Export.h>
 #include <transform/core/TransformerDefinition.h>
+#include <transform/registry/DefinitionText.h>
 
 #include <QString>
-#include <QStringList>
 
-#include <functional>
+#include <vector>
 
 class QIODevice;
 
 class ORX_EXPORT DefinitionFileParser {
  public:
-  using DefinitionHandler = std::function<void(TransformerDefinition&& definition)>;
-  using CategoryHandler = std::function<void(const QString& category, const QStringList& lines)>;
+  // The device is open for reading; `path` becomes each definition's file path. False, with nothing
+  // collected, when the device cannot be read or holds too much; errorString() tells why.
+  bool parse(QIODevice& device, const QString& path);
+  QString errorString() const { return m_error; }
 
-  // `onDefinition` is called for each definition as its template ends, `onCategory` for each category
-  // description.
-  DefinitionFileParser(DefinitionHandler onDefinition, CategoryHandler onCategory);
+  const std::vector<DefinitionText>& definitions() const { return m_definitions; }
+  // In order of appearance; of several descriptions of one category the last holds.
+  const std::vector<CategoryText>& categories() const { return m_categories; }
+  // What stood behind the last template: without a template of its own it is no definition.
+  const DefinitionText& unfinished() const { return m_unfinished; }
+  // The first line of a block that the end of the file ends; 0 when every block has its end.
+  int openBlockLine() const { return m_openBlockLine; }
+  bool isSoundUtf8() const { return m_isSoundUtf8; }
 
-  // The device is open for reading. `path` becomes each definition's file path.
-  void parse(QIODevice& device, const QString& path);
-
-  // Takes one header line into a definition. False when no keyword matches.
-  static bool takeHeaderLine(const QString& line, TransformerDefinition& definition);
+  // Takes the fields from the collected lines.
+  static TransformerDefinition interpret(const DefinitionText& text);
 
  private:
-  DefinitionHandler m_onDefinition;
-  CategoryHandler m_onCategory;
+  std::vector<DefinitionText> m_definitions;
+  std::vector<CategoryText> m_categories;
+  DefinitionText m_unfinished;
+  int m_openBlockLine = 0;
+  bool m_isSoundUtf8 = true;
+  QString m_error;
 };

@@ -1,29 +1,34 @@
+#include <transform/core/TransformerCfg.h>
 #include <transform/registry/DefinitionKeywords.h>
 
 namespace {
 
 using Fields = TransformerDefinition;
 
-DefinitionKeyword text(const char* word, QString Fields::*field) {
-  DefinitionKeyword keyword{QLatin1String(word), KeywordKind::Text};
+constexpr unsigned kHere = DefinitionKeyword::kDefinition;
+constexpr unsigned kBoth = DefinitionKeyword::kDefinition | DefinitionKeyword::kCompanion;
+
+DefinitionKeyword text(QLatin1String word, QString Fields::*field, unsigned places = kHere) {
+  DefinitionKeyword keyword{word, KeywordKind::Text, places};
   keyword.text = field;
   return keyword;
 }
 
-DefinitionKeyword number(const char* word, int Fields::*field, KeywordKind kind = KeywordKind::Number) {
-  DefinitionKeyword keyword{QLatin1String(word), kind};
+DefinitionKeyword number(QLatin1String word, int Fields::*field, KeywordKind kind, unsigned places = kHere) {
+  DefinitionKeyword keyword{word, kind, places};
   keyword.number = field;
   return keyword;
 }
 
-DefinitionKeyword flag(const char* word, bool Fields::*field) {
-  DefinitionKeyword keyword{QLatin1String(word), KeywordKind::Flag};
+DefinitionKeyword flag(QLatin1String word, bool Fields::*field) {
+  DefinitionKeyword keyword{word, KeywordKind::Flag, kHere};
   keyword.flag = field;
   return keyword;
 }
 
-DefinitionKeyword list(const char* word, QStringList Fields::*field, KeywordKind kind = KeywordKind::List) {
-  DefinitionKeyword keyword{QLatin1String(word), kind};
+DefinitionKeyword list(QLatin1String word, QStringList Fields::*field, KeywordKind kind = KeywordKind::List,
+                       unsigned places = kHere) {
+  DefinitionKeyword keyword{word, kind, places};
   keyword.list = field;
   return keyword;
 }
@@ -32,45 +37,89 @@ DefinitionKeyword list(const char* word, QStringList Fields::*field, KeywordKind
 
 const std::vector<DefinitionKeyword>& definitionKeywords() {
   static const std::vector<DefinitionKeyword> keywords = {
-      text("TRANSFORMER_NAME:", &Fields::name),
-      number("VERSION:", &Fields::version),
-      text("CATEGORY:", &Fields::category),
-      text("PLUGIN_DIALOG:", &Fields::pluginDialog),
-      number("FEATURE_HOLDING:", &Fields::featureHolding, KeywordKind::Modes),
-      list("INPUT_TAGS:", &Fields::inputTags, KeywordKind::InputList),
-      list("DYNAMIC_INPUT_TAGS:", &Fields::dynamicInputTags, KeywordKind::EncodedList),
-      text("HIDDEN_INPUT_TAG:", &Fields::hiddenInputTag),
-      text("HIDDEN_OUTPUT_TAG:", &Fields::hiddenOutputTag),
-      list("OUTPUT_TAGS:", &Fields::outputTags),
-      list("PRESERVES_ATTRIBUTES:", &Fields::preservesAttributes),
-      list("ATTRIBUTES_ADDED:", &Fields::attributesAdded),
-      list("ALIASES:", &Fields::aliases),
-      list("PARAMETER_NAME:", &Fields::parameterNames, KeywordKind::ParallelList),
-      list("PARAMETER_TYPE:", &Fields::parameterTypes, KeywordKind::ParallelList),
-      list("PARAMETER_PROMPT:", &Fields::parameterPrompts, KeywordKind::ParallelList),
-      list("PARAMETER_DEFAULT:", &Fields::parameterDefaults, KeywordKind::ParallelList),
-      {QLatin1String("PARAMETER_LOOKUP:"), KeywordKind::Lookup},
-      text("MULTIPROCESS:", &Fields::multiProcess),
-      list("LIST_ACTION:", &Fields::listActions, KeywordKind::ParallelList),
-      flag("NUKERS_REQUIRED:", &Fields::nukersRequired),
-      flag("VISIBLE:", &Fields::visible),
-      text("REPLACED_BY:", &Fields::replacedBy),
-      list("PARAMETER_MAPPING:", &Fields::parameterMapping),
-      list("TAG_MAPPING", &Fields::tagMapping),
-      text("DECORATION_NAME:", &Fields::decorationName),
-      flag("DECORATION_LEFT:", &Fields::decorationLeft),
-      list("CANVAS_PROPERTIES:", &Fields::canvasProperties),
-      {kTagDescription, KeywordKind::TagDescription},
-      list("DEPENDENCY:", &Fields::dependencyScripts, KeywordKind::ParallelList),
+      text(kTransformerName, &Fields::name, kBoth),
+      number(kVersion, &Fields::version, KeywordKind::Number, kBoth),
+      text(QLatin1String("CATEGORY:"), &Fields::category),
+      text(QLatin1String("PLUGIN_DIALOG:"), &Fields::pluginDialog),
+      number(QLatin1String("FEATURE_HOLDING:"), &Fields::featureHolding, KeywordKind::Modes),
+      list(QLatin1String("INPUT_TAGS:"), &Fields::inputTags, KeywordKind::InputList),
+      list(QLatin1String("DYNAMIC_INPUT_TAGS:"), &Fields::dynamicInputTags, KeywordKind::EncodedList),
+      text(QLatin1String("HIDDEN_INPUT_TAG:"), &Fields::hiddenInputTag),
+      text(QLatin1String("HIDDEN_OUTPUT_TAG:"), &Fields::hiddenOutputTag),
+      list(QLatin1String("OUTPUT_TAGS:"), &Fields::outputTags),
+      list(QLatin1String("PRESERVES_ATTRIBUTES:"), &Fields::preservesAttributes),
+      list(QLatin1String("ATTRIBUTES_ADDED:"), &Fields::attributesAdded),
+      list(QLatin1String("ALIASES:"), &Fields::aliases),
+      list(kParameterName, &Fields::parameterNames, KeywordKind::ParallelList, kBoth),
+      list(kParameterType, &Fields::parameterTypes, KeywordKind::ParallelList),
+      list(kParameterPrompt, &Fields::parameterPrompts, KeywordKind::ParallelList, kBoth),
+      list(kParameterDefault, &Fields::parameterDefaults, KeywordKind::ParallelList),
+      {kParameterLookup, KeywordKind::Lookup},
+      text(QLatin1String("MULTIPROCESS:"), &Fields::multiProcess),
+      list(QLatin1String("LIST_ACTION:"), &Fields::listActions, KeywordKind::ParallelList),
+      flag(QLatin1String("NUKERS_REQUIRED:"), &Fields::nukersRequired),
+      flag(QLatin1String("VISIBLE:"), &Fields::visible),
+      text(QLatin1String("REPLACED_BY:"), &Fields::replacedBy),
+      list(QLatin1String("PARAMETER_MAPPING:"), &Fields::parameterMapping),
+      list(QLatin1String("TAG_MAPPING"), &Fields::tagMapping),
+      text(QLatin1String("DECORATION_NAME:"), &Fields::decorationName),
+      flag(QLatin1String("DECORATION_LEFT:"), &Fields::decorationLeft),
+      list(QLatin1String("CANVAS_PROPERTIES:"), &Fields::canvasProperties),
+      {kTagDescription, KeywordKind::TagDescription, kBoth},
+      list(QLatin1String("DEPENDENCY:"), &Fields::dependencyScripts, KeywordKind::ParallelList),
+      {kLocalizedName, KeywordKind::Text, DefinitionKeyword::kCompanion},
+      {kCategoryName, KeywordKind::NamePair, DefinitionKeyword::kCompanion},
   };
   return keywords;
+}
+
+const DefinitionKeyword* findDefinitionKeyword(const QString& line, unsigned place) {
+  for (const DefinitionKeyword& keyword : definitionKeywords()) {
+    if ((keyword.places & place) && line.startsWith(keyword.word)) {
+      return &keyword;
+    }
+  }
+  return nullptr;
+}
+
+QString keywordValue(const DefinitionKeyword& keyword, const QString& line) {
+  return line.mid(keyword.word.size()).trimmed();
+}
+
+int featureHoldingBit(const QString& mode) {
+  return mode == TransformerCfg::kNone    ? 1
+         : mode == TransformerCfg::kGroup ? 2
+         : mode == TransformerCfg::kAll   ? 4
+                                          : 0;
+}
+
+int flagValue(const QString& value) {
+  const QString word = value.toLower();
+  if (word == QLatin1String("yes") || word == QLatin1String("true")) {
+    return 1;
+  }
+  return word == QLatin1String("no") || word == QLatin1String("false") ? 0 : -1;
 }
 
 QStringList splitDefinitionList(const QString& value) {
   QStringList pieces = value.split(QLatin1Char(' '), Qt::SkipEmptyParts);
   for (QString& piece : pieces) {
-    if (piece == QLatin1String("<BLANK>"))
-      piece.clear();
+    if (piece == kBlankEntry) {
+      piece = QLatin1String("");
+    }
   }
   return pieces;
+}
+
+bool splitTagDescription(const QString& value, QString& tag, QString& description) {
+  QStringList pieces = splitDefinitionList(value);
+  if (pieces.size() < 2) {
+    return false;
+  }
+  tag = pieces.takeFirst();
+  if (tag.endsWith(QLatin1Char(':'))) {
+    tag.chop(1);
+  }
+  description = pieces.join(QLatin1Char(' '));
+  return true;
 }

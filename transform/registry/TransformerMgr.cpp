@@ -8,6 +8,7 @@
 #include <transform/registry/CompanionFileParser.h>
 #include <transform/registry/DefinitionFileParser.h>
 #include <transform/registry/ExceptionList.h>
+#include <transform/registry/NamedConnections.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 #include <transform/text/MessageStrings.h>
@@ -15,10 +16,24 @@
 
 #include <QFile>
 #include <QRegularExpression>
-#include <QStandardPaths>
-#include <QTextStream>
+#include <QSet>
 
 #include <algorithm>
+#include <utility>
+
+namespace {
+
+const QString kResourceKind = QStringLiteral("transformer");
+
+constexpr long kNoChanges = 370642;
+constexpr long kChanges = 370643;
+constexpr long kVersionHeading = 370644;
+constexpr long kCustomTransformer = 370741;
+constexpr long kNamelessDefinition = 370742;
+constexpr long kNamedVersion = 370743;
+constexpr long kAllChanges = 370744;
+
+}  // namespace
 
 ITransformerMgr::~ITransformerMgr() = default;
 
@@ -35,44 +50,57 @@ TransformerMgr& TransformerMgr::getTransformerMgr() {
   return registry;
 }
 
-TransformerMgr::TransformerMgr() : m_exceptions(std::make_unique<ExceptionList>()) {}
+TransformerMgr::TransformerMgr()
+    : m_exceptions(std::make_unique<ExceptionList>()), m_connections(std::make_unique<NamedConnections>()) {}
+
 TransformerMgr::~TransformerMgr() = default;
 
 void TransformerMgr::reset() {
   m_loaded = false;
-  m_newest.clear();
-  m_versions.clear();
-  m_names.clear();
-  m_visibleNames.clear();
-  m_visibleNameSet.clear();
+  m_prototypes = PrototypeTable();
   m_iteration = 0;
   m_aliases.clear();
   m_categoryDescriptions.clear();
   m_lastError.clear();
   m_localizedCategories.clear();
   m_categoriesByLocalizedName.clear();
-  m_categories.clear();
-  m_categoryIndex.clear();
-  m_connections.clear();
+  m_session = nullptr;
   m_ignored.clear();
   *m_exceptions = ExceptionList();
+  *m_connections = NamedConnections();
 }
 
 void TransformerMgr::loadTransformers(IORXSession* session) {
   reset();
-  m_session = session;
-  if (session)
+  if (session) {
+    m_session = session;
     m_exceptions->readFromHome();
-  loadConnections();
-  for (const QString& folder : ORX_resourceDirectories(QStringLiteral("transformer")))
-    loadFolder(folder);
+  }
+  if (!m_connections->readAll()) {
+    m_lastError = m_connections->errorString();
+  }
+  for (const QString& folder : ORX_resourceDirectories(kResourceKind)) {
+    loadFolder(folder, false);
+  }
   m_loaded = true;
 }
 
-void TransformerMgr::reloadCustomTransformers() {}
+void TransformerMgr::reloadCustomTransformers() {
+  for (const QString& folder : ORX_resourceDirectories(kResourceKind)) {
+    loadFolder(folder, true);
+  }
+}
 
-void TransformerMgr::loadFolder(const QString& folder) {
-  static const QRegularExpression companion(QStringLiteral("^[^/\\\\.].*-localized\\.[a-zA-Z][a-zA-Z]$"));
+void TransformerMgr::loadRemoteTransformer(const QString& path, int version) {
+  const QString file = QORXPrettyUpFileName(path);
+  loadCustomTransformer(file, version, true);
+  if (version == 0) {
+    loadCustomTransformer(file, 1, true);
+  }
+}
+
+void TransformerMgr::loadFolder(const QString& folder, bool onlyCustomTransformers) {
+  static const QRegularExpression anyCompanion(QStringLiteral("^[^/\\\\.].*-localized\\.[a-zA-Z][a-zA-Z]$"));
   const FolderListing listing = FolderListing::files(folder);
   if (listing.failed()) {
     m_lastError = QLatin1String("Error getting file list for folder ") + folder;
@@ -86,140 +114,142 @@ void TransformerMgr::loadFolder(const QString& folder) {
   QStringList companions;
   for (const QString& name : listing.names()) {
     const QString path = folder + QLatin1Char('/') + name;
-    if (companion.match(name).hasMatch()) {
-      if (name.endsWith(companionEnd))
+    if (anyCompanion.match(name).hasMatch()) {
+      if (name.endsWith(companionEnd)) {
         companions.append(path);
+      }
     } else if (name.endsWith(QLatin1String(".ort")) ||
                name.startsWith(QLatin1String("CategoryDefinitions"))) {
-      loadDefinitionFile(path);
+      loadDefinitionFile(path, onlyCustomTransformers);
     }
   }
-  for (const QString& path : companions)
-    loadCompanionFile(path);
+  if (!onlyCustomTransformers) {
+    for (const QString& path : std::as_const(companions)) {
+      loadCompanionFile(path);
+    }
+  }
 }
 
-void TransformerMgr::loadDefinitionFile(const QString& path) {
-  // Such a file holds a custom transformer, which its own loader reads.
-  if (XMLComponentReader::IsFileXMLWorkspace(path))
-    return;
-  QFile file(path);
-  if (!file.open(QIODevice::ReadOnly)) {
-    m_lastError = QLatin1String("Could not open file ") + path;
+void TransformerMgr::noteUnreadable(const QString& path, const QString& reason) {
+  m_lastError = QLatin1String("Could not open file ") + path;
+  if (!reason.isEmpty()) {
+    m_lastError += QLatin1String(": ") + reason;
+  }
+}
+
+void TransformerMgr::loadDefinitionFile(const QString& path, bool onlyCustomTransformers) {
+  if (XMLComponentReader::IsFileXMLWorkspace(path)) {
+    loadCustomTransformer(path, NEWEST_VERSION, false);
     return;
   }
-  DefinitionFileParser parser([this](TransformerDefinition&& definition) { define(definition); },
-                              [this](const QString& category, const QStringList& lines) {
-                                m_categoryDescriptions.insert(category, lines);
-                              });
-  parser.parse(file, path);
+  if (onlyCustomTransformers) {
+    return;
+  }
+  QFile file(path);
+  if (!file.open(QIODevice::ReadOnly)) {
+    noteUnreadable(path, QString());
+    return;
+  }
+  DefinitionFileParser parser;
+  if (!parser.parse(file, path)) {
+    noteUnreadable(path, parser.errorString());
+    return;
+  }
+  for (const CategoryText& category : parser.categories()) {
+    m_categoryDescriptions.insert(category.name, category.texts());
+  }
+  for (const DefinitionText& text : parser.definitions()) {
+    define(DefinitionFileParser::interpret(text));
+  }
+}
+
+void TransformerMgr::loadCustomTransformer(const QString& path, int /*version*/, bool /*replaces*/) {
+  m_lastError = TransformResString(kCustomTransformer, path);
 }
 
 void TransformerMgr::loadCompanionFile(const QString& path) {
   QFile file(path);
   if (!file.open(QIODevice::ReadOnly)) {
-    m_lastError = QLatin1String("Could not open file ") + path;
+    noteUnreadable(path, QString());
     return;
   }
-  CompanionFileParser parser({[this](const CompanionEntry& entry) { localize(entry); },
-                              [this](const QString& category, const QStringList& lines) {
-                                m_categoryDescriptions.insert(category, lines);
-                              },
-                              [this](const QString& category, const QString& localizedName) {
-                                m_localizedCategories.insert(category, localizedName);
-                                m_categoriesByLocalizedName.insert(localizedName, category);
-                              }});
-  parser.parse(file);
-}
-
-void TransformerMgr::loadConnections() {
-  const QStringList folders = {
-      QORXOrxHome(),
-      QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation) + QLatin1String("/orx")};
-  for (const QString& folder : folders) {
-    QFile file(folder + QLatin1String("/connections.list"));
-    if (!file.open(QIODevice::ReadOnly))
-      continue;
-    QTextStream stream(&file);
-    stream.setCodec("utf-8");
-    QString line;
-    while (stream.readLineInto(&line)) {
-      line = line.trimmed();
-      if (!line.isEmpty() && !line.startsWith(QLatin1Char('#')))
-        m_connections.insert(line);
-    }
+  CompanionFileParser parser;
+  if (!parser.parse(file)) {
+    noteUnreadable(path, parser.errorString());
+    return;
+  }
+  for (const CompanionEntry& entry : parser.entries()) {
+    localize(entry);
+  }
+  for (const CategoryText& category : parser.categoryDescriptions()) {
+    m_categoryDescriptions.insert(category.name, category.texts());
+  }
+  for (const CategoryName& category : parser.categoryNames()) {
+    localizeCategory(category.name, category.localizedName);
   }
 }
 
 void TransformerMgr::define(const TransformerDefinition& definition) {
+  if (definition.name.isEmpty()) {
+    m_lastError = TransformResString(kNamelessDefinition, definition.filePath);
+    return;
+  }
   TransformerDefinition fields = definition;
   fields.allowed = m_exceptions->isAllowed(definition.name);
   std::unique_ptr<TransformerCfg> prototype(createTransformerCfg(fields.name, fields.version));
   prototype->configure(fields, m_session);
   prototype->setDefinitionDirectory(this);
-  if (fields.filePath.startsWith(QORXOrxHome() + QLatin1Char('/')))
-    prototype->setTransformerType(TransformerCfg::kBuiltIn);
-  const QStringList aliases = prototype->aliases();
-  registerPrototype(std::move(prototype));
-  for (const QString& alias : aliases) {
-    if (!m_aliases.contains(alias))
+  m_prototypes.add(std::move(prototype));
+  for (const QString& alias : std::as_const(fields.aliases)) {
+    if (!m_aliases.contains(alias)) {
       m_aliases.insert(alias, fields.name);
-  }
-}
-
-bool TransformerMgr::registerPrototype(std::unique_ptr<TransformerCfg> prototype) {
-  const QString name = prototype->getName();
-  const int version = prototype->getVersion();
-  const auto newest = m_newest.constFind(name);
-  const bool isNewName = newest == m_newest.constEnd();
-  if (isNewName) {
-    m_names.append(name);
-    if (prototype->isVisible()) {
-      m_visibleNames.append(name);
-      m_visibleNameSet.insert(name);
     }
   }
-  const bool isNewest = isNewName || version >= newest.value()->getVersion();
-  if (isNewest) {
-    for (const QString& tag : prototype->tags()) {
-      if (!m_categoryIndex.contains(tag))
-        m_categories.append(tag);
-      QStringList& listed = m_categoryIndex[tag];
-      if (!listed.contains(name))
-        listed.append(name);
-    }
-    m_newest.insert(name, prototype.get());
-  }
-  m_versions[name][version] = std::move(prototype);
-  return isNewest;
 }
 
 void TransformerMgr::localize(const CompanionEntry& entry) {
-  const auto versions = m_versions.constFind(entry.name);
-  if (versions == m_versions.constEnd())
+  const PrototypeTable::Versions* versions = m_prototypes.versions(entry.name);
+  if (!versions) {
     return;
-  for (auto version = versions->cbegin(); version != versions->cend(); ++version) {
-    if (entry.hasVersion && entry.version != version.key())
+  }
+  for (const auto& [version, prototype] : *versions) {
+    if (entry.hasVersion && entry.version != version) {
       continue;
-    TransformerCfg& prototype = *version.value();
-    if (!entry.localizedName.isEmpty())
-      prototype.setLocalizedName(entry.localizedName);
-    for (const auto& [parameter, prompt] : entry.prompts) {
-      if (!prompt.isEmpty())
-        prototype.setParameterPrompt(parameter, prompt);
     }
-    for (const auto& [tag, description] : entry.tagDescriptions)
-      prototype.setTagDescription(tag, description);
-    if (!entry.descriptionLines.isEmpty())
-      prototype.setDescriptionLines(entry.descriptionLines);
-    if (!entry.tooltipLines.isEmpty())
-      prototype.setTooltipLines(entry.tooltipLines);
-    if (!entry.changeLog.isEmpty())
-      prototype.setChangeLog(entry.changeLog);
+    if (!entry.localizedName.isEmpty()) {
+      prototype->setLocalizedName(entry.localizedName);
+    }
+    for (const CompanionEntry::Text& prompt : entry.prompts) {
+      if (!prompt.text.isEmpty() && prototype->hasParameter(prompt.name)) {
+        prototype->setParameterPrompt(prompt.name, prompt.text);
+      }
+    }
+    for (const CompanionEntry::Text& tag : entry.tagDescriptions) {
+      prototype->setTagDescription(tag.name, tag.text);
+    }
+    if (!entry.descriptionLines.isEmpty()) {
+      prototype->setDescriptionLines(entry.descriptionLines);
+    }
+    if (!entry.tooltipLines.isEmpty()) {
+      prototype->setTooltipLines(entry.tooltipLines);
+    }
+    if (!entry.changeLog.isEmpty()) {
+      prototype->setChangeLog(entry.changeLog);
+    }
   }
 }
 
+void TransformerMgr::localizeCategory(const QString& category, const QString& localizedName) {
+  const QString before = m_localizedCategories.value(category);
+  if (m_categoriesByLocalizedName.value(before) == category) {
+    m_categoriesByLocalizedName.remove(before);
+  }
+  m_localizedCategories.insert(category, localizedName);
+  m_categoriesByLocalizedName.insert(localizedName, category);
+}
+
 void TransformerMgr::getDefinitionFileName(const IORXString& name, IORXString& fileName) const {
-  const TransformerCfg* newest = m_newest.value(ORXToQString(name));
+  const TransformerCfg* newest = m_prototypes.newest(ORXToQString(name));
   ORXAssign(fileName, newest ? newest->getFileName() : QString());
 }
 
@@ -228,20 +258,9 @@ ITransformerCfg* TransformerMgr::getTransformer(const IORXString& name, int vers
 }
 
 const TransformerCfg* TransformerMgr::findPrototype(const QString& name, int version) const {
-  if (version == NEWEST_VERSION)
-    return m_newest.value(name);
-  const auto versions = m_versions.constFind(name);
-  if (versions == m_versions.constEnd())
-    return nullptr;
-  if (version == OLDEST_VERSION) {
-    const TransformerCfg* oldest = nullptr;
-    for (const std::shared_ptr<TransformerCfg>& prototype : *versions) {
-      if (prototype->getVersion() >= 0 && (!oldest || prototype->getVersion() < oldest->getVersion()))
-        oldest = prototype.get();
-    }
-    return oldest;
-  }
-  return versions->value(version).get();
+  return version == NEWEST_VERSION   ? m_prototypes.newest(name)
+         : version == OLDEST_VERSION ? m_prototypes.oldest(name)
+                                     : m_prototypes.find(name, version);
 }
 
 std::unique_ptr<TransformerCfg> TransformerMgr::copyOf(const QString& name, int version) const {
@@ -272,33 +291,41 @@ TransformerCfg* TransformerMgr::getTransformer(const QString& name, int version)
 }
 
 bool TransformerMgr::transformerExists(const QString& name, int version) const {
+  const bool anyVersion = version == NEWEST_VERSION || version == OLDEST_VERSION;
   QSet<QString> followed;
-  QString asked = name;
-  for (;;) {
-    const bool anyVersion = version == NEWEST_VERSION || version == OLDEST_VERSION;
-    if (anyVersion ? m_newest.contains(asked) : m_versions.value(asked).contains(version))
+  for (QString asked = name;; asked = m_aliases.value(asked)) {
+    if (anyVersion ? m_prototypes.contains(asked) : m_prototypes.find(asked, version) != nullptr) {
       return true;
-    if (followed.contains(asked) || !m_aliases.contains(asked))
+    }
+    if (followed.contains(asked) || !m_aliases.contains(asked)) {
       return false;
+    }
     followed.insert(asked);
-    asked = m_aliases.value(asked);
   }
 }
 
 int TransformerMgr::currentTransformerVersion(const QString& name) const {
-  const TransformerCfg* newest = m_newest.value(name);
+  const TransformerCfg* newest = m_prototypes.newest(name);
   return newest ? newest->getVersion() : -1;
+}
+
+QList<int> TransformerMgr::transformerVersions(const QString& name) const {
+  QList<int> result;
+  if (const PrototypeTable::Versions* versions = m_prototypes.versions(name)) {
+    for (const auto& [version, prototype] : *versions) {
+      result.append(version);
+    }
+  }
+  return result;
 }
 
 TransformerCfg* TransformerMgr::getTransformerWithGUID(const QString& guid) const {
   // By name and version, so that the answer does not depend on a hash.
-  for (const QString& name : m_names) {
-    const auto& versions = *m_versions.constFind(name);
-    QList<int> numbers = versions.keys();
-    std::sort(numbers.begin(), numbers.end());
-    for (const int number : numbers) {
-      if (versions.value(number)->getGUID() == guid)
-        return versions.value(number)->getCopy();
+  for (const QString& name : m_prototypes.names()) {
+    for (const auto& [version, prototype] : *m_prototypes.versions(name)) {
+      if (prototype->getGUID() == guid) {
+        return prototype->getCopy();
+      }
     }
   }
   return nullptr;
@@ -317,20 +344,21 @@ TransformerCfg* TransformerMgr::deserialize(const QString& text) {
 }
 
 TransformerCfg* TransformerMgr::getNextTransformer() {
-  return m_iteration < m_names.size() ? getTransformer(m_names.at(m_iteration++), NEWEST_VERSION) : nullptr;
+  const QStringList& names = m_prototypes.names();
+  return m_iteration < names.size() ? getTransformer(names.at(m_iteration++), NEWEST_VERSION) : nullptr;
 }
 
 bool TransformerMgr::isVisibleAlias(const QString& alias) const {
-  if (m_visibleNameSet.contains(alias))
+  if (m_prototypes.isVisible(alias))
     return false;
   const auto target = m_aliases.constFind(alias);
-  return target != m_aliases.constEnd() && m_visibleNameSet.contains(target.value());
+  return target != m_aliases.constEnd() && m_prototypes.isVisible(target.value());
 }
 
 QStringList TransformerMgr::getVisibleTransformerAliases() const {
   QStringList result;
   for (auto alias = m_aliases.cbegin(); alias != m_aliases.cend(); ++alias) {
-    if (m_visibleNameSet.contains(alias.value()))
+    if (m_prototypes.isVisible(alias.value()))
       result.append(alias.key());
   }
   result.sort();
@@ -338,11 +366,11 @@ QStringList TransformerMgr::getVisibleTransformerAliases() const {
 }
 
 void TransformerMgr::getCategories(IORXStringArray& categories) const {
-  ORXAssign(categories, m_categories);
+  ORXAssign(categories, m_prototypes.categories());
 }
 
 QStringList TransformerMgr::getCategoryTransformers(const QString& category) const {
-  return m_categoryIndex.value(getCategoryNameFromLocalizedCategoryName(category));
+  return m_prototypes.namesOf(getCategoryNameFromLocalizedCategoryName(category));
 }
 
 bool TransformerMgr::getCategoryDesc(const QString& category, QStringList& lines) const {
@@ -362,10 +390,13 @@ QString TransformerMgr::getCategoryNameFromLocalizedCategoryName(const QString& 
 }
 
 bool TransformerMgr::isTransformerIgnored(const IORXString& name, int version) const {
-  const QString wanted = ORXToQString(name);
+  return isTransformerIgnored(ORXToQString(name), version);
+}
+
+bool TransformerMgr::isTransformerIgnored(const QString& name, int version) const {
+  const bool anyVersion = version == NEWEST_VERSION || version == OLDEST_VERSION;
   return std::any_of(m_ignored.begin(), m_ignored.end(), [&](const IgnoredTransformer& ignored) {
-    return ignored.name == wanted &&
-           (version == NEWEST_VERSION || version == OLDEST_VERSION || ignored.version == version);
+    return ignored.name == name && (anyVersion || ignored.version == version);
   });
 }
 
@@ -374,41 +405,58 @@ void TransformerMgr::getChangeLog(ITransformerCfg* configuration, IORXString& pa
 }
 
 QString TransformerMgr::changeLog(TransformerCfg* configuration) const {
-  if (!configuration)
+  if (!configuration) {
     return QString();
+  }
   const bool isReplaced = !configuration->isVisible() && !configuration->replacedBy().isEmpty();
   const TransformerCfg* target =
-      m_newest.value(isReplaced ? configuration->replacedBy() : configuration->getName());
-  if (!target)
+      m_prototypes.newest(isReplaced ? configuration->replacedBy() : configuration->getName());
+  if (!target) {
     return QString();
+  }
   return changeLog(configuration->getName(), configuration->getVersion(), target->getName(),
                    target->getVersion())
       .join(QLatin1Char('\n'));
 }
 
-QStringList TransformerMgr::changeLog(const QString& name, int fromVersion, const QString& newName,
-                                      int toVersion) const {
-  ChangeLogPage page(
-      TransformResString(370643, {name, QString::number(fromVersion), newName, QString::number(toVersion)}));
-  // Newest first; the version that one comes from is not news, unless it is all there is.
-  const int first = name == newName && toVersion > fromVersion ? fromVersion + 1
-                    : name == newName                          ? toVersion
-                                                               : 0;
-  bool anything = false;
-  const auto versions = m_versions.constFind(newName);
-  if (versions != m_versions.constEnd()) {
-    QList<int> numbers = versions->keys();
-    std::sort(numbers.begin(), numbers.end(), std::greater<>());
-    for (const int number : numbers) {
-      const QStringList entries = versions->value(number)->getChangeLog();
-      if (number < first || number > toVersion || entries.isEmpty())
-        continue;
-      page.addVersion(TransformResString(370644, QString::number(number)), entries);
-      anything = true;
+void TransformerMgr::addChanges(ChangeLogPage& page, const QString& name, int first, int last,
+                                bool withName) const {
+  const PrototypeTable::Versions* versions = m_prototypes.versions(name);
+  if (!versions) {
+    return;
+  }
+  for (auto entry = versions->rbegin(); entry != versions->rend(); ++entry) {
+    const auto& [version, prototype] = *entry;
+    if (version >= first && version <= last) {
+      const QString number = QString::number(version);
+      page.addVersion(withName ? TransformResString(kNamedVersion, {prototype->getLocalizedName(), number})
+                               : TransformResString(kVersionHeading, number),
+                      prototype->getChangeLog());
     }
   }
-  if (!anything)
-    page.addVersion(TransformResString(370642), {});
+}
+
+QStringList TransformerMgr::changeLog(const QString& name, int fromVersion, const QString& newName,
+                                      int toVersion) const {
+  const auto shownName = [this](const QString& asked) {
+    const TransformerCfg* newest = m_prototypes.newest(asked);
+    return newest ? newest->getLocalizedName() : asked;
+  };
+  const int last = toVersion == NEWEST_VERSION ? currentTransformerVersion(newName) : toVersion;
+  const QString lastText = QString::number(last);
+  ChangeLogPage page(fromVersion < 0
+                         ? TransformResString(kAllChanges, {shownName(newName), lastText})
+                         : TransformResString(kChanges, {shownName(name), QString::number(fromVersion),
+                                                         shownName(newName), lastText}));
+  if (name != newName) {
+    addChanges(page, newName, 0, last, true);
+    addChanges(page, name, std::max(fromVersion, -1) + 1, currentTransformerVersion(name), true);
+  } else {
+    addChanges(page, name, fromVersion == last ? last : std::max(fromVersion, -1) + 1, last, false);
+  }
+  if (page.isEmpty()) {
+    page.addText(TransformResString(kNoChanges));
+  }
   return page.lines();
 }
 
@@ -417,7 +465,7 @@ QString TransformerMgr::parameterNotSetDisplayString() const {
 }
 
 bool TransformerMgr::isConnectionKnown(const QString& encodedName) const {
-  return m_connections.contains(encodedName);
+  return m_connections->contains(encodedName);
 }
 
 std::vector<GUIType> TransformerMgr::memberDefinitions(const GUIType& type) const {

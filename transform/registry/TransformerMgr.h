@@ -4,26 +4,28 @@
 // Loading never fails as a whole: a file or folder that cannot be read is recorded in lastError() and passed
 // over. Lookups answer null, false, -1 or an empty value. Used by one thread at a time.
 //
-// Named connections are one encoded name a line, in connections.list below the home and in the user's
-// configuration folder ($XDG_CONFIG_HOME/orx, by default ~/.config/orx); empty lines and lines that begin
-// with "#" are skipped.
+// Copies handed out keep the session and ask this object about connections and member types, so that both
+// must outlive them.
 #pragma once
 
 #include <platform/Export.h>
 #include <transform/core/TransformerSource.h>
 #include <transform/registry/ITransformerMgr.h>
+#include <transform/registry/PrototypeTable.h>
 
 #include <QHash>
-#include <QSet>
+#include <QList>
 #include <QString>
 #include <QStringList>
 
 #include <list>
 #include <memory>
+#include <vector>
 
 class ChangeLogPage;
 class ExceptionList;
 class IORXStringArray;
+class NamedConnections;
 class TransformerCfg;
 struct CompanionEntry;
 struct TransformerDefinition;
@@ -51,11 +53,17 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   void getChangeLog(ITransformerCfg* configuration, IORXString& page) const override;
   bool isTransformerIgnored(const IORXString& name, int version) const override;
 
-  // A new copy, owned by the caller; null when name (or alias) or version is unknown.
+  // Reads one custom-transformer file, of version 0 also version 1. Unlike the load of a folder it replaces
+  // what is there under the same name and version.
+  void loadRemoteTransformer(const QString& path, int version);
+
+  // A new copy, owned by the caller, with its localised name as identifier; null when name (or alias) or
+  // version is unknown.
   TransformerCfg* getTransformer(const QString& name, int version);
   bool transformerExists(const QString& name, int version) const;
   // -1 for an unknown name; aliases are not followed.
   int currentTransformerVersion(const QString& name) const;
+  // The identifier of the copy is not set. Owned by the caller; null when there is none.
   TransformerCfg* getTransformerWithGUID(const QString& guid) const;
   // A new copy restored from its serialised form; null when it names no known transformer.
   TransformerCfg* deserialize(const QString& text);
@@ -66,7 +74,7 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   bool isVisibleAlias(const QString& alias) const;
   QStringList getVisibleTransformerAliases() const;
   // In order of first appearance.
-  QStringList getCategories() const { return m_categories; }
+  QStringList getCategories() const { return m_prototypes.categories(); }
   void getCategories(IORXStringArray& categories) const;
   // `category` may be the localised name.
   QStringList getCategoryTransformers(const QString& category) const;
@@ -75,9 +83,21 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   QString getCategoryNameFromLocalizedCategoryName(const QString& localizedName) const;
 
   const std::list<IgnoredTransformer>& ignoredTransformers() const { return m_ignored; }
+  // In order of first registration.
+  const QStringList& transformerNames() const { return m_prototypes.names(); }
+  const QStringList& visibleTransformerNames() const { return m_prototypes.visibleNames(); }
+  // From the lowest up; empty for an unknown name. Aliases are not followed.
+  QList<int> transformerVersions(const QString& name) const;
+  bool isTransformerIgnored(const QString& name, int version) const;
+  // The last failure since the load began; empty when there was none.
   const QString& lastError() const { return m_lastError; }
-  // A whole HTML page; empty when there is nothing newer to compare with.
+  // A whole HTML page that leads from the configuration to the newest version of the transformer, or of the
+  // one that replaces it; empty when neither is known.
   QString changeLog(TransformerCfg* configuration) const;
+  // The same page as lines: what came after `fromVersion` up to `toVersion`, newest first. Under another new
+  // name the later versions of the old name follow those of the new one. With a negative `fromVersion` all
+  // versions count; where both versions are the same one, it alone is shown. `toVersion` may be
+  // NEWEST_VERSION.
   QStringList changeLog(const QString& name, int fromVersion, const QString& newName, int toVersion) const;
   // The text shown for a parameter that has no value.
   QString parameterNotSetDisplayString() const;
@@ -92,35 +112,29 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   ~TransformerMgr() override;
 
   void reset();
-  void loadFolder(const QString& folder);
-  void loadDefinitionFile(const QString& path);
+  void loadFolder(const QString& folder, bool onlyCustomTransformers);
+  void loadDefinitionFile(const QString& path, bool onlyCustomTransformers);
+  void loadCustomTransformer(const QString& path, int version, bool replaces);
   void loadCompanionFile(const QString& path);
-  void loadConnections();
   void define(const TransformerDefinition& definition);
-  // Takes the prototype over. True when it is the newest of its name.
-  bool registerPrototype(std::unique_ptr<TransformerCfg> prototype);
   void localize(const CompanionEntry& entry);
+  void localizeCategory(const QString& category, const QString& localizedName);
+  void noteUnreadable(const QString& path, const QString& reason);
   // Null when there is none; aliases are not followed.
   const TransformerCfg* findPrototype(const QString& name, int version) const;
   std::unique_ptr<TransformerCfg> copyOf(const QString& name, int version) const;
+  void addChanges(ChangeLogPage& page, const QString& name, int first, int last, bool withName) const;
 
-  // The version table owns; the newest table points into it.
-  QHash<QString, QHash<int, std::shared_ptr<TransformerCfg>>> m_versions;
-  QHash<QString, TransformerCfg*> m_newest;
-  QStringList m_names;
-  QStringList m_visibleNames;
-  QSet<QString> m_visibleNameSet;
+  PrototypeTable m_prototypes;
   int m_iteration = 0;
   QHash<QString, QString> m_aliases;
   QHash<QString, QStringList> m_categoryDescriptions;
   QString m_lastError;
   QHash<QString, QString> m_localizedCategories;
   QHash<QString, QString> m_categoriesByLocalizedName;
-  QStringList m_categories;
-  QHash<QString, QStringList> m_categoryIndex;
-  QSet<QString> m_connections;
   IORXSession* m_session = nullptr;
   bool m_loaded = false;
   std::list<IgnoredTransformer> m_ignored;
   std::unique_ptr<ExceptionList> m_exceptions;
+  std::unique_ptr<NamedConnections> m_connections;
 };

@@ -1,30 +1,26 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 
-#include <limits>
-#include <vector>
-
-namespace {
-
-// Walked from the top; the first rule that fits in name and version decides.
-struct Rule {
-  QLatin1String name;
-  int firstVersion = 0;
-  int lastVersion = std::numeric_limits<int>::max();
-  TransformerCfg* (*make)() = nullptr;
-};
-
-const std::vector<Rule>& rules() {
-  static const std::vector<Rule> table = {};
-  return table;
+const std::vector<TransformerCfgRule>& transformerCfgRules() {
+  static const std::vector<TransformerCfgRule> rules = {};
+  return rules;
 }
 
-}  // namespace
+const TransformerCfgRule* findTransformerCfgRule(const QString& name, int version) {
+  return findTransformerCfgRule(transformerCfgRules(), name, version);
+}
+
+const TransformerCfgRule* findTransformerCfgRule(const std::vector<TransformerCfgRule>& rules,
+                                                 const QString& name, int version) {
+  for (const TransformerCfgRule& rule : rules) {
+    if (name == rule.name && version >= rule.firstVersion && version <= rule.lastVersion) {
+      return &rule;
+    }
+  }
+  return nullptr;
+}
 
 TransformerCfg* createTransformerCfg(const QString& name, int version) {
-  for (const Rule& rule : rules()) {
-    if (name == rule.name && version >= rule.firstVersion && version <= rule.lastVersion)
-      return rule.make();
-  }
-  return new TransformerCfg;
+  const TransformerCfgRule* rule = findTransformerCfgRule(name, version);
+  return rule ? rule->make() : new TransformerCfg;
 }

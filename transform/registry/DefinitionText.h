@@ -1,0 +1,38 @@
+// One definition as it stands in its file, and what the file says of categories: collected lines, nothing
+// taken from them yet. DefinitionFileParser::interpret() makes a TransformerDefinition of it.
+#pragma once
+
+#include <transform/registry/DefinitionLines.h>
+
+#include <QString>
+#include <QStringList>
+
+#include <vector>
+
+struct DefinitionText {
+  QString filePath;
+  std::vector<DefinitionLine> header;  // trimmed, as are the blocks
+  std::vector<DefinitionLine> templateLines;
+  std::vector<DefinitionLine> description;
+  std::vector<DefinitionLine> tooltip;
+  std::vector<DefinitionLine> changeLog;
+  // Where it stands in the file, in bytes: from its first line up to and with the end of its template. These
+  // bytes alone, read again, give the definition.
+  qint64 offset = 0;
+  qint64 size = 0;
+
+  bool isEmpty() const {
+    return header.empty() && templateLines.empty() && description.empty() && tooltip.empty() &&
+           changeLog.empty();
+  }
+};
+
+QStringList textsOf(const std::vector<DefinitionLine>& lines);
+
+struct CategoryText {
+  QString name;
+  std::vector<DefinitionLine> lines;
+  int line = 0;  // where the block begins, from 1
+
+  QStringList texts() const { return textsOf(lines); }
+};
