@@ -23,17 +23,21 @@
 #include <QString>
 #include <QStringList>
 
+#include <functional>
 #include <memory>
 #include <vector>
 
 class AttributePassage;
 class AttributeReferences;
 class AttributeUnion;
+class CompiledTemplate;
 class ConfiguredDefinition;
 class DefinitionDirectory;
 class IORXSession;
 class MFBuffer;
+class ParameterSubstitution;
 class QTextStream;
+class TemplateExpansion;
 class TransformerCfgListener;
 class TransformerSource;
 class WorkspaceParameterDirectory;
@@ -214,6 +218,10 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   virtual void substOutputs(QStringList& lines) const;
   virtual void substParametersForToolTips(QStringList& lines) const;
   virtual void addAttributesToList(const AddAttributesInfo& info, QStringList& result) const;
+  // Whether substInputs() and substOutputs() are those of TransformerCfg, so that the ports may be filled in
+  // together with the parameters. The base answers for its own class alone, so every other class is asked step
+  // by step; one that overrides neither may answer `typeid(*this) == typeid(ThatClass)`.
+  virtual bool hasPlainPorts() const;
 
   // --- configuration ---------------------------------------------------------------------------------------
 
@@ -421,6 +429,16 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   // The definition, or an empty one before configure().
   const ConfiguredDefinition& configured() const;
   void ensureBaseGuid();
+
+  // The statements of this instance, without writing them. False when values insert each other without end.
+  bool expandTemplate(MFBuffer& buffer, QStringList& lines);
+  bool expandInOrder(const ParameterSubstitution& values, QStringList& lines);
+  bool fillPorts(TemplateExpansion& expansion, const CompiledTemplate& compiled,
+                 const ParameterSubstitution& values) const;
+  void fillInstanceTokens(const std::function<bool(const QString& token)>& holds,
+                          const std::function<void(const QString& token, const QString& text)>& substitute);
+  QString lookedUp(MFBuffer& buffer, const QString& name, const TransformParamCfg& record,
+                   const QString& value) const;
 
   std::shared_ptr<const ConfiguredDefinition> m_definition;  // null before configure()
   std::shared_ptr<const PreservedAttributes> m_preserved;    // null: what the definition says

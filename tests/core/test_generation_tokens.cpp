@@ -1,0 +1,236 @@
+#include "GenerationSetup.h"
+#include <transform/core/CompiledTemplate.h>
+#include <transform/core/ConfiguredDefinition.h>
+#include <transform/core/OrderedSubstitution.h>
+
+#include <gtest/gtest.h>
+
+#include <random>
+
+namespace {
+
+// Takes the ports step by step, as any class of its own does.
+class StepwiseCfg : public TransformerCfg {};
+
+TEST(Tokens, SubstituteAndDropLines) {
+  struct Case {
+    QStringList lines;
+    QString value;
+    QStringList expected;
+  };
+  const Case cases[] = {
+      {{"$(P)"}, "", {}},
+      {{"A $(P)"}, "", {"A "}},
+      {{"", "  ", "$(P)"}, "  ", {"", "  "}},
+      {{"$(P)$(P)", "$(p)", "$(P"}, "x", {"xx", "$(p)", "$(P"}},
+      {{"$(P)"}, "$(P)", {"$(P)"}},
+      {{"$($(P))"}, "P", {"$(P)"}},
+      {{"$$(P)"}, "(P)", {"$(P)"}},
+  };
+  for (const Case& c : cases) {
+    QStringList lines = c.lines;
+    TransformerCfg::substToken(lines, "P", c.value);
+    EXPECT_EQ(lines, c.expected) << c.lines.join('|').toStdString();
+    EXPECT_EQ(TransformerCfg::containsToken(lines, "P"), lines.join('\n').contains("$(P)"));
+  }
+}
+
+TEST(Tokens, NameThatIsNoPlainToken) {
+  QStringList lines{"a $($(A)_B) b", "$(A)"};
+  TransformerCfg::substToken(lines, "$(A)_B", "x");
+  EXPECT_EQ(lines, (QStringList{"a x b", "$(A)"}));
+}
+
+TEST(Tokens, RemoveClauses) {
+  struct Case {
+    QStringList lines;
+    bool wildcard;
+    QStringList expected;
+  };
+  const Case cases[] = {
+      {{"x", "O FEATURE_TYPE $(OUTPUT_A_FTYPE)", "more", "$(OUTPUT_A_FUNCS)", "y"}, false, {"x", "y"}},
+      {{"$(OUTPUT_A_FTYPE) $(OUTPUT_A_FUNCS)", "$(OUTPUT_B_FTYPE)"}, false, {"$(OUTPUT_B_FTYPE)"}},
+      {{"$(OUTPUT_A_FTYPE)", "m", "", "$(OUTPUT_A_FUNCS)"}, false, {"", "$(OUTPUT_A_FUNCS)"}},
+      {{"$(OUTPUT_A_FTYPE)", "m", "OUTPUT B FEATURE_TYPE b", "z"}, false, {"OUTPUT B FEATURE_TYPE b", "z"}},
+      {{"$(OUTPUT_A_FTYPE)", "OUTPUT A FEATURE_TYPE $(OUTPUT_A_FUNCS)", "z"}, false, {"z"}},
+      {{"OUTPUT A FEATURE_TYPE \t*", "$(OUTPUT_A_FUNCS)", "OUTPUT B FEATURE_TYPE b"},
+       true,
+       {"OUTPUT B FEATURE_TYPE b"}},
+      {{"OUTPUT A FEATURE_TYPE *"}, false, {"OUTPUT A FEATURE_TYPE *"}},
+  };
+  for (const Case& c : cases) {
+    QStringList lines = c.lines;
+    TransformerCfg::removeOutputClause(lines, "A", c.wildcard);
+    EXPECT_EQ(lines, c.expected) << c.lines.join('|').toStdString();
+  }
+}
+
+TEST(Tokens, Ports) {
+  const TestDefinition definition{{"IN:ALIAS", "SIDE", "LAST"},
+                                  {"OUT", "NONE"},
+                                  {},
+                                  {"F $(INPUT_LINES) end", "$(INPUT_SIDE_LINES)", "S $(INPUT_IN_LINES)",
+                                   "O $(OUTPUT_OUT_FTYPE) $(OUTPUT_OUT_FUNCS)",
+                                   "N $(OUTPUT_NONE_FTYPE) "
+                                   "$(OUTPUT_NONE_FUNCS)"}};
+  for (const bool stepwise : {false, true}) {
+    std::unique_ptr<TransformerCfg> cfg(stepwise ? new StepwiseCfg : new TransformerCfg);
+    configure(*cfg, definition);
+    cfg->addInputFeatureType("IN", "a");
+    cfg->addInputFeatureType("IN", "b c");
+    cfg->addInputFilter("IN", "WHERE 1");
+    cfg->setOutputFeatureType("OUT", "o (1)");
+    cfg->setOutputTagFuncs("OUT", {"@F(1)", "@F(2)"});
+    TextBuffer buffer;
+    ASSERT_TRUE(cfg->doInstantiate(buffer, true));
+    const QString pad = QString(" \\\n");
+    const auto joined = [&](const QStringList& lines) {
+      QString text;
+      for (int i = 0; i < lines.size(); ++i) {
+        text += i + 1 < lines.size() ? lines[i].leftJustified(70) + pad : lines[i] + "\n\n";
+      }
+      return text;
+    };
+    EXPECT_EQ(buffer.text().toStdString(),
+              (joined({"F INPUT ALIAS FEATURE_TYPE a WHERE 1", "   INPUT ALIAS FEATURE_TYPE \"b c\"",
+                       "       end"}) +
+               joined({"S INPUT ALIAS FEATURE_TYPE a WHERE 1", "   INPUT ALIAS FEATURE_TYPE \"b c\""}) +
+               joined({"O \"o (1)\"     @F(1)", "    @F(2)"}))
+                  .toStdString())
+        << stepwise;
+    EXPECT_EQ(cfg->getTransformFactoryInputLines(),
+              (QStringList{"   INPUT ALIAS FEATURE_TYPE a WHERE 1", "   INPUT ALIAS FEATURE_TYPE \"b c\""}));
+  }
+  TestDefinition kept = definition;
+  kept.nukers = true;
+  EXPECT_EQ(statementsOf(*makeCfg(kept)).last(), "N \"\"");
+}
+
+TEST(Tokens, InstanceTokens) {
+  const auto cfg = makeCfg({{},
+                            {},
+                            {{"XFORMER_NAME", "TEXT", "a b$(M)"},
+                             {"A", "TEXT_ENCODED", "x<space>y"},
+                             {"G", "GROUP", ""},
+                             {"U", "OMITTABLE TEXT", "<Unused>"},
+                             {"T", "TEXT", "p \"q"}},
+                            {"$(XFORMER_NAME)", "$(ORX_UUID)", "$(XFORMER_NAME_ENCODED)|X",
+                             "V $(ORX_PARM_VAL_LIST)", "S $(XFORMER_SCHEMA)", "U $(U) $(T)", "E $(ENGINE)"}});
+  cfg->setInputAttributes("", QStringList());
+  const QStringList first = statementsOf(*cfg);
+  const QStringList second = statementsOf(*cfg);
+  EXPECT_EQ(first.value(0), "\"a b$(M)\"");
+  EXPECT_EQ(first.value(1), "a b$(M)_g10");
+  EXPECT_EQ(second.value(1), "a b$(M)_g11");
+  EXPECT_EQ(first.value(2), "a<space>b$(M)|X");
+  EXPECT_EQ(first.value(3).simplified(), "V A x<space>y T \"p \\\"q\"");
+  EXPECT_EQ(first.value(4), "S");
+  EXPECT_EQ(first.value(5), "E $(ENGINE)");
+}
+
+TEST(Tokens, Schema) {
+  const auto cfg = makeCfg({{"IN"}, {}, {}, {"$(XFORMER_SCHEMA)"}});
+  cfg->setInputAttributes("IN", {"a b", "list{}.x", "c"});
+  EXPECT_EQ(statementsOf(*cfg), QStringList("a<space>b,varchar<leftparenthesis>255<rightparenthesis>,c,"
+                                            "varchar<leftparenthesis>255<rightparenthesis>"));
+}
+
+TEST(Tokens, ValuesThatHoldTokens) {
+  const RunTimeListener listener;
+  struct Case {
+    QString first;
+    QString second;
+    QString expected;
+  };
+  const Case cases[] = {
+      {"$(P2)", "x", "x"},         // comes in before its token is substituted
+      {"x", "$(P1)", "x"},         // deferred: once more
+      {"$(P1)y", "z", "$(P1)yy"},  // its own token: twice and no further
+      {"$(GLOBAL)", "$[P1]", "$(GLOBAL)"},
+  };
+  for (const Case& c : cases) {
+    const auto cfg =
+        makeCfg({{}, {}, {{"P1", "TEXT", c.first}, {"P2", "TEXT", c.second}}, {"$(P1) | $(P2)"}});
+    cfg->setListener(const_cast<RunTimeListener*>(&listener));
+    EXPECT_EQ(statementsOf(*cfg).value(0).section(" | ", 0, 0), c.expected) << c.first.toStdString();
+  }
+}
+
+TEST(Tokens, ValuesThatInsertEachOtherWithoutEnd) {
+  TestDefinition definition{{}, {}, {}, {"$(P0)"}};
+  for (int i = 0; i < 60; ++i) {
+    definition.parameters.append({QString("P%1").arg(i), "TEXT", QString("$(P%1)$(P%1)").arg(i + 1)});
+  }
+  const auto cfg = makeCfg(definition);
+  EXPECT_EQ(cfg->findUnwritableValues().keys(), QStringList("P0"));
+  TextBuffer buffer;
+  EXPECT_FALSE(cfg->instantiate(buffer, QString()));
+  EXPECT_EQ(buffer.text(), "");
+}
+
+// --- the single pass against the order of the contract
+// ------------------------------------------------------
+
+QString replaceOne(const QStringList& pieces, std::mt19937& random) {
+  return pieces.at(int(random() % unsigned(pieces.size())));
+}
+
+// As the contract has it, in the plainest way.
+QStringList inOrder(QStringList lines, const QVector<QPair<QString, QString>>& values) {
+  for (const auto& value : values) {
+    QStringList left;
+    for (QString line : lines) {
+      const bool wasBlank = line.trimmed().isEmpty();
+      line.replace("$(" + value.first + ")", value.second);
+      if (wasBlank || !line.trimmed().isEmpty()) {
+        left << line;
+      }
+    }
+    lines = left;
+  }
+  return lines;
+}
+
+TEST(Tokens, SinglePassEqualsOrder) {
+  std::mt19937 random(7);
+  const QStringList text{" ",    "x",    "$",     "(",    ")",  "$(",     "A",       "$(A)",
+                         "$(B)", "$(C)", "$(AB)", "$(M)", "\t", "INPUT ", "$(A)$(B)"};
+  const QStringList plainText{" ", "x", "$(A)", "$(B)", "$(C)", "$(AB)", "$(M)", ""};
+  const QStringList values{"", " ", "v", "$(B)", "$(M)", "$", "(B)", "B", "$(", "w x", ")"};
+  int single = 0;
+  for (int round = 0; round < 4000; ++round) {
+    QStringList lines;
+    for (unsigned i = random() % 5 + 1; i > 0; --i) {
+      QString line;
+      for (unsigned j = random() % 6; j > 0; --j) {
+        line += replaceOne(round % 2 ? text : plainText, random);
+      }
+      lines << line;
+    }
+    TestDefinition definition{{}, {}, {{"XFORMER_NAME", "TEXT", "n"}}, lines};
+    QVector<QPair<QString, QString>> expected{{"XFORMER_NAME", "n"}};
+    for (const char* name : {"C", "AB", "A", "B"}) {
+      const QString value = replaceOne(values, random);
+      definition.parameters.append({name, "TEXT", value});
+      expected.append({name, value});
+    }
+    const auto cfg = makeCfg(definition);
+    StepwiseCfg stepwise;
+    configure(stepwise, definition);
+    TextBuffer buffer;
+    TextBuffer stepBuffer;
+    ASSERT_TRUE(cfg->doInstantiate(buffer, true));
+    ASSERT_TRUE(stepwise.doInstantiate(stepBuffer, true));
+    TextBuffer reference;
+    for (const QString& line : inOrder(lines, expected)) {
+      reference.add(line);
+      reference.flush();
+    }
+    ASSERT_EQ(buffer.text(), reference.text()) << lines.join("|").toStdString();
+    ASSERT_EQ(stepBuffer.text(), reference.text()) << lines.join("|").toStdString();
+    single += cfg->definition()->compiledTemplate && cfg->definition()->compiledTemplate->isPlain();
+  }
+  EXPECT_GT(single, 1500);  // else the single pass is not tried
+}
+
+}  // namespace

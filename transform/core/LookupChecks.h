@@ -1,0 +1,31 @@
+// What the fixed texts of the lookup fragments cannot carry. References to macros count as harmless words:
+// the engine puts the macros' values in their places before it runs a fragment.
+//
+// Each function answers with the number of the message that says why, or 0.
+#pragma once
+
+#include <platform/Export.h>
+#include <transform/core/LookupWriters.h>
+
+namespace lookup_checks {
+
+ORX_EXPORT long refuseChoiceBox(const ChoiceList& choices, const BoxLookup& lookup);
+ORX_EXPORT long refuseListBox(const ChoiceList& choices, const BoxLookup& lookup);
+ORX_EXPORT long refuseChoiceProcedure(const ChoiceList& choices, const QString& procedure,
+                                      const QString& value);
+
+// Characters that no line of the mapping file can carry: line breaks, null characters, broken surrogate
+// pairs.
+ORX_EXPORT bool isOneLine(const QString& text);
+
+constexpr long kBreaksLine = 370720;
+constexpr long kUnclosedReference = 370721;
+constexpr long kEndsInBackslash = 370722;
+constexpr long kValueInScript = 370723;
+constexpr long kChoiceInScript = 370724;
+constexpr long kPromptInScript = 370725;
+constexpr long kIdentifierInScript = 370726;
+constexpr long kGrowsWithoutEnd = 370727;
+constexpr long kNameInMacro = 370728;
+
+}  // namespace lookup_checks

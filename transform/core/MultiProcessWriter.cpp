@@ -1,0 +1,49 @@
+#include <transform/core/Keywords.h>
+#include <transform/core/MultiProcessWriter.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/text/MFBuffer.h>
+#include <transform/text/TextHelpers.h>
+
+#include <algorithm>
+
+namespace multi_process_writer {
+
+void write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, const QString& parallelism,
+           const QString& processSetting) {
+  const QString identifier = cfg.getIdentifier();
+  // A transformer without a template of its own is a custom one, whose definition stands elsewhere.
+  const bool hasStatements = !cfg.getTemplateLines().isEmpty();
+  QStringList lines;
+  lines << QLatin1String("FACTORY_DEF * TransformFact:") + QString::number(cfg.getVersion()) +
+               QLatin1Char(':') + quotifyStringForMF(cfg.getVisualName())
+        << QLatin1String("   FACTORY_NAME ") + quotifyStringForMF(identifier)
+        << QStringLiteral("   FACTORY_META_PARAMS")
+        << QLatin1String("   TRANSFORMER_NAME:") + quotifyStringForMF(identifier)
+        << QLatin1String("   TRANSFORMER_PARAMS:") + cfg.getTransformerParams()
+        << QLatin1String(hasStatements ? "   RUN:STATEMENTS" : "   RUN:DEFINITION");
+  const auto addSetting = [&lines](const char* key, const QString& value) {
+    if (!value.isEmpty() && value != kUnusedValue && value != kUnusedGroupBy) {
+      lines << QLatin1String("   ") + QLatin1String(key) + QLatin1Char(':') + quotifyStringForMF(value);
+    }
+  };
+  addSetting("GROUP_BY", groupBy);
+  addSetting("PARALLELISM", parallelism);
+  addSetting("PROCESS_SETTING", processSetting);
+  lines << cfg.getTransformFactoryInputLines();
+  QStringList tags;
+  cfg.getOutputTags(tags);
+  for (const QString& tag : std::as_const(tags)) {
+    QString featureType = identifier + QLatin1Char('_') + tag;
+    if (hasStatements && !cfg.getOutputFeatureType(tag, featureType)) {
+      continue;
+    }
+    lines << QLatin1String("   OUTPUT ") + tag + QLatin1String(" FEATURE_TYPE ") +
+                 quotifyStringForMF(featureType);
+  }
+  if (std::all_of(lines.cbegin(), lines.cend(), &MFBuffer::closesDeferredMacros)) {
+    buffer.addLines(lines);
+    buffer.flush();
+  }
+}
+
+}  // namespace multi_process_writer

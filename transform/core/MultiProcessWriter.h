@@ -1,0 +1,16 @@
+// Writes the statement by which the engine runs a transformer in several processes. Its grammar stands in
+// docs/mapping-file.md.
+#pragma once
+
+#include <QString>
+
+class MFBuffer;
+class TransformerCfg;
+
+namespace multi_process_writer {
+
+// Unset settings are left out. Nothing is written when a deferred reference in a text never closes.
+void write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, const QString& parallelism,
+           const QString& processSetting);
+
+}  // namespace multi_process_writer

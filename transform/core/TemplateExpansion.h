@@ -1,0 +1,56 @@
+// One instance's text of a compiled template: values are put in the place of tokens in a single pass.
+//
+// The result is that of OrderedSubstitution as long as the template is plain and no value brings a token that
+// is substituted (isInert() tells); the caller sees to both.
+#pragma once
+
+#include <platform/Export.h>
+#include <transform/core/CompiledTemplate.h>
+
+#include <QString>
+#include <QStringList>
+#include <QVarLengthArray>
+
+class ORX_EXPORT TemplateExpansion {
+ public:
+  // The template must outlive the expansion.
+  explicit TemplateExpansion(const CompiledTemplate& compiled);
+
+  // The first value of a slot stands. kNoSlot is ignored.
+  void setValue(int slot, const QString& value);
+  void removeLinesOf(int slot);
+  // Whether a line that is not removed holds the token.
+  bool holds(int slot) const;
+
+  QStringList lines() const;
+
+  // Whether the value brings no token that `isSubstituted` tells, and no part of one, wherever it is inserted
+  // in a plain template.
+  template <class IsSubstituted>
+  static bool isInert(const QString& value, IsSubstituted isSubstituted);
+
+ private:
+  struct Slot {
+    QString value;
+    bool isSet = false;
+  };
+
+  QString expand(const CompiledTemplate::Line& line, int size) const;
+
+  const CompiledTemplate& m_compiled;
+  QVarLengthArray<Slot, 24> m_slots;
+  QVarLengthArray<bool, 32> m_removed;
+};
+
+#include <transform/core/TokenScanner.h>
+
+template <class IsSubstituted>
+bool TemplateExpansion::isInert(const QString& value, IsSubstituted isSubstituted) {
+  TokenScanner scanner(value);
+  while (scanner.next()) {
+    if (isSubstituted(scanner.name().toString())) {
+      return false;
+    }
+  }
+  return !scanner.endsOpen();
+}
