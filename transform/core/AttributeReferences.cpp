@@ -91,7 +91,8 @@ bool isUnset(const QString& value) {
 }
 
 bool holdsReference(const QString& value) {
-  return value.contains(kValueReference) || value.contains(kValueReferenceEncoded);
+  return value.contains(kValueReference) || value.contains(kValueReferenceEncoded) ||
+         value.contains(kValueReferenceWord);
 }
 
 bool namesOneAttribute(const GUIType& type) {
@@ -125,7 +126,12 @@ QString withoutIndexes(const QString& name) {
 QStringList valueReferences(const QString& text) {
   QStringList names;
   collectReferences(text, kPlainForm, names);
-  collectReferences(text, kEncodedForm, names);
+  if (text.contains(kValueReferenceWord)) {
+    collectReferences(QString(text).replace(kValueReferenceWord, kValueReferenceEncoded), kEncodedForm,
+                      names);
+  } else {
+    collectReferences(text, kEncodedForm, names);
+  }
   return names;
 }
 

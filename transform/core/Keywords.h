@@ -39,6 +39,8 @@ constexpr QLatin1String kAllowNew("ALLOW_NEW");
 // What values are made of.
 constexpr QLatin1String kConditionalPrefix("ORX_CONDITIONAL:");
 constexpr QLatin1String kValueReference("@Value(");
+// The same in the word encoding, as it is stored, and with its "@" left as it is, as it is read as well.
+constexpr QLatin1String kValueReferenceWord("<commercialat>Value<leftparenthesis>");
 constexpr QLatin1String kValueReferenceEncoded("@Value<leftparenthesis>");
 constexpr QLatin1String kEncodedLeftParenthesis("<leftparenthesis>");
 constexpr QLatin1String kEncodedRightParenthesis("<rightparenthesis>");

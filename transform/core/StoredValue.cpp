@@ -38,7 +38,7 @@ QString withAttributeReference(const GUIType& type, const QString& value) {
         (word.startsWith(kTextEditType) && word.endsWith(kOrAttributeSuffix)))) {
     return value;
   }
-  return kValueReferenceEncoded + value.mid(1) + kEncodedRightParenthesis;
+  return kValueReferenceWord + value.mid(1) + kEncodedRightParenthesis;
 }
 
 bool takesAttributeReference(const GUIType& type) {

@@ -1,0 +1,1 @@
+orx_bench(bench_copy orx_core)
