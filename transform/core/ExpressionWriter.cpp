@@ -39,25 +39,29 @@ std::vector<Reference> findReferences(const QString& text) {
     bool isEncoded;
   };
   std::vector<Bracket> open;
+  const auto openReference = [&](int& position, QLatin1String mark, bool isEncoded) {
+    for (auto outer = open.rbegin(); outer != open.rend() && outer->begin >= 0; ++outer) {
+      outer->begin = -1;
+    }
+    open.push_back({position, position + mark.size(), isEncoded});
+    position += mark.size() - 1;
+  };
   for (int i = 0; i < text.size(); ++i) {
     switch (text.at(i).unicode()) {
       case u'@':
-        for (const QLatin1String mark : {kValueReference, kValueReferenceEncoded}) {
-          if (standsAt(text, i, mark)) {
-            for (auto outer = open.rbegin(); outer != open.rend() && outer->begin >= 0; ++outer) {
-              outer->begin = -1;
-            }
-            open.push_back({i, i + mark.size(), mark.size() > kValueReference.size()});
-            i += mark.size() - 1;
-            break;
-          }
+        if (standsAt(text, i, kValueReference)) {
+          openReference(i, kValueReference, false);
+        } else if (standsAt(text, i, kValueReferenceEncoded)) {
+          openReference(i, kValueReferenceEncoded, true);
         }
         break;
       case u'(':
         open.push_back({-1, i, false});
         break;
       case u'<':
-        if (standsAt(text, i, kEncodedLeftParenthesis)) {
+        if (standsAt(text, i, kValueReferenceWord)) {
+          openReference(i, kValueReferenceWord, true);
+        } else if (standsAt(text, i, kEncodedLeftParenthesis)) {
           open.push_back({-1, i, true});
         } else if (standsAt(text, i, kEncodedRightParenthesis) && !open.empty() && open.back().isEncoded) {
           if (open.back().begin >= 0) {
@@ -83,7 +87,8 @@ std::vector<Reference> findReferences(const QString& text) {
 }
 
 bool isWholeReference(const QString& value) {
-  if (!value.startsWith(kValueReference) && !value.startsWith(kValueReferenceEncoded)) {
+  if (!value.startsWith(kValueReference) && !value.startsWith(kValueReferenceEncoded) &&
+      !value.startsWith(kValueReferenceWord)) {
     return false;
   }
   const std::vector<Reference> references = findReferences(value);
@@ -140,17 +145,18 @@ QLatin1String expressionType(const QString& type, bool encoded) {
 }  // namespace
 
 bool ExpressionWriter::holdsReference(const QString& value) {
-  return value.contains(kValueReference) || value.contains(kValueReferenceEncoded);
+  return value.contains(kValueReference) || value.contains(kValueReferenceEncoded) ||
+         value.contains(kValueReferenceWord);
 }
 
 bool ExpressionWriter::needsWrapping(const GUIType& type, const QString& value) {
   if (value.startsWith(kConditionalPrefix)) {
     return true;
   }
-  if (!value.contains(QLatin1Char('@')) || type.getType().startsWith(kExpressionType)) {
+  if (!holdsReference(value) || type.getType().startsWith(kExpressionType)) {
     return false;
   }
-  return type.mayHoldAttributeReference() ? holdsReference(value) : isWholeReference(value);
+  return type.mayHoldAttributeReference() || isWholeReference(value);
 }
 
 QString ExpressionWriter::withStoredResults(const QString& value, const ChoiceList& choices) {

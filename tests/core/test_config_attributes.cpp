@@ -1,0 +1,241 @@
+#include <tests/core/ConfigHelpers.h>
+#include <transform/core/AttributeReferences.h>
+
+#include <gtest/gtest.h>
+
+#include <memory>
+
+namespace {
+
+struct PropagationCase {
+  const char* what;
+  const char* preserves;
+  const char* added;
+  std::vector<const char*> listActions;
+  const char* out;   // what leaves OUT
+  const char* rest;  // what leaves REST
+};
+
+// IN brings "a l{} l{}.x", OTHER brings "b a l{}.y".
+std::unique_ptr<TransformerCfg> makePropagating(const PropagationCase& c) {
+  TransformerDefinition definition = makeDefinition({{"NEW", "NEW_ATTR_ENCODED", "", "n<space>1"},
+                                                     {"LIST", "TEXT", "", "l"},
+                                                     {"MANY", "ATTR_LIST", "", "p,q"},
+                                                     {"EMPTY", "TEXT", "", "<Unused>"}});
+  definition.preservesAttributes = words(c.preserves);
+  definition.attributesAdded = words(c.added);
+  for (const char* action : c.listActions) {
+    definition.listActions << qs(action);
+  }
+  auto cfg = std::make_unique<TransformerCfg>();
+  cfg->configure(definition);
+  cfg->setInputAttributes(qs("OTHER"), words("b a l{}.y"));
+  cfg->setInputAttributes(qs("IN"), words("a l{} l{}.x a"));
+  return cfg;
+}
+
+TEST(ConfigAttributes, Propagation) {
+  const PropagationCase cases[] = {
+      {"nothing said", "", "", {}, "", ""},
+      {"none", "<NONE>", "", {}, "", ""},
+      {"all, each once, by the order of the inputs",
+       "<ALL>",
+       "",
+       {},
+       "a|l{}|l{}.x|b|l{}.y",
+       "a|l{}|l{}.x|b|l{}.y"},
+      {"one output", "OUT", "", {}, "a|l{}|l{}.x|b|l{}.y", ""},
+      {"an output from inputs", "OUT:OTHER REST:IN REST:OTHER", "", {}, "b|a|l{}.y", "a|l{}|l{}.x|b|l{}.y"},
+      {"names", "=b =nobody", "", {}, "b", "b"},
+      {"added everywhere and at one output", "", "c OUT:d NOWHERE:e c", {}, "c|d|NOWHERE:e", "c|NOWHERE:e"},
+      {"added by parameters",
+       "",
+       "$(NEW) $(MANY) $(EMPTY) $(NOBODY) pre_$(MANY)",
+       {},
+       "n 1|p|q|pre_p|pre_q",
+       "n 1|p|q|pre_p|pre_q"},
+      {"added to lists",
+       "",
+       "$(LIST){}.count OUT:$(LIST){}.$(MANY) $(EMPTY){}.count",
+       {},
+       "l{}.count|l{}.p|l{}.q",
+       "l{}.count"},
+      {"lists dropped", "<ALL>", "", {"OUT DROP"}, "a|b", "a|l{}|l{}.x|b|l{}.y"},
+      {"an output's own action after that of all",
+       "<ALL>",
+       "",
+       {"REST KEEP", "<ALL> DROP"},
+       "a|b",
+       "a|l{}|l{}.x|b|l{}.y"},
+      {"collected",
+       "OUT:IN",
+       "",
+       {"OUT DROP", "OUT COLLECT OTHER m{}", "OUT COLLECT OTHER $(EMPTY)"},
+       "a|m{}.b|m{}.a|m{}.l{}.y",
+       ""},
+      {"exploded", "<ALL>", "", {"OUT EXPLODE $(LIST)"}, "a|x|b|y", "a|l{}|l{}.x|b|l{}.y"},
+  };
+  for (const PropagationCase& c : cases) {
+    const auto cfg = makePropagating(c);
+    EXPECT_EQ(cfg->getOutputAttributes(qs("OUT")).join(QLatin1Char('|')), qs(c.out)) << c.what;
+    EXPECT_EQ(cfg->getOutputAttributes(qs("REST")).join(QLatin1Char('|')), qs(c.rest)) << c.what;
+  }
+}
+
+TEST(ConfigAttributes, ParametersOfTheRulesAffectTheOutput) {
+  const auto cfg = makePropagating({"", "", "$(NEW)", {"OUT EXPLODE $(LIST)"}, "", ""});
+  EXPECT_TRUE(cfg->parmValueAffectsOutputAttrs(qs("NEW")));
+  EXPECT_TRUE(cfg->parmValueAffectsOutputAttrs(qs("LIST")));
+  EXPECT_FALSE(cfg->parmValueAffectsOutputAttrs(qs("MANY")));
+  cfg->updatePreservesAttributes(words("=a"));
+  EXPECT_EQ(cfg->getOutputAttributes(qs("REST")), QStringList({qs("a"), qs("n 1")}));
+}
+
+TEST(ConfigAttributes, SubclassesChangeSingleSteps) {
+  struct Prefixing : TransformerCfg {
+    void transformAttr(const QString& attribute, QStringList& result, const QString& in,
+                       const QString& out) const override {
+      QStringList passed;
+      TransformerCfg::transformAttr(attribute, passed, in, out);
+      for (const QString& name : passed) {
+        result << qs("p_") + name;
+      }
+    }
+    void addAdditionalAttrsFromParameter(const QString& parameter, const QString&, const QString&,
+                                         QStringList& result) const override {
+      result << qs("from_") + parameter;
+    }
+  };
+  TransformerDefinition definition = makeDefinition({{"NEW", "NEW_ATTR"}});
+  definition.preservesAttributes = words("OUT:IN");
+  definition.attributesAdded = words("$(NEW)");
+  Prefixing cfg;
+  cfg.configure(definition);
+  cfg.setInputAttributes({{qs("IN"), words("a b")}, {qs("OTHER"), words("c")}});
+  EXPECT_EQ(cfg.getOutputAttributes(qs("OUT")), words("p_a p_b from_NEW"));
+}
+
+TEST(ConfigAttributes, ManyAttributesTakeTimeInProportion) {
+  const auto cfg = makePropagating({"", "<ALL>", "$(MANY)", {}, "", ""});
+  QStringList names;
+  for (int i = 0; i < 200000; ++i) {
+    names << qs("a") + QString::number(i);
+  }
+  cfg->setInputAttributes(qs("IN"), names);
+  cfg->setInputAttributes(qs("OTHER"), names);
+  cfg->setParameterValue(qs("MANY"), names.join(QLatin1Char(',')), true);
+  EXPECT_EQ(cfg->getOutputAttributes(qs("OUT")), names);
+  QStringList missing;
+  bool hasReferences = false;
+  cfg->getMissingAttributeReferences(qs("MANY"), missing, hasReferences);
+  EXPECT_TRUE(missing.isEmpty());
+}
+
+TEST(ConfigAttributes, References) {
+  const struct {
+    const char* type;
+    const char* value;
+    const char* names;  // separated by "|"
+  } cases[] = {
+      {"TEXT_OR_ATTR", "@Value(a)", "a"},
+      {"TEXT_OR_ATTR", "x@Value(b)+@Value(a)@Value(b)", "b|a"},
+      {"TEXT_OR_ATTR", "@Value(a (b))", "a (b)"},
+      {"TEXT_OR_ATTR", "@Value(a(b) end", "a(b"},
+      {"TEXT_OR_ATTR", "@Value(open", ""},
+      {"TEXT_OR_ATTR", "@Value()", ""},
+      {"TEXT_OR_ATTR", "@value(a)", ""},
+      {"TEXT_OR_ATTR", "@Value(\"a b\")", "a b"},
+      {"TEXT_OR_ATTR", "@Value(x@Value(y))", "y"},
+      {"TEXT_OR_ATTR", "@Value($(P))", ""},
+      {"TEXT_OR_ATTR_ENCODED", "@Value<leftparenthesis>a<space>b<rightparenthesis>", "a b"},
+      {"EXPRESSION_ENCODED",
+       "<commercialat>Value<leftparenthesis>a<rightparenthesis>+@Value<leftparenthesis>b<rightparenthesis>",
+       "a|b"},
+      {"TEXT_OR_ATTR", "ORX_CONDITIONAL:@Value(a);=;1;@Value(c);", "a|c"},
+      {"TEXT", "a", ""},
+      {"ATTR", "a,b", "a,b"},
+      {"ATTR_ENCODED", "a<comma>b", "a,b"},
+      {"ATTR_LIST", "a,\"b,c\"", "a|b,c"},
+      {"ATTR_LIST_ENCODED", "a<space>1,b", "a 1|b"},
+      {"ATTR", "<Unused>", ""},
+      {"ATTR_LIST", "$(P),a", "a"},
+      {"NEW_ATTR", "a", ""},
+      {"MULTIPARAMETER ;,GUI<space>ATTR<space>K<space>K,GUI<space>TEXT_OR_ATTR<space>T<space>T",
+       "K;a;T;@Value(b);X;@Value(c)", "a|b|c"},
+      {"GUI_LINE_TABLE ;,GUI<space>NEW_ATTR<space>K<space>K,GUI<space>TEXT_OR_ATTR<space>T<space>T",
+       "n;@Value(b);m;@Value(c);@Value(d)", "b|c|d"},
+  };
+  for (const auto& c : cases) {
+    TransformerCfg cfg;
+    cfg.configure(makeDefinition({{"P", c.type, "P", c.value}}));
+    EXPECT_EQ(cfg.getAttributeNamesInValue(qs("P")).join(QLatin1Char('|')), qs(c.names))
+        << c.type << " " << c.value;
+  }
+}
+
+TEST(ConfigAttributes, MissingReferences) {
+  const struct {
+    const char* type;
+    const char* value;
+    const char* missing;
+    bool hasReferences;
+  } cases[] = {
+      {"TEXT_OR_ATTR", "@Value(a)@Value(z)", "z", true},
+      {"TEXT_OR_ATTR", "plain", "", false},
+      {"ATTR", "b", "", true},
+      {"ATTR ALLOW_NEW", "z", "", true},
+      {"ATTR ALLOW_NEW", "@Value(z)", "z", true},
+      {"TEXT_OR_ATTR", "@Value(l{3}.x)@Value(l{}.x)@Value(l{0}.z)", "l{0}.z", true},
+      {"ATTR", "l{}", "", true},
+      {"ATTR", "m{}", "m{}", true},
+  };
+  for (const auto& c : cases) {
+    TransformerCfg cfg;
+    cfg.configure(makeDefinition({{"P", c.type, "P", c.value}}));
+    cfg.setInputAttributes(qs("IN"), words("a"));
+    cfg.setInputAttributes(qs("OTHER"), words("b l{}.x"));
+    QStringList missing = words("stale");
+    bool hasReferences = !c.hasReferences;
+    cfg.getMissingAttributeReferences(qs("P"), missing, hasReferences);
+    EXPECT_EQ(missing, words(c.missing)) << c.value;
+    EXPECT_EQ(hasReferences, c.hasReferences) << c.value;
+  }
+}
+
+TEST(ConfigAttributes, HostileReferencesTakeTimeInProportion) {
+  const int count = 100000;
+  const QString opens = qs("@Value(").repeated(count);
+  EXPECT_EQ(valueReferences(opens + qs("a") + qs(")").repeated(count)), words("a"));
+  EXPECT_TRUE(valueReferences(opens).isEmpty());
+  EXPECT_EQ(valueReferences(opens + qs("a)")), words("a"));
+  AttributeUnion reaching;
+  reaching.add({qs("l{}.").repeated(count) + qs("x")});
+  EXPECT_FALSE(reaching.contains(qs("l{")));
+}
+
+TEST(ConfigAttributes, ByType) {
+  TransformerCfg cfg;
+  cfg.configure(makeDefinition({{"A", "ATTR", "", "a"},
+                                {"L", "ATTR_LIST_ENCODED", "", "b<space>1,a,z"},
+                                {"N", "NEW_ATTR", "", "n"},
+                                {"T", "TEXT", "", "t"}}));
+  cfg.setInputAttributes(qs("IN"), {qs("a"), qs("b 1")});
+  const struct {
+    const char* type;
+    bool onlyInputs;
+    QStringList names;
+  } cases[] = {
+      {"ATTR", false, {qs("a"), qs("b 1"), qs("z")}},
+      {"ATTR", true, {qs("a"), qs("b 1")}},
+      {"ATTR_LIST", false, {qs("b 1"), qs("a"), qs("z")}},
+      {"NEW_ATTR", false, {qs("n")}},
+      {"NEW_ATTR", true, {}},
+  };
+  for (const auto& c : cases) {
+    QStringList names = words("stale");
+    cfg.getAttributesByType(qs(c.type), names, c.onlyInputs);
+    EXPECT_EQ(names, c.names) << c.type << c.onlyInputs;
+  }
+}
+
+}  // namespace

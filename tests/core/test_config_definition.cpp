@@ -1,0 +1,234 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <platform/session/session.h>
+#include <tests/core/ConfigHelpers.h>
+#include <transform/core/ConfiguredDefinition.h>
+#include <transform/core/Keywords.h>
+
+#include <QTextStream>
+#include <gtest/gtest.h>
+
+#include <memory>
+
+namespace {
+
+TEST(ConfigDefinition, NewObjectHasTheDocumentedDefaults) {
+  const TransformerCfg cfg;
+  EXPECT_EQ(cfg.lastParmEditBuild(), 18286);
+  EXPECT_EQ(cfg.replacedByVersion(), -1);
+  EXPECT_EQ(TransformerCfg::floatDivisionBuild, 15179);
+  EXPECT_TRUE(cfg.strictParameterValidation());
+  EXPECT_TRUE(cfg.isVisible());
+  EXPECT_TRUE(cfg.platformSupported());
+  EXPECT_TRUE(cfg.dependencyMet());
+  EXPECT_TRUE(cfg.showInNavigator());
+  EXPECT_TRUE(cfg.isDecorationLeft());
+  EXPECT_FALSE(cfg.isDeprecated());
+  EXPECT_FALSE(cfg.nukersRequired());
+  EXPECT_EQ(cfg.transformerType(), TransformerCfg::kOrdinary);
+  EXPECT_EQ(cfg.getParameterValue(qs("ANY")), QString());
+  EXPECT_TRUE(cfg.getParameterGUIType(qs("ANY")).isNull());
+}
+
+TEST(ConfigDefinition, VisibilityAndDeprecation) {
+  const struct {
+    bool visible;
+    bool allowed;
+    const char* replacedBy;
+    bool isVisible;
+    bool isDeprecated;
+  } cases[] = {
+      {true, true, "", true, false},       {true, true, "Other", true, false},
+      {false, true, "", false, false},     {false, true, "Other", false, true},
+      {true, false, "Other", false, true},
+  };
+  for (const auto& c : cases) {
+    TransformerDefinition definition = makeDefinition({});
+    definition.visible = c.visible;
+    definition.allowed = c.allowed;
+    definition.replacedBy = qs(c.replacedBy);
+    TransformerCfg cfg;
+    cfg.configure(definition);
+    EXPECT_EQ(cfg.isVisible(), c.isVisible) << c.replacedBy;
+    EXPECT_EQ(cfg.isDeprecated(), c.isDeprecated) << c.replacedBy;
+  }
+}
+
+TEST(ConfigDefinition, TagTokens) {
+  const struct {
+    const char* token;
+    const char* tag;
+    const char* alias;
+    const char* shown;
+  } cases[] = {
+      {"IN", "IN", "", ""},
+      {"IN:ENTRY", "IN", "ENTRY", ""},
+      {"IN::Many<space>Features", "IN", "", "Many Features"},
+      {"IN:ENTRY:First", "IN", "ENTRY", "First"},
+      {"IN:", "IN", "", ""},
+  };
+  for (const auto& c : cases) {
+    const TagList list = TagList::parse({qs(c.token), qs("IN:AGAIN"), qs(":NONE")});
+    EXPECT_EQ(list.tags, QStringList(qs(c.tag))) << c.token;
+    EXPECT_EQ(list.aliases.value(qs(c.tag)), qs(c.alias)) << c.token;
+    EXPECT_EQ(list.shownNames.value(qs(c.tag)), qs(c.shown)) << c.token;
+  }
+}
+
+TEST(ConfigDefinition, FaultyParameterEntriesAreReportedAndTheRestIsKept) {
+  TransformerDefinition definition = makeDefinition(
+      {{"A", "INT", "", "1"}, {"A", "TEXT", "", "2"}, {"", "TEXT"}, {"B", "", "", "x"}, {"C", "SUNDIAL"}});
+  definition.parameterTypes.removeLast();  // fewer types than names
+  definition.listActions << qs("OUT COLLECT IN");
+  definition.parameterMapping << qs("OLD");
+  definition.tagMapping << qs(":") << qs("X:A=B");
+  definition.preservesAttributes << qs("NOWHERE:IN");
+  QString text;
+  QTextStream log(&text);
+  TransformerCfg cfg;
+  cfg.configure(definition, nullptr, &log);
+  log.flush();
+  EXPECT_EQ(cfg.getParameters(), words("A B C XFORMER_NAME"));
+  EXPECT_EQ(cfg.getParameterValue(qs("A")), qs("1"));
+  EXPECT_EQ(cfg.getParameterType(qs("B")), qs("TEXT"));
+  const char* reported[] = {"PARAMETER_NAME: missing or there twice: A\n",
+                            "PARAMETER_TYPE: missing, taken as TEXT: B\n",
+                            "LIST_ACTION: not understood: OUT COLLECT IN\n",
+                            "PARAMETER_MAPPING: no renaming: OLD\n",
+                            "TAG_MAPPING: no renaming: X:A=B\n",
+                            "PRESERVES_ATTRIBUTES: no output: NOWHERE:IN\n"};
+  for (const char* line : reported) {
+    EXPECT_TRUE(text.contains(qs("Sorter version 3: ") + qs(line))) << line << "\n" << text.toStdString();
+  }
+}
+
+TEST(ConfigDefinition, DefaultParameters) {
+  TransformerCfg plain;
+  plain.configure(makeDefinition({}));
+  EXPECT_EQ(plain.getParameters(), words("XFORMER_NAME"));
+  EXPECT_EQ(plain.getParameterPrompt(qs("XFORMER_NAME")), qs("Transformer Name"));
+
+  TransformerDefinition definition = makeDefinition({{"GROUP_BY", "OPTIONAL ATTR_LIST", "Group By"}});
+  definition.multiProcess = qs("GROUP_BY");
+  TransformerCfg grouped;
+  grouped.configure(definition);
+  EXPECT_EQ(
+      grouped.getParameters(),
+      words("GROUP_BY XFORMER_NAME ORX_PROCESS_COUNT ORX_PROCESS_COUNTDISP ORX_PROCESS_GROUPS_ORDERED"));
+  EXPECT_EQ(grouped.getParameterValue(qs("GROUP_BY")), qs("<UNUSED>"));
+  EXPECT_EQ(grouped.getParameterValue(qs("ORX_PROCESS_COUNT")), qs("No Parallelism"));
+  EXPECT_EQ(grouped.getParameterByMacroName(qs("ORX_PROCESS_COUNT"))->choices().toStored(qs("Extreme")),
+            qs("EXTREME"));
+  EXPECT_TRUE(grouped.getAttributeNamesInValue(qs("GROUP_BY")).isEmpty());
+  QHash<QString, QString> table;
+  EXPECT_TRUE(grouped.getParameterLookupTable(qs("ORX_PROCESS_GROUPS_ORDERED"), QString(), table));
+  EXPECT_EQ(table.size(), 2);
+}
+
+TEST(ConfigDefinition, ATransformerUnderTheHomeIsBuiltIn) {
+  for (const bool isBuiltIn : {true, false}) {
+    TransformerDefinition definition = makeDefinition({});
+    definition.filePath = (isBuiltIn ? QORXOrxHome() : QORXOrxHome() + qs("2")) + qs("/transformers/x.ort");
+    TransformerCfg cfg;
+    cfg.configure(definition);
+    EXPECT_EQ(cfg.transformerType() == TransformerCfg::kBuiltIn, isBuiltIn);
+  }
+}
+
+TEST(ConfigDefinition, CopiesShareTheDefinitionUntilOneIsLocalised) {
+  TransformerCfg prototype;
+  prototype.configure(makeDefinition({{"A", "TEXT"}}));
+  const std::unique_ptr<TransformerCfg> copy(prototype.getCopy());
+  EXPECT_EQ(copy->definition(), prototype.definition());
+  copy->setLocalizedName(qs("Sortierer"));
+  EXPECT_NE(copy->definition(), prototype.definition());
+  EXPECT_EQ(copy->getVisualName(), qs("Sortierer"));
+  EXPECT_EQ(prototype.getLocalizedName(), qs("Sorter"));
+  EXPECT_EQ(copy->getSavedName(), qs("Sorter"));
+  copy->setSavedName(qs("Ordner"));
+  EXPECT_EQ(copy->getSavedName(), qs("Ordner"));
+}
+
+TEST(ConfigDefinition, CopiesHoldTheirOwnValuesPortsAndIdentity) {
+  TransformerCfg prototype;
+  prototype.configure(makeDefinition({{"A", "TEXT", "A", "1"}}));
+  prototype.setBaseGuid(qs("stem"));
+  prototype.setInputAttributes(qs("IN"), words("x"));
+  const std::unique_ptr<TransformerCfg> copy(prototype.getCopy());
+  EXPECT_EQ(copy->getBaseGuid(), QString());
+  copy->setParameterValue(qs("A"), qs("2"), true);
+  copy->setInputAttributes(qs("IN"), words("y"));
+  copy->addInputFeatureType(qs("roads"));
+  copy->addParameter(TransformParamCfg(GUIType::fromTransformerTypeString(qs("TEXT"), qs("B"))));
+  EXPECT_EQ(prototype.getParameterValue(qs("A")), qs("1"));
+  EXPECT_EQ(prototype.getInputAttributeUnion(), words("x"));
+  EXPECT_TRUE(prototype.getInputFeatureTypes(qs("IN")).isEmpty());
+  EXPECT_EQ(prototype.getParameters(), words("A XFORMER_NAME"));
+  prototype.copyValues(copy.get());
+  EXPECT_EQ(prototype.getParameterValue(qs("A")), qs("2"));
+  EXPECT_EQ(prototype.getInputAttributeUnion(), words("y"));
+  EXPECT_FALSE(prototype.hasParameter(qs("B")));
+}
+
+TEST(ConfigDefinition, ClosedStringsReachTheSameOperations) {
+  TransformerCfg cfg;
+  cfg.configure(makeDefinition({{"A", "TEXT"}}));
+  ITransformerCfg& face = cfg;
+  EXPECT_TRUE(face.setParameterValue(ORXString("A"), ORXString(qs("Zürich")), true));
+  EXPECT_FALSE(face.setParameterValue(ORXString("NO"), ORXString("1"), true));
+  EXPECT_EQ(cfg.getParameterValue(qs("A")), qs("Zürich"));
+  face.setIdentifier(ORXString("S_1"));
+  EXPECT_EQ(cfg.getIdentifier(), qs("S_1"));
+  face.addInputFeatureType(ORXString("roads"));
+  ORXStringArray array;
+  face.getInputFeatureTypes(ORXString("IN"), array);
+  EXPECT_EQ(ORXToQStringList(array), words("roads"));
+  face.getInputTagAliases(array);
+  EXPECT_EQ(ORXToQStringList(array), words("ENTRY OTHER"));
+  ORXString text("untouched");
+  EXPECT_FALSE(face.lookupInputTagAlias(ORXString("OTHER"), text));
+  EXPECT_FALSE(face.getOutputFeatureType(ORXString("OUT"), text));
+  EXPECT_STREQ(text.data(), "untouched");
+}
+
+TEST(ConfigDefinition, UpgradeFollowsTheMappings) {
+  TransformerDefinition old = makeDefinition(
+      {{"MODE", "TEXT", "", "a"}, {"GONE", "TEXT", "", "d"}, {"KEPT", "TEXT"}, {"EARLY", "TEXT"}});
+  old.version = 1;
+  old.inputTags = words("A B");
+  TransformerCfg older;
+  older.configure(old);
+  older.setBaseGuid(qs("stem"));
+  older.setIdentifier(qs("S_1"));
+  older.setParameterValue(qs("MODE"), qs("b"), true);
+  older.setParameterValue(qs("KEPT"), qs("k"), true);
+  older.setParameterValue(qs("EARLY"), qs("e"), true);
+  older.addInputFeatureType(qs("A"), qs("roads"));
+  older.setInputAttributes(qs("B"), words("x"));
+  older.setOutputFeatureType(qs("OUT"), qs("sorted"));
+
+  TransformerDefinition now =
+      makeDefinition({{"METHOD", "TEXT"}, {"KEPT", "TEXT"}, {"EARLY", "TEXT"}, {"LATE", "TEXT"}});
+  now.inputTags = words("FIRST SECOND");
+  now.outputTags = words("SORTED REST");
+  now.parameterMapping = words("2:MODE=WAY 3:WAY=METHOD 1:EARLY=LATE");
+  now.tagMapping = words("I:A=FIRST 2:I:B=SECOND O:OUT=SORTED");
+  TransformerCfg newer;
+  newer.configure(now);
+  EXPECT_TRUE(newer.upgradeTransformer(&older));
+  EXPECT_EQ(newer.getParameterValue(qs("METHOD")), qs("b"));
+  EXPECT_EQ(newer.getParameterValue(qs("KEPT")), qs("k"));
+  EXPECT_EQ(newer.getParameterValue(qs("EARLY")), qs("e"));  // renamed in a version it already has
+  EXPECT_EQ(newer.getParameterValue(qs("LATE")), QString());
+  EXPECT_EQ(newer.getIdentifier(), qs("S_1"));
+  EXPECT_EQ(newer.getBaseGuid(), qs("stem"));
+  EXPECT_EQ(newer.getInputFeatureTypes(qs("FIRST")), words("roads"));
+  EXPECT_EQ(newer.getInputAttributes().value(qs("SECOND")), words("x"));
+  QString featureType;
+  EXPECT_TRUE(newer.getOutputFeatureType(qs("SORTED"), featureType));
+  EXPECT_EQ(featureType, qs("sorted"));
+
+  older.setParameterValue(qs("GONE"), qs("something"), true);
+  EXPECT_FALSE(newer.upgradeTransformer(&older)) << "a value without a place has to be told";
+}
+
+}  // namespace

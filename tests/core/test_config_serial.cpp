@@ -1,0 +1,115 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <tests/core/ConfigHelpers.h>
+
+#include <gtest/gtest.h>
+
+#include <memory>
+
+namespace {
+
+QHash<QString, QString> fieldsOf(const QString& serialised) {
+  const QStringList elements = QORXSdfStringToList(serialised, QLatin1Char(','));
+  QHash<QString, QString> fields;
+  for (int i = 0; i + 1 < elements.size(); i += 2) {
+    fields.insert(elements[i], elements[i + 1]);
+  }
+  return fields;
+}
+
+const std::vector<ConfigParameter> kParameters = {{"A", "TEXT"}, {"B", "ATTR"}};
+
+TEST(ConfigSerial, HostileValuesComeBack) {
+  const QStringList values = {qs(""),
+                              qs(" "),
+                              qs(","),
+                              qs("\""),
+                              qs("\"\""),
+                              qs("a,\"b\""),
+                              qs("\n\r\t"),
+                              qs("\\"),
+                              qs("{a}"),
+                              qs("<Unused>"),
+                              qs("A,1,B,2"),
+                              qs("\"open, it"),
+                              qs("Grüße 𝄞"),
+                              qs("$(A),%,;"),
+                              QString(QChar(0xd800)),
+                              QString(3, QLatin1Char('"')),
+                              qs(" \"x\" , ")};
+  for (const QString& value : values) {
+    TransformerCfg cfg;
+    cfg.configure(makeDefinition(kParameters));
+    cfg.setParameterValue(qs("A"), value, true);
+    cfg.addInputFeatureType(qs("IN"), value);
+    cfg.addInputFeatureType(qs("IN"), qs("second"));
+    cfg.addInputFilter(qs("OTHER"), value);
+    cfg.setInputAttributes(qs("IN"), {value, qs("x")});
+    cfg.setOutputFeatureType(qs("OUT"), value);
+    cfg.setOutputTagFuncs(qs("REST"), {value, value});
+    const QString serialised = cfg.serialize();
+
+    TransformerCfg restored;
+    restored.configure(makeDefinition(kParameters));
+    QHash<QString, QString> fields = fieldsOf(serialised);
+    restored.deserialize(fields);
+    EXPECT_EQ(restored.getParameterValue(qs("A")), value);
+    EXPECT_EQ(restored.serialize(), serialised);
+    EXPECT_EQ(restored.getInputAttributeUnion(), cfg.getInputAttributeUnion());
+  }
+}
+
+TEST(ConfigSerial, KeysStandInTheirOrder) {
+  TransformerCfg cfg;
+  cfg.configure(makeDefinition(kParameters));
+  cfg.addInputFeatureType(qs("OTHER"), qs("o"));
+  cfg.addInputFeatureType(qs("ZZZ"), qs("z"));
+  cfg.addInputFeatureType(qs("IN"), qs("i"));
+  EXPECT_EQ(cfg.serialize(),
+            qs("NAME,Sorter,VERSION,3,PARAMETER_VALUES,\"A,\"\"\"\",B,\"\"\"\",XFORMER_NAME,\"\"\"\"\","
+               "INPUT_FEATURE_TYPES,\"IN,i,OTHER,o,ZZZ,z\",INPUT_FILTERS,\"\",INPUT_ATTRS,\"\","
+               "OUTPUT_FEATURE_TYPES,\"\",OUTPUT_FUNCTIONS,\"\""));
+}
+
+TEST(ConfigSerial, PartialFields) {
+  const struct {
+    const char* key;
+    const char* value;
+    const char* a;             // value of A afterwards
+    const char* featureTypes;  // of IN, twice restored
+  } cases[] = {
+      {"PARAMETER_VALUES", "NOBODY,1,A,2", "2", ""},
+      {"PARAMETER_VALUES", "A,2,B", "2", ""},
+      {"PARAMETER_VALUES", "", "old", ""},
+      {"INPUT_FEATURE_TYPES", "IN,\"x,y\",OTHER", "old", "x y x y"},
+      {"UNKNOWN", "A,2", "old", ""},
+  };
+  for (const auto& c : cases) {
+    TransformerCfg cfg;
+    cfg.configure(makeDefinition(kParameters));
+    cfg.setParameterValue(qs("A"), qs("old"), true);
+    QHash<QString, QString> fields{{qs(c.key), qs(c.value)}};
+    cfg.deserialize(fields);
+    cfg.deserialize(fields);
+    EXPECT_EQ(cfg.getParameterValue(qs("A")), qs(c.a)) << c.value;
+    EXPECT_EQ(cfg.getInputFeatureTypes(qs("IN")), words(c.featureTypes)) << c.value;
+  }
+}
+
+TEST(ConfigSerial, AttributesArePropagated) {
+  struct Counting : TransformerCfg {
+    using TransformerCfg::setInputAttributes;
+    void setInputAttributes(const QHash<QString, QStringList>& attributes) override {
+      ++calls;
+      TransformerCfg::setInputAttributes(attributes);
+    }
+    int calls = 0;
+  };
+  Counting cfg;
+  cfg.configure(makeDefinition(kParameters));
+  QHash<QString, QString> fields{{qs("INPUT_ATTRS"), qs("IN,\"a,b\"")}};
+  cfg.deserialize(fields);
+  EXPECT_EQ(cfg.calls, 1);
+  EXPECT_EQ(cfg.getInputAttributeUnion(), words("a b"));
+}
+
+}  // namespace

@@ -1,0 +1,171 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <tests/core/ConfigHelpers.h>
+#include <transform/core/TransformerCfgListener.h>
+#include <transform/core/TransformerSource.h>
+#include <transform/text/MessageStrings.h>
+
+#include <QDir>
+#include <QFile>
+#include <QTemporaryDir>
+#include <gtest/gtest.h>
+
+namespace {
+
+const char kPair[] =
+    "MULTIPARAMETER ;,GUI<space>TEXT<space>K<space>Key,GUI<space>OPTIONAL<space>TEXT<space>T<space>Target,"
+    "GUI<space>TEXT<space>ORX_CONTROLLER_QUERY_FILE<space>File";
+const char kTable[] =
+    "GUI_LINE_TABLE ;,GUI<space>TEXT<space>K<space>K,GUI<space>TEXT_OR_ATTR<space>T<space>T";
+const char kLooseTable[] =
+    "GUI_LINE_TABLE ;,GUI<space>TEXT<space>K<space>K,GUI<space>OPTIONAL<space>TEXT<space>T<space>T";
+
+struct Connections : DefinitionDirectory {
+  bool isConnectionKnown(const QString& encodedName) const override {
+    return encodedName == qs("My<space>Base");
+  }
+  std::vector<GUIType> memberDefinitions(const GUIType&) const override { return {}; }
+};
+
+struct Accepting : TransformerCfgListener {
+  bool acceptsValue(const TransformerCfg&, const QString&, const QString& value) const override {
+    return value == qs("accepted");
+  }
+};
+
+constexpr long kNoMessage = 0;
+
+struct ValidationCase {
+  const char* type;
+  const char* prompt;
+  const char* value;
+  bool valid;
+  long message = kNoMessage;
+  const char* argument = "";
+};
+
+class ConfigValidation : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    QFile file(m_folder.filePath(qs("Grüße.txt")));
+    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+    ASSERT_TRUE(QDir::setCurrent(m_folder.path()));
+  }
+  void TearDown() override {
+    QORXSetLanguage(qs("en"));
+    QDir::setCurrent(QDir::rootPath());
+  }
+
+  void check(const ValidationCase& c, TransformerCfgListener* listener = nullptr) {
+    TransformerCfg cfg;
+    cfg.configure(makeDefinition({{"P", c.type, c.prompt, c.value}}));
+    cfg.setInputAttributes(qs("IN"), words("here"));
+    cfg.setDefinitionDirectory(&m_connections);
+    cfg.setListener(listener);
+    for (const char* language : {"en", "de", "fr"}) {
+      QORXSetLanguage(qs(language));
+      const QString untouched = qs("untouched");
+      QString message = untouched;
+      EXPECT_EQ(cfg.validateParameter(qs("P"), message), c.valid) << c.type << " = " << c.value;
+      EXPECT_EQ(message, c.message == kNoMessage ? untouched : TransformResString(c.message, qs(c.argument)))
+          << c.type << " = " << c.value;
+    }
+  }
+
+  QTemporaryDir m_folder;
+  Connections m_connections;
+};
+
+TEST_F(ConfigValidation, WithoutListener) {
+  const ValidationCase cases[] = {
+      {"TEXT", "Size", "", false, 370608, "Size"},
+      {"OPTIONAL TEXT", "Size", "", true},
+      {"TEXT", "", "", true},
+      {"FILENAME_MUSTEXIST", "", "nothing", true},
+      {"TEXT", "Size", "<Unused>", true},
+      {"ATTR", "A", "gone", false, 370607, "'gone'"},
+      {"ATTR", "A", "here", true},
+      {"ATTR ALLOW_NEW", "A", "gone", true},
+      {"TEXT_OR_ATTR", "A", "@Value(a)@Value(b)", false, 370607, "'a' 'b'"},
+      {"TEXT_OR_ATTR_ENCODED", "A", "@Value<leftparenthesis>here<rightparenthesis>", true},
+      {kPair, "Pair", "K;1;T;", true},
+      {kPair, "Pair", "K;;T;1", false, 370608, "Key"},
+      {kPair, "Pair", "K;1;ORX_CONTROLLER_QUERY_FILE;", true},
+      {kPair, "Pair", "K;1;UNKNOWN;", true},
+      {kPair, "Pair", "K", true},
+      {kTable, "Table", "a;b;c;d", true},
+      {kTable, "Table", "a;b;c;", false, 370608, "Table"},
+      {kLooseTable, "Table", "a;b;c;", true},
+      {kTable, "Table", "a;@Value(here);;x", false, 370608, "Table"},
+      {"TEXT", "C", "orx://connect?x=1&connection=My%20Base", true},
+      {"TEXT", "C", "orx://connect?connection=None%20Such", false, 370636, "None Such"},
+      {"TEXT_ENCODED", "C", "orx:<solidus><solidus>a?connection=My<percentsign>20Base", true},
+      {"TEXT_ENCODED", "C", "orx:<solidus><solidus>a?connection=X", false, 370636, "X"},
+      {"TEXT", "C", "orx://", false, 370636, ""},
+      {"NAMED_CONNECTION", "C", "None Such", true},
+      {"TEXT_ENCODED", "E", "a<space>b$(MACRO)", true},
+      {"TEXT_ENCODED", "E", "a b", false},
+      {"TEXT_ENCODED", "E", "<commercialat>Value<leftparenthesis>gone<rightparenthesis>", false, 370607,
+       "'gone'"},
+      {"TEXT_EDIT", "E", "a b", true},
+      {"FILENAME_MUSTEXIST", "F", "Grüße.txt", true},
+      {"FILENAME_MUSTEXIST_ENCODED", "F", ".<solidus>Grüße.txt", true},
+      {"FILENAME_MUSTEXIST", "F", "no.txt", false, 370612, "no.txt"},
+      {"FILENAME_MUSTEXIST", "F", ".", false, 370612, "."},
+      {"FILEMUSTEXIST", "F", "/", false, 370612, "/"},
+      {"FILEMUSTEXIST", "F", "ORX_CONDITIONAL:x", true},
+      {"FILENAME_MUSTEXIST", "F", "ORX_CONDITIONAL:x", false, 370612, "ORX_CONDITIONAL:x"},
+      {"FILENAME", "F", "no.txt", true},
+  };
+  for (const ValidationCase& c : cases) {
+    check(c);
+  }
+}
+
+TEST_F(ConfigValidation, WithListener) {
+  const ValidationCase cases[] = {
+      {"FILENAME_MUSTEXIST", "F", "accepted", true},
+      {"NAMED_CONNECTION", "C", "My Base", true},
+      {"NAMED_DB_CONNECTION_ENCODED", "C", "My<space>Base", true},
+      {"NAMED_DB_CONNECTION", "C", "None<Such", false, 370636, "None<Such"},
+      {"NAMED_DB_CONNECTION", "C", "ORX_CONDITIONAL:x", true},
+  };
+  Accepting listener;
+  for (const ValidationCase& c : cases) {
+    check(c, &listener);
+  }
+}
+
+TEST_F(ConfigValidation, MissingNamesAreCutAtOneHundredCharacters) {
+  QStringList names;
+  for (int i = 0; i < 40; ++i) {
+    names << qs("a_rather_long_name_") + QString::number(i);
+  }
+  TransformerCfg cfg;
+  cfg.configure(makeDefinition({{"P", "ATTR_LIST", "A"}}));
+  cfg.setParameterValue(qs("P"), names.join(QLatin1Char(',')), true);
+  QString message;
+  EXPECT_FALSE(cfg.validateParameter(qs("P"), message));
+  const QString quoted = qs("'") + names.join(qs("' '")) + qs("'");
+  EXPECT_EQ(message, TransformResString(370607, quoted.left(100)));
+}
+
+TEST_F(ConfigValidation, AllParameters) {
+  TransformerCfg cfg;
+  cfg.configure(
+      makeDefinition({{"A", "TEXT", "First"}, {"B", "TEXT", "Second"}, {"C", "OPTIONAL TEXT", "Third"}}));
+  QString message;
+  EXPECT_FALSE(cfg.validateParameters(message));
+  EXPECT_EQ(message, TransformResString(370608, qs("First")));
+  QStringList names = words("C B A NONE");
+  QHash<QString, QString> messages;
+  EXPECT_FALSE(cfg.validateParameters(names, messages));
+  EXPECT_EQ(messages.size(), 3);
+  EXPECT_EQ(messages.value(qs("B")), TransformResString(370608, qs("Second")));
+  EXPECT_TRUE(messages.contains(qs("NONE")));
+  cfg.setParameterValue(qs("A"), qs("1"), true);
+  cfg.setParameterValue(qs("B"), qs("1"), true);
+  cfg.setIdentifier(qs("S"));
+  EXPECT_TRUE(cfg.validateParameters(message));
+}
+
+}  // namespace
