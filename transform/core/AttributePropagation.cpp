@@ -139,11 +139,7 @@ void TransformerCfg::addAttributesToList(const AddAttributesInfo& info, QStringL
 }
 
 QStringList TransformerCfg::attributesListedBy(const QString& parameter) const {
-  const QString value = getParameterValue(parameter, UnpackLevel::Resolved);
-  if (value == kUnusedGroupBy && parameter == configured().fields.multiProcess) {
-    return QStringList();
-  }
-  return listedAttributeNames(typeOfValue(parameter), value);
+  return listedAttributeNames(typeOfValue(parameter), getParameterValue(parameter, UnpackLevel::Resolved));
 }
 
 bool TransformerCfg::parmValueAffectsOutputAttrs(const QString& parameter) const {

@@ -93,9 +93,6 @@ void TransformerCfg::substParametersForToolTips(QStringList& lines) const {
 }
 
 QString TransformerCfg::tooltipValue(const QString& parameter) const {
-  QString text = getParameterDisplayValue(parameter, UnpackLevel::Decoded);
-  if (text == kUnusedGroupBy && parameter == configured().fields.multiProcess) {
-    text.clear();
-  }
+  const QString text = getParameterDisplayValue(parameter, UnpackLevel::Decoded);
   return escaped(text.isEmpty() ? TransformResString(kNotSetMessage) : text, m_tooltipAsHtml);
 }

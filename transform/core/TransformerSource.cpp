@@ -3,5 +3,10 @@
 #include <transform/core/WorkspaceParameterDirectory.h>
 
 TransformerSource::~TransformerSource() = default;
+
+QString TransformerSource::refusalReason() const {
+  return QString();
+}
+
 DefinitionDirectory::~DefinitionDirectory() = default;
 WorkspaceParameterDirectory::~WorkspaceParameterDirectory() = default;

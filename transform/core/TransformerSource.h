@@ -20,6 +20,9 @@ class ORX_EXPORT TransformerSource {
   virtual ~TransformerSource();
   // A new configuration, or null when name or version is unknown.
   virtual std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) = 0;
+  // Why the last makeTransformer() answered null although the transformer is known: a message for the user.
+  // Empty by default.
+  virtual QString refusalReason() const;
 };
 
 class ORX_EXPORT DefinitionDirectory {

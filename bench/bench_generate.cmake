@@ -1,1 +1,0 @@
-orx_bench(bench_generate orxtranslation)

@@ -1,0 +1,275 @@
+#include "CustomFixtures.h"
+#include <transform/custom/SubDocNetworkObj.h>
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+namespace {
+
+struct Propagation {
+  const char* what;
+  const char* graph;  // lines of assemble(), separated by ";"
+  const char* output;
+  const char* attributes;
+  const char* upstreamInputs;
+};
+
+// Every input receives the attribute of its own name in lower case, and "k".
+const Propagation kPropagations[] = {
+    {"nothing feeds the output", "out O", "O", "", ""},
+    {"unknown output", "in A;out O;A -> O", "X", "", ""},
+    {"straight through", "in A;out O;A -> O", "O", "a,k", "A"},
+    {"own list, whatever arrives", "in A;own O x,y;A -> O", "O", "x,y", "A"},
+    {"own list without a feeder", "own O a,b", "O", "a,b", ""},
+    {"added on the way", "in A;out O;add T x;A -> T;T -> O", "O", "a,k,x", "A"},
+    {"two inputs, first link first", "in B;in A;out O;A -> O;B -> O", "O", "a,k,b", "A,B"},
+    {"only what feeds this output", "in A;in B;out O;out P;A -> O;B -> P", "P", "b,k", "B"},
+    {"diamond", "in A;out O;add S s;add T t;pass U;A -> S;A -> T;S -> U;T -> U;U -> O", "O", "a,k,s,t", "A"},
+    {"order against the numbers", "out O;add T t;add S s;in A;T -> O;S -> T;A -> S", "O", "a,k,s,t", "A"},
+    {"circle of two behind an input", "in A;out O;add S s;add T t;A -> S;T -> S;S -> T;T -> O", "O",
+     "a,k,t,s", "A"},
+    {"a circle that the output reaches at its head", "in A;out O;add S s;add T t;A -> S;T -> S;S -> T;S -> O",
+     "O", "a,k,t,s", "A"},
+    {"feeds itself", "in A;out O;add S s;A -> S;S -> S;S -> O", "O", "a,k,s", "A"},
+    {"circle without an input", "out O;add S s;add T t;S -> T;T -> S;T -> O", "O", "s,t", ""},
+    {"through a loop point", "in A;out O;loop L;add T t;A -> T;T -> L;L -> O", "O", "a,k,t", "A"},
+    {"sent back to an input", "in A;out O;loop L;add T t;A -> T;T -> L;L -> A;T -> O", "O", "a,k,t", "A"},
+};
+
+TEST(Network, PropagatesAttributes) {
+  for (const Propagation& row : kPropagations) {
+    OpenNetwork network;
+    assemble(network, QString::fromLatin1(row.graph).split(QLatin1Char(';')));
+    for (const QString& input : network.getInputs())
+      network.setInputAttributes(input, {input.toLower(), QStringLiteral("k")});
+    const QString output = QLatin1String(row.output);
+    // Asked twice: what a query left behind must not show in the next.
+    network.attributesOf(output);
+    QStringList attributes = network.attributesOf(output);
+    QStringList expected = names(QLatin1String(row.attributes));
+    EXPECT_EQ(attributes.size(), expected.size()) << row.what;
+    attributes.sort();
+    expected.sort();
+    EXPECT_EQ(attributes, expected) << row.what << ": " << qPrintable(attributes.join(QLatin1Char(',')));
+    EXPECT_EQ(network.getUpstreamInputs(output), names(QLatin1String(row.upstreamInputs))) << row.what;
+  }
+}
+
+TEST(Network, TellsWhereAttributesComeFrom) {
+  OpenNetwork network;
+  assemble(network, {QStringLiteral("in A"), QStringLiteral("add T t"), QStringLiteral("out O"),
+                     QStringLiteral("A -> T"), QStringLiteral("T -> O")});
+  network.setStaticInputAttributes(QStringLiteral("A"), {QStringLiteral("declared")});
+  network.setInputAttributes(QHash<QString, QStringList>{{QStringLiteral("A"), {QStringLiteral("a")}}});
+  QHash<QString, QString> origins;
+  EXPECT_EQ(network.getOutputAttributes(QStringLiteral("O"), origins), names(QStringLiteral("declared,a,t")));
+  EXPECT_EQ(origins.value(QStringLiteral("a")), QStringLiteral("A"));
+  EXPECT_EQ(origins.value(QStringLiteral("t")), QStringLiteral("T"));
+}
+
+// The list and the order of a graph whose circle stands between an input and the output.
+TEST(Network, OrdersAncestors) {
+  OpenNetwork network;
+  assemble(
+      network,
+      QStringLiteral("out O;in B;in A;pass S;pass T;pass U;S -> O;U -> O;T -> S;A -> S;S -> T;B -> T;A -> U")
+          .split(QLatin1Char(';')));
+  std::vector<SubDocNetworkObj*> ancestors;
+  NodeSet set;
+  OpenNetwork::createAncestorList(network.nodeByNumber(0), ancestors, set);
+  const auto namesOf = [](const std::vector<SubDocNetworkObj*>& nodes) {
+    QStringList list;
+    for (const SubDocNetworkObj* node : nodes)
+      list.append(node->name());
+    return list.join(QLatin1Char(' '));
+  };
+  EXPECT_EQ(namesOf(ancestors), QStringLiteral("O S T B A U"));
+  const NetworkOrder order(ancestors);
+  EXPECT_EQ(namesOf(order.nodes()), QStringLiteral("B A S T U O"));
+  ASSERT_EQ(order.cycles().size(), 1U);
+  EXPECT_EQ(order.cycles().front().begin, 2U);
+  EXPECT_EQ(order.cycles().front().end, 4U);
+}
+
+TEST(Network, WalksLongChainsWithoutRecursion) {
+  constexpr int kLength = 100000;
+  OpenNetwork network;
+  network.addInput(QStringLiteral("A"), 0, 0);
+  for (int number = 1; number <= kLength; ++number)
+    network.addLoop(QString::number(number), number);
+  network.addOutput(QStringLiteral("O"), kLength + 1, kOutgoingArriving, {}, 0);
+  for (int number = 0; number <= kLength; ++number)
+    network.addLink(number, QStringLiteral("OUT"), number + 1, QStringLiteral("IN"));
+  network.doneAdding(true);
+  network.setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
+  EXPECT_EQ(network.attributesOf(QStringLiteral("O")), names(QStringLiteral("a")));
+  // Closed to one circle.
+  network.addLink(kLength, QStringLiteral("OUT"), 0, QStringLiteral("IN"));
+  EXPECT_EQ(network.attributesOf(QStringLiteral("O")), names(QStringLiteral("a")));
+  EXPECT_EQ(network.getUpstreamInputs(QStringLiteral("O")), names(QStringLiteral("A")));
+}
+
+TEST(Network, AnswersAsAWhole) {
+  OpenNetwork network;
+  EXPECT_TRUE(network.getIsAsynchronous());
+  EXPECT_FALSE(network.getIsBlocking());
+  EXPECT_EQ(network.getLoopTo(), QString());
+  network.addLoop(QStringLiteral("L1"), 1);
+  network.addLoop(QStringLiteral("L1"), 2);
+  network.addLoop(QStringLiteral("L2"), 3);
+  EXPECT_EQ(network.getLoops(), names(QStringLiteral("L1,L2")));
+  EXPECT_EQ(network.nodes().size(), 2U);
+  EXPECT_EQ(network.nodeByNumber(2), network.nodeByNumber(1));
+  EXPECT_EQ(network.getLoopTo(), QStringLiteral("L1"));
+  EXPECT_EQ(network.getLoopOutput(), QStringLiteral("INCOMPLETE"));
+  TransformerDefinition holder = passing(QStringLiteral("Holder"));
+  holder.featureHolding = 4;
+  network.addTransformer(configured(holder).release(), {}, 4);
+  EXPECT_FALSE(network.getIsAsynchronous());
+  EXPECT_TRUE(network.getIsBlocking());
+  EXPECT_TRUE(network.getUsesTransformer(QStringLiteral("Holder"), nullptr));
+  EXPECT_FALSE(network.getUsesTransformer(QStringLiteral("holder"), nullptr));
+  EXPECT_EQ(OpenNetwork::createExposedParmName(QStringLiteral("T"), QStringLiteral("P")),
+            QStringLiteral("T_P"));
+  EXPECT_EQ(network.addTransformer(configured(holder).release(), {}, 4), nullptr) << "number taken";
+  EXPECT_FALSE(network.addLink(4, QStringLiteral("OUT"), 9, QStringLiteral("IN"))) << "no such node";
+
+  auto mode = kOutgoingOwnList;
+  QStringList list{QStringLiteral("untouched")};
+  network.getOutputAttributeMode(QStringLiteral("none"), mode, list);
+  EXPECT_EQ(mode, kOutgoingArriving);
+  EXPECT_EQ(list, names(QStringLiteral("untouched")));
+}
+
+// --- editing while instances exist
+// ---------------------------------------------------------------------------
+
+class Watcher : public CompoundTransformerNetworkListener {
+ public:
+  Watcher(CompoundTransformerNetwork& network, QStringList& log, const QString& name)
+      : m_network(&network), m_log(log), m_name(name) {
+    network.addListener(this);
+  }
+  ~Watcher() override {
+    if (m_network)
+      m_network->removeListener(this);
+  }
+  void networkChanged(bool parametersChanged) override {
+    m_log.append(m_name + (parametersChanged ? QLatin1String("!") : QLatin1String("")));
+    if (onChange)
+      onChange();
+  }
+  void networkDeleted() override {
+    m_log.append(m_name + QLatin1String(" gone"));
+    m_network = nullptr;
+  }
+  void renameIONode(bool isInput, const QString& oldName, const QString& newName) override {
+    m_log.append(m_name + QLatin1Char(' ') + (isInput ? QLatin1String("in ") : QLatin1String("out ")) +
+                 oldName + QLatin1Char('>') + newName);
+  }
+  std::function<void()> onChange;
+
+ private:
+  CompoundTransformerNetwork* m_network;
+  QStringList& m_log;
+  QString m_name;
+};
+
+TEST(Network, TellsListenersInOrder) {
+  QStringList log;
+  auto network = std::make_unique<OpenNetwork>();
+  assemble(*network, {QStringLiteral("in A"), QStringLiteral("out O"), QStringLiteral("A -> O")});
+  EXPECT_FALSE(network->getIsInUse());
+  auto first = std::make_unique<Watcher>(*network, log, QStringLiteral("1"));
+  auto second = std::make_unique<Watcher>(*network, log, QStringLiteral("2"));
+  auto third = std::make_unique<Watcher>(*network, log, QStringLiteral("3"));
+  EXPECT_TRUE(network->getIsInUse());
+  EXPECT_TRUE(network->renameInput(QStringLiteral("A"), QStringLiteral("B")));
+  EXPECT_FALSE(network->renameInput(QStringLiteral("A"), QStringLiteral("C")));
+  EXPECT_EQ(log.join(QLatin1Char(',')), QStringLiteral("1 in A>B,2 in A>B,3 in A>B,1,2,3"));
+  log.clear();
+  first->onChange = [&] { second.reset(); };
+  network->doneAdding(true);
+  EXPECT_EQ(log.join(QLatin1Char(',')), QStringLiteral("1!,3!"));
+  log.clear();
+  network.reset();
+  EXPECT_EQ(log.join(QLatin1Char(',')), QStringLiteral("1 gone,3 gone"));
+}
+
+TEST(Network, InstancesFollowEditing) {
+  OpenNetwork network;
+  assemble(network, {QStringLiteral("in A"), QStringLiteral("in B"), QStringLiteral("out O"),
+                     QStringLiteral("A -> O"), QStringLiteral("B -> O")});
+  CompoundTransformerCfg instance(&network);
+  instance.addInputFeatureType(QStringLiteral("A"), QStringLiteral("f"));
+  instance.addInputFeatureType(QStringLiteral("B"), QStringLiteral("g"));
+  instance.setOutputFeatureType(QStringLiteral("O"), QStringLiteral("h"));
+  instance.setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
+  instance.setInputAttributes(QStringLiteral("B"), {QStringLiteral("b")});
+
+  EXPECT_TRUE(network.renameInput(QStringLiteral("A"), QStringLiteral("Z")));
+  EXPECT_TRUE(network.renameOutput(QStringLiteral("O"), QStringLiteral("P")));
+  EXPECT_FALSE(network.renameInput(QStringLiteral("Z"), QStringLiteral("B"))) << "taken";
+  QStringList tags;
+  instance.getInputTags(tags);
+  EXPECT_EQ(tags, names(QStringLiteral("Z,B")));
+  EXPECT_EQ(instance.getInputFeatureTypes(QStringLiteral("Z")), names(QStringLiteral("f")));
+  QString featureType;
+  EXPECT_TRUE(instance.getOutputFeatureType(QStringLiteral("P"), featureType));
+  EXPECT_EQ(featureType, QStringLiteral("h"));
+  EXPECT_EQ(instance.getOutputAttributes(QStringLiteral("P")), names(QStringLiteral("a,b")));
+  EXPECT_EQ(instance.getOutputAttributes(QStringLiteral("O")), QStringList());
+
+  EXPECT_FALSE(network.removeInput(QStringLiteral("B"), 0)) << "another node's number";
+  EXPECT_TRUE(network.removeInput(QStringLiteral("B"), 1));
+  EXPECT_EQ(instance.getOutputAttributes(QStringLiteral("P")), names(QStringLiteral("a")));
+  EXPECT_EQ(instance.getInputFeatureTypes(QStringLiteral("B")), QStringList());
+  EXPECT_TRUE(network.removeOutput(QStringLiteral("P"), 2));
+  EXPECT_FALSE(instance.getOutputFeatureType(QStringLiteral("P"), featureType));
+  EXPECT_EQ(instance.getOutputAttributes(QStringLiteral("P")), QStringList());
+  network.clear();
+  instance.getInputTags(tags);
+  EXPECT_EQ(tags, QStringList());
+}
+
+// Networks, instances, copies and the networks that they stand in may go in any order.
+TEST(Network, GoesInEveryOrder) {
+  std::vector<int> order{0, 1, 2, 3};
+  int runs = 0;
+  do {
+    auto inner = std::make_unique<OpenNetwork>(QStringLiteral("Inner"));
+    assemble(*inner, {QStringLiteral("in A"), QStringLiteral("out O"), QStringLiteral("A -> O")});
+    auto outer = std::make_unique<OpenNetwork>(QStringLiteral("Outer"));
+    outer->addInput(QStringLiteral("A"), 0, 0);
+    outer->addOutput(QStringLiteral("O"), 1, kOutgoingArriving, {}, 0);
+    outer->addTransformer(new CompoundTransformerCfg(inner.get()), {}, 2);
+    outer->addLink(0, QStringLiteral("A"), 2, QStringLiteral("A"));
+    outer->addLink(2, QStringLiteral("O"), 1, QStringLiteral("O"));
+    outer->doneAdding(true);
+    auto instance = std::make_unique<CompoundTransformerCfg>(outer.get());
+    auto copy = std::unique_ptr<TransformerCfg>(instance->getCopy());
+    instance->setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
+    ASSERT_EQ(instance->getOutputAttributes(QStringLiteral("O")), names(QStringLiteral("a")));
+    for (const int what : order) {
+      if (what == 0)
+        inner.reset();
+      else if (what == 1)
+        outer.reset();
+      else if (what == 2)
+        instance.reset();
+      else
+        copy.reset();
+      if (instance) {
+        const QStringList expected = inner && outer ? names(QStringLiteral("a")) : QStringList();
+        EXPECT_EQ(instance->getOutputAttributes(QStringLiteral("O")), expected);
+        TextBuffer buffer;
+        EXPECT_EQ(instance->doInstantiate(buffer, true), outer != nullptr);
+      }
+    }
+    ++runs;
+  } while (std::next_permutation(order.begin(), order.end()));
+  EXPECT_EQ(runs, 24);
+}
+
+}  // namespace

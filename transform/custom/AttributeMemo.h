@@ -1,0 +1,23 @@
+// What a network answered during one outermost query for attributes. Custom transformers that stand inside
+// each other share their definitions: without this, a definition placed twice on each of n levels would be
+// worked through 2^n times.
+#pragma once
+
+#include <transform/custom/CompoundTransformerNetwork.h>
+
+struct CompoundTransformerNetwork::AttributeMemo {
+  struct Key {
+    QString output;
+    QVector<QStringList> inputs;  // in the order of the ports
+
+    friend bool operator==(const Key& left, const Key& right) {
+      return left.output == right.output && left.inputs == right.inputs;
+    }
+    friend uint qHash(const Key& key, uint seed = 0) {
+      return ::qHash(key.output, seed) ^ ::qHash(key.inputs, seed);
+    }
+  };
+
+  quint64 query = 0;
+  QHash<Key, QStringList> answers;
+};

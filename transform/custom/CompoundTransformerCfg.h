@@ -1,0 +1,95 @@
+// One instance of a custom transformer: a configuration whose ports, parameters and attributes come from a
+// network instead of a definition.
+//
+// The network is shared by all instances and not owned; the instance listens to it and lives on, without
+// ports, when the network goes first. The network computes attributes for one instance at a time: an instance
+// keeps what reaches it and puts it to the network again before it asks, when another instance asked last.
+#pragma once
+
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerNetworkListener.h>
+
+class CompoundTransformerNetwork;
+
+class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public CompoundTransformerNetworkListener {
+ public:
+  enum class Body {
+    Now,       // load the network's body at once
+    Deferred,  // take what the header tells; the rest follows when the body is loaded or a copy is made
+  };
+
+  explicit CompoundTransformerCfg(CompoundTransformerNetwork* network, Body body = Body::Now);
+  ~CompoundTransformerCfg() override;
+
+  // Null after the network is gone.
+  CompoundTransformerNetwork* getNetwork() const { return m_network; }
+
+  TransformerCfg* getCopy() const override;
+  // Takes over the values of `other`; from another custom transformer only those of parameters that both
+  // have.
+  void assign(const TransformerCfg* other) override;
+  QString getFileName() const override;
+  void getInputTags(QStringList& tags, QHash<QString, QString>* shownNames = nullptr) const override;
+  void getOutputTags(QStringList& tags, QHash<QString, QString>* shownNames = nullptr) const override;
+  void setInputAttributes(const QString& tag, const QStringList& attributes) override;
+  void setInputAttributes(const QHash<QString, QStringList>& attributes) override;
+  // Names that refer to a parameter of this instance, "$(NAME)", are given with its value.
+  QStringList getOutputAttributes(const QString& tag) const override;
+  bool parmValueAffectsOutputAttrs(const QString& parameter) const override;
+  QStringList getDescriptionLines() const override;
+  QStringList getChangeLog() const override;
+  bool validateParameter(const QString& parameter, QString& message) const override;
+  bool getIsAsynchronous() const override;
+  bool getIsBlocking() const override;
+  bool getIsEmbeddable() const override;
+  int getInsertMode() const override;
+  QString getTransformerFile() const override;
+  bool isDefinitionDeletable() const override;
+  void deleteDefinition() override;
+  QString getGUID() const override;
+  bool getRequiresVisualizerLauncher() const override;
+  bool getIsSource() const override;
+  bool getIsDefinitionValid() const override;
+  bool getUsesTransformer(const QString& name, QSet<QString>* visited) const override;
+  void getUsedComponents(QStringList& readers, QStringList& writers, QStringList& transformers,
+                         bool recursive) const override;
+  QStringList getTransformFactoryInputLines() const override;
+  bool containsPython() const override;
+  void turnOffMultiProcessing() override;
+  // False, and nothing written, when the network is gone or stands inside itself; instantiationFault() says
+  // why.
+  bool doInstantiate(MFBuffer& buffer, bool inlineFlag) override;
+
+  using TransformerCfg::getFileName;
+  using TransformerCfg::getInputTags;
+  using TransformerCfg::getOutputTags;
+  using TransformerCfg::getUsedComponents;
+
+  bool getUseMarkdown() const;
+  // The first version that the network or a transformer inside names.
+  QString pythonVersion() const;
+  // A message for the user; empty when instances can be written.
+  QString instantiationFault() const;
+  void writeParametersToMappingFile(MFBuffer& buffer, const QString& prefixMacro, bool defaultsOnly) const;
+
+  void networkChanged(bool parametersChanged) override;
+  void networkDeleted() override;
+  void renameIONode(bool isInput, const QString& oldName, const QString& newName) override;
+
+ protected:
+  // Whether an AttributeSetter inside the network has "$(PARAMETER)" as its "DEST_ATTR".
+  bool isParmUsedAsAttributeSetterAttribute(const QString& parameter) const;
+  void networkChanged(bool parametersChanged, bool portsChanged);
+
+ private:
+  void takeParameters();
+  void putInputAttributes() const;
+  QStringList resolvedAttributes(const QStringList& attributes) const;
+  QStringList propertyLines(const QString& property) const;
+  void writeInputCollectors(MFBuffer& buffer) const;
+  void writeOutputRenamers(MFBuffer& buffer) const;
+  // What the AttributeSetters inside, at any depth, have as their "DEST_ATTR".
+  QSet<QString> attributeSetterDestinations() const;
+
+  CompoundTransformerNetwork* m_network;
+};

@@ -1,0 +1,3 @@
+#include <transform/custom/CompoundTransformerNetworkListener.h>
+
+CompoundTransformerNetworkListener::~CompoundTransformerNetworkListener() = default;

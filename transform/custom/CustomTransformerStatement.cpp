@@ -1,0 +1,89 @@
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/CustomTransformerStatement.h>
+#include <transform/custom/InstancePrototype.h>
+#include <transform/text/MFBuffer.h>
+#include <transform/text/TextHelpers.h>
+
+namespace {
+
+// A reference to a parameter of the instance gives its value; a parameter without a value is no setting.
+QString resolve(const QString& setting, const TransformerCfg& instance) {
+  if (!isParameterReference(setting))
+    return setting;
+  const QString name = setting.mid(kMacroOpen.size(), setting.size() - kMacroOpen.size() - 1);
+  if (!instance.hasParameter(name))
+    return setting;
+  const QString value = instance.getParameterValue(name);
+  return value == kUnusedValue ? QString() : value;
+}
+
+QString resolveGroupBy(const QString& groupBy, const TransformerCfg& instance) {
+  QString resolved = resolve(groupBy, instance);
+  if (!isParameterReference(groupBy) && instance.hasParameter(kProcessGroupByParameter))
+    resolved = instance.getParameterValue(kProcessGroupByParameter);
+  return resolved == kUnusedValue || resolved == kUnusedGroupBy ? QString() : resolved;
+}
+
+void writeLoopFactory(MFBuffer& buffer, const CompoundTransformerNetwork& network,
+                      const TransformerCfg& instance) {
+  const QString id = instance.getIdentifier();
+  const QString quotedId = quotifyStringForMF(id);
+  const QString loopTo = network.getLoopTo();
+  QStringList inputs;
+  QStringList outputs;
+  instance.getInputTags(inputs);
+  instance.getOutputTags(outputs);
+  QStringList recurring;
+  for (const QString& input : qAsConst(inputs)) {
+    if (input != loopTo)
+      recurring.append(QORXWwjdEncode(input));
+  }
+  buffer.add(QLatin1String("FACTORY_DEF * TransformFact:") + QString::number(network.getVersion()) +
+             QLatin1Char(':') + quotifyStringForMF(instance.getVisualName()));
+  buffer.add(QLatin1String("   FACTORY_NAME ") + quotedId);
+  buffer.add(QStringLiteral("   FACTORY_META_PARAMS"));
+  buffer.add(QLatin1String("   TRANSFORMER_NAME:") + quotedId);
+  buffer.add(QLatin1String("   TRANSFORMER_PARAMS:") + instance.getTransformerParams());
+  buffer.add(QLatin1String("   LOOPBACK_INPUT_TAG:") + quotifyStringForMF(loopTo));
+  buffer.add(QLatin1String("   LOOPBACK_OUTPUT_TAG:") + network.getLoopOutput());
+  buffer.add(QLatin1String("   RECURRING_INPUT_TAG:") + recurring.join(QLatin1Char(',')));
+  buffer.add(QLatin1String("   MAX_LOOP_ITERATIONS:") +
+             instance.getParameterValue(kMaxLoopIterationsParameter, UnpackLevel::Decoded));
+  buffer.add(QLatin1String("   ITERATION_COUNT_ATTR:") +
+             instance.getParameterValue(kIterationCountParameter, UnpackLevel::Decoded));
+  const auto addPorts = [&](const char* keyword, const QStringList& tags) {
+    for (const QString& tag : tags) {
+      buffer.add(QLatin1String(keyword) + tag + QLatin1String(" FEATURE_TYPE ") +
+                 quotifyStringForMF(id + QLatin1Char('_') + tag));
+    }
+  };
+  addPorts("   INPUT ", inputs);
+  addPorts("   OUTPUT ", outputs);
+}
+
+}  // namespace
+
+void writeCustomTransformerStatement(MFBuffer& buffer, const CompoundTransformerNetwork& network,
+                                     const TransformerCfg& instance, bool inlineFlag) {
+  const ParallelSettings settings = network.getParallelSettings();
+  ParallelSettings resolved = settings;
+  resolved.groupBy = resolveGroupBy(settings.groupBy, instance);
+  resolved.parallelism = resolve(settings.parallelism, instance);
+  resolved.processSetting = resolve(settings.processSetting, instance);
+  if (resolved.isEnabled()) {
+    instance.writeMultiProcessTransformFact(buffer, resolved.groupBy, resolved.parallelism,
+                                            resolved.processSetting);
+    return;
+  }
+  if (inlineFlag && network.blockedLooping()) {
+    writeLoopFactory(buffer, network, instance);
+  } else {
+    const bool isBuiltIn = instance.transformerType() == TransformerCfg::kBuiltIn;
+    buffer.add(QLatin1String(isBuiltIn ? "INCLUDE_BUILTIN_CUSTOM_TRANSFORMER_VER "
+                                       : "INCLUDE_CUSTOM_TRANSFORMER_VER ") +
+               network.getName() + QLatin1Char(':') + QString::number(network.getVersion()));
+  }
+  buffer.flush();
+}

@@ -1,0 +1,403 @@
+#include <platform/qorxcore/Lists.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerSource.h>
+#include <transform/custom/CustomMessages.h>
+#include <transform/custom/ExternalDocNetworkBuilder.h>
+#include <transform/custom/SubDocNetworkObjXformer.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
+#include <transform/workspace/IXMLComponentReader.h>
+
+#include <algorithm>
+
+namespace {
+
+const QLatin1String kSubDocumentName("SUB_DOC_NAME");
+
+QString nodeTitle(const TransformerStruct& record) {
+  return record.name.isEmpty() ? record.type + QLatin1Char('_') + QString::number(record.identifier)
+                               : record.name;
+}
+
+QString subDocumentName(const TransformerStruct& record) {
+  for (const XformParmStruct& parameter : record.parameters) {
+    if (parameter.parmName == kSubDocumentName)
+      return parameter.parmValue;
+  }
+  return QString();
+}
+
+// The ports of an input order: lists in a list, each beginning with the port's tag.
+QStringList portsOfOrder(const QString& text) {
+  QStringList ports;
+  for (const QString& port : QORXSdfStringToList(text, QLatin1Char(',')))
+    ports.append(QORXSdfStringToList(port, QLatin1Char(' ')).value(0));
+  return ports;
+}
+
+// Every name under which a transformer's tags are known; a tag itself goes before an older or a second name.
+QHash<QString, QString> namesOfTags(const QStringList& tags, const QHash<QString, QString>& aliases,
+                                    const QHash<QString, QString>& renamed) {
+  QHash<QString, QString> names;
+  for (const QString& tag : tags)
+    names.insert(tag, tag);
+  for (const QString& tag : tags) {
+    const QString alias = aliases.value(tag);
+    if (!alias.isEmpty() && !names.contains(alias))
+      names.insert(alias, tag);
+  }
+  QStringList olds = renamed.keys();
+  olds.sort();
+  for (const QString& old : qAsConst(olds)) {
+    const QString tag = renamed.value(old);
+    if (!names.contains(old) && names.value(tag) == tag)
+      names.insert(old, tag);
+  }
+  return names;
+}
+
+}  // namespace
+
+void ExternalDocNetwork::build(const IXMLComponentReader& reader, const QString& subDocumentName,
+                               TransformerSource& source) {
+  Builder(*this, reader, subDocumentName, source).build();
+}
+
+ExternalDocNetwork::Builder::Builder(ExternalDocNetwork& network, const IXMLComponentReader& reader,
+                                     const QString& document, TransformerSource& source)
+    : m_network(network), m_reader(reader), m_document(document), m_source(source) {}
+
+void ExternalDocNetwork::Builder::build() {
+  m_network.clearNodes();
+  m_network.m_transformerNames.clear();
+  m_network.takeSettings(m_reader.GetSubDocParms(m_document));
+  addPorts();
+  for (const TransformerStruct& record : m_reader.GetTransformerList(m_document))
+    addTransformer(record);
+  for (const LinkStruct& record : m_reader.GetFeatureTypeLinkList(m_document))
+    addLink(record);
+  for (const LinkStruct& record : m_reader.GetAttributeLinkList(m_document))
+    addAttributeLink(record);
+  addParameters();
+  m_network.doneAdding(true);
+}
+
+void ExternalDocNetwork::Builder::report(NetworkProblem::Kind kind, int line, const QString& node,
+                                         long message, const QStringList& arguments) {
+  m_network.addProblem(kind, line, node, TransformResString(message, arguments));
+}
+
+bool ExternalDocNetwork::Builder::enter(int identifier, const Place& place) {
+  const auto earlier = m_places.constFind(identifier);
+  if (earlier == m_places.constEnd()) {
+    m_places.insert(identifier, place);
+    return true;
+  }
+  report(NetworkProblem::Kind::DuplicateNumber, place.line, place.title, custom_messages::kDuplicateNumber,
+         {QString::number(identifier), QString::number(earlier->line)});
+  return false;
+}
+
+// --- nodes
+// --------------------------------------------------------------------------------------------------
+
+void ExternalDocNetwork::Builder::addPorts() {
+  int inputs = 0;
+  int outputs = 0;
+  for (const SubDocumentIOStruct& record : m_reader.GetSubDocumentIOList(m_document)) {
+    Place place;
+    place.line = record.line;
+    place.title = record.name;
+    QStringList attributes;
+    for (const SubDocumentIOAttrStruct& attribute : record.attributes)
+      attributes.append(attribute.attrName);
+    switch (record.isSource) {
+      case SubDocumentIOKind::Input:
+        place.kind = Kind::Input;
+        if (!enter(record.identifier, place))
+          break;
+        m_network.addInput(record.name, record.identifier, inputs++);
+        m_network.setStaticInputAttributes(record.name, attributes);
+        break;
+      case SubDocumentIOKind::Output:
+        place.kind = Kind::Output;
+        if (!enter(record.identifier, place))
+          break;
+        m_network.addOutput(record.name, record.identifier,
+                            record.attrMode == kOutgoingOwnList ? kOutgoingOwnList : kOutgoingArriving,
+                            attributes, outputs++);
+        break;
+      case SubDocumentIOKind::Loop:
+        place.kind = Kind::Loop;
+        if (enter(record.identifier, place))
+          m_network.addLoop(record.name, record.identifier);
+        break;
+    }
+  }
+  const QStringList inputNames = m_network.getInputs();
+  const QSet<QString> taken(inputNames.begin(), inputNames.end());
+  for (const QString& output : m_network.getOutputs()) {
+    if (taken.contains(output)) {
+      report(NetworkProblem::Kind::DuplicateName, m_reader.GetDocumentLine(m_document), output,
+             custom_messages::kSamePortName, {output});
+    }
+  }
+}
+
+void ExternalDocNetwork::Builder::addTransformer(const TransformerStruct& record) {
+  Place place;
+  place.line = record.line;
+  place.title = nodeTitle(record);
+  place.isLeftOut = !record.enabled;
+  std::unique_ptr<TransformerCfg> cfg;
+  if (record.enabled) {
+    const auto sameName = m_linesByTitle.constFind(place.title);
+    if (sameName != m_linesByTitle.constEnd()) {
+      report(NetworkProblem::Kind::DuplicateName, record.line, place.title, custom_messages::kDuplicateName,
+             {place.title, QString::number(*sameName)});
+    } else {
+      m_linesByTitle.insert(place.title, record.line);
+    }
+    cfg = makeTransformer(record, place.title);
+    place.isLeftOut = !cfg;
+  }
+  if (cfg) {
+    place.cfg = cfg.get();
+    configure(record, place);
+  }
+  if (!enter(record.identifier, place) || !cfg)
+    return;
+  SubDocNetworkObjXformer* node = m_network.addTransformer(cfg.release(), {}, record.identifier);
+  node->setExposedAttributes(exposedAttributes(record, place));
+  m_network.m_transformerNames.insert(place.title);
+}
+
+std::unique_ptr<TransformerCfg> ExternalDocNetwork::Builder::makeTransformer(const TransformerStruct& record,
+                                                                             const QString& title) {
+  const bool isCustom = record.kind == TransformerKind::SubDocument;
+  const QString type = isCustom ? subDocumentName(record) : record.type;
+  if (isCustom && type.isEmpty()) {
+    report(NetworkProblem::Kind::UnknownTransformer, record.line, title, custom_messages::kNoSubDocumentName,
+           {});
+    return nullptr;
+  }
+  std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(type, record.version);
+  if (cfg)
+    return cfg;
+  const QString refusal = m_source.refusalReason();
+  if (!refusal.isEmpty()) {
+    m_network.addProblem(NetworkProblem::Kind::Nesting, record.line, title, refusal);
+    return nullptr;
+  }
+  const auto newest = m_source.makeTransformer(type, TransformerSource::kNewestVersion);
+  if (newest) {
+    report(NetworkProblem::Kind::UnknownVersion, record.line, title, custom_messages::kUnknownVersion,
+           {type, QString::number(record.version), QString::number(newest->getVersion())});
+  } else {
+    report(NetworkProblem::Kind::UnknownTransformer, record.line, title, custom_messages::kUnknownTransformer,
+           {type});
+  }
+  return nullptr;
+}
+
+void ExternalDocNetwork::Builder::configure(const TransformerStruct& record, Place& place) {
+  TransformerCfg& cfg = *place.cfg;
+  if (record.lastParmEdit > 0)
+    cfg.setLastParmEditBuild(record.lastParmEdit);
+  cfg.setIdentifier(place.title);
+  for (const XformParmStruct& parameter : record.parameters) {
+    if (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentName)
+      continue;
+    if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
+      report(NetworkProblem::Kind::UnknownParameter, parameter.line, place.title,
+             custom_messages::kUnknownParameter, {cfg.getName(), parameter.parmName});
+    }
+  }
+  cfg.autoUpgradeTransformer();
+  if (cfg.isAutoUpgraded()) {
+    report(NetworkProblem::Kind::Upgraded, record.line, place.title, custom_messages::kUpgraded,
+           {cfg.getName()});
+  }
+  if (!cfg.dependencyMet()) {
+    report(NetworkProblem::Kind::UnmetDependency, record.line, place.title, custom_messages::kUnmetDependency,
+           {cfg.getName(), cfg.dependencyMsg()});
+  }
+
+  for (const OutputFeatStruct& output : record.outputFeats)
+    place.recordOutputs.append(output.name);
+  place.recordInputs = portsOfOrder(record.inputFtOrder);
+  QStringList tags;
+  cfg.getInputTags(tags);
+  tags += cfg.getDynamicInputTags();
+  place.inputs = namesOfTags(tags, cfg.getInputTagAliases(), cfg.renamedInputTags(record.version, &cfg));
+  cfg.getOutputTags(tags);
+  place.outputs = namesOfTags(tags, {}, cfg.renamedOutputTags(record.version, &cfg));
+}
+
+QHash<QString, QStringList> ExternalDocNetwork::Builder::exposedAttributes(const TransformerStruct& record,
+                                                                           const Place& place) const {
+  QHash<QString, QStringList> exposed;
+  QStringList tags;
+  place.cfg->getOutputTags(tags);
+  const QStringList& ports = place.recordOutputs.isEmpty() ? tags : place.recordOutputs;
+  for (const XformAttrStruct& attribute : record.attributes) {
+    if (!attribute.isUserCreated || !attribute.attrIsEnabled)
+      continue;
+    if (attribute.featIndex >= 0 && attribute.featIndex < ports.size()) {
+      const QString port = ports.at(attribute.featIndex);
+      exposed[place.outputs.value(port, port)].append(attribute.attrName);
+      continue;
+    }
+    for (const QString& tag : qAsConst(tags))
+      exposed[tag].append(attribute.attrName);
+  }
+  return exposed;
+}
+
+// --- links
+// --------------------------------------------------------------------------------------------------
+
+bool ExternalDocNetwork::Builder::findEnds(const LinkStruct& record, Place*& source, Place*& target) {
+  for (const int identifier : {record.sourceNode, record.targetNode}) {
+    if (m_places.contains(identifier))
+      continue;
+    report(NetworkProblem::Kind::DanglingLink, record.line, QString(), custom_messages::kDanglingLink,
+           {QString::number(record.identifier), QString::number(identifier)});
+    return false;
+  }
+  source = &m_places[record.sourceNode];
+  target = &m_places[record.targetNode];
+  return !source->isLeftOut && !target->isLeftOut;
+}
+
+void ExternalDocNetwork::Builder::reportPort(const LinkStruct& record, const Place& place,
+                                             const QString& description) {
+  report(NetworkProblem::Kind::BadPort, record.line, place.title, custom_messages::kBadPort,
+         {QString::number(record.identifier), description});
+}
+
+bool ExternalDocNetwork::Builder::findOutput(const LinkStruct& record, const Place& place, unsigned number,
+                                             const QString& name, QString& tag) {
+  if (place.kind != Kind::Transformer) {
+    tag = place.title;
+    return true;
+  }
+  QStringList tags;
+  place.cfg->getOutputTags(tags);
+  const QStringList& ports = place.recordOutputs.isEmpty() ? tags : place.recordOutputs;
+  const QString wanted = name.isEmpty() && number < static_cast<unsigned>(ports.size())
+                             ? ports.at(static_cast<int>(number))
+                             : name;
+  const auto found = place.outputs.constFind(wanted);
+  if (found != place.outputs.constEnd()) {
+    tag = *found;
+    return true;
+  }
+  report(NetworkProblem::Kind::UnknownOutput, record.line, place.title, custom_messages::kUnknownOutput,
+         {place.cfg->getName(), wanted.isEmpty() ? QString::number(number) : wanted,
+          tags.join(QLatin1String(", "))});
+  return false;
+}
+
+bool ExternalDocNetwork::Builder::findInput(const LinkStruct& record, const Place& place, unsigned number,
+                                            const QString& name, QString& tag) {
+  if (place.kind != Kind::Transformer) {
+    tag = place.title;
+    return true;
+  }
+  QStringList tags;
+  place.cfg->getInputTags(tags);
+  QString wanted = name;
+  if (wanted.isEmpty())
+    wanted = place.recordInputs.value(static_cast<int>(std::min(number, 0x7fffffffU)));
+  if (wanted.isEmpty())
+    wanted = tags.value(static_cast<int>(std::min(number, 0x7fffffffU)));
+  const auto found = place.inputs.constFind(wanted);
+  if (found != place.inputs.constEnd()) {
+    tag = *found;
+    return true;
+  }
+  report(NetworkProblem::Kind::UnknownInput, record.line, place.title, custom_messages::kUnknownInput,
+         {place.cfg->getName(), wanted.isEmpty() ? QString::number(number) : wanted,
+          tags.join(QLatin1String(", "))});
+  return false;
+}
+
+void ExternalDocNetwork::Builder::addLink(const LinkStruct& record) {
+  Place* source = nullptr;
+  Place* target = nullptr;
+  if (!record.enabled || !findEnds(record, source, target))
+    return;
+  const auto readPort = [&](const Place& place, const QString& description, bool wantsOutput,
+                            unsigned& number, QString& name) {
+    bool isFeaturePort = false;
+    bool isOutput = false;
+    unsigned second = 0;
+    if (decodePortDescription(description, isFeaturePort, isOutput, number, second, name) && isFeaturePort &&
+        isOutput == wantsOutput)
+      return true;
+    reportPort(record, place, description);
+    return false;
+  };
+  if (source->kind == Kind::Output || target->kind == Kind::Input) {
+    const bool isSource = source->kind == Kind::Output;
+    reportPort(record, isSource ? *source : *target,
+               isSource ? record.sourcePortDesc : record.targetPortDesc);
+    return;
+  }
+  unsigned number = 0;
+  QString name;
+  QString output;
+  if (!readPort(*source, record.sourcePortDesc, true, number, name) ||
+      !findOutput(record, *source, number, name, output))
+    return;
+  number = 0;
+  name.clear();
+  QString input;
+  if (readPort(*target, record.targetPortDesc, false, number, name) &&
+      findInput(record, *target, number, name, input))
+    m_network.addLink(record.sourceNode, output, record.targetNode, input);
+}
+
+void ExternalDocNetwork::Builder::addAttributeLink(const LinkStruct& record) {
+  Place* source = nullptr;
+  Place* target = nullptr;
+  if (!record.enabled || !findEnds(record, source, target))
+    return;
+  bool isFeaturePort = false;
+  bool isOutput = false;
+  unsigned port = 0;
+  unsigned ignored = 0;
+  QString from;
+  QString to;
+  if (source->kind == Kind::Output ||
+      !decodePortDescription(record.sourcePortDesc, isFeaturePort, isOutput, port, ignored, from) ||
+      isFeaturePort || !isOutput || from.isEmpty()) {
+    reportPort(record, *source, record.sourcePortDesc);
+    return;
+  }
+  if (!decodePortDescription(record.targetPortDesc, isFeaturePort, isOutput, ignored, ignored, to) ||
+      isFeaturePort || isOutput || to.isEmpty()) {
+    reportPort(record, *target, record.targetPortDesc);
+    return;
+  }
+  QString tag;
+  if (from != to && findOutput(record, *source, port, QString(), tag))
+    m_network.nodeByNumber(record.sourceNode)->addAttributeCopy(tag, from, to);
+}
+
+// --- parameters
+// ---------------------------------------------------------------------------------------------
+
+void ExternalDocNetwork::Builder::addParameters() {
+  for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(m_document)) {
+    const GUIType type = GUIType::fromGuiLine(record.guiLine);
+    if (type.getName().isEmpty()) {
+      report(NetworkProblem::Kind::BadPromptLine, record.line, QString(), custom_messages::kBadPromptLine,
+             {record.guiLine});
+      continue;
+    }
+    m_network.addPublishedParameter(type, type.getName());
+    m_network.addPublishedParameter(type.getName(), record.defaultValue);
+  }
+}

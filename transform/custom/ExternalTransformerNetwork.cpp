@@ -1,0 +1,281 @@
+// Header, answers and lazy loading; what changes files stands in CustomTransformerFiles.cpp.
+#include <transform/core/Keywords.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/CustomMessages.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/custom/SubDocumentLibrary.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/workspace/PlainFile.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/XMLComponentReader.h>
+
+#include <QFileInfo>
+
+namespace {
+
+enum Field {
+  kInsertMode = 4,
+  kBlockedLooping = 5,
+  kParallelism = 6,
+  kGroupBy = 7,
+  kProcessSetting = 8,
+  kCountSetting = 9,
+  kDeprecated = 11,
+  kPython = 12,
+};
+
+const QLatin1String kYes("yes");
+const QLatin1String kNo("no");
+const QString kEmbeddedByDefault = QStringLiteral("Embedded by Default");
+const QLatin1String kLinkedAlways("Linked Always");
+const QString kTemporaryName = QStringLiteral("kx-custom-xform-ver-XXXXXX");
+
+// The sub-document that is the custom transformer itself: the one that an instance in the main document
+// names, else the one of its name, else the only one, else the main document.
+QString bodyName(const IXMLComponentReader& reader, const QString& name) {
+  const QStringList documents = reader.GetSubDocList();
+  QStringList placed;
+  for (const TransformerStruct& record : reader.GetTransformerList(QString())) {
+    if (record.kind != TransformerKind::SubDocument)
+      continue;
+    for (const XformParmStruct& parameter : record.parameters) {
+      if (parameter.parmName == QLatin1String("SUB_DOC_NAME") && documents.contains(parameter.parmValue))
+        placed.append(parameter.parmValue);
+    }
+  }
+  if (placed.contains(name) || (placed.isEmpty() && documents.contains(name)))
+    return name;
+  if (!placed.isEmpty())
+    return placed.first();
+  return documents.size() == 1 ? documents.first() : QString();
+}
+
+}  // namespace
+
+ExternalTransformerNetwork::ExternalTransformerNetwork(const QString& fileName, int version,
+                                                       TransformerSource* manager)
+    : m_fileName(fileName), m_manager(manager), m_insertMode(kEmbeddedByDefault) {
+  setPythonVersion(QStringLiteral("27"));
+  ParallelSettings parallel;
+  parallel.parallelism = kNoParallelism;
+  setParallelSettings(parallel);
+  readHeader(version);
+}
+
+ExternalTransformerNetwork::~ExternalTransformerNetwork() = default;
+
+void ExternalTransformerNetwork::readHeader(int version) {
+  QString error;
+  try {
+    PlainFile plain(m_fileName, kTemporaryName);
+    m_isLoaded = m_header.read(plain.fileName(), version, error);
+  } catch (const WorkspaceLoaderException& exception) {
+    error = exception.getMessage();
+  }
+  if (!error.isEmpty()) {
+    addProblem(NetworkProblem::Kind::NoBody, 0, QString(),
+               TransformResString(custom_messages::kNoBody, {getName(), m_fileName, error}));
+  }
+  if (!m_isLoaded)
+    return;
+  const QStringList& fields = m_header.fields;
+  const auto has = [&](Field field) { return fields.size() > field; };
+  setName(m_header.name());
+  setVersion(m_header.version());
+  setCategory(fields.at(2));
+  setGUID(m_header.guid());
+  if (has(kInsertMode))
+    m_insertMode = fields.at(kInsertMode);
+  takeBlockedLooping(fields.value(kBlockedLooping) == kYes);
+  ParallelSettings parallel = ExternalDocNetwork::getParallelSettings();
+  if (has(kParallelism) && fields.at(kParallelism) != kYes && fields.at(kParallelism) != kNo)
+    parallel.parallelism = fields.at(kParallelism);
+  parallel.groupBy = fields.value(kGroupBy);
+  parallel.processSetting = fields.value(kProcessSetting);
+  parallel.countSetting = fields.value(kCountSetting).toInt();
+  setParallelSettings(parallel);
+  setDeprecated(fields.value(kDeprecated) == kYes);
+  if (has(kPython))
+    setPythonVersion(fields.at(kPython));
+}
+
+// --- the body
+// -----------------------------------------------------------------------------------------------
+
+void ExternalTransformerNetwork::takeIdentity(const QHash<QString, QString>& settings) {
+  QHash<QString, QString> unknown = settings;
+  if (m_settingsChanged || m_header.fields.size() > kBlockedLooping)
+    unknown.remove(QStringLiteral("BLOCKED_LOOPING"));
+  if (m_header.fields.size() > kPython)
+    unknown.remove(QStringLiteral("PYTHON_COMPATIBILITY"));
+  takeRunSettings(unknown);
+}
+
+void ExternalTransformerNetwork::forceLoad() {
+  // Files may name each other in a long row: a row longer than custom transformers may nest is left where it
+  // is, and the nesting refused when it is written.
+  static thread_local int depth = 0;
+  if (m_isComplete || !m_isLoaded || m_isLoading || !m_manager || depth > kDeepestNesting)
+    return;
+  ++depth;
+  m_isLoading = true;
+  try {
+    loadBody();
+  } catch (const WorkspaceLoaderException& exception) {
+    addProblem(NetworkProblem::Kind::NoBody, exception.line(), QString(),
+               TransformResString(custom_messages::kNoBody, {getName(), m_fileName, exception.getMessage()}));
+    doneAdding(true);
+  }
+  m_isLoading = false;
+  --depth;
+}
+
+void ExternalTransformerNetwork::loadBody() {
+  PlainFile plain(m_fileName, kTemporaryName);
+  QString error;
+  qint64 length = -1;
+  for (const VersionInfo& version : XMLComponentReader::getVersions(plain.fileName(), error)) {
+    if (version.byteOffset == m_header.byteOffset && version.name == m_header.name() &&
+        version.version == m_header.version())
+      length = version.byteLength;
+  }
+  if (length < 0)
+    throw WorkspaceLoaderException(TransformResString(custom_messages::kFileChanged, m_fileName));
+  XMLComponentReader reader;
+  QStringList headerLines;
+  QByteArray before;
+  QByteArray behind;
+  reader.ReadVersionedInput(plain.fileName(), m_header.byteOffset, length, false, headerLines, before,
+                            behind);
+  before.clear();
+  behind.clear();
+  m_library = std::make_unique<SubDocumentLibrary>(reader, m_manager);
+  build(reader, bodyName(reader, getName()), *m_library);
+  m_library->forgetReader();
+  for (const ExternalDocNetwork* inner : m_library->networks()) {
+    for (const NetworkProblem& problem : inner->problems())
+      addProblem(problem.kind, problem.line, problem.node, problem.text);
+  }
+}
+
+void ExternalTransformerNetwork::doneAdding(bool parametersChanged) {
+  m_isComplete = true;
+  ExternalDocNetwork::doneAdding(parametersChanged);
+}
+
+// A body that is read when it is first asked for is no change of the network.
+void ExternalTransformerNetwork::ensureBody() const {
+  if (!m_isComplete)
+    const_cast<ExternalTransformerNetwork*>(this)->forceLoad();
+}
+
+QStringList ExternalTransformerNetwork::getInputs() const {
+  ensureBody();
+  return ExternalDocNetwork::getInputs();
+}
+
+QStringList ExternalTransformerNetwork::getOutputs() const {
+  ensureBody();
+  return ExternalDocNetwork::getOutputs();
+}
+
+QStringList ExternalTransformerNetwork::getLoops() const {
+  ensureBody();
+  return ExternalDocNetwork::getLoops();
+}
+
+const std::list<TransformerCfg*>& ExternalTransformerNetwork::getTransformers() const {
+  ensureBody();
+  return ExternalDocNetwork::getTransformers();
+}
+
+void ExternalTransformerNetwork::setInputAttributes(const QString& input, const QStringList& attributes) {
+  forceLoad();
+  ExternalDocNetwork::setInputAttributes(input, attributes);
+}
+
+void ExternalTransformerNetwork::setInputAttributes(const QHash<QString, QStringList>& attributes) {
+  forceLoad();
+  ExternalDocNetwork::setInputAttributes(attributes);
+}
+
+QStringList ExternalTransformerNetwork::getOutputAttributes(const QString& output,
+                                                            QHash<QString, QString>& origins) const {
+  ensureBody();
+  return ExternalDocNetwork::getOutputAttributes(output, origins);
+}
+
+bool ExternalTransformerNetwork::hasTransformerNamed(const QString& identifier) const {
+  ensureBody();
+  return ExternalDocNetwork::hasTransformerNamed(identifier);
+}
+
+QStringList ExternalTransformerNetwork::getParameters() const {
+  ensureBody();
+  return ExternalDocNetwork::getParameters();
+}
+
+bool ExternalTransformerNetwork::hasParameter(const QString& name) const {
+  ensureBody();
+  return ExternalDocNetwork::hasParameter(name);
+}
+
+const CompoundTransformerParm* ExternalTransformerNetwork::getParameterInfo(const QString& name) const {
+  ensureBody();
+  return ExternalDocNetwork::getParameterInfo(name);
+}
+
+IncomingAttributePropogationMode ExternalTransformerNetwork::getIncomingAttributePropogationMode() const {
+  ensureBody();
+  return ExternalDocNetwork::getIncomingAttributePropogationMode();
+}
+
+QStringList ExternalTransformerNetwork::getUpstreamInputs(const QString& output) const {
+  ensureBody();
+  return ExternalDocNetwork::getUpstreamInputs(output);
+}
+
+QHash<QString, QString> ExternalTransformerNetwork::getProperties() const {
+  ensureBody();
+  return ExternalDocNetwork::getProperties();
+}
+
+QStringList ExternalTransformerNetwork::getDescriptionLines() const {
+  ensureBody();
+  return ExternalDocNetwork::getDescriptionLines();
+}
+
+// --- the header's answers
+// -----------------------------------------------------------------------------------
+
+QString ExternalTransformerNetwork::getFileName() const {
+  return m_fileName;
+}
+
+int ExternalTransformerNetwork::getStartLine() const {
+  return static_cast<int>(m_header.endLine);
+}
+
+int ExternalTransformerNetwork::getInsertMode() const {
+  static const QStringList modes{kEmbeddedByDefault, QStringLiteral("Linked by Default"),
+                                 QStringLiteral("Embedded Always"), QString(kLinkedAlways)};
+  return qMax(modes.indexOf(m_insertMode), 0) + 1;
+}
+
+bool ExternalTransformerNetwork::getIsEmbeddable() const {
+  return m_insertMode != kLinkedAlways;
+}
+
+bool ExternalTransformerNetwork::getIsDefinitionValid() const {
+  return QFileInfo::exists(m_fileName) && ExternalDocNetwork::getIsDefinitionValid();
+}
+
+void ExternalTransformerNetwork::setBlockedLooping(bool blocked) {
+  m_settingsChanged = true;
+  ExternalDocNetwork::setBlockedLooping(blocked);
+}
+
+void ExternalTransformerNetwork::turnOffMultiProcessing() {
+  m_settingsChanged = true;
+  ExternalDocNetwork::turnOffMultiProcessing();
+}

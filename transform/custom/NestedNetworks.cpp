@@ -1,0 +1,104 @@
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerCfg.h>
+#include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/CustomMessages.h>
+#include <transform/custom/NestedNetworks.h>
+#include <transform/text/MessageStrings.h>
+
+#include <QHash>
+#include <QSet>
+
+#include <algorithm>
+
+bool isCustomTransformer(const TransformerCfg* cfg) {
+  return dynamic_cast<const CompoundTransformerCfg*>(cfg) != nullptr;
+}
+
+CompoundTransformerNetwork* networkOf(const TransformerCfg* cfg) {
+  const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(cfg);
+  return custom ? custom->getNetwork() : nullptr;
+}
+
+std::vector<CompoundTransformerNetwork*> nestedNetworks(CompoundTransformerNetwork& root) {
+  std::vector<CompoundTransformerNetwork*> found{&root};
+  QSet<const CompoundTransformerNetwork*> seen{&root};
+  for (std::size_t at = 0; at < found.size(); ++at) {
+    found[at]->forceLoad();
+    for (const TransformerCfg* cfg : found[at]->customTransformers()) {
+      CompoundTransformerNetwork* inner = networkOf(cfg);
+      if (!inner || seen.contains(inner))
+        continue;
+      seen.insert(inner);
+      found.push_back(inner);
+    }
+  }
+  return found;
+}
+
+namespace {
+
+// A walk over the nested networks of one network that can be interrupted.
+struct OpenNetwork {
+  CompoundTransformerNetwork* network;
+  std::vector<CompoundTransformerNetwork*> inner;
+  std::size_t next = 0;
+};
+
+OpenNetwork openNetwork(CompoundTransformerNetwork& network) {
+  OpenNetwork opened{&network, {}};
+  network.forceLoad();
+  QSet<const CompoundTransformerNetwork*> seen;
+  for (const TransformerCfg* cfg : network.customTransformers()) {
+    CompoundTransformerNetwork* inner = networkOf(cfg);
+    if (!inner || seen.contains(inner))
+      continue;
+    seen.insert(inner);
+    opened.inner.push_back(inner);
+  }
+  return opened;
+}
+
+QString circle(const std::vector<OpenNetwork>& open, const CompoundTransformerNetwork* repeated) {
+  QStringList names;
+  bool inside = false;
+  for (const OpenNetwork& level : open) {
+    inside = inside || level.network == repeated;
+    if (inside)
+      names.append(level.network->getName());
+  }
+  names.append(repeated->getName());
+  return names.join(QLatin1String(" > "));
+}
+
+}  // namespace
+
+QString findNestingFault(CompoundTransformerNetwork& root) {
+  constexpr int kOpen = 0;
+  QHash<const CompoundTransformerNetwork*, int> depths{{&root, kOpen}};  // kOpen while it is being worked out
+  std::vector<OpenNetwork> open{openNetwork(root)};
+  while (!open.empty()) {
+    OpenNetwork& level = open.back();
+    if (level.next == level.inner.size()) {
+      int depth = 1;
+      for (const CompoundTransformerNetwork* inner : level.inner)
+        depth = std::max(depth, depths.value(inner) + 1);
+      if (depth > CompoundTransformerNetwork::kDeepestNesting) {
+        return TransformResString(
+            custom_messages::kNestedTooDeep,
+            {root.getName(), QString::number(CompoundTransformerNetwork::kDeepestNesting)});
+      }
+      depths.insert(level.network, depth);
+      open.pop_back();
+      continue;
+    }
+    CompoundTransformerNetwork* inner = level.inner[level.next++];
+    const auto known = depths.constFind(inner);
+    if (known == depths.constEnd()) {
+      depths.insert(inner, kOpen);
+      open.push_back(openNetwork(*inner));
+    } else if (*known == kOpen) {
+      return TransformResString(custom_messages::kContainsItself, {inner->getName(), circle(open, inner)});
+    }
+  }
+  return QString();
+}

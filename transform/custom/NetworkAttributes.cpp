@@ -1,0 +1,174 @@
+// What leaves the outputs of a network.
+#include <transform/custom/AttributeMemo.h>
+#include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/SubDocNetworkObjInput.h>
+#include <transform/custom/SubDocNetworkObjOutput.h>
+
+namespace {
+
+// Rounds through a cycle until nothing changes any more; attributes that still change then (a list that
+// grows with every round) are taken as they are.
+constexpr int kMostRounds = 8;
+// Different sets of arriving attributes for which one output is worked out within an outermost query. A
+// definition placed more often than that gives what reaches it.
+constexpr int kMostAnswers = 4096;
+
+struct QueryState {
+  int depth = 0;
+  quint64 number = 0;
+};
+
+QueryState& queryState() {
+  static thread_local QueryState state;
+  return state;
+}
+
+}  // namespace
+
+// One query for attributes, from its begin to its end; queries nest with the custom transformers.
+struct CompoundTransformerNetwork::AttributeQuery {
+  explicit AttributeQuery(bool& isEvaluating) : m_isEvaluating(isEvaluating) {
+    m_isEvaluating = true;
+    if (queryState().depth++ == 0)
+      ++queryState().number;
+  }
+  ~AttributeQuery() {
+    m_isEvaluating = false;
+    --queryState().depth;
+  }
+  AttributeQuery(const AttributeQuery&) = delete;
+  AttributeQuery& operator=(const AttributeQuery&) = delete;
+
+ private:
+  bool& m_isEvaluating;
+};
+
+void CompoundTransformerNetwork::setInputAttributes(const QString& input, const QStringList& attributes) {
+  const auto at = m_inputNodes.find(input);
+  if (at == m_inputNodes.end())
+    return;
+  at->second->setAttributes(attributes);
+  m_attributeOwner = nullptr;
+}
+
+void CompoundTransformerNetwork::setInputAttributes(const QHash<QString, QStringList>& attributes) {
+  for (const auto& [name, node] : m_inputNodes)
+    node->setAttributes(attributes.value(name));
+  m_attributeOwner = nullptr;
+}
+
+void CompoundTransformerNetwork::setStaticInputAttributes(const QString& input,
+                                                          const QStringList& attributes) {
+  const auto at = m_inputNodes.find(input);
+  if (at != m_inputNodes.end())
+    at->second->setStaticAttributes(attributes);
+}
+
+QStringList CompoundTransformerNetwork::getInputAttributes(const QString& input, bool withStatic) const {
+  const auto at = m_inputNodes.find(input);
+  if (at == m_inputNodes.end())
+    return QStringList();
+  if (!withStatic)
+    return at->second->setAttributes();
+  QStringList all = at->second->staticAttributes() + at->second->setAttributes();
+  all.removeDuplicates();
+  return all;
+}
+
+QStringList CompoundTransformerNetwork::arrivingAttributes() const {
+  QStringList all;
+  for (const QString& input : m_inputs)
+    all += getInputAttributes(input, true);
+  all.removeDuplicates();
+  return all;
+}
+
+QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& output,
+                                                            QHash<QString, QString>& origins) const {
+  const auto node = m_outputNodes.find(output);
+  // A network that is being worked out stands inside itself.
+  if (node == m_outputNodes.end() || m_isEvaluating || queryState().depth >= kDeepestNesting)
+    return QStringList();
+  ensureOrders();
+  const NetworkOrder& order = m_orders.at(output);
+  if (queryState().depth == 0)
+    return evaluate(*node->second, order, origins);
+
+  if (!m_memo)
+    m_memo = std::make_unique<AttributeMemo>();
+  if (m_memo->query != queryState().number) {
+    m_memo->query = queryState().number;
+    m_memo->answers.clear();
+  }
+  AttributeMemo::Key key;
+  key.output = output;
+  for (const QString& input : m_inputs)
+    key.inputs.append(m_inputNodes.at(input)->setAttributes());
+  const auto known = m_memo->answers.constFind(key);
+  if (known != m_memo->answers.constEnd())
+    return *known;
+  if (m_memo->answers.size() >= kMostAnswers)
+    return arrivingAttributes();
+  const QStringList answer = evaluate(*node->second, order, origins);
+  m_memo->answers.insert(key, answer);
+  return answer;
+}
+
+QStringList CompoundTransformerNetwork::evaluate(SubDocNetworkObjOutput& output, const NetworkOrder& order,
+                                                 QHash<QString, QString>& origins) const {
+  const AttributeQuery query(m_isEvaluating);
+  const std::vector<SubDocNetworkObj*>& nodes = order.nodes();
+  for (SubDocNetworkObj* node : nodes)
+    node->beginQuery();
+  auto cycle = order.cycles().begin();
+  for (std::size_t at = 0; at < nodes.size();) {
+    if (cycle == order.cycles().end() || cycle->begin != at) {
+      nodes[at++]->compute(origins);
+      continue;
+    }
+    bool hasChanged = true;
+    for (int round = 0; hasChanged && round < kMostRounds; ++round) {
+      hasChanged = false;
+      for (SubDocNetworkObj* node : cycle->flow) {
+        node->compute(origins);
+        hasChanged = hasChanged || node->hasChanged();
+      }
+    }
+    at = cycle->end;
+    ++cycle;
+  }
+  return output.getAttributes(output.name());
+}
+
+QStringList CompoundTransformerNetwork::getUpstreamInputs(const QString& output) const {
+  QStringList inputs;
+  ensureOrders();
+  const auto order = m_orders.find(output);
+  if (order == m_orders.end())
+    return inputs;
+  for (SubDocNetworkObj* node : order->second.nodes()) {
+    if (dynamic_cast<const SubDocNetworkObjInput*>(node))
+      inputs.append(node->name());
+  }
+  return inputs;
+}
+
+void CompoundTransformerNetwork::getOutputAttributeMode(const QString& output,
+                                                        OutgoingAttributePropogationMode& mode,
+                                                        QStringList& attributes) const {
+  const auto at = m_outputNodes.find(output);
+  if (at == m_outputNodes.end()) {
+    mode = kOutgoingArriving;
+    return;
+  }
+  mode = at->second->mode();
+  attributes = at->second->ownAttributes();
+}
+
+void CompoundTransformerNetwork::setOutputAttributeMode(const QString& output,
+                                                        OutgoingAttributePropogationMode mode,
+                                                        const QStringList& attributes) {
+  const auto at = m_outputNodes.find(output);
+  if (at != m_outputNodes.end())
+    at->second->setMode(mode, attributes);
+}

@@ -1,0 +1,17 @@
+// A loop point of a custom transformer, to which features are sent back, as a node of its network.
+#pragma once
+
+#include <transform/custom/SubDocNetworkObj.h>
+
+class ORX_EXPORT SubDocNetworkObjLoop : public SubDocNetworkObj {
+ public:
+  SubDocNetworkObjLoop(const QString& name, int number);
+
+  void compute(QHash<QString, QString>& origins) override;
+  // What reaches the loop point passes on.
+  QStringList getAttributes(const QString& port) const override;
+  QString name() const override { return m_name; }
+
+ private:
+  QString m_name;
+};

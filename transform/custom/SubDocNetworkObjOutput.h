@@ -1,0 +1,29 @@
+// An output port of a custom transformer, as a node of its network.
+#pragma once
+
+#include <transform/custom/AttributePropogationMode.h>
+#include <transform/custom/SubDocNetworkObj.h>
+
+class ORX_EXPORT SubDocNetworkObjOutput : public SubDocNetworkObj {
+ public:
+  SubDocNetworkObjOutput(const QString& name, int number, OutgoingAttributePropogationMode mode,
+                         const QStringList& ownAttributes, int position);
+
+  void compute(QHash<QString, QString>& origins) override;
+  QStringList getAttributes(const QString& port) const override;
+  QString name() const override { return m_name; }
+
+  void setName(const QString& name) { m_name = name; }
+  // Among the output ports, as the document has them.
+  int position() const { return m_position; }
+  OutgoingAttributePropogationMode mode() const { return m_mode; }
+  const QStringList& ownAttributes() const { return m_ownAttributes; }
+  void setMode(OutgoingAttributePropogationMode mode, const QStringList& ownAttributes);
+
+ private:
+  QString m_name;
+  int m_position;
+  QStringList m_computed;
+  OutgoingAttributePropogationMode m_mode;
+  QStringList m_ownAttributes;
+};

@@ -1,0 +1,33 @@
+// An inner transformer, as a node of a custom transformer's network. Owns its configuration.
+#pragma once
+
+#include <transform/custom/SubDocNetworkObj.h>
+
+#include <memory>
+
+class TransformerCfg;
+
+class ORX_EXPORT SubDocNetworkObjXformer : public SubDocNetworkObj {
+ public:
+  // `inputAttributes` are known to reach an input beside what its links bring, by input tag.
+  SubDocNetworkObjXformer(std::unique_ptr<TransformerCfg> cfg,
+                          const QHash<QString, QStringList>& inputAttributes, int number);
+  ~SubDocNetworkObjXformer() override;
+
+  void compute(QHash<QString, QString>& origins) override;
+  // Asks the configuration, once per port between two changes of what arrives.
+  QStringList getAttributes(const QString& port) const override;
+  QString name() const override;
+  virtual TransformerCfg* getTransformer() const;
+
+  // Attributes that a user added to what leaves an output, by output tag.
+  const QHash<QString, QStringList>& exposedAttributes() const { return m_exposed; }
+  void setExposedAttributes(const QHash<QString, QStringList>& attributes) { m_exposed = attributes; }
+
+ private:
+  std::unique_ptr<TransformerCfg> m_cfg;
+  QHash<QString, QStringList> m_inputAttributes;
+  QHash<QString, QStringList> m_exposed;
+  QHash<QString, QStringList> m_arrivedByTag;
+  mutable QHash<QString, QStringList> m_leaving;  // of the ports that were asked for
+};
