@@ -24,12 +24,17 @@ QString severityName(Severity severity) {
   return QStringLiteral("hint");
 }
 
+QString formatFinding(const QString& file, int line, const QString& severity, const QString& text) {
+  const QString place = line > 0 ? file + QLatin1Char(':') + QString::number(line) : file;
+  return place + QLatin1String(": ") + severity + QLatin1String(": ") + text;
+}
+
+QString textWithNode(const Diagnostic& diagnostic) {
+  return diagnostic.node.isEmpty() ? diagnostic.text
+                                   : diagnostic.node + QLatin1String(": ") + diagnostic.text;
+}
+
 QString formatDiagnostic(const Diagnostic& diagnostic) {
-  QString result = diagnostic.file;
-  if (diagnostic.line > 0)
-    result += QLatin1Char(':') + QString::number(diagnostic.line);
-  result += QLatin1String(": ") + severityName(diagnostic.severity) + QLatin1String(": ");
-  if (!diagnostic.node.isEmpty())
-    result += diagnostic.node + QLatin1String(": ");
-  return result + diagnostic.text;
+  return formatFinding(diagnostic.file, diagnostic.line, severityName(diagnostic.severity),
+                       textWithNode(diagnostic));
 }

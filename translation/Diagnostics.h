@@ -40,5 +40,9 @@ class ORX_EXPORT Diagnostics {
 
 // "error", "warning" or "hint".
 ORX_EXPORT QString severityName(Severity severity);
-// FILE:LINE: error|warning|hint: NODE: text; line and node are left out when there is none.
+// FILE:LINE: severity: text; the line is left out when it is 0.
+ORX_EXPORT QString formatFinding(const QString& file, int line, const QString& severity, const QString& text);
+// The text with its node in front, as findings show it.
+ORX_EXPORT QString textWithNode(const Diagnostic& diagnostic);
+// FILE:LINE: error|warning|hint: NODE: text
 ORX_EXPORT QString formatDiagnostic(const Diagnostic& diagnostic);

@@ -51,7 +51,7 @@ bool GlobalParameters::override(const QString& name, const QString& value) {
   if (!m_index.contains(name))
     return false;
   Parameter& parameter = entry(name);
-  parameter.value = value;
+  parameter.overridingValue = value;
   parameter.isOverridden = true;
   return true;
 }
@@ -114,7 +114,7 @@ QString GlobalParameters::resolve(const QString& text, QStringList& open, int& b
       continue;
     result += text.midRef(copied, references.start() - copied);
     open.append(parameter->name);
-    result += resolve(parameter->value, open, budget);
+    result += resolve(parameter->currentValue(), open, budget);
     open.removeLast();
     copied = references.end();
     if (result.size() > kMaximumLength)

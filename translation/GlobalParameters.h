@@ -16,17 +16,20 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
   struct Parameter {
     QString name;
     QString value;             // as stored: encoded where its type is
+    QString overridingValue;   // takes its place when isOverridden
     bool setInHeader = false;  // a header line sets it, so no statement of ours does
     bool isPublished = false;  // declared by a prompt line
     bool isOverridden = false;
     int line = 0;
+
+    const QString& currentValue() const { return isOverridden ? overridingValue : value; }
   };
 
   // Takes "MACRO NAME VALUE" and "DEFAULT_MACRO NAME VALUE" lines; every other line is passed over.
   void readHeaderLine(const QString& line, int lineNumber);
   // A value that the header sets is kept.
   void declare(const QString& name, const QString& value, int lineNumber);
-  // False when the workspace has no such parameter.
+  // Gives a parameter another value. False when the workspace has no such parameter.
   bool override(const QString& name, const QString& value);
 
   // In order of first appearance.

@@ -181,8 +181,10 @@ void MappingFileWriter::checkText(const QString& text, const QString& what, int 
 
 void MappingFileWriter::check() {
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
-    if (!parameter.setInHeader || parameter.isOverridden)
+    if (!parameter.setInHeader)
       checkText(parameter.value, parameter.name, parameter.line, QString());
+    if (parameter.isOverridden)
+      checkText(parameter.overridingValue, parameter.name, parameter.line, QString());
   }
   for (const WorkspaceNode& node : m_workspace.nodes) {
     checkText(node.name, node.name, node.line, node.name);
@@ -213,11 +215,11 @@ void MappingFileWriter::write(MFBuffer& buffer) {
 
 void MappingFileWriter::writeParameters(MFBuffer& buffer) const {
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
-    const QString setting = parameter.name + QLatin1Char(' ') + parameter.value;
+    const QString name = parameter.name + QLatin1Char(' ');
     if (!parameter.setInHeader)
-      writeStatement(buffer, QLatin1String("DEFAULT_MACRO ") + setting);
+      writeStatement(buffer, QLatin1String("DEFAULT_MACRO ") + name + parameter.value);
     if (parameter.isOverridden)
-      writeStatement(buffer, QLatin1String("MACRO ") + setting);
+      writeStatement(buffer, QLatin1String("MACRO ") + name + parameter.overridingValue);
   }
 }
 

@@ -139,7 +139,11 @@ void TransformerCfg::addAttributesToList(const AddAttributesInfo& info, QStringL
 }
 
 QStringList TransformerCfg::attributesListedBy(const QString& parameter) const {
-  return listedAttributeNames(typeOfValue(parameter), getParameterValue(parameter, UnpackLevel::Resolved));
+  const QString value = getParameterValue(parameter, UnpackLevel::Resolved);
+  if (value == kUnusedGroupBy && parameter == configured().fields.multiProcess) {
+    return QStringList();
+  }
+  return listedAttributeNames(typeOfValue(parameter), value);
 }
 
 bool TransformerCfg::parmValueAffectsOutputAttrs(const QString& parameter) const {

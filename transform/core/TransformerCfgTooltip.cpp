@@ -93,6 +93,9 @@ void TransformerCfg::substParametersForToolTips(QStringList& lines) const {
 }
 
 QString TransformerCfg::tooltipValue(const QString& parameter) const {
-  const QString text = getParameterDisplayValue(parameter, UnpackLevel::Decoded);
+  QString text = getParameterDisplayValue(parameter, UnpackLevel::Decoded);
+  if (text == kUnusedGroupBy && parameter == configured().fields.multiProcess) {
+    text.clear();
+  }
   return escaped(text.isEmpty() ? TransformResString(kNotSetMessage) : text, m_tooltipAsHtml);
 }

@@ -1,0 +1,147 @@
+#include <apps/orxt/Console.h>
+#include <apps/orxt/GenerateCommand.h>
+#include <apps/orxt/ProcessPool.h>
+#include <transform/registry/TransformerMgr.h>
+#include <translation/WorkspaceTranslation.h>
+
+#include <CLI/CLI.hpp>
+#include <QDir>
+#include <QFileInfo>
+
+namespace {
+
+constexpr CommandFacts kFacts = {"generate", "Write the mapping file of a workspace",
+                                 "orxt generate parcels.orw -o parcels.mf\n"
+                                 "orxt generate roads.orw --param MAX_SPEED=80 -o -\n"
+                                 "orxt generate nightly/*.orw -d out --jobs 4"};
+
+ExitStatus exitStatus(TranslationResult result) {
+  switch (result) {
+    case TranslationResult::Done:
+      return kExitDone;
+    case TranslationResult::Refused:
+      return kExitRefused;
+    case TranslationResult::Unreadable:
+    case TranslationResult::Unwritable:
+      break;
+  }
+  return kExitFile;
+}
+
+}  // namespace
+
+GenerateCommand::GenerateCommand() : Command(kFacts) {}
+
+void GenerateCommand::declare(CLI::App& app) {
+  app.add_option("workspace", m_workspaces, "Workspace files")->type_name("WORKSPACE")->required();
+  CLI::Option* output = app.add_option("-o,--output", m_output,
+                                       "Mapping file to write; - is standard output, which is the default")
+                            ->type_name("FILE");
+  app.add_option("-d,--directory", m_directory,
+                 "Folder for the mapping files of several workspaces (NAME.mf)")
+      ->type_name("DIR")
+      ->excludes(output);
+  app.add_option("--param", m_parameters, "Gives a global parameter another value (repeatable)")
+      ->type_name("NAME=VALUE")
+      ->expected(1)
+      ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+  app.add_option("-j,--jobs", m_jobs, "How many workspaces to work on at once")
+      ->type_name("N")
+      ->check(CLI::Range(1, 256))
+      ->capture_default_str();
+  m_definitions.declare(app);
+}
+
+bool GenerateCommand::planJobs(std::vector<Job>& jobs, Console& console) const {
+  if (m_directory.empty()) {
+    if (m_workspaces.size() > 1) {
+      console.fail(QStringLiteral("several workspaces need a folder for their mapping files: give -d DIR"));
+      return false;
+    }
+    jobs.push_back({QString::fromStdString(m_workspaces.front()),
+                    m_output.empty() ? QStringLiteral("-") : QString::fromStdString(m_output)});
+    return true;
+  }
+  const QString directory = QString::fromStdString(m_directory);
+  QHash<QString, QString> claimed;
+  for (const std::string& name : m_workspaces) {
+    const QString workspace = QString::fromStdString(name);
+    const QString base = workspace == QLatin1String("-") ? QStringLiteral("standard-input")
+                                                         : QFileInfo(workspace).completeBaseName();
+    const QString output = directory + QLatin1Char('/') + base + QLatin1String(".mf");
+    if (claimed.contains(output)) {
+      console.fail(QStringLiteral("%1 and %2 would both be written to %3; give them separately")
+                       .arg(claimed.value(output), workspace, output));
+      return false;
+    }
+    claimed.insert(output, workspace);
+    jobs.push_back({workspace, output});
+  }
+  return true;
+}
+
+bool GenerateCommand::readParameters(QHash<QString, QString>& values, Console& console) const {
+  for (const std::string& text : m_parameters) {
+    const QString setting = QString::fromStdString(text);
+    const int equals = setting.indexOf(QLatin1Char('='));
+    if (equals <= 0) {
+      console.fail(QStringLiteral("--param takes NAME=VALUE, not '%1'").arg(setting));
+      return false;
+    }
+    values.insert(setting.left(equals), setting.mid(equals + 1));
+  }
+  return true;
+}
+
+ExitStatus GenerateCommand::run(Console& console) {
+  std::vector<Job> jobs;
+  QHash<QString, QString> values;
+  if (!planJobs(jobs, console) || !readParameters(values, console))
+    return kExitUsage;
+  if (!m_directory.empty()) {
+    const QString directory = QString::fromStdString(m_directory);
+    if (!QDir().mkpath(directory)) {
+      console.failFile(directory, QStringLiteral("the folder cannot be made"));
+      return kExitFile;
+    }
+  }
+  TransformerMgr& registry = m_definitions.load(console);
+  if (jobs.size() == 1)
+    return runJob(jobs.front(), values, registry, console);
+  return runInProcesses(jobs, values, registry, console);
+}
+
+ExitStatus GenerateCommand::runJob(const Job& job, const QHash<QString, QString>& values,
+                                   TransformerSource& source, Console& console) const {
+  Diagnostics diagnostics(job.workspace);
+  QString error;
+  const TranslationResult result =
+      translateWorkspace({job.workspace, job.output, values}, source, diagnostics, error);
+  console.show(diagnostics);
+  if (result == TranslationResult::Unreadable)
+    console.failFile(job.workspace, error);
+  else if (result == TranslationResult::Unwritable)
+    console.fail(error);
+  return exitStatus(result);
+}
+
+ExitStatus GenerateCommand::runInProcesses(const std::vector<Job>& jobs,
+                                           const QHash<QString, QString>& values, TransformerSource& source,
+                                           Console& console) const {
+  int worst = kExitDone;
+  int done = 0;
+  const int count = static_cast<int>(jobs.size());
+  const auto work = [&](int job) {
+    return static_cast<int>(runJob(jobs[static_cast<std::size_t>(job)], values, source, console));
+  };
+  const auto finished = [&](int, int status) {
+    worst = std::max(worst, status);
+    console.showProgress(QStringLiteral("%1 of %2 workspaces").arg(++done).arg(count));
+  };
+  if (!runInPool(count, m_jobs, work, finished)) {
+    console.fail(QStringLiteral("no further process can be started"));
+    return kExitFile;
+  }
+  console.endProgress();
+  return static_cast<ExitStatus>(worst);
+}

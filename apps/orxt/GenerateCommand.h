@@ -1,0 +1,40 @@
+#pragma once
+
+#include <apps/orxt/Command.h>
+#include <apps/orxt/DefinitionOptions.h>
+
+#include <QHash>
+#include <QString>
+
+#include <string>
+#include <vector>
+
+class TransformerSource;
+
+class GenerateCommand : public Command {
+ public:
+  GenerateCommand();
+  void declare(CLI::App& app) override;
+  ExitStatus run(Console& console) override;
+
+ private:
+  struct Job {
+    QString workspace;
+    QString output;
+  };
+
+  // False, with the reason on the console, when the options do not go together.
+  bool planJobs(std::vector<Job>& jobs, Console& console) const;
+  bool readParameters(QHash<QString, QString>& values, Console& console) const;
+  ExitStatus runJob(const Job& job, const QHash<QString, QString>& values, TransformerSource& source,
+                    Console& console) const;
+  ExitStatus runInProcesses(const std::vector<Job>& jobs, const QHash<QString, QString>& values,
+                            TransformerSource& source, Console& console) const;
+
+  std::vector<std::string> m_workspaces;
+  std::string m_output;
+  std::string m_directory;
+  std::vector<std::string> m_parameters;
+  int m_jobs = 1;
+  DefinitionOptions m_definitions;
+};

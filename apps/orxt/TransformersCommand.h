@@ -1,0 +1,20 @@
+#pragma once
+
+#include <apps/orxt/Command.h>
+#include <apps/orxt/DefinitionOptions.h>
+
+#include <memory>
+#include <string>
+#include <vector>
+
+// The catalogue: `list` and `show`, each a small command of its own.
+class TransformersCommand : public Command {
+ public:
+  TransformersCommand();
+  void declare(CLI::App& app) override;
+  ExitStatus run(Console& console) override;
+
+ private:
+  std::vector<std::unique_ptr<Command>> m_commands;
+  CLI::App* m_app = nullptr;
+};

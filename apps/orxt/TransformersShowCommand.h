@@ -1,0 +1,24 @@
+#pragma once
+
+#include <apps/orxt/Command.h>
+#include <apps/orxt/DefinitionOptions.h>
+
+#include <string>
+
+class TransformerCfg;
+
+class TransformersShowCommand : public Command {
+ public:
+  TransformersShowCommand();
+  void declare(CLI::App& app) override;
+  ExitStatus run(Console& console) override;
+
+ private:
+  void showText(const TransformerCfg& cfg, Console& console) const;
+  void showJson(const TransformerCfg& cfg, Console& console) const;
+
+  std::string m_name;
+  std::string m_version = "newest";
+  bool m_json = false;
+  DefinitionOptions m_definitions;
+};

@@ -1,0 +1,150 @@
+// The command as a person runs it: what it prints where, and with which exit status it ends.
+#include <tests/support/QtPrinters.h>
+
+#include <QDir>
+#include <QFile>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QProcess>
+#include <QTemporaryDir>
+#include <gtest/gtest.h>
+
+namespace {
+
+struct Outcome {
+  int status;
+  QString out;
+  QString err;
+};
+
+Outcome orxt(const QStringList& arguments, const QString& folder = QString(),
+             const QString& outputFile = QString()) {
+  QProcess process;
+  QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+  environment.insert("LC_ALL", "C.UTF-8");
+  process.setProcessEnvironment(environment);
+  if (!folder.isEmpty())
+    process.setWorkingDirectory(folder);
+  if (!outputFile.isEmpty())
+    process.setStandardOutputFile(outputFile);
+  process.start(QStringLiteral(ORX_BINARY_DIR) + "/bin/orxt", arguments);
+  process.closeWriteChannel();
+  EXPECT_TRUE(process.waitForFinished(120000)) << arguments.join(' ').toStdString();
+  EXPECT_EQ(process.exitStatus(), QProcess::NormalExit) << arguments.join(' ').toStdString();
+  return {process.exitCode(), QString::fromUtf8(process.readAllStandardOutput()),
+          QString::fromUtf8(process.readAllStandardError())};
+}
+
+QString sample(const QString& name) {
+  return QStringLiteral(ORX_SOURCE_DIR) + "/samples/" + name;
+}
+
+QStringList samples() {
+  QStringList result;
+  for (const QString& name : QDir(QStringLiteral(ORX_SOURCE_DIR) + "/samples").entryList({"*.orw"}))
+    result << sample(name);
+  return result;
+}
+
+QByteArray readAll(const QString& path) {
+  QFile file(path);
+  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+void write(const QString& path, const QByteArray& bytes) {
+  QFile file(path);
+  ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+  ASSERT_EQ(file.write(bytes), bytes.size());
+}
+
+TEST(CommandLine, EndsWithTheStatusThatFits) {
+  QTemporaryDir folder;
+  write(folder.filePath("empty.orw"), "");
+  write(folder.filePath("cut.orw"), readAll(samples().first()).left(3000));
+  const QString good = samples().first();
+  const struct {
+    QStringList arguments;
+    int status;
+    const char* out;  // a piece of what is printed; empty: nothing may be printed
+    const char* err;
+  } cases[] = {
+      {{"--help"}, 0, "Example:", ""},
+      {{"--version"}, 0, "orxt ", ""},
+      {{"generate", "--help"}, 0, "--param NAME=VALUE", ""},
+      {{"transformers", "show", "--help"}, 0, "Example:", ""},
+      {{}, 2, "", "generate"},
+      {{"frobnicate"}, 2, "", "frobnicate"},
+      {{"generate"}, 2, "", "workspace"},
+      {{"generate", good, good}, 2, "", "give -d DIR"},
+      {{"generate", good, good, "-d", "out"}, 2, "", "give them separately"},
+      {{"generate", good, "-o", "x", "-d", "y"}, 2, "", "excludes"},
+      {{"generate", good, "--param", "novalue"}, 2, "", "NAME=VALUE"},
+      {{"generate", good, "--param", "NO_SUCH=1"}, 1, "", "NO_SUCH"},
+      {{"generate", "missing.orw"}, 3, "", "missing.orw: error: "},
+      {{"generate", "empty.orw"}, 1, "", "empty.orw:1: error: "},
+      {{"generate", "cut.orw", "-o", "cut.mf"}, 1, "", "cut.orw:"},
+      {{"generate", good, "-o", "/dev/full"}, 3, "", "/dev/full"},
+      {{"generate", good, "-o", "no/such/folder/x.mf"}, 3, "", "no/such/folder/x.mf"},
+      {{"generate", good}, 0, "FACTORY_DEF * ", ""},
+      {{"generate", good, "-o", "-"}, 0, "FACTORY_DEF * ", ""},
+      {{"transformers", "list"}, 0, "GeometryBufferer", ""},
+      {{"transformers", "list", "--category", "No Such"}, 1, "", "there are: "},
+      {{"transformers", "show", "GeometryBufferer"}, 0, "Parameters", ""},
+      {{"transformers", "show", "NoSuchThing"}, 1, "", "NoSuchThing"},
+      {{"transformers", "show", "GeometryBufferer", "--version", "99"}, 1, "", "99"},
+      {{"transformers", "show", "GeometryBufferer", "--version", "new"}, 2, "", "new"},
+  };
+  for (const auto& test : cases) {
+    const Outcome run = orxt(test.arguments, folder.path());
+    const std::string line = test.arguments.join(' ').toStdString();
+    EXPECT_EQ(run.status, test.status) << line << "\n" << run.err.toStdString();
+    EXPECT_TRUE(*test.out ? run.out.contains(test.out) : run.out.isEmpty()) << line << "\n"
+                                                                            << run.out.toStdString();
+    EXPECT_TRUE(*test.err ? run.err.contains(test.err) : run.err.isEmpty()) << line << "\n"
+                                                                            << run.err.toStdString();
+  }
+  EXPECT_FALSE(QFile::exists(folder.filePath("cut.mf")));
+}
+
+TEST(CommandLine, GeneratesManyWorkspacesAtOnce) {
+  QTemporaryDir folder;
+  write(folder.filePath("broken.orw"), "#! <WORKSPACE><TRANSFORMERS>\n");
+  QStringList arguments = {"generate", "-d", "out", "--jobs", "3", "broken.orw"};
+  arguments += samples();
+  const Outcome run = orxt(arguments, folder.path());
+  EXPECT_EQ(run.status, 1);
+  EXPECT_TRUE(run.err.startsWith("broken.orw")) << run.err.toStdString();
+  const QDir out(folder.filePath("out"));
+  EXPECT_EQ(out.entryList(QDir::Files).size(), samples().size());
+  for (const QString& name : out.entryList(QDir::Files))
+    EXPECT_EQ(readAll(out.filePath(name)), readAll(sample(name))) << name.toStdString();
+}
+
+TEST(CommandLine, StandardOutputThatTakesNothingIsAnError) {
+  for (const QStringList& arguments :
+       {QStringList{"transformers", "list"}, QStringList{"generate", samples().first()}}) {
+    const Outcome run = orxt(arguments, QString(), "/dev/full");
+    EXPECT_EQ(run.status, 3) << arguments.join(' ').toStdString();
+    EXPECT_NE(run.err, QString());
+  }
+}
+
+TEST(CommandLine, TheCatalogueAsJson) {
+  const Outcome list = orxt({"transformers", "list", "--json", "--lang", "de"});
+  const QJsonArray entries = QJsonDocument::fromJson(list.out.toUtf8()).array();
+  EXPECT_GE(entries.size(), 20);
+  QString previous;
+  for (const QJsonValue& entry : entries) {
+    const QString name = entry.toObject().value("name").toString();
+    EXPECT_LT(previous, name);
+    previous = name;
+    EXPECT_FALSE(entry.toObject().value("summary").toString().isEmpty()) << name.toStdString();
+  }
+  const Outcome show = orxt({"transformers", "show", "GeometryBufferer", "--json"});
+  const QJsonObject shown = QJsonDocument::fromJson(show.out.toUtf8()).object();
+  EXPECT_EQ(shown.value("name").toString(), QString("GeometryBufferer"));
+  EXPECT_FALSE(shown.value("parameters").toArray().isEmpty());
+}
+
+}  // namespace

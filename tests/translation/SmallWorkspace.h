@@ -1,0 +1,142 @@
+// Small workspaces for tests: a document put together element by element, and transformers that need no
+// files.
+#pragma once
+
+#include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerDefinition.h>
+#include <transform/core/TransformerSource.h>
+
+#include <QFile>
+#include <QString>
+#include <QStringList>
+#include <QTemporaryDir>
+
+class SmallWorkspace {
+ public:
+  SmallWorkspace& header(const QString& line) {
+    m_header += line + "\n";
+    return *this;
+  }
+  SmallWorkspace& parameter(const QString& guiLine, const QString& value) {
+    m_parameters += element("GLOBAL_PARAMETER", {"GUI_LINE", guiLine, "DEFAULT_VALUE", value});
+    return *this;
+  }
+  SmallWorkspace& reader(int id, const QString& name, const QStringList& attributes = {}) {
+    return featureType(id, name, "true", attributes);
+  }
+  SmallWorkspace& writer(int id, const QString& name) { return featureType(id, name, "false", {}); }
+  // `parameters` are name, value, name, value; `extra` are further attributes of the element.
+  SmallWorkspace& transformer(int id, const QString& type, const QStringList& parameters,
+                              const QStringList& extra = {}, const QString& children = QString()) {
+    QString inner = children;
+    for (int i = 0; i + 1 < parameters.size(); i += 2)
+      inner += element("XFORM_PARM", {"PARM_NAME", parameters.at(i), "PARM_VALUE", parameters.at(i + 1)});
+    m_transformers +=
+        element("TRANSFORMER", QStringList{"IDENTIFIER", QString::number(id), "TYPE", type} + extra, inner);
+    return *this;
+  }
+  SmallWorkspace& link(int from, const QString& output, int to, const QString& input,
+                       const QStringList& extra = {}) {
+    m_links += element("FEAT_LINK", QStringList{"IDENTIFIER", QString::number(++m_linkCount), "SOURCE_NODE",
+                                                QString::number(from), "TARGET_NODE", QString::number(to),
+                                                "SOURCE_PORT_DESC", output, "TARGET_PORT_DESC", input} +
+                                        extra);
+    return *this;
+  }
+  SmallWorkspace& attributeLink(int from, const QString& output, int to, const QString& input) {
+    m_attributeLinks +=
+        element("ATTR_LINK", {"IDENTIFIER", "900", "SOURCE_NODE", QString::number(from), "TARGET_NODE",
+                              QString::number(to), "SOURCE_PORT_DESC", output, "TARGET_PORT_DESC", input});
+    return *this;
+  }
+
+  QString text() const {
+    const QString xml = "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n<WORKSPACE>\n<FEATURE_TYPES>\n" +
+                        m_featureTypes + "</FEATURE_TYPES>\n<GLOBAL_PARAMETERS>\n" + m_parameters +
+                        "</GLOBAL_PARAMETERS>\n<TRANSFORMERS>\n" + m_transformers +
+                        "</TRANSFORMERS>\n<FEAT_LINKS>\n" + m_links + "</FEAT_LINKS>\n<ATTR_LINKS>\n" +
+                        m_attributeLinks + "</ATTR_LINKS>\n</WORKSPACE>\n";
+    QString result;
+    for (const QString& line : xml.split('\n', Qt::SkipEmptyParts))
+      result += "#! " + line + "\n";
+    return result + "#! START_HEADER\n" + m_header + "#! END_HEADER\n";
+  }
+  QString save(const QTemporaryDir& folder, const QString& name = "test.orw") const {
+    const QString path = folder.filePath(name);
+    QFile file(path);
+    if (!file.open(QIODevice::WriteOnly) || file.write(text().toUtf8()) < 0)
+      return QString();
+    return path;
+  }
+
+ private:
+  static QString element(const QString& name, const QStringList& attributes,
+                         const QString& inner = QString()) {
+    QString result = "<" + name;
+    for (int i = 0; i + 1 < attributes.size(); i += 2)
+      result +=
+          " " + attributes.at(i) + "=\"" + attributes.at(i + 1).toHtmlEscaped().replace("\n", "&#10;") + "\"";
+    return inner.isEmpty() ? result + "/>\n" : result + ">\n" + inner + "</" + name + ">\n";
+  }
+  SmallWorkspace& featureType(int id, const QString& name, const QString& isSource,
+                              const QStringList& attributes) {
+    QString inner;
+    for (const QString& attribute : attributes)
+      inner += element("FEAT_ATTRIBUTE", {"ATTR_NAME", attribute});
+    m_featureTypes += element("FEATURE_TYPE",
+                              {"IS_SOURCE", isSource, "FEATURE_TYPE_NAME", name, "IDENTIFIER",
+                               QString::number(id), "KEYWORD", "DATA"},
+                              inner);
+    return *this;
+  }
+
+  QString m_header;
+  QString m_parameters;
+  QString m_featureTypes;
+  QString m_transformers;
+  QString m_links;
+  QString m_attributeLinks;
+  int m_linkCount = 0;
+};
+
+// Makes the transformers "Copy" (INPUT to OUTPUT, REST), "Join" (LEFT, RIGHT to OUTPUT) and "Pick" (a lookup
+// choice).
+class SmallSource : public TransformerSource {
+ public:
+  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override {
+    TransformerDefinition definition;
+    definition.name = name;
+    definition.version = 1;
+    if (version != 1 && version != 0 && version != kNewestVersion)
+      return nullptr;
+    definition.preservesAttributes = QStringList{"<ALL>"};
+    definition.inputTags = QStringList{"INPUT"};
+    definition.outputTags = QStringList{"OUTPUT", "REST"};
+    QString parameter = "VALUE";
+    QString type = "OPTIONAL TEXT";
+    if (name == "Join") {
+      definition.inputTags = QStringList{"LEFT", "RIGHT:R"};
+      definition.outputTags = QStringList{"OUTPUT"};
+    } else if (name == "Pick") {
+      parameter = "MODE";
+      type = "LOOKUP_CHOICE Fast,fast%Slow<space>one,slow";
+    } else if (name != "Copy") {
+      return nullptr;
+    }
+    definition.parameterNames = QStringList{parameter};
+    definition.parameterTypes = QStringList{type};
+    definition.parameterPrompts = QStringList{"Value"};
+    definition.parameterDefaults = QStringList{""};
+    definition.templateLines =
+        QStringList{"FACTORY_DEF * " + name + "Factory FACTORY_NAME $(XFORMER_NAME) $(INPUT_LINES) P $(" +
+                    parameter + ")"};
+    for (const QString& tag : definition.outputTags) {
+      definition.templateLines << "FACTORY_DEF * TeeFactory INPUT FEATURE_TYPE $(XFORMER_NAME_ENCODED)|" +
+                                      tag + " OUTPUT FEATURE_TYPE $(OUTPUT_" + tag + "_FTYPE) $(OUTPUT_" +
+                                      tag + "_FUNCS)";
+    }
+    auto cfg = std::make_unique<TransformerCfg>();
+    cfg->configure(definition);
+    return cfg;
+  }
+};

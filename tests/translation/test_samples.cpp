@@ -1,0 +1,39 @@
+// The shipped samples against their reference output (scripts/renew-samples writes it).
+#include <platform/session/session.h>
+#include <tests/support/QtPrinters.h>
+#include <transform/registry/TransformerMgr.h>
+#include <translation/WorkspaceTranslation.h>
+
+#include <QDir>
+#include <QTemporaryDir>
+#include <gtest/gtest.h>
+
+namespace {
+
+QByteArray readAll(const QString& path) {
+  QFile file(path);
+  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+TEST(Samples, GiveTheirReferenceOutput) {
+  ORXSession session;
+  TransformerMgr& registry = TransformerMgr::getTransformerMgr();
+  registry.loadTransformers(&session);
+  const QDir samples(QStringLiteral(ORX_SOURCE_DIR) + "/samples");
+  const QStringList names = samples.entryList({"*.orw"});
+  ASSERT_GE(names.size(), 3);
+  QTemporaryDir folder;
+  for (const QString& name : names) {
+    const QString file = samples.filePath(name);
+    const QString output = folder.filePath("out.mf");
+    Diagnostics diagnostics(file);
+    QString error;
+    EXPECT_EQ(translateWorkspace({file, output, {}}, registry, diagnostics, error), TranslationResult::Done)
+        << name.toStdString();
+    for (const Diagnostic& diagnostic : diagnostics.all())
+      ADD_FAILURE() << formatDiagnostic(diagnostic).toStdString();
+    EXPECT_EQ(readAll(output), readAll(samples.filePath(name.chopped(4) + ".mf"))) << name.toStdString();
+  }
+}
+
+}  // namespace

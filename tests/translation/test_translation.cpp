@@ -1,0 +1,342 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <tests/support/QtPrinters.h>
+#include <tests/translation/SmallWorkspace.h>
+#include <translation/WorkspaceTranslation.h>
+
+#include <QRegularExpression>
+#include <gtest/gtest.h>
+
+namespace {
+
+struct Outcome {
+  TranslationResult result;
+  QStringList diagnostics;  // "line rule node"
+  QString text;
+};
+
+QStringList describe(const Diagnostics& diagnostics) {
+  QStringList result;
+  for (const Diagnostic& diagnostic : diagnostics.all()) {
+    EXPECT_FALSE(diagnostic.text.isEmpty()) << diagnosticRule(diagnostic.rule).name.latin1();
+    result << QString("%1 %2").arg(diagnosticRule(diagnostic.rule).name, diagnostic.node);
+  }
+  return result;
+}
+
+QString readAll(const QString& path) {
+  QFile file(path);
+  return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
+}
+
+Outcome translate(const SmallWorkspace& workspace, const QHash<QString, QString>& values = {}) {
+  QTemporaryDir folder;
+  SmallSource source;
+  const QString file = workspace.save(folder);
+  Diagnostics diagnostics(file);
+  QString error;
+  const QString output = folder.filePath("out.mf");
+  Outcome outcome;
+  outcome.result = translateWorkspace({file, output, values}, source, diagnostics, error);
+  EXPECT_EQ(error, QString());
+  outcome.diagnostics = describe(diagnostics);
+  // Continuation lines joined and padding dropped: what is compared is the statements.
+  outcome.text = readAll(output)
+                     .replace(QRegularExpression(" +\\\\\n"), " ")
+                     .replace(QRegularExpression(" +"), " ")
+                     .replace("\n\n", "\n");
+  return outcome;
+}
+
+SmallWorkspace copyBetween() {
+  SmallWorkspace workspace;
+  workspace.reader(1, "Parcels", {"id", "area"})
+      .writer(2, "Flooded")
+      .transformer(3, "Copy", {"XFORMER_NAME", "C"});
+  workspace.link(1, "fo 0 Parcels", 3, "fi 0 INPUT").link(3, "fo 0 OUTPUT", 2, "fi 0");
+  return workspace;
+}
+
+TEST(Translation, WritesTheStatementsInOrder) {
+  SmallWorkspace workspace = copyBetween();
+  workspace.header("# kept as it stands ").header("MACRO Set 1");
+  workspace.parameter("GUI TEXT Set Prompt", "2").parameter("GUI TEXT Free Prompt", "a b");
+  const Outcome outcome = translate(workspace, {{"Free", "c"}});
+  EXPECT_EQ(outcome.result, TranslationResult::Done);
+  EXPECT_EQ(outcome.diagnostics, QStringList());
+  const QStringList lines = outcome.text.split('\n', Qt::SkipEmptyParts);
+  ASSERT_EQ(lines.size(), 8) << outcome.text.toStdString();
+  EXPECT_TRUE(lines.at(0).startsWith("# Written by orxt "));
+  EXPECT_EQ(lines.mid(1),
+            (QStringList{
+                "# kept as it stands ",
+                "MACRO Set 1",
+                "DEFAULT_MACRO Free a b",
+                "MACRO Free c",
+                "FACTORY_DEF * CopyFactory FACTORY_NAME C INPUT INPUT FEATURE_TYPE Parcels P ",
+                "FACTORY_DEF * TeeFactory INPUT FEATURE_TYPE C|OUTPUT OUTPUT FEATURE_TYPE C_OUTPUT ",
+                "FACTORY_DEF * TeeFactory FACTORY_NAME \"DATA Flooded Output Renamer/Nuker\" "
+                "INPUT FEATURE_TYPE C_OUTPUT OUTPUT FEATURE_TYPE Flooded",
+            }));
+}
+
+TEST(Translation, FlowsKeepApart) {
+  SmallWorkspace workspace;
+  // The writer keeps its name, the readers give way; the transformer's own flow name is taken by a reader.
+  workspace.reader(1, "Roads").reader(2, "Roads").reader(4, "C_OUTPUT").writer(3, "Roads");
+  workspace.transformer(5, "Copy", {"XFORMER_NAME", "C"});
+  for (const int reader : {1, 2, 4})
+    workspace.link(reader, "fo 0", 5, "fi 0 INPUT");
+  workspace.link(5, "fo 0 OUTPUT", 3, "fi 0");
+  const QString text = translate(workspace).text;
+  for (const char* statement :
+       {"READER_FEATURE_TYPE DATA Roads Roads_2\n", "READER_FEATURE_TYPE DATA Roads Roads_3\n",
+        "INPUT INPUT FEATURE_TYPE Roads_2 INPUT INPUT FEATURE_TYPE Roads_3 INPUT INPUT FEATURE_TYPE C_OUTPUT "
+        "P",
+        "INPUT FEATURE_TYPE C|OUTPUT OUTPUT FEATURE_TYPE C_OUTPUT_2 ",
+        "INPUT FEATURE_TYPE C_OUTPUT_2 OUTPUT FEATURE_TYPE Roads\n"})
+    EXPECT_TRUE(text.contains(statement)) << statement << "\n" << text.toStdString();
+}
+
+TEST(Translation, SourcesOfOneInputStandInTheirOrder) {
+  struct {
+    const char* promise;
+    QString order;              // of the input port
+    QList<int> executionIndex;  // of the links from A, B, C
+    const char* expected;
+  } const cases[] = {
+      {"document order", "", {-1, -1, -1}, "A B C"},
+      {"execution index from 0 up, others behind", "", {-1, 1, 0}, "C B A"},
+      {"the port's order first", "INPUT B A", {0, 1, 2}, "B A C"},
+      {"an order of another port does nothing", "REST B A", {-1, -1, -1}, "A B C"},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.reader(1, "A").reader(2, "B").reader(3, "C");
+    workspace.transformer(4, "Copy", {"XFORMER_NAME", "T"}, {"INPUT_FT_ORDER", test.order});
+    for (int reader = 1; reader <= 3; ++reader) {
+      workspace.link(reader, "fo 0", 4, "fi 0 INPUT",
+                     {"EXECUTION_IDX", QString::number(test.executionIndex.at(reader - 1))});
+    }
+    QStringList found;
+    QRegularExpressionMatchIterator match =
+        QRegularExpression("INPUT INPUT FEATURE_TYPE (\\w)").globalMatch(translate(workspace).text);
+    while (match.hasNext())
+      found << match.next().captured(1);
+    EXPECT_EQ(found.join(' '), QString(test.expected)) << test.promise;
+  }
+}
+
+TEST(Translation, PortsAreFoundByNameNumberAndAlias) {
+  const struct {
+    const char* promise;
+    const char* output;
+    const char* input;
+    const char* expected;
+  } cases[] = {
+      {"by name", "fo 9 REST", "fi 9 RIGHT", "C_REST RIGHT"},
+      {"by number through the record's ports", "fo 0", "fi 1", "C_REST RIGHT"},
+      {"by alias", "fo 0 OUTPUT", "fi 0 R", "C_OUTPUT RIGHT"},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.transformer(1, "Copy", {"XFORMER_NAME", "C"}, {},
+                          "<OUTPUT_FEAT NAME=\"REST\"/>\n<OUTPUT_FEAT NAME=\"OUTPUT\"/>\n");
+    workspace.transformer(2, "Join", {"XFORMER_NAME", "J"}).link(1, test.output, 2, test.input);
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.diagnostics, QStringList()) << test.promise;
+    const QStringList words = QString(test.expected).split(' ');
+    // The alias of RIGHT is what stands in the mapping file.
+    EXPECT_TRUE(outcome.text.contains("INPUT R FEATURE_TYPE " + words.at(0))) << outcome.text.toStdString();
+  }
+}
+
+TEST(Translation, DisabledNodesAndLinksAreLeftOut) {
+  SmallWorkspace workspace = copyBetween();
+  workspace.transformer(4, "NoSuchThing", {"XFORMER_NAME", "D"}, {"ENABLED", "false"});
+  workspace.link(3, "fo 1 REST", 4, "fi 0 INPUT").link(1, "fo 0", 2, "fi 0", {"ENABLED", "false"});
+  const Outcome outcome = translate(workspace);
+  EXPECT_EQ(outcome.diagnostics, QStringList());
+  EXPECT_FALSE(outcome.text.contains("REST"));
+  EXPECT_FALSE(outcome.text.contains("INPUT FEATURE_TYPE Parcels OUTPUT"));
+}
+
+TEST(Translation, AttributeLinksCopyAttributes) {
+  SmallWorkspace workspace = copyBetween();
+  workspace.attributeLink(1, "ao 0 0 id", 3, "ai 0 0 parcel<space>id")
+      .attributeLink(3, "ao 0 0 area", 2, "ai 0 0 size");
+  workspace.attributeLink(3, "ao 0 0 id", 2, "ai 0 1 id");
+  const QString text = translate(workspace).text;
+  for (const char* statement :
+       {"INPUT FEATURE_TYPE Parcels OUTPUT FEATURE_TYPE Parcels_2 @CopyAttribute(parcel<space>id,id)\n",
+        "INPUT INPUT FEATURE_TYPE Parcels_2 P", "C_OUTPUT @CopyAttribute(size,area)\n"})
+    EXPECT_TRUE(text.contains(statement)) << statement << "\n" << text.toStdString();
+  EXPECT_FALSE(text.contains("(id,id)"));
+}
+
+TEST(Translation, RunTimeLookupsComeBeforeTheStatementThatUsesThem) {
+  SmallWorkspace workspace;
+  workspace.parameter("GUI TEXT Speed Prompt", "Fast")
+      .transformer(1, "Pick", {"XFORMER_NAME", "P", "MODE", "$(Speed)"});
+  const QString text = translate(workspace).text;
+  const int lookup = text.indexOf("INCLUDE [ switch {$(Speed)} {");
+  EXPECT_GT(lookup, 0) << text.toStdString();
+  EXPECT_GT(text.indexOf("PickFactory"), lookup);
+}
+
+TEST(Translation, RefusesWhatItCannotTranslate) {
+  const auto with = [](const std::function<void(SmallWorkspace&)>& change) {
+    SmallWorkspace workspace = copyBetween();
+    change(workspace);
+    return workspace;
+  };
+  const struct {
+    SmallWorkspace workspace;
+    QStringList diagnostics;
+  } cases[] = {
+      {with([](auto& w) {
+         w.transformer(7, "Nothing", {"XFORMER_NAME", "N"});
+       }),
+       {"unknown-transformer N"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "N"}, {"VERSION", "9"});
+       }),
+       {"unknown-version N"}},
+      {with([](auto& w) {
+         w.transformer(7, "SubDocumentTransformer", {"XFORMER_NAME", "N"});
+       }),
+       {"custom-transformer N"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"COLOUR", "red"});
+       }),
+       {"unknown-parameter Copy_7"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "C"});
+       }),
+       {"duplicate-name C"}},
+      {with([](auto& w) {
+         w.transformer(1, "Copy", {"XFORMER_NAME", "N"});
+       }),
+       {"duplicate-number N"}},
+      {with([](auto& w) { w.link(3, "fo 0 OUTPUT", 77, "fi 0"); }), {"dangling-link "}},
+      {with([](auto& w) { w.link(2, "fo 0", 3, "fi 0 INPUT"); }), {"bad-port Flooded"}},
+      {with([](auto& w) { w.link(3, "xo 0 OUTPUT", 2, "fi 0"); }), {"bad-port C"}},
+      {with([](auto& w) { w.link(3, "fo 0 OUTPUT", 2, "fo 0"); }), {"bad-port Flooded"}},
+      {with([](auto& w) { w.link(1, "fo 0", 3, "fi 0 MIDDLE"); }), {"unknown-input C"}},
+      {with([](auto& w) { w.link(3, "fo 2", 2, "fi 0"); }), {"unknown-output C"}},
+      {with([](auto& w) { w.link(3, "fo 1 REST", 3, "fi 0 INPUT"); }), {"cycle C"}},
+      {with([](auto& w) { w.parameter("nonsense", ""); }), {"bad-prompt-line "}},
+      {with([](auto& w) { w.parameter("GUI TEXT A P", "$[B"); }), {"unclosed-reference "}},
+      {with([](auto& w) { w.parameter("GUI TEXT A P", "a\nb"); }), {"line-break "}},
+      {with([](auto& w) { w.reader(9, "$[B]$[").link(9, "fo 0", 3, "fi 0 INPUT"); }),
+       {"unclosed-reference $[B]$["}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "$[x"});
+       }),
+       {"unwritable-value N"}},
+      {with([](auto& w) {
+         w.transformer(7, "Nothing", {})
+             .transformer(8, "Copy", {"XFORMER_NAME", "C"})
+             .link(3, "fo 8", 2, "fi 0");
+       }),
+       {"unknown-transformer Nothing_7", "duplicate-name C", "unknown-output C"}},
+  };
+  for (const auto& test : cases) {
+    const Outcome outcome = translate(test.workspace);
+    EXPECT_EQ(outcome.diagnostics, test.diagnostics);
+    EXPECT_EQ(outcome.result, TranslationResult::Refused);
+    EXPECT_EQ(outcome.text, QString());
+  }
+}
+
+TEST(Translation, EveryRuleHasItsTextInEveryLanguage) {
+  int place = 0;
+  for (const DiagnosticRule& rule : diagnosticRules()) {
+    EXPECT_EQ(static_cast<int>(rule.rule), place++);
+    if (rule.message == 0)
+      continue;
+    QStringList texts;
+    for (const char* language : {"en", "de", "fr"}) {
+      QORXSetLanguage(language);
+      Diagnostics diagnostics("f");
+      diagnostics.report(rule.rule, 1, "n", {"one", "two", "three"});
+      texts << diagnostics.all().front().text;
+    }
+    QORXSetLanguage("en");
+    EXPECT_FALSE(texts.contains(QString())) << rule.name.latin1();
+    EXPECT_EQ(texts.removeDuplicates(), 0) << rule.name.latin1();
+  }
+}
+
+TEST(Translation, FilesThatCannotBeReadOrWritten) {
+  QTemporaryDir folder;
+  SmallSource source;
+  const QString good = copyBetween().save(folder);
+  const auto run = [&](const QString& input, const QString& output, QString& error) {
+    Diagnostics diagnostics(input);
+    return translateWorkspace({input, output, {}}, source, diagnostics, error);
+  };
+  QString error;
+  EXPECT_EQ(run(folder.filePath("missing.orw"), folder.filePath("o"), error), TranslationResult::Unreadable);
+  EXPECT_NE(error, QString());
+  EXPECT_EQ(run(folder.path(), folder.filePath("o"), error), TranslationResult::Unreadable);
+
+  for (const QString& output : {QString("/dev/full"), folder.filePath("no/such/folder/o")}) {
+    error.clear();
+    EXPECT_EQ(run(good, output, error), TranslationResult::Unwritable) << output.toStdString();
+    EXPECT_NE(error, QString());
+  }
+
+  // What stood there before stays when the workspace is refused.
+  const QString output = folder.filePath("kept.mf");
+  QFile kept(output);
+  ASSERT_TRUE(kept.open(QIODevice::WriteOnly));
+  kept.write("before");
+  kept.close();
+  SmallWorkspace broken = copyBetween();
+  broken.transformer(7, "Nothing", {});
+  EXPECT_EQ(run(broken.save(folder, "broken.orw"), output, error), TranslationResult::Refused);
+  EXPECT_EQ(readAll(output), QString("before"));
+  EXPECT_EQ(run(good, output, error), TranslationResult::Done);
+  EXPECT_NE(readAll(output), QString("before"));
+}
+
+TEST(Translation, TruncatedDocumentsAreRefused) {
+  QTemporaryDir folder;
+  SmallSource source;
+  const QByteArray whole = copyBetween().text().toUtf8();
+  const int end = whole.indexOf("#! </WORKSPACE>");
+  for (int length = 0; length < end; length += 7) {
+    const QString path = folder.filePath("cut.orw");
+    QFile file(path);
+    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+    file.write(whole.left(length));
+    file.close();
+    Diagnostics diagnostics(path);
+    QString error;
+    EXPECT_EQ(translateWorkspace({path, folder.filePath("o"), {}}, source, diagnostics, error),
+              TranslationResult::Refused)
+        << length;
+    EXPECT_TRUE(diagnostics.hasErrors()) << length;
+  }
+}
+
+TEST(Translation, TheSameDocumentGivesTheSameBytes) {
+  QString first;
+  for (int run = 0; run < 3; ++run) {
+    QTemporaryDir folder;
+    SmallSource source;
+    SmallWorkspace workspace = copyBetween();
+    workspace.parameter("GUI TEXT Speed Prompt", "Fast")
+        .transformer(8, "Pick", {"XFORMER_NAME", "P", "MODE", "$(Speed)"});
+    const QString file = workspace.save(folder, QString("name%1.orw").arg(run));
+    Diagnostics diagnostics(file);
+    QString error;
+    const QString output = folder.filePath("out");
+    ASSERT_EQ(translateWorkspace({file, output, {}}, source, diagnostics, error), TranslationResult::Done);
+    if (run == 0)
+      first = readAll(output);
+    EXPECT_EQ(readAll(output), first);
+  }
+}
+
+}  // namespace
