@@ -1,6 +1,8 @@
 #include <transform/workspace/DocumentGuard.h>
 #include <transform/workspace/DocumentLimits.h>
 
+#include <algorithm>
+
 bool DocumentGuard::refuse(const QString& message) {
   m_refusal = message;
   return false;
@@ -14,10 +16,51 @@ bool DocumentGuard::enter(State state) {
   return true;
 }
 
+// Passes over units that mean nothing in the present state; answers how many.
+int DocumentGuard::skipPlain(const ushort* units, int size) {
+  const auto bit = [](char unit) { return Q_UINT64_C(1) << unit; };
+  quint64 stops = bit('\0') | bit('\n') | bit('\r');
+  switch (m_state) {
+    case State::Text:
+      stops |= bit('<');
+      break;
+    case State::DoubleQuoted:
+      stops |= bit('"');
+      break;
+    case State::SingleQuoted:
+      stops |= bit('\'');
+      break;
+    case State::Tag:
+      stops |= bit('"') | bit('\'') | bit('/') | bit('>');
+      break;
+    case State::EndTag:
+      stops |= bit('>');
+      break;
+    default:
+      return 0;
+  }
+  // The last unit that the limit allows is looked at in full.
+  const int end = static_cast<int>(std::min<qint64>(size, limits::kValueLength - m_runLength));
+  int at = 0;
+  while (at < end && (units[at] >= 64 || (stops >> units[at] & 1) == 0) &&
+         (m_replacement == 0 || units[at] != m_replacement))
+    ++at;
+  if (at > 0) {
+    m_runLength += at;
+    m_column += at;
+    m_afterReturn = false;
+    m_previous = 0;
+  }
+  return at;
+}
+
 int DocumentGuard::check(const ushort* units, int size) {
   if (hasRefused())
     return 0;
   for (int i = 0; i < size; ++i) {
+    i += skipPlain(units + i, size - i);
+    if (i == size)
+      break;
     const ushort unit = units[i];
     if (unit == 0 || (m_replacement != 0 && unit == m_replacement)) {
       refuse(QStringLiteral("A null character, or bytes that are not valid in the document's encoding"));
@@ -38,7 +81,7 @@ int DocumentGuard::check(const ushort* units, int size) {
     } else if (unit == '\r') {
       ++m_line;
       m_column = 1;
-    } else if (!QChar::isLowSurrogate(unit)) {
+    } else {
       ++m_column;
     }
     m_afterReturn = unit == '\r';

@@ -40,6 +40,7 @@ class DocumentGuard {
     Instruction
   };
 
+  int skipPlain(const ushort* units, int size);
   bool take(ushort unit);
   bool takeOpen(ushort unit);
   bool takeTag(ushort unit);

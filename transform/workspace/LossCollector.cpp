@@ -5,21 +5,11 @@ using XERCES_CPP_NAMESPACE::XMLString;
 
 namespace {
 
-bool isNamed(const LossCollector::Element& element, const Word& name) {
-  return XMLString::equals(element.getTagName(), name.text);
-}
-
 template <class Visitor>
-void eachAttribute(const LossCollector::Element& element, Visitor&& visit) {
+void eachAttribute(const ElementTable::Element& element, Visitor&& visit) {
   const auto* const attributes = element.getAttributes();
   for (XMLSize_t i = 0; i < attributes->getLength(); ++i)
     visit(*static_cast<const DOMAttr*>(attributes->item(i)));
-}
-
-template <class Visitor>
-void eachChild(const LossCollector::Element& element, Visitor&& visit) {
-  for (const auto* child = element.getFirstElementChild(); child; child = child->getNextElementSibling())
-    visit(*child);
 }
 
 // Whether the text says something else than its absence would.
@@ -35,24 +25,27 @@ bool differsFromDefault(const AttributeRule<R>& rule, const XMLCh* text) {
 
 }  // namespace
 
-void LossCollector::report(Kind kind, const Element& element, const QString& attribute,
-                           const QString& value) {
-  m_losses.push_back(
-      {kind, m_lines.lineOf(&element, m_cursor), fromXml(element.getTagName()), attribute, value});
+bool LossCollector::isNamed(Place element, const Word& name) const {
+  return XMLString::equals(m_elements.element(element).getTagName(), name.text);
 }
 
-void LossCollector::allAttributes(const Element& element) {
-  eachAttribute(element, [&](const DOMAttr& attribute) {
+void LossCollector::report(Kind kind, Place element, const QString& attribute, const QString& value) {
+  m_losses.push_back(
+      {kind, m_elements.line(element), fromXml(m_elements.element(element).getTagName()), attribute, value});
+}
+
+void LossCollector::allAttributes(Place element) {
+  eachAttribute(m_elements.element(element), [&](const DOMAttr& attribute) {
     report(Kind::UnknownAttribute, element, fromXml(attribute.getName()), fromXml(attribute.getValue()));
   });
 }
 
-void LossCollector::everything(const Element& holder, Kind kind) {
+void LossCollector::everything(Place holder, Kind kind) {
   allAttributes(holder);
-  eachChild(holder, [&](const Element& element) { report(kind, element); });
+  m_elements.eachChild(holder, [&](Place element) { report(kind, element); });
 }
 
-void LossCollector::document(const Element& root) {
+void LossCollector::document(Place root) {
   const bool isKnown = isNamed(root, words::kWorkspace) || isNamed(root, words::kDatasource) ||
                        isNamed(root, words::kEtlTool) || isNamed(root, words::kTransformer);
   if (!isKnown)
@@ -60,15 +53,15 @@ void LossCollector::document(const Element& root) {
   sections(root, true);
 }
 
-void LossCollector::sections(const Element& parent, bool isMain) {
-  eachChild(parent, [&](const Element& element) {
+void LossCollector::sections(Place parent, bool isMain) {
+  m_elements.eachChild(parent, [&](Place element) {
     const bool isKnown = documentSection(element) || (isMain && mainSection(element));
     if (!isKnown)
       report(Kind::UnknownElement, element);
   });
 }
 
-bool LossCollector::documentSection(const Element& element) {
+bool LossCollector::documentSection(Place element) {
   if (isNamed(element, words::kGlobalParameters))
     section<tables::GlobalParameter>(element);
   else if (isNamed(element, words::kComments))
@@ -92,7 +85,7 @@ bool LossCollector::documentSection(const Element& element) {
   return true;
 }
 
-bool LossCollector::mainSection(const Element& element) {
+bool LossCollector::mainSection(Place element) {
   if (isNamed(element, words::kDatasets))
     section<tables::Dataset>(element);
   else if (isNamed(element, words::kDataTypes))
@@ -112,7 +105,7 @@ bool LossCollector::mainSection(const Element& element) {
   return true;
 }
 
-void LossCollector::server(const Element& element) {
+void LossCollector::server(Place element) {
   if (m_hasServer) {
     report(Kind::RepeatedElement, element);
     return;
@@ -121,14 +114,14 @@ void LossCollector::server(const Element& element) {
   record<tables::ServerParameter>(element);
 }
 
-void LossCollector::subDocuments(const Element& holder) {
+void LossCollector::subDocuments(Place holder) {
   allAttributes(holder);
-  eachChild(holder, [&](const Element& element) {
+  m_elements.eachChild(holder, [&](Place element) {
     if (!isNamed(element, words::kSubdocument)) {
       report(Kind::UnknownElement, element);
       return;
     }
-    const QString name = fromXml(element.getAttribute(words::kName.text));
+    const QString name = fromXml(m_elements.element(element).getAttribute(words::kName.text));
     if (name.isEmpty() || m_subDocuments.contains(name)) {
       report(Kind::SubDocument, element, name);
       return;
@@ -139,9 +132,9 @@ void LossCollector::subDocuments(const Element& holder) {
 }
 
 template <class Table>
-void LossCollector::section(const Element& holder) {
+void LossCollector::section(Place holder) {
   allAttributes(holder);
-  eachChild(holder, [&](const Element& element) {
+  m_elements.eachChild(holder, [&](Place element) {
     if (isNamed(element, Table::element))
       record<Table>(element);
     else
@@ -150,10 +143,10 @@ void LossCollector::section(const Element& holder) {
 }
 
 template <class Table>
-void LossCollector::record(const Element& element) {
+void LossCollector::record(Place element) {
   const auto& rules = SortedRules<Table>::get();
   std::size_t hint = 0;
-  eachAttribute(element, [&](const DOMAttr& attribute) {
+  eachAttribute(m_elements.element(element), [&](const DOMAttr& attribute) {
     const auto* const rule = rules.find(attribute.getName(), hint);
     const auto lose = [&](Kind kind) {
       report(kind, element, fromXml(attribute.getName()), fromXml(attribute.getValue()));
@@ -172,8 +165,8 @@ void LossCollector::record(const Element& element) {
 }
 
 template <class Table>
-void LossCollector::recordChildren(const Element& element) {
-  eachChild(element, [&](const Element& inner) {
+void LossCollector::recordChildren(Place element) {
+  m_elements.eachChild(element, [&](Place inner) {
     const bool isKnown =
         std::apply([&](const auto&... rule) { return (child(rule, inner) || ...); }, Table::children);
     if (!isKnown)
@@ -182,7 +175,7 @@ void LossCollector::recordChildren(const Element& element) {
 }
 
 template <class R, class Table>
-bool LossCollector::child(const ChildRule<R, Table>& rule, const Element& element) {
+bool LossCollector::child(const ChildRule<R, Table>& rule, Place element) {
   if (!isNamed(element, rule.wrapper ? *rule.wrapper : Table::element) || rule.emission == Emission::Never)
     return false;
   if (rule.wrapper)

@@ -8,38 +8,39 @@
 
 class LossCollector {
  public:
-  using Element = ElementLines::Element;
+  // A place in the table of elements.
+  using Place = std::size_t;
   using Kind = WorkspaceLossReport::Kind;
 
-  LossCollector(const ElementLines& lines, std::vector<WorkspaceLossReport::Loss>& losses)
-      : m_lines(lines), m_losses(losses) {}
+  LossCollector(const ElementTable& elements, std::vector<WorkspaceLossReport::Loss>& losses)
+      : m_elements(elements), m_losses(losses) {}
 
-  void document(const Element& root);
+  void document(Place root);
 
  private:
-  void sections(const Element& parent, bool isMain);
-  bool documentSection(const Element& section);
-  bool mainSection(const Element& section);
-  void subDocuments(const Element& holder);
-  void server(const Element& element);
+  void sections(Place parent, bool isMain);
+  bool documentSection(Place section);
+  bool mainSection(Place section);
+  void subDocuments(Place holder);
+  void server(Place element);
 
   template <class Table>
-  void section(const Element& section);
+  void section(Place section);
   template <class Table>
-  void record(const Element& element);
+  void record(Place element);
   template <class Table>
-  void recordChildren(const Element& element);
+  void recordChildren(Place element);
   template <class R, class Table>
-  bool child(const ChildRule<R, Table>& rule, const Element& element);
+  bool child(const ChildRule<R, Table>& rule, Place element);
 
-  void allAttributes(const Element& element);
-  void everything(const Element& holder, Kind kind);
-  void report(Kind kind, const Element& element, const QString& attribute = QString(),
+  bool isNamed(Place element, const Word& name) const;
+  void allAttributes(Place element);
+  void everything(Place holder, Kind kind);
+  void report(Kind kind, Place element, const QString& attribute = QString(),
               const QString& value = QString());
 
-  const ElementLines& m_lines;
+  const ElementTable& m_elements;
   std::vector<WorkspaceLossReport::Loss>& m_losses;
-  std::size_t m_cursor = 0;
   bool m_hasServer = false;
   QSet<QString> m_subDocuments;
 };

@@ -1,7 +1,7 @@
 // Builds records from elements, as their tables say.
 #pragma once
 
-#include <transform/workspace/ElementLines.h>
+#include <transform/workspace/ElementTable.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/RecordTables.h>
 #include <transform/workspace/ValueText.h>
@@ -47,19 +47,18 @@ class SortedRules {
 
 class RecordReader {
  public:
-  using Element = XERCES_CPP_NAMESPACE::DOMElement;
+  using Element = ElementTable::Element;
 
-  // Reads forward from the element at `cursor` in document order. Lines and source outlive the reader.
-  RecordReader(const ElementLines& lines, std::size_t cursor, const PromptDefinitionSource& prompts)
-      : m_lines(lines), m_cursor(cursor), m_prompts(prompts) {}
+  // Elements and source outlive the reader.
+  RecordReader(const ElementTable& elements, const PromptDefinitionSource& prompts)
+      : m_elements(elements), m_prompts(prompts) {}
 
   template <class Table>
-  typename Table::Record read(const Element& element) {
+  typename Table::Record read(std::size_t index) const {
     typename Table::Record record;
-    record.line = m_lines.lineOf(&element, m_cursor);
-    readAttributes<Table>(element, record);
-    for (const Element* child = element.getFirstElementChild(); child; child = child->getNextElementSibling())
-      readChild<Table>(*child, record);
+    record.line = m_elements.line(index);
+    readAttributes<Table>(m_elements.element(index), record);
+    m_elements.eachChild(index, [&](std::size_t child) { readChild<Table>(child, record); });
     finish(record);
     return record;
   }
@@ -96,25 +95,26 @@ class RecordReader {
   }
 
   template <class Table>
-  void readChild(const Element& child, typename Table::Record& record) {
+  void readChild(std::size_t child, typename Table::Record& record) const {
     std::apply([&](const auto&... rule) { static_cast<void>((readInto(rule, child, record) || ...)); },
                Table::children);
   }
 
   // Whether the element is one of that kind, or the wrapper of that kind.
   template <class R, class Table>
-  bool readInto(const ChildRule<R, Table>& rule, const Element& child, R& record) {
-    using XERCES_CPP_NAMESPACE::XMLString;
-    const XMLCh* const name = rule.wrapper ? rule.wrapper->text : Table::element.text;
-    if (!XMLString::equals(child.getTagName(), name))
+  bool readInto(const ChildRule<R, Table>& rule, std::size_t child, R& record) const {
+    const auto isNamed = [this](std::size_t index, const Word& name) {
+      return XERCES_CPP_NAMESPACE::XMLString::equals(m_elements.element(index).getTagName(), name.text);
+    };
+    if (!isNamed(child, rule.wrapper ? *rule.wrapper : Table::element))
       return false;
-    if (!rule.wrapper) {
+    if (rule.wrapper) {
+      m_elements.eachChild(child, [&](std::size_t inner) {
+        if (isNamed(inner, Table::element))
+          (record.*rule.list).append(read<Table>(inner));
+      });
+    } else {
       (record.*rule.list).append(read<Table>(child));
-      return true;
-    }
-    for (const Element* inner = child.getFirstElementChild(); inner; inner = inner->getNextElementSibling()) {
-      if (XMLString::equals(inner->getTagName(), Table::element.text))
-        (record.*rule.list).append(read<Table>(*inner));
     }
     return true;
   }
@@ -126,7 +126,6 @@ class RecordReader {
   static void finish(XformParmStruct& record);
   void finish(TransformerStruct& record) const;
 
-  const ElementLines& m_lines;
-  std::size_t m_cursor;
+  const ElementTable& m_elements;
   const PromptDefinitionSource& m_prompts;
 };

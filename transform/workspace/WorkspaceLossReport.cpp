@@ -18,8 +18,8 @@ WorkspaceLossReport::Kind kindOf(XORXDOMParser::Content content) {
 }  // namespace
 
 WorkspaceLossReport::WorkspaceLossReport(const XMLComponentReader& reader) {
-  if (const auto* const root = static_cast<const ElementLines::Element*>(reader.getRootNode()))
-    LossCollector(reader.getElementLines(), m_losses).document(*root);
+  if (reader.getElements().size() > 0)
+    LossCollector(reader.getElements(), m_losses).document(0);
   for (const XORXDOMParser::LeftOut& entry : reader.getLeftOutContent())
     m_losses.push_back({kindOf(entry.content), entry.line, QString(), QString(), QString()});
   std::stable_sort(m_losses.begin(), m_losses.end(),

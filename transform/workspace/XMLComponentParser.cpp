@@ -180,7 +180,7 @@ void XMLComponentParser::splitAndParse(WorkspaceSplitter& splitter, QIODevice& i
 
 void XMLComponentParser::forgetDocument() {
   m_root = nullptr;
-  m_lines = ElementLines();
+  m_elements = ElementTable();
   m_map = LineMap();
   m_parser->forget();
   m_parser->resetDocumentPool();
@@ -253,7 +253,8 @@ void XMLComponentParser::parseGuarded(QIODevice& device, const LineMap& map) {
     throw placedError(guard.refusal(), map.fileLine(guard.line()), guard.column());
   m_root = m_parser->getDocument() ? m_parser->getDocument()->getDocumentElement() : nullptr;
   m_map = map;
-  m_lines = ElementLines(m_parser->elements(), guard.elementLines(), map);
+  m_elements = m_parser->takeElements();
+  m_elements.setLines(guard.elementLines(), map);
 }
 
 std::vector<XORXDOMParser::LeftOut> XMLComponentParser::getLeftOutContent() const {

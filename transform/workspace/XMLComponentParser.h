@@ -1,7 +1,7 @@
 // The parser level of the reader: owns one XML parser and the root element of its last parse.
 #pragma once
 
-#include <transform/workspace/ElementLines.h>
+#include <transform/workspace/ElementTable.h>
 #include <transform/workspace/IXMLComponentParser.h>
 #include <transform/workspace/XORXDOMParser.h>
 
@@ -40,7 +40,7 @@ class ORX_EXPORT XMLComponentParser : public virtual IXMLComponentParser {
 
   // What the parser left out of the tree, with the line of the file.
   std::vector<XORXDOMParser::LeftOut> getLeftOutContent() const;
-  const ElementLines& getElementLines() const { return m_lines; }
+  const ElementTable& getElements() const { return m_elements; }
 
  protected:
   // Parses what the device holds from where it stands; `map` leads from its lines to those of the file. The
@@ -61,6 +61,6 @@ class ORX_EXPORT XMLComponentParser : public virtual IXMLComponentParser {
 
   std::unique_ptr<XORXDOMParser> m_parser;
   Node* m_root = nullptr;
-  ElementLines m_lines;
+  ElementTable m_elements;
   LineMap m_map;
 };

@@ -14,12 +14,8 @@ namespace {
 const QString kTemporaryName = QStringLiteral("kx-in-XXXXXX");
 constexpr int kRecognisedBytes = 100;
 
-bool isNamed(const ElementLines::Element& element, const Word& name) {
+bool isNamed(const ElementTable::Element& element, const Word& name) {
   return XERCES_CPP_NAMESPACE::XMLString::equals(element.getTagName(), name.text);
-}
-
-const ElementLines::Element* firstChild(const ElementLines::Element& element) {
-  return element.getFirstElementChild();
 }
 
 }  // namespace
@@ -110,47 +106,43 @@ void XMLComponentReader::documentForgotten() {
   m_firstHeaderLine = 0;
 }
 
-void XMLComponentReader::indexDocument(const ElementLines::Element& element, const QString& name,
-                                       std::size_t& cursor) {
+void XMLComponentReader::indexDocument(std::size_t index, const QString& name) {
+  const ElementTable& elements = getElements();
   Document document;
-  document.line = getElementLines().lineOf(&element, cursor);
-  const auto* const attributes = element.getAttributes();
+  document.line = elements.line(index);
+  const auto* const attributes = elements.element(index).getAttributes();
   for (XMLSize_t i = 0; i < attributes->getLength(); ++i) {
     const auto* const attribute = attributes->item(i);
     document.parameters.insert(fromXml(attribute->getNodeName()), fromXml(attribute->getNodeValue()));
   }
-  for (const auto* child = firstChild(element); child; child = child->getNextElementSibling()) {
-    getElementLines().lineOf(child, cursor);
-    document.sections[fromXml(child->getTagName())].append({child, cursor});
-  }
+  elements.eachChild(index, [&](std::size_t child) {
+    document.sections[fromXml(elements.element(child).getTagName())].append(child);
+  });
   m_documents.insert(name, document);
 }
 
 void XMLComponentReader::documentParsed() {
-  const auto* const root = static_cast<const ElementLines::Element*>(getRootNode());
-  if (!root)
+  const ElementTable& elements = getElements();
+  if (elements.size() == 0)
     return;
-  std::size_t cursor = 0;
-  indexDocument(*root, QString(), cursor);
-  const Document& main = m_documents[QString()];
+  indexDocument(0, QString());
+  const Document main = m_documents.value(QString());
   m_visualizersDisabled =
       main.parameters.value(words::kDisableVisualizers.toQString()) == words::kTrue.view();
-  const QVector<Section> servers = main.sections.value(words::kOrxserver.toQString());
-  if (!servers.isEmpty()) {
-    RecordReader reader(getElementLines(), servers.first().ordinal, m_prompts);
-    m_serverParameters = reader.read<tables::ServerParameter>(*servers.first().element);
-  }
-  const QVector<Section> holders = main.sections.value(words::kSubdocuments.toQString());
-  for (const Section& holder : holders) {
-    cursor = holder.ordinal;
-    for (const auto* child = firstChild(*holder.element); child; child = child->getNextElementSibling()) {
-      if (!isNamed(*child, words::kSubdocument))
-        continue;
-      const QString name = fromXml(child->getAttribute(words::kName.text));
+  const QVector<std::size_t> servers = main.sections.value(words::kOrxserver.toQString());
+  if (!servers.isEmpty())
+    m_serverParameters = RecordReader(elements, m_prompts).read<tables::ServerParameter>(servers.first());
+  const QVector<std::size_t> holders = main.sections.value(words::kSubdocuments.toQString());
+  for (const std::size_t holder : holders) {
+    elements.eachChild(holder, [&](std::size_t child) {
+      const ElementTable::Element& element = elements.element(child);
+      if (!isNamed(element, words::kSubdocument))
+        return;
+      const QString name = fromXml(element.getAttribute(words::kName.text));
       m_subDocuments.append(name);
       if (!m_documents.contains(name))
-        indexDocument(*child, name, cursor);
-    }
+        indexDocument(child, name);
+    });
   }
 }
 
@@ -158,7 +150,7 @@ DocumentType XMLComponentReader::GetDocumentType() const {
   const Node* const root = getRootNode();
   if (!root || root->getNodeType() != Node::ELEMENT_NODE)
     return kUnknownDocument;
-  const auto& element = *static_cast<const ElementLines::Element*>(root);
+  const auto& element = *static_cast<const ElementTable::Element*>(root);
   for (const auto& [name, type] : {std::make_pair(words::kWorkspace, kWorkspaceDocument),
                                    std::make_pair(words::kDatasource, kDataSourceDocument),
                                    std::make_pair(words::kEtlTool, kToolDocument),
@@ -196,13 +188,14 @@ ORXTValSlist<typename Table::Record> XMLComponentReader::readSection(const QStri
   const auto found = m_documents.constFind(document);
   if (found == m_documents.constEnd())
     return records;
-  const QVector<Section> parts = found->sections.value(section.toQString());
-  for (const Section& part : parts) {
-    RecordReader reader(getElementLines(), part.ordinal, m_prompts);
-    for (const auto* child = firstChild(*part.element); child; child = child->getNextElementSibling()) {
-      if (isNamed(*child, Table::element))
-        records.append(reader.read<Table>(*child));
-    }
+  const ElementTable& elements = getElements();
+  const RecordReader reader(elements, m_prompts);
+  const QVector<std::size_t> parts = found->sections.value(section.toQString());
+  for (const std::size_t part : parts) {
+    elements.eachChild(part, [&](std::size_t child) {
+      if (isNamed(elements.element(child), Table::element))
+        records.append(reader.read<Table>(child));
+    });
   }
   return records;
 }

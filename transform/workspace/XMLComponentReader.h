@@ -63,18 +63,14 @@ class ORX_EXPORT XMLComponentReader : public XMLComponentParser, public IXMLComp
   void documentForgotten() override;
 
  private:
-  struct Section {
-    const ElementLines::Element* element;
-    std::size_t ordinal;  // of the element, in document order
-  };
   struct Document {
     int line = 0;
     QHash<QString, QString> parameters;
-    // A section that is repeated counts as one.
-    QHash<QString, QVector<Section>> sections;
+    // By name, the places of the section elements; a section that is repeated counts as one.
+    QHash<QString, QVector<std::size_t>> sections;
   };
 
-  void indexDocument(const ElementLines::Element& element, const QString& name, std::size_t& cursor);
+  void indexDocument(std::size_t index, const QString& name);
   template <class Table>
   ORXTValSlist<typename Table::Record> readSection(const QString& document, const Word& section) const;
 

@@ -32,7 +32,8 @@ XORXDOMParser::~XORXDOMParser() {
 void XORXDOMParser::forget() {
   XMLString::release(&m_encodingName);
   m_encodingName = nullptr;
-  m_elements.clear();
+  m_elements = ElementTable();
+  m_depth = 0;
   m_leftOut.clear();
 }
 
@@ -47,8 +48,16 @@ void XORXDOMParser::XMLDecl(const XMLCh* const version, const XMLCh* const encod
 void XORXDOMParser::startElement(const XMLElementDecl& declaration, const unsigned int uriId,
                                  const XMLCh* const prefix, const RefVectorOf<XMLAttr>& attributes,
                                  const XMLSize_t attributeCount, const bool isEmpty, const bool isRoot) {
+  const int depth = m_depth++;
+  // Of an empty element the base also reports the end.
   XercesDOMParser::startElement(declaration, uriId, prefix, attributes, attributeCount, isEmpty, isRoot);
-  m_elements.push_back(static_cast<const DOMElement*>(fCurrentNode));
+  m_elements.append(static_cast<const DOMElement*>(fCurrentNode), depth);
+}
+
+void XORXDOMParser::endElement(const XMLElementDecl& declaration, const unsigned int uriId, const bool isRoot,
+                               const XMLCh* const prefix) {
+  --m_depth;
+  XercesDOMParser::endElement(declaration, uriId, isRoot, prefix);
 }
 
 void XORXDOMParser::docCharacters(const XMLCh* const text, const XMLSize_t length, const bool) {

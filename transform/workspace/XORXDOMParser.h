@@ -4,6 +4,7 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/workspace/ElementTable.h>
 
 #include <xercesc/parsers/XercesDOMParser.hpp>
 
@@ -26,8 +27,8 @@ class ORX_EXPORT XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
   // Forgets encoding, elements and left-out content.
   void forget();
 
-  // Every element of the last parse, in document order.
-  const std::vector<const XERCES_CPP_NAMESPACE::DOMElement*>& elements() const { return m_elements; }
+  // Hands over the elements of the last parse, still without lines.
+  ElementTable takeElements() { return std::move(m_elements); }
   // Text only when it is not blank; at most some thousand entries are noted.
   const std::vector<LeftOut>& leftOut() const { return m_leftOut; }
 
@@ -37,6 +38,8 @@ class ORX_EXPORT XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
                     const XMLCh* const prefix,
                     const XERCES_CPP_NAMESPACE::RefVectorOf<XERCES_CPP_NAMESPACE::XMLAttr>& attributes,
                     const XMLSize_t attributeCount, const bool isEmpty, const bool isRoot) override;
+  void endElement(const XERCES_CPP_NAMESPACE::XMLElementDecl& declaration, const unsigned int uriId,
+                  const bool isRoot, const XMLCh* const prefix) override;
   void docCharacters(const XMLCh* const text, const XMLSize_t length, const bool isCharacterData) override;
   void ignorableWhitespace(const XMLCh* const text, const XMLSize_t length,
                            const bool isCharacterData) override;
@@ -47,6 +50,7 @@ class ORX_EXPORT XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
   void noteLeftOut(Content content);
 
   XMLCh* m_encodingName = nullptr;
-  std::vector<const XERCES_CPP_NAMESPACE::DOMElement*> m_elements;
+  ElementTable m_elements;
+  int m_depth = 0;
   std::vector<LeftOut> m_leftOut;
 };
