@@ -1,3 +1,4 @@
+#include <transform/workspace/CompactAttribute.h>
 #include <transform/workspace/XORXDOMParser.h>
 
 #include <xercesc/dom/DOMElement.hpp>
@@ -68,6 +69,10 @@ void XORXDOMParser::docCharacters(const XMLCh* const text, const XMLSize_t lengt
       return;
     }
   }
+}
+
+DOMAttr* XORXDOMParser::createAttr(const XMLCh* name) {
+  return CompactAttribute::create(*fDocument, name);
 }
 
 void XORXDOMParser::ignorableWhitespace(const XMLCh* const, const XMLSize_t, const bool) {}

@@ -46,6 +46,8 @@ class ORX_EXPORT XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
   void docComment(const XMLCh* const text) override;
   void docPI(const XMLCh* const target, const XMLCh* const data) override;
 
+  XERCES_CPP_NAMESPACE::DOMAttr* createAttr(const XMLCh* name) override;
+
  private:
   void noteLeftOut(Content content);
 
