@@ -6,11 +6,13 @@
 #include <transform/workspace/XMLDatasetElement.h>
 #include <transform/workspace/XMLFeatureTypeElement.h>
 #include <transform/workspace/XMLGlobalParamElement.h>
+#include <transform/workspace/XmlText.h>
 
 #include <QDir>
 #include <QFile>
 #include <QTextCodec>
 #include <gtest/gtest.h>
+#include <xercesc/dom/DOM.hpp>
 
 namespace {
 
@@ -314,6 +316,11 @@ TEST(Reading, ParserLevelAnswersForSingleElements) {
             "none");
   EXPECT_EQ(dynamic_cast<XMLComponentParser&>(*parser).getAttrColour(QStringLiteral("C"), items[0]),
             (QStringList{"1", "0.5", "0"}));
+  auto* const attribute = items[0]->getAttributes()->item(0);
+  EXPECT_EQ(fromXml(attribute->getTextContent()), fromXml(attribute->getFirstChild()->getNodeValue()));
+  EXPECT_EQ(attribute->getChildNodes()->getLength(), 1u);
+  attribute->setNodeValue(u"changed");
+  EXPECT_EQ(parser->getAttrString(fromXml(attribute->getNodeName()), items[0]).toStdString(), "changed");
   const ScratchFile noMarkup("plain\n<A/>");
   parser->ReadInput(noMarkup.name());
   EXPECT_EQ(parser->getRootNode(), nullptr);

@@ -183,6 +183,12 @@ TEST(Writer, WhatCannotBeReadBackIsRefusedBeforeAnythingIsWritten) {
       {"digit first", parameter("sub", "1", ""), "the parameters of sub, 1: this is no name of XML"},
       {"parameter value", parameter(kMain, "a", QString(QChar(2))), "U+0002"},
       {"document name", parameter(QString(QChar(2)), "a", ""), "U+0002"},
+      {"parameter name and encoding",
+       [](XMLComponentWriter& writer) {
+         writer.setMiscParms(QStringLiteral("s"), {{QString(QChar(0x4e2d)), ""}});
+         writer.setEncoding("ISO-8859-1");
+       },
+       "cannot be written in the encoding"},
       {"number",
        [](XMLComponentWriter& writer) {
          TransformerStruct record;

@@ -235,7 +235,7 @@ bool WorkspaceFile::writeXml(QIODevice& device, DocumentType type,
   }
   writer.writeDocument();
   if (writer.stream().status() != QTextStream::Ok) {
-    error = lines.errorString();
+    error = writer.getRefusal().isEmpty() ? lines.errorString() : writer.getRefusal();
     return false;
   }
   return true;

@@ -124,9 +124,8 @@ void XMLComponentWriter::checkParameters(const QString& document, const QHash<QS
   QStringList names = parameters.keys();
   names.sort();
   for (const QString& name : qAsConst(names)) {
-    const QTextCodec* const codec = m_stream.codec();
-    if (!isXmlName(name) || !codec->canEncode(name))
-      check(name, QStringLiteral("this is no name of XML, or cannot be written in the encoding"));
+    if (!isXmlName(name))
+      check(name, QStringLiteral("this is no name of XML"));
     check(name, valueRefusal(parameters.value(name)));
   }
 }
@@ -173,7 +172,20 @@ void XMLComponentWriter::writeParameters(const QString& document) {
   }
 }
 
+// Names, unlike values, have no way to hold a character that the encoding lacks.
+void XMLComponentWriter::checkEncoding() {
+  for (const QString& document : QStringList(QString()) + m_subDocuments) {
+    QStringList names = m_parameters.value(document).keys();
+    names.sort();
+    for (const QString& name : qAsConst(names)) {
+      if (!m_stream.codec()->canEncode(name))
+        refuse(QStringLiteral("the parameter name %1 cannot be written in the encoding").arg(name));
+    }
+  }
+}
+
 void XMLComponentWriter::writeDocument() {
+  checkEncoding();
   if (!m_refusal.isEmpty()) {
     m_stream.setStatus(QTextStream::WriteFailed);
     return;

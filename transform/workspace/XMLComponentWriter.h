@@ -106,6 +106,7 @@ class ORX_EXPORT XMLComponentWriter {
   void flushText();
   void refuse(const QString& reason);
   void checkParameters(const QString& document, const QHash<QString, QString>& parameters);
+  void checkEncoding();
   void writeParameters(const QString& document);
   void writeSubDocuments();
 
