@@ -1,0 +1,252 @@
+#include <platform/qorxcore/OrxHome.h>
+#include <transform/files/FolderListing.h>
+#include <transform/registry/CompanionLint.h>
+#include <transform/registry/DefinitionFileParser.h>
+#include <transform/registry/DefinitionLint.h>
+#include <transform/registry/HeaderLint.h>
+#include <transform/registry/LintedDefinition.h>
+#include <transform/registry/ParameterLint.h>
+#include <transform/registry/ScriptLint.h>
+#include <transform/registry/TemplateLint.h>
+#include <transform/workspace/XMLComponentReader.h>
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QRegularExpression>
+
+using namespace lint_rules;
+
+namespace {
+
+const QLatin1String kShippedLanguages[] = {QLatin1String("de")};
+constexpr int kDeepestFolder = 32;
+
+bool isCompanionName(const QString& name) {
+  static const QRegularExpression companion(QStringLiteral("^[^/\\\\.].*-localized\\.[a-zA-Z][a-zA-Z]$"));
+  return companion.match(name).hasMatch();
+}
+
+bool isDefinitionName(const QString& name) {
+  return name.endsWith(QLatin1String(".ort")) || name.startsWith(QLatin1String("CategoryDefinitions"));
+}
+
+bool isShipped(const QString& path) {
+  return path.startsWith(QDir(QORXOrxHome()).absolutePath() + QLatin1Char('/'));
+}
+
+QString entryKey(const QString& place, const QString& name, int version) {
+  return place + QLatin1Char('\n') + name + QLatin1Char('\n') + QString::number(version);
+}
+
+}  // namespace
+
+DefinitionLint::DefinitionLint()
+    : m_catalogue(std::make_unique<LintedCatalogue>()), m_scripts(std::make_unique<ScriptLint>()) {}
+
+DefinitionLint::~DefinitionLint() = default;
+
+void DefinitionLint::checkPath(const QString& path) {
+  // Folders below folders, without recursion; links that lead in a circle end at the bound.
+  if (!QFileInfo(path).isDir()) {
+    addFile(path);
+    return;
+  }
+  std::vector<std::pair<QString, int>> pending = {{QDir::cleanPath(path), 0}};
+  while (!pending.empty()) {
+    const auto [folder, depth] = pending.back();
+    pending.pop_back();
+    const FolderListing folders = FolderListing::folders(folder);
+    for (const QString& name : folders.names()) {
+      if (depth < kDeepestFolder) {
+        pending.emplace_back(folder + QLatin1Char('/') + name, depth + 1);
+      }
+    }
+    addFolder(folder);
+  }
+}
+
+void DefinitionLint::addFolder(const QString& folder) {
+  const FolderListing listing = FolderListing::files(folder);
+  if (listing.failed()) {
+    m_report.add(kUnreadable, folder, 0, listing.errorString());
+  }
+  for (const QString& name : listing.names()) {
+    if (isCompanionName(name) || isDefinitionName(name)) {
+      addFile(folder + QLatin1Char('/') + name);
+    }
+  }
+}
+
+void DefinitionLint::addFile(const QString& path) {
+  const QString real = QFileInfo(path).canonicalFilePath();
+  if (!real.isEmpty() && m_given.contains(real)) {
+    return;
+  }
+  m_given.insert(real);
+  if (isCompanionName(QFileInfo(path).fileName())) {
+    m_companions.append(path);
+  } else {
+    readDefinitions(path, true);
+  }
+}
+
+void DefinitionLint::readDefinitions(const QString& path, bool isGiven) {
+  const QString real = QFileInfo(path).canonicalFilePath();
+  const bool isNew = real.isEmpty() || !m_readFiles.contains(real);
+  m_readFiles.insert(real);
+  if (!isNew && !isGiven) {
+    return;
+  }
+  LintReport ignored;
+  LintReport& report = isGiven ? m_report : ignored;
+  QFile file(path);
+  DefinitionFileParser parser;
+  if (!file.open(QIODevice::ReadOnly)) {
+    report.add(kUnreadable, path, 0, file.errorString());
+    return;
+  }
+  if (!parser.parse(file, path)) {
+    report.add(kUnreadable, path, 0, parser.errorString());
+    return;
+  }
+  if (XMLComponentReader::IsFileXMLWorkspace(path)) {
+    if (parser.definitions().empty()) {
+      return;
+    }
+    report.add(
+        kWorkspaceMark, path, 1,
+        QStringLiteral("The first 100 bytes hold ORW or a tag of a workspace, so the file is taken for one "
+                       "and its definitions are not read"));
+  }
+  if (!parser.isSoundUtf8()) {
+    report.add(kNotUtf8, path, 0, QStringLiteral("The file is not UTF-8"));
+  }
+  if (parser.openBlockLine() != 0) {
+    report.add(kOpenBlock, path, parser.openBlockLine(), QStringLiteral("This block has no end"));
+  }
+  if (!parser.unfinished().isEmpty()) {
+    const std::vector<DefinitionLine>& header = parser.unfinished().header;
+    report.add(kUnfinished, path, header.empty() ? 0 : header.front().number,
+               QStringLiteral("What stands behind the last TEMPLATE_END is no definition and is lost"));
+  }
+  for (const CategoryText& category : parser.categories()) {
+    if (category.name.isEmpty()) {
+      report.add(kBadValue, path, category.line, QStringLiteral("The category has no name"));
+    }
+    m_catalogue->addCategory(category.name);
+  }
+  for (const DefinitionText& text : parser.definitions()) {
+    const auto definition = std::make_shared<const LintedDefinition>(text);
+    if (isNew) {
+      m_catalogue->add(definition);
+    }
+    if (isGiven) {
+      m_definitions.push_back(definition);
+    }
+  }
+}
+
+// A companion speaks of the definitions beside it, whether they are to be checked or not.
+void DefinitionLint::readFolderOf(const QString& companion) {
+  const QString folder = QFileInfo(companion).path();
+  const FolderListing listing = FolderListing::files(folder);
+  for (const QString& name : listing.names()) {
+    if (!isCompanionName(name) && isDefinitionName(name)) {
+      readDefinitions(folder + QLatin1Char('/') + name, false);
+    }
+  }
+}
+
+void DefinitionLint::checkDefinition(const LintedDefinition& definition) {
+  const TransformerDefinition& fields = definition.fields();
+  const QString key = entryKey(QFileInfo(definition.file()).absolutePath(), fields.name, fields.version);
+  if (m_defined.contains(key)) {
+    m_report.add(kDuplicateDefinition, definition.file(), definition.nameLine(),
+                 QStringLiteral("The folder defines %1 version %2 already; the last one read is kept")
+                     .arg(fields.name)
+                     .arg(fields.version));
+  }
+  m_defined.insert(key);
+  HeaderLint(definition, m_report).check();
+  ParameterLint(definition, m_report).check();
+  TemplateLint(definition, m_report).check();
+  m_scripts->check(definition, m_report);
+}
+
+void DefinitionLint::checkCompanion(const QString& path) {
+  QFile file(path);
+  if (!file.open(QIODevice::ReadOnly)) {
+    m_report.add(kUnreadable, path, 0, file.errorString());
+    return;
+  }
+  CompanionLint lint(path, *m_catalogue, m_report);
+  lint.check(file, isShipped(QFileInfo(path).absoluteFilePath()));
+  noteTranslated(path, lint);
+}
+
+// A shipped definition that was given alone has its companions beside it.
+void DefinitionLint::readTranslations() {
+  LintReport ignored;
+  QSet<QString> folders;
+  for (const auto& definition : m_shipped) {
+    folders.insert(QFileInfo(definition->file()).path());
+  }
+  for (const QString& folder : std::as_const(folders)) {
+    const FolderListing listing = FolderListing::files(folder);
+    for (const QString& name : listing.names()) {
+      const QString path = folder + QLatin1Char('/') + name;
+      QFile file(path);
+      if (isCompanionName(name) && !m_companions.contains(path) && file.open(QIODevice::ReadOnly)) {
+        CompanionLint lint(path, *m_catalogue, ignored);
+        lint.check(file, false);
+        noteTranslated(path, lint);
+      }
+    }
+  }
+}
+
+void DefinitionLint::noteTranslated(const QString& path, const CompanionLint& lint) {
+  const QString language = path.right(2).toLower();
+  for (const auto& [name, version] : lint.translated()) {
+    m_translated.insert(entryKey(language, name, version));
+  }
+}
+
+void DefinitionLint::checkShipped() {
+  readTranslations();
+  for (const auto& definition : m_shipped) {
+    for (const QLatin1String language : kShippedLanguages) {
+      const TransformerDefinition& fields = definition->fields();
+      if (!m_translated.contains(entryKey(language, fields.name, fields.version))) {
+        m_report.add(kMissingTranslation, definition->file(), definition->nameLine(),
+                     QStringLiteral("%1 version %2 has no entry in a companion for '%3'")
+                         .arg(fields.name)
+                         .arg(fields.version)
+                         .arg(language));
+      }
+    }
+  }
+  m_shipped.clear();
+}
+
+const std::vector<LintFinding>& DefinitionLint::findings() {
+  for (const auto& definition : m_definitions) {
+    checkDefinition(*definition);
+    if (isShipped(QFileInfo(definition->file()).absoluteFilePath())) {
+      m_shipped.push_back(definition);
+    }
+  }
+  m_definitions.clear();
+  for (const QString& path : std::as_const(m_companions)) {
+    readFolderOf(path);
+  }
+  for (const QString& path : std::as_const(m_companions)) {
+    checkCompanion(path);
+  }
+  checkShipped();
+  m_companions.clear();
+  m_scripts->checkPython(m_report);
+  m_report.sort();
+  return m_report.findings();
+}

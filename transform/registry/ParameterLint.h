@@ -1,0 +1,25 @@
+// Checks the parameters of a definition: that their lines belong together, their types and defaults.
+#pragma once
+
+#include <transform/registry/LintReport.h>
+#include <transform/registry/LintedDefinition.h>
+
+class ParameterLint {
+ public:
+  // Neither is owned.
+  ParameterLint(const LintedDefinition& definition, LintReport& report)
+      : m_definition(definition), m_report(report) {}
+
+  void check();
+
+ private:
+  void add(const LintRule& rule, int line, const QString& text);
+  void checkLines();
+  void checkType(const LintedParameter& parameter, const GUIType& type);
+  void checkGroup(const LintedParameter& parameter);
+  void checkDefault(const LintedParameter& parameter);
+  void checkDefault(const LintedParameter& parameter, const GUIType& type, const QString& value);
+
+  const LintedDefinition& m_definition;
+  LintReport& m_report;
+};

@@ -1,0 +1,61 @@
+#include <transform/registry/PythonSyntax.h>
+
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QProcess>
+#include <QStandardPaths>
+
+namespace {
+
+constexpr int kTimeLimit = 60 * 1000;  // milliseconds
+
+const QLatin1String kProgram(
+    "import json, sys\n"
+    "faults = []\n"
+    "for index, script in enumerate(json.load(sys.stdin)):\n"
+    "    try:\n"
+    "        compile(script, 'script', 'exec', dont_inherit=True)\n"
+    "    except SyntaxError as error:\n"
+    "        faults.append([index, error.lineno or 0, str(error.msg)])\n"
+    "    except Exception as error:\n"
+    "        faults.append([index, 0, str(error) or type(error).__name__])\n"
+    "json.dump(faults, sys.stdout)\n");
+
+}  // namespace
+
+bool PythonSyntax::check(const QStringList& scripts) {
+  m_faults.clear();
+  m_error.clear();
+  if (scripts.isEmpty()) {
+    return true;
+  }
+  const QString program = QStandardPaths::findExecutable(QStringLiteral("python3"));
+  if (program.isEmpty()) {
+    m_error = QStringLiteral("There is no python3 in the search path");
+    return false;
+  }
+  QProcess python;
+  // Apart from the user's own modules and settings.
+  python.start(program, {QStringLiteral("-I"), QStringLiteral("-S"), QStringLiteral("-W"),
+                         QStringLiteral("ignore"), QStringLiteral("-c"), kProgram});
+  python.write(QJsonDocument(QJsonArray::fromStringList(scripts)).toJson(QJsonDocument::Compact));
+  python.closeWriteChannel();
+  if (!python.waitForFinished(kTimeLimit)) {
+    m_error = python.error() == QProcess::Timedout ? QStringLiteral("python3 does not answer")
+                                                   : python.errorString();
+    python.kill();
+    python.waitForFinished();
+    return false;
+  }
+  const QJsonDocument answer = QJsonDocument::fromJson(python.readAllStandardOutput());
+  if (python.exitStatus() != QProcess::NormalExit || python.exitCode() != 0 || !answer.isArray()) {
+    m_error = QLatin1String("python3 stopped over the scripts: ") +
+              QString::fromUtf8(python.readAllStandardError()).trimmed().section(QLatin1Char('\n'), -1);
+    return false;
+  }
+  for (const QJsonValue& value : answer.array()) {
+    const QJsonArray fault = value.toArray();
+    m_faults.push_back({fault.at(0).toInt(), fault.at(1).toInt(), fault.at(2).toString()});
+  }
+  return true;
+}
