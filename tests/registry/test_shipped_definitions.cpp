@@ -6,6 +6,7 @@
 #include <transform/specialised/TransformerCfgFactory.h>
 #include <transform/text/MFBuffer.h>
 
+#include <QBuffer>
 #include <gtest/gtest.h>
 
 #include <memory>
@@ -16,9 +17,17 @@ const QString kResources = QStringLiteral(ORX_SOURCE_DIR "/resources");
 
 class MemoryBuffer : public MFBuffer {
  public:
-  void write(const QByteArray& written) override { bytes += written; }
+  MemoryBuffer() {
+    m_device.open(QIODevice::WriteOnly);
+    setDevice(&m_device);
+  }
+  ~MemoryBuffer() override { setDevice(nullptr); }
+  void write(const QByteArray& bytes) override { m_device.write(bytes); }
 
-  QByteArray bytes;
+  QString text() { return QString::fromUtf8(m_device.data()); }
+
+ private:
+  QBuffer m_device;
 };
 
 // The registry as it is installed, in one language.
@@ -97,7 +106,8 @@ TEST_P(ShippedDefinitions, AnswerEveryQuestion) {
       }
       MemoryBuffer buffer;
       EXPECT_TRUE(cfg->instantiate(buffer, QString()));
-      const QString text = QString::fromUtf8(buffer.bytes);
+      buffer.flush();
+      const QString text = buffer.text();
       EXPECT_FALSE(text.isEmpty());
       for (const QString& tag : outputs) {
         EXPECT_TRUE(text.contains(QStringLiteral("out_") + tag)) << tag.toStdString();
