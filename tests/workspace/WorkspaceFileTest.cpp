@@ -28,7 +28,11 @@ DocumentContent rewritten(const QString& fileName, QString& error) {
 }  // namespace
 
 TEST(WorkspaceFile, SavingKeepsWhatSurroundsTheXml) {
-  const DocumentContent content = randomContent(11, 2);
+  DocumentContent content = randomContent(11, 2);
+  // Longer than any buffer, of characters that have a line feed's byte in either half.
+  QString& longest = content.documents[QString()].comments[0].commentValue;
+  for (int i = 0; i < 200001; ++i)
+    longest += QString(QChar(0x0a41)) + QChar(0x410a) + QLatin1Char('x');
   for (const char* const encoding : {"UTF-8", "windows-1252", "UTF-16LE", "UTF-16BE"}) {
     SCOPED_TRACE(encoding);
     const ScratchFile file("");
