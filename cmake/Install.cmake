@@ -10,15 +10,13 @@ set(shared_libraries qorxcore orxvtl orxsession orxparameter orxutil orxtransfor
 # Libraries find each other in their own folder, the command finds them from its own.
 file(RELATIVE_PATH libraries_from_command /${CMAKE_INSTALL_BINDIR} /${CMAKE_INSTALL_LIBDIR})
 set_target_properties(${shared_libraries} PROPERTIES INSTALL_RPATH "$ORIGIN")
-if(TARGET orxt)
-  set_target_properties(orxt PROPERTIES INSTALL_RPATH "$ORIGIN/${libraries_from_command}")
-  install(TARGETS orxt RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
-endif()
+set_target_properties(orxt PROPERTIES INSTALL_RPATH "$ORIGIN/${libraries_from_command}")
 
 install(TARGETS ${shared_libraries}
   EXPORT orxtransformTargets
   LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR}
   INCLUDES DESTINATION ${ORX_INSTALL_INCLUDEDIR})
+install(TARGETS orxt RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/resources/ DESTINATION ${ORX_INSTALL_DATADIR})
 
 # Which headers are public is read from the headers themselves, at the time of the installation.
