@@ -60,7 +60,8 @@ QStringList statementsOf(TransformerCfg& cfg) {
 QStringList readStatements(const QString& text) {
   QStringList statements;
   QString statement;
-  for (const QString& line : text.split('\n')) {
+  static const QRegularExpression lineEnd("\\r\\n|\\r|\\n");
+  for (const QString& line : text.split(lineEnd)) {
     if (line.endsWith('\\')) {
       statement += line.left(line.size() - 1);
     } else if (!(statement + line).trimmed().isEmpty()) {

@@ -1,0 +1,10 @@
+# Measured against a general template library, which is not needed for anything else.
+find_package(PkgConfig QUIET)
+if(PKG_CONFIG_FOUND)
+  pkg_check_modules(CTEMPLATE QUIET IMPORTED_TARGET libctemplate)
+endif()
+if(NOT TARGET PkgConfig::CTEMPLATE)
+  message(STATUS "bench_substitution is left out: libctemplate is not installed")
+  return()
+endif()
+orx_bench(bench_substitution orx_core PkgConfig::CTEMPLATE)

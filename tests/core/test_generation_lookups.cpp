@@ -1,0 +1,433 @@
+// Every Tcl fragment that the lookup writers emit is run through a real interpreter. A text is refused
+// exactly when some run of its fragment gives anything but the stored side.
+#include "GenerationSetup.h"
+#include <platform/qorxcore/Lists.h>
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/LookupChecks.h>
+#include <transform/core/LookupWriters.h>
+#include <transform/text/MessageStrings.h>
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <functional>
+
+namespace {
+
+using Entry = QPair<QString, QString>;
+
+const QStringList kTexts{"plain",
+                         "two words",
+                         "{",
+                         "}",
+                         "{}",
+                         "}{",
+                         "a}b{c",
+                         "{a}",
+                         "\"",
+                         "a\"b",
+                         "\"q\"",
+                         "$",
+                         "$x",
+                         "$(Q)",
+                         "$5",
+                         "[",
+                         "]",
+                         "[x]",
+                         "[exit]",
+                         ";",
+                         "a;b",
+                         "#",
+                         "#{",
+                         "a\\",
+                         "\\{",
+                         "\\",
+                         "\\\\",
+                         "a\\nb",
+                         "C:\\dir",
+                         "a\nb",
+                         "a\r",
+                         "-exact",
+                         "--",
+                         "-",
+                         "default",
+                         "",
+                         " lead",
+                         "trail ",
+                         "'",
+                         "%1",
+                         "\u00e9 \u20ac",
+                         "a\tb",
+                         "}} ; exit ; {",
+                         "$finalVal",
+                         "B",
+                         "Bb",
+                         "aB",
+                         "b2",
+                         "B c d",
+                         "aB c",
+                         "e B",
+                         " B",
+                         "c",
+                         "x)",
+                         "(x",
+                         "a b\\",
+                         "$(",
+                         "$()",
+                         "*",
+                         "?",
+                         "\"a b",
+                         QString(QChar(0xd800))};
+
+ChoiceList choicesOf(const QVector<Entry>& entries) {
+  ChoiceList choices;
+  for (const Entry& entry : entries) {
+    QString shown = entry.first;
+    choices.addLookup('"' + shown.replace("\"", "\"\"") + "\"," + QORXWwjdEncode(entry.second));
+  }
+  return choices;
+}
+
+// The macros of a run: what the parameter refers to, and one that any text may.
+QMap<QString, QString> macrosOf(const QString& given) {
+  return {{"G", given}, {"Q", "q"}};
+}
+
+QString expanded(const QString& text) {
+  return expandMacros(text, {{"Q", "q"}});
+}
+
+QStringList expandedAll(QStringList texts) {
+  for (QString& text : texts) {
+    text = expanded(text);
+  }
+  return texts;
+}
+
+// Whether the fragment defines the macro, with this value but for blanks around it.
+bool defines(const QStringList& statements, const QString& given, const QString& expected) {
+  TestEngine engine(macrosOf(given));
+  engine.run(statements);
+  return engine.error.isEmpty() && engine.macros.value("mac", "?") == expanded(expected).trimmed() &&
+         engine.macros.size() == 3;
+}
+
+bool complains(const QStringList& statements, const BoxLookup& lookup) {
+  TestEngine engine(macrosOf(""));
+  engine.run(statements);
+  return engine.error == "exit" && !engine.macros.contains("mac") &&
+         engine.messages ==
+             QStringList(expanded(lookup.identifier + " - '" + lookup.prompt + "' must be given a value."));
+}
+
+// The entries as the configuration gives them: a line break in a shown side is kept as its word there.
+QVector<Entry> entriesOf(const QVector<Entry>& given) {
+  QVector<Entry> entries;
+  const ChoiceList choices = choicesOf(given);
+  for (const auto& entry : choices.entries()) {
+    entries.append({entry.first, entry.second});
+  }
+  return entries;
+}
+
+// What no entry shows stays as it is; in the file, a broken surrogate pair would look like this.
+bool showsQuestionMark(const QVector<Entry>& entries) {
+  return std::any_of(entries.begin(), entries.end(), [](const Entry& entry) { return entry.first == "?"; });
+}
+
+struct Counts {
+  int refused = 0;
+  int written = 0;
+  void expectEqual(bool isRefused, bool isRight, const QString& what) {
+    EXPECT_EQ(isRefused, !isRight) << what.toStdString();
+    ++(isRefused ? refused : written);
+  }
+};
+
+QStringList written(const std::function<void(MFBuffer&)>& write) {
+  TextBuffer buffer;
+  write(buffer);
+  return readStatements(buffer.text());
+}
+
+bool choiceBoxIsRight(const QVector<Entry>& given, const BoxLookup& lookup) {
+  const QVector<Entry> entries = entriesOf(given);
+  const QStringList statements =
+      written([&](MFBuffer& buffer) { lookup_writers::writeChoiceBox(buffer, choicesOf(entries), lookup); });
+  if (statements.size() != 1) {
+    return false;
+  }
+  bool right = true;
+  bool emptyIsChoice = false;
+  for (const Entry& entry : entries) {
+    emptyIsChoice = emptyIsChoice || entry.first.isEmpty();
+    right = right && (lookup.value != "$(G)" || defines(statements, entry.first, entry.second));
+  }
+  right = right && defines(statements, "other", QString(lookup.value).replace("$(G)", "other"));
+  right = right && (showsQuestionMark(entries) ||
+                    defines(statements, "?", QString(lookup.value).replace("$(G)", "?")));
+  if (!emptyIsChoice && lookup.value == "$(G)") {
+    right = right && (lookup.isOptional ? defines(statements, "", "") : complains(statements, lookup));
+  }
+  return right;
+}
+
+TEST(Lookups, ChoiceBoxRefusesExactlyWhatGoesWrong) {
+  Counts counts;
+  for (const bool optional : {false, true}) {
+    for (const QString& text : kTexts) {
+      const BoxLookup lookup{"$(G)", "Size", "mac", "My Name", optional};
+      const auto check = [&](const QVector<Entry>& entries, const BoxLookup& about, const char* what) {
+        counts.expectEqual(lookup_checks::refuseChoiceBox(choicesOf(entries), about) != 0,
+                           choiceBoxIsRight(entries, about), QString(what) + ": " + text);
+      };
+      check({{text, "stored"}, {"Bx", "b2"}}, lookup, "shown");
+      check({{"shown", text}, {"Bx", "b2"}}, lookup, "stored");
+      BoxLookup about = lookup;
+      about.value = text + "$(G)";
+      check({{"Bx", "b2"}}, about, "value");
+      if (!optional && !text.contains("$(G)")) {
+        about = lookup;
+        about.prompt = text;
+        check({{"Bx", "b2"}}, about, "prompt");
+        about = lookup;
+        about.identifier = text;
+        check({{"Bx", "b2"}}, about, "identifier");
+      }
+    }
+  }
+  EXPECT_GT(counts.refused, 100);
+  EXPECT_GT(counts.written, 200);
+}
+
+bool listBoxIsRight(const QVector<Entry>& given, const BoxLookup& lookup) {
+  const QVector<Entry> entries = entriesOf(given);
+  const ChoiceList choices = choicesOf(entries);
+  const QStringList statements =
+      written([&](MFBuffer& buffer) { lookup_writers::writeListBox(buffer, choices, lookup); });
+  if (statements.size() != 1) {
+    return false;
+  }
+  const auto isMapped = [&](const QStringList& shown, const QStringList& stored) {
+    TestEngine engine(macrosOf(QORXListToSdfString(shown, ' ')));
+    engine.run(statements);
+    return engine.error.isEmpty() && engine.macros.size() == 3 &&
+           QORXSdfStringToList(engine.macros.value("mac"), ' ') == expandedAll(stored);
+  };
+  bool right = lookup.isOptional ? defines(statements, "", "") : complains(statements, lookup);
+  right = right && (showsQuestionMark(entries) || isMapped({"?"}, {"?"}));
+  for (const Entry& first : entries) {
+    right = right && isMapped({first.first}, {first.second});
+    for (const Entry& second : entries) {
+      right = right && isMapped({first.first, second.first}, {first.second, second.second});
+      for (const Entry& third : entries) {
+        right = right && isMapped({first.first, second.first, third.first},
+                                  {first.second, second.second, third.second});
+      }
+    }
+  }
+  return right;
+}
+
+TEST(Lookups, ListBoxRefusesExactlyWhatGoesWrong) {
+  Counts counts;
+  for (const bool optional : {false, true}) {
+    for (const QString& text : kTexts) {
+      const BoxLookup lookup{"$(G)", "Size", "mac", "My Name", optional};
+      for (const QVector<Entry>& entries :
+           {QVector<Entry>{{"aa", "1"}, {text, "stored"}, {"Bx", "b2"}},
+            QVector<Entry>{{"aa", "1"}, {"shown", text}, {"two words", "b2"}},
+            QVector<Entry>{{"B", "1"}, {text, "2"}, {text + "z", "3"}, {"c", "4"}}}) {
+        if (choicesOf(entries).entries().size() != std::size_t(entries.size())) {
+          continue;
+        }
+        counts.expectEqual(
+            lookup_checks::refuseListBox(choicesOf(entries), lookup) != 0, listBoxIsRight(entries, lookup),
+            entries[1].first + "=" + entries[1].second + ", " + entries[2].first + ": " + text);
+      }
+    }
+  }
+  EXPECT_GT(counts.refused, 100);
+  EXPECT_GT(counts.written, 100);
+}
+
+bool procedureIsRight(const QVector<Entry>& given, const QString& value) {
+  const QVector<Entry> entries = entriesOf(given);
+  const ChoiceList choices = choicesOf(entries);
+  QString call;
+  const QStringList statements = written(
+      [&](MFBuffer& buffer) { call = lookup_writers::writeChoiceProcedure(buffer, choices, "g1_P", value); });
+  if (statements.size() != 1 || call.contains('\n') || call.contains('\r')) {
+    return false;
+  }
+  const auto gives = [&](const QString& text, const QString& expected) {
+    TestEngine engine(macrosOf(text));
+    engine.run(statements);
+    return engine.error.isEmpty() && engine.call(call) == expanded(expected) && engine.error.isEmpty();
+  };
+  bool right =
+      gives("other", value == "$(G)" ? "other" : choices.toStored(QString(value).replace("$(G)", "other")));
+  right = right && (value != "$(G)" || showsQuestionMark(entries) || gives("?", "?"));
+  for (const Entry& entry : entries) {
+    right = right && (value != "$(G)" || gives(entry.first, entry.second));
+  }
+  return right;
+}
+
+TEST(Lookups, ChoiceProcedureRefusesExactlyWhatGoesWrong) {
+  Counts counts;
+  for (const QString& text : kTexts) {
+    const auto check = [&](const QVector<Entry>& entries, const QString& value) {
+      counts.expectEqual(lookup_checks::refuseChoiceProcedure(choicesOf(entries), "g1_P", value) != 0,
+                         procedureIsRight(entries, value), value + ": " + text);
+    };
+    check({{text, "stored"}, {"Bx", "b2"}}, "$(G)");
+    check({{"Bx", "b2"}, {text, "stored"}}, "$(G)");
+    check({{text, "stored"}}, "$(G)");
+    check({{"shown", text}}, "$(G)");
+    check({{"shown", "b2"}}, text);
+  }
+  EXPECT_GT(counts.refused, 50);
+  EXPECT_GT(counts.written, 100);
+}
+
+TEST(Lookups, TextsOfTheFragments) {
+  const ChoiceList choices = choicesOf({{"Red", "r"}, {"Pale Blue", "b"}});
+  const auto lines = [&](const std::function<void(MFBuffer&)>& write) {
+    TextBuffer buffer;
+    write(buffer);
+    QStringList result;
+    for (QString line : buffer.text().split('\n', Qt::SkipEmptyParts)) {
+      if (line.endsWith('\\')) {
+        line.chop(2);
+      }
+      while (line.endsWith(' ')) {
+        line.chop(1);
+      }
+      result << line;
+    }
+    return result.join('\n').toStdString();
+  };
+  BoxLookup lookup{"$(V)", "Colour", "g1_C", "T1", false};
+  EXPECT_EQ(lines([&](MFBuffer& b) { lookup_writers::writeChoiceBox(b, choices, lookup); }),
+            "INCLUDE [ switch {$(V)} {\n"
+            "  {Red} { puts \"MACRO g1_C r\"; }\n"
+            "  {Pale Blue} { puts \"MACRO g1_C b\"; }\n"
+            "  {} { puts_real \"T1 - 'Colour' must be given a value.\"; exit 1; }\n"
+            "  {default} { puts \"MACRO g1_C $(V)\"; }\n"
+            "} ]");
+  EXPECT_EQ(lines([&](MFBuffer& b) { lookup_writers::writeListBox(b, choices, lookup); }),
+            "INCLUDE [ set lookupMap {};\n"
+            "append lookupMap {Red} { } {r};\n"
+            "append lookupMap { } {\"Pale Blue\"} { } {b};\n"
+            " if { {$(V)} == {} } { puts_real \"T1 - 'Colour' must be given a value.\"; exit 1; };\n"
+            " set finalVal [string map $lookupMap {$(V)}];\n"
+            " puts \"MACRO g1_C $finalVal \";\n"
+            "]");
+  lookup.isOptional = true;
+  EXPECT_NE(lines([&](MFBuffer& b) {
+              lookup_writers::writeChoiceBox(b, choices, lookup);
+            }).find("\n  {} { puts \"MACRO g1_C \"; }\n"),
+            std::string::npos);
+  QString call;
+  EXPECT_EQ(
+      lines([&](MFBuffer& b) { call = lookup_writers::writeChoiceProcedure(b, choices, "g1_C", "Red"); }),
+      "Tcl2 proc g1_C { curAttrValue } {\n"
+      "  switch $curAttrValue {\n"
+      "  {Red} { return {r}; }\n"
+      "  {Pale Blue} { return {b}; }\n"
+      "};\n"
+      "return $curAttrValue;\n"
+      "}");
+  EXPECT_EQ(call, "@Tcl2(g1_C {Red} )");
+}
+
+TEST(Lookups, WhichFormAValueTakes) {
+  struct Case {
+    const char* type;
+    QStringList lookup;
+    QString value;
+    QString written;
+    int statements;  // ahead of the template's own
+  };
+  const Case cases[] = {
+      {"LOOKUP_CHOICE Red,r%\"Pale Blue\",b", {}, "Pale Blue", "b", 0},
+      {"LOOKUP_CHOICE Red,r%\"Pale Blue\",b", {}, "r", "r", 0},
+      {"LOOKUP_CHOICE Red,r%\"Pale Blue\",b", {}, "else", "else", 0},
+      {"LOOKUP_CHOICE Red,r%\"Pale Blue\",b", {}, "$(G)", "$(g1P)", 1},
+      {"LOOKUP_LISTBOX Red,r%\"Pale Blue\",b", {}, "\"Pale Blue\" Red r", "b r r", 0},
+      {"LOOKUP_LISTBOX Red,r%\"Pale Blue\",b", {}, "$(G)", "$(g1P)", 1},
+      {"LISTBOX Red%Green", {}, "Red  Green", "Red  Green", 0},
+      {"CHOICE Red%Green", {}, "Green", "Green", 0},
+      {"CHOICE Red%Green", {}, "$(G)", "$(G)", 0},
+      {"CHOICE Red%Green", {"Red,r"}, "Red", "@Tcl2(g1P {Red} )", 1},
+      {"CHOICE_OR_ATTR Red%Green", {"Red,r"}, "@Value(x)", "@EvaluateExpression(FDIV,STRING,P,@Value(x))", 0},
+      {"LOOKUP_CHOICE Red,r",
+       {},
+       "ORX_CONDITIONAL:@Value(x)=1;Red;Red",
+       "@EvaluateExpression(FDIV,STRING,P,@Choose(@Value(x)=1,r,r))",
+       0},
+      {"OMITTABLE LOOKUP_CHOICE Red,r", {}, "<Unused>", "", -1},
+  };
+  RunTimeListener listener;
+  for (const Case& c : cases) {
+    const auto cfg = makeCfg({{}, {}, {{"P", c.type, c.value, "Colour", c.lookup}}, {"K $(P)"}});
+    cfg->setListener(&listener);
+    EXPECT_TRUE(cfg->findUnwritableValues().isEmpty());
+    const QStringList statements = statementsOf(*cfg);
+    ASSERT_EQ(statements.size(), c.statements + 1) << c.value.toStdString();
+    if (c.statements >= 0) {
+      EXPECT_EQ(statements.last().toStdString(), "K " + c.written.toStdString());
+    }
+  }
+}
+
+TEST(Lookups, FaultsAreFoundBeforeWriting) {
+  using namespace lookup_checks;
+  struct Case {
+    TestParameter parameter;
+    QString line;
+    long number;  // 0: fine
+  };
+  const Case cases[] = {
+      {{"P", "TEXT", "a\nb"}, "K $(P)", kBreaksLine},
+      {{"P", "TEXT", "a\nb"}, "K $(Q)", 0},
+      {{"P", "TEXT", "a\nb"}, "K $(ORX_PARM_VAL_LIST)", kBreaksLine},
+      {{"P", "TEXT_ENCODED", "a\\nb"}, "K $(P)", kBreaksLine},  // the escape becomes a line feed
+      {{"P", "TEXT_ENCODED", "a<u000a>b"}, "K $(P)", 0},
+      {{"P", "TEXT", "a\\"}, "K $(P)", kEndsInBackslash},
+      {{"P", "TEXT", "a\\"}, "K $(P) x", 0},
+      {{"P", "TEXT", "$[x"}, "K $(P)", kUnclosedReference},
+      {{"P", "TEXT", "$[x] {\"[;"}, "K $(P)", 0},
+      {{"P", "TEXT_OR_ATTR", "@Value(a)$[x\n"}, "K $(P)", 0},  // the wrapped text is one word
+      {{"P", "LOOKUP_CHOICE A,a", "$(G) $["}, "K $(P)", kUnclosedReference},
+      {{"P", "LOOKUP_CHOICE A,a", "$(G)\""}, "K", kValueInScript},
+      {{"P", "LOOKUP_CHOICE A,a<quotationmark>", "$(G)"}, "K", kChoiceInScript},
+      {{"P", "LOOKUP_CHOICE A,a<quotationmark>", "A"}, "K $(P)", 0},
+      {{"P", "LOOKUP_LISTBOX A,a<space>b", "$(G)"}, "K", kChoiceInScript},
+      {{"P", "LOOKUP_CHOICE A,a", "$(G)", "Size [m]"}, "K", kPromptInScript},
+      {{"P", "OPTIONAL LOOKUP_CHOICE A,a", "$(G)", "Size [m]"}, "K", 0},
+      {{"P Q", "LOOKUP_CHOICE A,a", "$(G)"}, "K", kNameInMacro},
+      {{"XFORMER_NAME", "TEXT", "a\"$(G)"}, "K $(XFORMER_NAME)", kIdentifierInScript},
+      {{"XFORMER_NAME", "TEXT", "a\" b\\"}, "K $(XFORMER_NAME)", 0},
+  };
+  RunTimeListener listener;
+  for (const Case& c : cases) {
+    const auto cfg = makeCfg({{}, {}, {c.parameter}, {c.line}});
+    cfg->setListener(&listener);
+    QHash<QString, QString> expected;
+    if (c.number != 0) {
+      ASSERT_FALSE(TransformResString(c.number).isEmpty());
+      expected.insert(c.parameter.name, TransformResString(c.number));
+    }
+    EXPECT_EQ(cfg->findUnwritableValues(), expected)
+        << c.parameter.type.toStdString() << ' ' << c.parameter.value.toStdString() << ' '
+        << cfg->findUnwritableValues().values().join('|').toStdString();
+    if (c.number == kUnclosedReference) {
+      TextBuffer buffer;  // comes to an end all the same
+      EXPECT_FALSE(cfg->instantiate(buffer, QString()));
+    }
+  }
+}
+
+}  // namespace
