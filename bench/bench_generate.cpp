@@ -1,6 +1,7 @@
 // Whole workspaces into mapping files: the time per transformer must not grow with the workspace. Loading the
 // definitions is left out.
 #include <platform/session/session.h>
+#include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
 #include <translation/MFDeviceBuffer.h>
 #include <translation/MappingFileWriter.h>

@@ -2,11 +2,10 @@
 
 add_library(orx_build_options INTERFACE)
 target_compile_options(orx_build_options INTERFACE
-  -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Wnull-dereference -Werror)
+  -Wall -Wextra -Wpedantic -Wshadow -Wnon-virtual-dtor -Werror)
 if(ORX_SANITIZE)
-  # GCC reports false null dereferences through the sanitizer's own instrumentation.
   target_compile_options(orx_build_options INTERFACE
-    -Wno-null-dereference -fsanitize=address,undefined -fno-sanitize-recover=undefined -fno-omit-frame-pointer)
+    -fsanitize=address,undefined -fno-sanitize-recover=undefined -fno-omit-frame-pointer)
   target_link_options(orx_build_options INTERFACE -fsanitize=address,undefined)
 endif()
 if(ORX_BUILD_FUZZ)
