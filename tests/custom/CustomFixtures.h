@@ -47,6 +47,7 @@ class OpenNetwork : public ExternalDocNetwork {
   using CompoundTransformerNetwork::addOutput;
   using CompoundTransformerNetwork::addPublishedParameter;
   using CompoundTransformerNetwork::addTransformer;
+  using CompoundTransformerNetwork::clearNodes;
   using CompoundTransformerNetwork::createAncestorList;
   using ExternalDocNetwork::setParallelSettings;
 

@@ -142,8 +142,7 @@ TEST(Network, AnswersAsAWhole) {
   EXPECT_EQ(list, names(QStringLiteral("untouched")));
 }
 
-// --- editing while instances exist
-// ---------------------------------------------------------------------------
+// --- editing while instances exist -------------------------------------------------------------------------
 
 class Watcher : public CompoundTransformerNetworkListener {
  public:

@@ -9,12 +9,13 @@ struct CompoundTransformerNetwork::AttributeMemo {
   struct Key {
     QString output;
     QVector<QStringList> inputs;  // in the order of the ports
+    QStringList values;           // of the parameters that references inside may take
 
     friend bool operator==(const Key& left, const Key& right) {
-      return left.output == right.output && left.inputs == right.inputs;
+      return left.output == right.output && left.inputs == right.inputs && left.values == right.values;
     }
     friend uint qHash(const Key& key, uint seed = 0) {
-      return ::qHash(key.output, seed) ^ ::qHash(key.inputs, seed);
+      return ::qHash(key.output, seed) ^ ::qHash(key.inputs, seed) ^ ::qHash(key.values, seed + 1);
     }
   };
 

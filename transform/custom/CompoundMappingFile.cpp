@@ -1,12 +1,14 @@
 // What an instance of a custom transformer writes into the mapping file.
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/CustomMessages.h>
+#include <transform/custom/ParameterReferences.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MessageStrings.h>
 
-#include <QRegularExpression>
-
+#include <algorithm>
 #include <optional>
 
 namespace {
@@ -14,7 +16,7 @@ namespace {
 // The flag of parameters whose references become those of the instance's own macros.
 constexpr unsigned kInstanceMacros = 2048;
 const QLatin1String kSetterAttributeType("STRING_OR_ATTR_ENCODED");
-const QLatin1String kTeeFactory("FACTORY_DEF * TeeFactory");
+const QString kTeeFactory = QStringLiteral("FACTORY_DEF * TeeFactory");
 
 QString factoryName(const QString& id, const QString& tag, const char* role) {
   return QLatin1String("  FACTORY_NAME \"") + id + QLatin1Char(' ') + tag + QLatin1String(role) +
@@ -24,18 +26,10 @@ QString factoryName(const QString& id, const QString& tag, const char* role) {
 // References to parameters, "$(NAME)", become references to the instance's macros. Macros that every mapping
 // file has are no parameters.
 QString redirectReferences(const QString& value, const QString& prefixMacro) {
-  static const QRegularExpression reference(QStringLiteral("\\$\\(([^$()]*)\\)"));
-  QString redirected;
-  int copied = 0;
-  for (auto match = reference.globalMatch(value); match.hasNext();) {
-    const QRegularExpressionMatch found = match.next();
-    if (isGlobalMacro(found.captured(1)))
-      continue;
-    redirected += value.mid(copied, found.capturedStart() - copied) + QLatin1String("$($(") + prefixMacro +
-                  QLatin1String(")_") + found.captured(1) + QLatin1Char(')');
-    copied = found.capturedEnd();
-  }
-  return redirected + value.mid(copied);
+  return replaceParameterReferences(value, [&](const QString& name, QString& replacement) {
+    replacement = QLatin1String("$($(") + prefixMacro + QLatin1String(")_") + name + QLatin1Char(')');
+    return !isGlobalMacro(name);
+  });
 }
 
 // "@Value(NAME)" of a name or of an encoded reference; the name keeps its encoding.
@@ -50,59 +44,90 @@ QString attributeValueForm(const QString& value) {
   return kValueReference + name + QLatin1Char(')');
 }
 
+bool areClosed(const std::vector<QStringList>& statements) {
+  return std::all_of(statements.begin(), statements.end(), [](const QStringList& lines) {
+    return std::all_of(lines.begin(), lines.end(), &MFBuffer::closesDeferredMacros);
+  });
+}
+
+void write(MFBuffer& buffer, const std::vector<QStringList>& statements) {
+  for (const QStringList& lines : statements) {
+    buffer.addLines(lines);
+    buffer.flush();
+  }
+}
+
 }  // namespace
 
 bool CompoundTransformerCfg::doInstantiate(MFBuffer& buffer, bool inlineFlag) {
   if (!instantiationFault().isEmpty())
     return false;
-  writeInputCollectors(buffer);
-  if (!(m_network->blockedLooping() && inlineFlag)) {
-    const QString id = getIdentifier();
-    const QString prefix = makePrefixMacro(getVisualName());
-    buffer.add(QLatin1String("MACRO ") + prefix + QLatin1Char(' ') + id);
-    buffer.flush();
-    writeParametersToMappingFile(buffer, prefix, false);
-    m_network->saveSubdocPrefixMacro(prefix, id);
+  const QString id = getIdentifier();
+  const QString prefix = makePrefixMacro(getVisualName());
+  const bool hasParameters = !(m_network->blockedLooping() && inlineFlag);
+  Statements before = inputCollectors();
+  if (hasParameters) {
+    before.push_back({QLatin1String("MACRO ") + prefix + QLatin1Char(' ') + id});
+    for (const QString& statement : parameterStatements(prefix, false))
+      before.push_back({statement});
   }
-  const bool written = m_network->instantiate(buffer, this, inlineFlag);
-  writeOutputRenamers(buffer);
-  return written;
+  const Statements behind = outputRenamers();
+  const ParallelSettings parallel = m_network->getParallelSettings();
+  const QStringList body{id,
+                         m_network->getName(),
+                         getVisualName(),
+                         getTransformerParams(),
+                         parallel.groupBy,
+                         parallel.parallelism,
+                         parallel.processSetting};
+  if (!areClosed(before) || !areClosed({body}) || !areClosed(behind))
+    return false;
+
+  write(buffer, before);
+  if (hasParameters)
+    m_network->saveSubdocPrefixMacro(prefix, id);
+  const bool isWritten = m_network->instantiate(buffer, this, inlineFlag);
+  write(buffer, behind);
+  return isWritten;
 }
 
-void CompoundTransformerCfg::writeInputCollectors(MFBuffer& buffer) const {
+CompoundTransformerCfg::Statements CompoundTransformerCfg::inputCollectors() const {
   const QString id = getIdentifier();
   QStringList tags;
   getInputTags(tags);
+  Statements statements;
   for (const QString& tag : qAsConst(tags)) {
     const QStringList featureTypes = getInputFeatureTypes(tag);
     if (featureTypes.isEmpty())
       continue;
-    buffer.add(QString(kTeeFactory));
-    buffer.add(factoryName(id, tag, " Input Collector"));
+    QStringList lines{kTeeFactory, factoryName(id, tag, " Input Collector")};
     for (const QString& featureType : featureTypes)
-      buffer.add(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(featureType));
-    buffer.add(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag));
-    buffer.flush();
+      lines.append(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(featureType));
+    lines.append(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag));
+    statements.push_back(lines);
   }
+  return statements;
 }
 
-void CompoundTransformerCfg::writeOutputRenamers(MFBuffer& buffer) const {
+CompoundTransformerCfg::Statements CompoundTransformerCfg::outputRenamers() const {
   const QString id = getIdentifier();
   QStringList tags;
   getOutputTags(tags);
+  Statements statements;
   for (const QString& tag : qAsConst(tags)) {
-    buffer.add(QString(kTeeFactory));
-    buffer.add(factoryName(id, tag, " Output Renamer/Nuker"));
-    buffer.add(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag));
+    QStringList lines{
+        kTeeFactory, factoryName(id, tag, " Output Renamer/Nuker"),
+        QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag)};
     QString featureType;
     getOutputFeatureType(tag, featureType);
     if (!featureType.isEmpty()) {
-      buffer.add(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(featureType));
+      lines.append(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(featureType));
       for (const QString& function : getOutputTagFuncs(tag))
-        buffer.add(QLatin1String("    ") + function);
+        lines.append(QLatin1String("    ") + function);
     }
-    buffer.flush();
+    statements.push_back(lines);
   }
+  return statements;
 }
 
 QStringList CompoundTransformerCfg::getTransformFactoryInputLines() const {
@@ -119,6 +144,14 @@ QStringList CompoundTransformerCfg::getTransformFactoryInputLines() const {
 
 void CompoundTransformerCfg::writeParametersToMappingFile(MFBuffer& buffer, const QString& prefixMacro,
                                                           bool defaultsOnly) const {
+  for (const QString& statement : parameterStatements(prefixMacro, defaultsOnly)) {
+    buffer.add(statement);
+    buffer.flush();
+  }
+}
+
+QStringList CompoundTransformerCfg::parameterStatements(const QString& prefixMacro, bool defaultsOnly) const {
+  QStringList statements;
   const QLatin1String keyword(defaultsOnly ? "DEFAULT_MACRO " : "MACRO ");
   std::optional<QSet<QString>> setterDestinations;  // found when the first parameter asks for them
   for (const QString& parameter : getParameters()) {
@@ -126,24 +159,15 @@ void CompoundTransformerCfg::writeParametersToMappingFile(MFBuffer& buffer, cons
     const QString stored = getParameterValue(parameter);
     const ScriptLanguage language = scriptLanguage(type);
     if (language != ScriptLanguage::None && !isUnsetScript(stored)) {
-      QStringList lines;
       if (language == ScriptLanguage::Python)
-        getPythonParameterLines(prefixMacro, parameter, stored, lines);
+        getPythonParameterLines(prefixMacro, parameter, stored, statements);
       else
-        getTclParameterLines(prefixMacro, parameter, stored, lines);
-      for (const QString& line : qAsConst(lines)) {
-        buffer.add(line);
-        buffer.flush();
-      }
+        getTclParameterLines(prefixMacro, parameter, stored, statements);
       continue;
     }
     QString value;
-    if (language == ScriptLanguage::None) {
-      value = stripBasicStringInfo(getParameterValueForMappingFile(stored, type.valueIsEncoded(), false));
-      const TransformParamCfg* record = getParameterByMacroName(parameter);
-      if (record && record->getFlag(kInstanceMacros) && !prefixMacro.isEmpty())
-        value = redirectReferences(value, prefixMacro);
-    }
+    if (language == ScriptLanguage::None)
+      value = macroValue(parameter, type, prefixMacro);
     if (type.getType() == kSetterAttributeType) {
       if (!setterDestinations)
         setterDestinations = attributeSetterDestinations();
@@ -152,7 +176,48 @@ void CompoundTransformerCfg::writeParametersToMappingFile(MFBuffer& buffer, cons
     }
     const QString macro =
         prefixMacro.isEmpty() ? parameter : kMacroOpen + prefixMacro + QLatin1String(")_") + parameter;
-    buffer.add(keyword + macro + QLatin1Char(' ') + value);
-    buffer.flush();
+    statements.append(keyword + macro + QLatin1Char(' ') + value);
   }
+  return statements;
+}
+
+QString CompoundTransformerCfg::macroValue(const QString& parameter, const GUIType& type,
+                                           const QString& prefixMacro) const {
+  const QString value = stripBasicStringInfo(
+      getParameterValueForMappingFile(getParameterValue(parameter), type.valueIsEncoded(), false));
+  const TransformParamCfg* record = getParameterByMacroName(parameter);
+  return record && record->getFlag(kInstanceMacros) && !prefixMacro.isEmpty()
+             ? redirectReferences(value, prefixMacro)
+             : value;
+}
+
+QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const {
+  const QString prefix = makePrefixMacro(getVisualName());
+  QHash<QString, QString> messages;
+  for (const QString& parameter : getParameters()) {
+    const GUIType& type = getParameterGUIType(parameter);
+    const QString stored = getParameterValue(parameter);
+    const ScriptLanguage language = scriptLanguage(type);
+    QString message;
+    QStringList lines;
+    if (language == ScriptLanguage::None) {
+      lines.append(macroValue(parameter, type, prefix));
+      if (lines.first().contains(QLatin1Char('\n')) || lines.first().contains(QLatin1Char('\r')))
+        message = TransformResString(custom_messages::kLineBreak, parameter);
+    } else if (!isUnsetScript(stored)) {
+      const bool isPython = language == ScriptLanguage::Python;
+      if (isPython ? canWritePythonParameter(prefix, parameter, stored, message)
+                   : canWriteTclParameter(prefix, parameter, stored, message))
+        message.clear();
+      if (isPython)
+        getPythonParameterLines(prefix, parameter, stored, lines);
+      else
+        getTclParameterLines(prefix, parameter, stored, lines);
+    }
+    if (message.isEmpty() && !areClosed({lines}))
+      message = TransformResString(custom_messages::kUnclosedReference, parameter);
+    if (!message.isEmpty())
+      messages.insert(parameter, message);
+  }
+  return messages;
 }

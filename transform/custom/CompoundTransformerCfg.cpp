@@ -5,10 +5,10 @@
 #include <transform/custom/CustomMessages.h>
 #include <transform/custom/InstancePrototype.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/ParameterReferences.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/MessageStrings.h>
 
-#include <QRegularExpression>
 #include <QSet>
 
 #include <utility>
@@ -76,8 +76,7 @@ void CompoundTransformerCfg::assign(const TransformerCfg* other) {
   }
 }
 
-// --- ports
-// --------------------------------------------------------------------------------------------------
+// --- ports -------------------------------------------------------------------------------------------------
 
 void CompoundTransformerCfg::getInputTags(QStringList& tags, QHash<QString, QString>* shownNames) const {
   tags = m_network ? m_network->getInputs() : QStringList();
@@ -127,39 +126,33 @@ QStringList CompoundTransformerCfg::getOutputAttributes(const QString& tag) cons
 }
 
 QStringList CompoundTransformerCfg::resolvedAttributes(const QStringList& attributes) const {
-  static const QRegularExpression reference(QStringLiteral("\\$\\(([^$()]*)\\)"));
   QStringList resolved;
-  bool isResolved = false;
+  bool isChanged = false;
   for (const QString& attribute : attributes) {
     if (!attribute.contains(kMacroOpen)) {
       resolved.append(attribute);
       continue;
     }
-    QString name;
-    int copied = 0;
     bool isUnset = false;
-    for (auto match = reference.globalMatch(attribute); match.hasNext();) {
-      const QRegularExpressionMatch found = match.next();
-      const TransformParamCfg* parameter = getParameterByMacroName(found.captured(1));
-      if (!parameter)
-        continue;
-      isResolved = true;
-      const QString value = getParameterValue(found.captured(1));
+    const QString name = replaceParameterReferences(attribute, [&](const QString& parameter, QString& value) {
+      if (!hasParameter(parameter))
+        return false;
+      value = getParameterValue(parameter, UnpackLevel::Resolved);
       isUnset = isUnset || value.isEmpty() || value == kUnusedValue;
-      name += attribute.mid(copied, found.capturedStart() - copied) +
-              (parameter->valueIsEncoded() ? QORXWwjdDecode(value) : value);
-      copied = found.capturedEnd();
-    }
+      if (isValueEncoded(parameter))
+        value = QORXWwjdDecode(value);
+      return true;
+    });
+    isChanged = true;
     if (!isUnset)
-      resolved.append(name + attribute.mid(copied));
+      resolved.append(name);
   }
-  if (isResolved)
+  if (isChanged)
     resolved.removeDuplicates();
   return resolved;
 }
 
-// --- parameters
-// ---------------------------------------------------------------------------------------------
+// --- parameters ------------------------------------------------------------------------------------------
 
 bool CompoundTransformerCfg::parmValueAffectsOutputAttrs(const QString& parameter) const {
   if (!m_network)
@@ -226,8 +219,7 @@ bool CompoundTransformerCfg::isParmUsedAsAttributeSetterAttribute(const QString&
   return attributeSetterDestinations().contains(kMacroOpen + parameter + QLatin1Char(')'));
 }
 
-// --- answers of the network
-// ---------------------------------------------------------------------------------
+// --- answers of the network --------------------------------------------------------------------------------
 
 QString CompoundTransformerCfg::getFileName() const {
   return m_network ? m_network->getFileName() : QString();
@@ -350,8 +342,7 @@ QString CompoundTransformerCfg::instantiationFault() const {
                    : TransformResString(custom_messages::kNoInstance, getName());
 }
 
-// --- listening
-// ----------------------------------------------------------------------------------------------
+// --- listening ---------------------------------------------------------------------------------------------
 
 void CompoundTransformerCfg::networkChanged(bool parametersChanged) {
   networkChanged(parametersChanged, true);

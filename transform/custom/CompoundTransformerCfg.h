@@ -33,7 +33,8 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   void getOutputTags(QStringList& tags, QHash<QString, QString>* shownNames = nullptr) const override;
   void setInputAttributes(const QString& tag, const QStringList& attributes) override;
   void setInputAttributes(const QHash<QString, QStringList>& attributes) override;
-  // Names that refer to a parameter of this instance, "$(NAME)", are given with its value.
+  // Names that refer to a parameter of this instance, "$(NAME)", are given with its value; left out without
+  // one.
   QStringList getOutputAttributes(const QString& tag) const override;
   bool parmValueAffectsOutputAttrs(const QString& parameter) const override;
   QStringList getDescriptionLines() const override;
@@ -56,8 +57,7 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   QStringList getTransformFactoryInputLines() const override;
   bool containsPython() const override;
   void turnOffMultiProcessing() override;
-  // False, and nothing written, when the network is gone or stands inside itself; instantiationFault() says
-  // why.
+  // False, and nothing written, when instantiationFault() says so or a deferred reference never closes.
   bool doInstantiate(MFBuffer& buffer, bool inlineFlag) override;
 
   using TransformerCfg::getFileName;
@@ -68,8 +68,13 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   bool getUseMarkdown() const;
   // The first version that the network or a transformer inside names.
   QString pythonVersion() const;
+  // What would make the parameter macros wrong if they were written: scripts that their block would change,
+  // line breaks, deferred references that never close. One message per parameter.
+  QHash<QString, QString> findUnwritableParameters() const;
   // A message for the user; empty when instances can be written.
   QString instantiationFault() const;
+  // The caller sees to it that every deferred reference, "$[", in a value or script is closed;
+  // doInstantiate() refuses one that is not.
   void writeParametersToMappingFile(MFBuffer& buffer, const QString& prefixMacro, bool defaultsOnly) const;
 
   void networkChanged(bool parametersChanged) override;
@@ -82,12 +87,17 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   void networkChanged(bool parametersChanged, bool portsChanged);
 
  private:
+  using Statements = std::vector<QStringList>;
+
   void takeParameters();
   void putInputAttributes() const;
   QStringList resolvedAttributes(const QStringList& attributes) const;
   QStringList propertyLines(const QString& property) const;
-  void writeInputCollectors(MFBuffer& buffer) const;
-  void writeOutputRenamers(MFBuffer& buffer) const;
+  Statements inputCollectors() const;
+  Statements outputRenamers() const;
+  // One line each.
+  QStringList parameterStatements(const QString& prefixMacro, bool defaultsOnly) const;
+  QString macroValue(const QString& parameter, const GUIType& type, const QString& prefixMacro) const;
   // What the AttributeSetters inside, at any depth, have as their "DEST_ATTR".
   QSet<QString> attributeSetterDestinations() const;
 

@@ -3,6 +3,7 @@
 #include <transform/custom/AttributeMemo.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CompoundTransformerNetworkListener.h>
+#include <transform/custom/InnerTransformerListener.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjLoop.h>
@@ -13,7 +14,8 @@
 
 const QString CompoundTransformerNetwork::kLoopOutput = QStringLiteral("INCOMPLETE");
 
-CompoundTransformerNetwork::CompoundTransformerNetwork() = default;
+CompoundTransformerNetwork::CompoundTransformerNetwork()
+    : m_innerListener(std::make_unique<InnerTransformerListener>(*this)) {}
 
 CompoundTransformerNetwork::~CompoundTransformerNetwork() {
   m_listeners.tellAll([](CompoundTransformerNetworkListener& listener) { listener.networkDeleted(); });
@@ -21,8 +23,7 @@ CompoundTransformerNetwork::~CompoundTransformerNetwork() {
   clearNodes();
 }
 
-// --- building
-// -----------------------------------------------------------------------------------------------
+// --- building ----------------------------------------------------------------------------------------------
 
 void CompoundTransformerNetwork::noteNumber(int number, SubDocNetworkObj* node) {
   if (m_nodesByNumber.emplace(number, node).second)
@@ -78,6 +79,8 @@ SubDocNetworkObjXformer* CompoundTransformerNetwork::addTransformer(
   if (!owned || m_nodesByNumber.count(nodeNumber) > 0)
     return nullptr;
   m_transformers.push_back(cfg);
+  if (!cfg->listener())
+    cfg->setListener(m_innerListener.get());
   if (isCustomTransformer(cfg))
     m_customTransformers.push_back(cfg);
   return enter(std::make_unique<SubDocNetworkObjXformer>(std::move(owned), inputAttributes, nodeNumber));
@@ -144,8 +147,7 @@ void CompoundTransformerNetwork::forgetOrders() {
   m_ordersValid = false;
 }
 
-// --- editing
-// ------------------------------------------------------------------------------------------------
+// --- editing -----------------------------------------------------------------------------------------------
 
 bool CompoundTransformerNetwork::removeNode(SubDocNetworkObj* node) {
   node->removeLinks();
@@ -256,8 +258,7 @@ void CompoundTransformerNetwork::clear() {
   onNetworkChanged(true);
 }
 
-// --- listeners
-// ----------------------------------------------------------------------------------------------
+// --- listeners ---------------------------------------------------------------------------------------------
 
 void CompoundTransformerNetwork::addListener(CompoundTransformerNetworkListener* listener) {
   m_listeners.add(listener);

@@ -26,6 +26,7 @@
 #include <memory>
 
 class CompoundTransformerNetworkListener;
+class InnerTransformerListener;
 class MFBuffer;
 class SubDocNetworkObj;
 class SubDocNetworkObjInput;
@@ -155,9 +156,12 @@ class ORX_EXPORT CompoundTransformerNetwork {
   SubDocNetworkObj* nodeByNumber(int number) const;
   // Those of the inner transformers that are custom transformers themselves.
   const std::vector<TransformerCfg*>& customTransformers() const { return m_customTransformers; }
-  // Whoever put the input attributes last; null when they are nobody's.
-  const void* attributeOwner() const { return m_attributeOwner; }
-  void setAttributeOwner(const void* owner) { m_attributeOwner = owner; }
+  // The instance that put the input attributes last, with whose values the published parameters are taken;
+  // null when the attributes are nobody's.
+  const TransformerCfg* attributeOwner() const { return m_attributeOwner; }
+  void setAttributeOwner(const TransformerCfg* owner) { m_attributeOwner = owner; }
+  // What the network sets on inner transformers that have no listener.
+  const InnerTransformerListener& innerListener() const { return *m_innerListener; }
   // What a new instance starts from: made once, shared by all instances, renewed after a change.
   const TransformerCfg& instancePrototype() const;
 
@@ -226,7 +230,8 @@ class ORX_EXPORT CompoundTransformerNetwork {
 
   mutable bool m_ordersValid = false;
   mutable std::map<QString, NetworkOrder> m_orders;  // by output
-  const void* m_attributeOwner = nullptr;
+  const TransformerCfg* m_attributeOwner = nullptr;
+  std::unique_ptr<InnerTransformerListener> m_innerListener;
   mutable std::unique_ptr<AttributeMemo> m_memo;  // of the nested query under way
   mutable bool m_isEvaluating = false;
   mutable std::shared_ptr<const TransformerCfg> m_prototype;

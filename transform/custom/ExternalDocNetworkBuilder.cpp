@@ -98,8 +98,7 @@ bool ExternalDocNetwork::Builder::enter(int identifier, const Place& place) {
   return false;
 }
 
-// --- nodes
-// --------------------------------------------------------------------------------------------------
+// --- nodes -------------------------------------------------------------------------------------------------
 
 void ExternalDocNetwork::Builder::addPorts() {
   int inputs = 0;
@@ -254,8 +253,7 @@ QHash<QString, QStringList> ExternalDocNetwork::Builder::exposedAttributes(const
   return exposed;
 }
 
-// --- links
-// --------------------------------------------------------------------------------------------------
+// --- links -------------------------------------------------------------------------------------------------
 
 bool ExternalDocNetwork::Builder::findEnds(const LinkStruct& record, Place*& source, Place*& target) {
   for (const int identifier : {record.sourceNode, record.targetNode}) {
@@ -386,8 +384,7 @@ void ExternalDocNetwork::Builder::addAttributeLink(const LinkStruct& record) {
     m_network.nodeByNumber(record.sourceNode)->addAttributeCopy(tag, from, to);
 }
 
-// --- parameters
-// ---------------------------------------------------------------------------------------------
+// --- parameters --------------------------------------------------------------------------------------------
 
 void ExternalDocNetwork::Builder::addParameters() {
   for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(m_document)) {

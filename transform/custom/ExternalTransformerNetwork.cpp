@@ -99,8 +99,7 @@ void ExternalTransformerNetwork::readHeader(int version) {
     setPythonVersion(fields.at(kPython));
 }
 
-// --- the body
-// -----------------------------------------------------------------------------------------------
+// --- the body ----------------------------------------------------------------------------------------------
 
 void ExternalTransformerNetwork::takeIdentity(const QHash<QString, QString>& settings) {
   QHash<QString, QString> unknown = settings;
@@ -245,8 +244,7 @@ QStringList ExternalTransformerNetwork::getDescriptionLines() const {
   return ExternalDocNetwork::getDescriptionLines();
 }
 
-// --- the header's answers
-// -----------------------------------------------------------------------------------
+// --- the header's answers ----------------------------------------------------------------------------------
 
 QString ExternalTransformerNetwork::getFileName() const {
   return m_fileName;

@@ -1,4 +1,5 @@
 // What leaves the outputs of a network.
+#include <transform/core/TransformerCfg.h>
 #include <transform/custom/AttributeMemo.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
@@ -104,6 +105,9 @@ QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& outpu
   key.output = output;
   for (const QString& input : m_inputs)
     key.inputs.append(m_inputNodes.at(input)->setAttributes());
+  for (const QString& parameter : m_parameterNames)
+    key.values.append(m_attributeOwner ? m_attributeOwner->getParameterValue(parameter, UnpackLevel::Resolved)
+                                       : QString());
   const auto known = m_memo->answers.constFind(key);
   if (known != m_memo->answers.constEnd())
     return *known;

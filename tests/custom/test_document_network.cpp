@@ -1,0 +1,375 @@
+// Networks from documents: inside a workspace, and in files of their own.
+#include "CustomFixtures.h"
+#include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/custom/SubDocumentLibrary.h>
+#include <transform/workspace/VersionStore.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/XMLComponentReader.h>
+
+#include <QDir>
+#include <QFile>
+#include <QTemporaryDir>
+#include <gtest/gtest.h>
+
+namespace {
+
+using Kind = NetworkProblem::Kind;
+
+QStringList split(const char* text) {
+  return QString::fromUtf8(text).split(QLatin1Char(';'));
+}
+
+Definitions someDefinitions() {
+  Definitions definitions;
+  TransformerDefinition adder =
+      passing(QStringLiteral("Adder"), QStringLiteral("OUT,REST"), QStringLiteral("$(ATTR)"));
+  adder.parameterNames = names(QStringLiteral("ATTR"));
+  adder.parameterTypes = names(QStringLiteral("NEW_ATTR"));
+  adder.parameterPrompts = adder.parameterDefaults = QStringList{QString()};
+  definitions.add(adder);
+  return definitions;
+}
+
+class DocumentNetwork : public testing::Test {
+ protected:
+  void read(const std::vector<DocumentText>& documents) { reader.ReadBufferInput(documentXml(documents)); }
+
+  QString path(const char* name) const { return folder.filePath(QLatin1String(name)); }
+
+  QString write(const char* name, const QByteArray& bytes) const {
+    QFile file(path(name));
+    EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+    file.write(bytes);
+    return file.fileName();
+  }
+
+  // Puts a version into a file of versions.
+  QString store(const char* name, const QStringList& fields,
+                const std::vector<DocumentText>& documents) const {
+    QString error;
+    EXPECT_TRUE(
+        VersionStore(path(name))
+            .insert(fields, {QStringLiteral("DEFINITION ") + fields.value(1)}, documentXml(documents), error))
+        << qPrintable(error);
+    return path(name);
+  }
+
+  Definitions definitions = someDefinitions();
+  XMLComponentReader reader;
+  QTemporaryDir folder;
+};
+
+QStringList attributesOf(CompoundTransformerNetwork& network, const char* output) {
+  QHash<QString, QString> origins;
+  return network.getOutputAttributes(QLatin1String(output), origins);
+}
+
+TEST_F(DocumentNetwork, IsBuiltFromItsSubDocument) {
+  read({{QStringLiteral("Net"),
+         split("set VERSION 4;set CATEGORY Cat;set DESCRIPTION Does things;set BLOCKED_LOOPING yes;"
+               "set ORT_ATTRIBUTE_PROPOGATION_MODE ALL;set PYTHON_COMPATIBILITY 36;set OTHER x;"
+               "gui GUI TEXT LABEL The label | none;in A declared;in B;out O;own P x,y;loop L;t T Adder;"
+               "parm T ATTR added;A -> T ;B -> T ;T -> O OUT;T -> P REST;T -> L REST")}});
+  ExternalDocNetwork network;
+  network.build(reader, QStringLiteral("Net"), definitions);
+  EXPECT_TRUE(network.problems().empty()) << qPrintable(network.problems().front().text);
+  EXPECT_EQ(network.getName(), QStringLiteral("Net"));
+  EXPECT_EQ(network.getVersion(), 4);
+  EXPECT_EQ(network.getCategory(), QStringLiteral("Cat"));
+  EXPECT_EQ(network.getDescriptionLines(), names(QStringLiteral("Does things")));
+  EXPECT_FALSE(network.getProperties().contains(QStringLiteral("OTHER")));
+  EXPECT_TRUE(network.blockedLooping());
+  EXPECT_EQ(network.getPythonVersion(), QStringLiteral("36"));
+  EXPECT_EQ(network.getIncomingAttributePropogationMode(), kIncomingAll);
+  EXPECT_EQ(network.getInputs(), names(QStringLiteral("A,B")));
+  EXPECT_EQ(network.getOutputs(), names(QStringLiteral("O,P")));
+  EXPECT_EQ(network.getLoops(), names(QStringLiteral("L")));
+  EXPECT_EQ(network.getParameters(), names(QStringLiteral("LABEL")));
+  EXPECT_EQ(network.getParameterInfo(QStringLiteral("LABEL"))->defaultValue, QStringLiteral("none"));
+  EXPECT_TRUE(network.hasTransformerNamed(QStringLiteral("T")));
+  EXPECT_FALSE(network.hasTransformerNamed(QStringLiteral("t")));
+  network.setInputAttributes(QHash<QString, QStringList>{{QStringLiteral("B"), {QStringLiteral("b")}}});
+  EXPECT_EQ(attributesOf(network, "O"), names(QStringLiteral("declared,b,added")));
+  EXPECT_EQ(attributesOf(network, "P"), names(QStringLiteral("x,y")));
+  EXPECT_EQ(network.getUpstreamInputs(QStringLiteral("P")), names(QStringLiteral("A,B")));
+  CompoundTransformerCfg instance(&network);
+  EXPECT_EQ(instance.getParameters(),
+            names(QStringLiteral("XFORMER_NAME,LABEL,MAX_LOOP_ITERATIONS,ITERATION_COUNT_ATTR")));
+}
+
+struct Fault {
+  const char* document;
+  Kind kind;
+  const char* node;
+  const char* inText;
+};
+
+const Fault kFaults[] = {
+    {"t T Nothing", Kind::UnknownTransformer, "T", "Nothing"},
+    {"use T ", Kind::UnknownTransformer, "T", "SUB_DOC_NAME"},
+    {"t T Adder;parm T SIZE 3", Kind::UnknownParameter, "T", "SIZE"},
+    {"t T Adder;in A;A -> T  NONE", Kind::UnknownInput, "T", "NONE"},
+    {"t T Adder;out O;T -> O NONE", Kind::UnknownOutput, "T", "OUT, REST"},
+    {"in A;A -> T", Kind::DanglingLink, "", "999"},
+    {"in A;out O;O -> A", Kind::BadPort, "O", "fo 0"},
+    {"in A;out O;raw <FEAT_LINK SOURCE_NODE=\"0\" TARGET_NODE=\"1\" SOURCE_PORT_DESC=\"fi 0\" "
+     "TARGET_PORT_DESC=\"fi 0\"/>",
+     Kind::BadPort, "A", "fi 0"},
+    {"t T Adder;t T Adder", Kind::DuplicateName, "T", "T"},
+    {"in A;out A", Kind::DuplicateName, "A", "A"},
+    {"gui NONSENSE | 1", Kind::BadPromptLine, "", "NONSENSE"},
+    {"use T Net", Kind::Nesting, "T", "Net > Net"},
+};
+
+TEST_F(DocumentNetwork, TellsWhatIsWrongAndBuildsTheRest) {
+  for (const Fault& row : kFaults) {
+    read({{QStringLiteral("Net"), split(row.document) + split("in GOOD;out FINE;GOOD -> FINE")}});
+    SubDocumentLibrary library(reader, &definitions);
+    ExternalDocNetwork* network = library.network(QStringLiteral("Net"));
+    ASSERT_NE(network, nullptr);
+    ASSERT_EQ(network->problems().size(), 1U) << row.document;
+    const NetworkProblem& problem = network->problems().front();
+    EXPECT_EQ(problem.kind, row.kind) << row.document;
+    EXPECT_EQ(problem.node, QLatin1String(row.node)) << row.document;
+    EXPECT_TRUE(problem.text.contains(QLatin1String(row.inText))) << qPrintable(problem.text);
+    EXPECT_GT(problem.line, 0) << row.document;
+    network->setInputAttributes(QStringLiteral("GOOD"), {QStringLiteral("g")});
+    EXPECT_EQ(attributesOf(*network, "FINE"), names(QStringLiteral("g"))) << row.document;
+  }
+}
+
+TEST_F(DocumentNetwork, LibraryBuildsEachDefinitionOnce) {
+  read({{QStringLiteral("Outer"),
+         split("in A;out O;use ONE Inner;use TWO Inner;parm ONE NAME first;parm TWO NAME second;"
+               "A -> ONE  X;ONE -> TWO Y X;TWO -> O Y")},
+        {QStringLiteral("Inner"),
+         split("gui GUI TEXT NAME Name | none;in X;out Y;t T Adder;parm T ATTR $(NAME);X -> T;T -> Y OUT")}});
+  SubDocumentLibrary library(reader, &definitions);
+  std::unique_ptr<TransformerCfg> instance = library.makeTransformer(QStringLiteral("Outer"), 1);
+  ASSERT_NE(instance, nullptr);
+  ASSERT_EQ(library.networks().size(), 2U);
+  EXPECT_EQ(library.networks().front()->getName(), QStringLiteral("Inner"));
+  EXPECT_TRUE(library.networks().back()->problems().empty());
+  instance->setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
+  EXPECT_EQ(instance->getOutputAttributes(QStringLiteral("O")), names(QStringLiteral("a,first,second")));
+  EXPECT_NE(library.makeTransformer(QStringLiteral("Adder"), 1), nullptr);
+  EXPECT_EQ(library.makeTransformer(QStringLiteral("None"), 1), nullptr);
+  EXPECT_EQ(library.refusalReason(), QString());
+}
+
+TEST_F(DocumentNetwork, LibraryRefusesDeepNesting) {
+  const auto chain = [](int levels) {
+    std::vector<DocumentText> documents;
+    for (int level = 0; level < levels; ++level)
+      documents.push_back({QStringLiteral("L%1").arg(level),
+                           level == 0 ? QStringList{QStringLiteral("in A")}
+                                      : QStringList{QStringLiteral("use T L%1").arg(level - 1)}});
+    return documents;
+  };
+  for (const bool innermostFirst : {false, true}) {
+    read(chain(66));
+    SubDocumentLibrary library(reader, &definitions);
+    for (int level = 0; innermostFirst && level < 64; ++level)
+      ASSERT_NE(library.makeTransformer(QStringLiteral("L%1").arg(level), 1), nullptr) << level;
+    library.makeTransformer(QStringLiteral("L65"), 1);
+    int refusals = 0;
+    for (const ExternalDocNetwork* network : library.networks())
+      refusals += static_cast<int>(network->problems().size());
+    EXPECT_EQ(refusals, 1) << "one link of the chain is left out";
+  }
+}
+
+// --- files of their own
+// -------------------------------------------------------------------------------------
+
+struct Header {
+  const char* line;
+  const char* answers;  // name;version;category;GUID;insert mode;embeddable;blocked;parallelism;group-by;
+                        // setting;count;deprecated;python
+};
+
+const Header kHeaders[] = {
+    {"Foo,0,Cat,{1234}", "Foo;1;Cat;1234;1;1;0;NO_PARALLELISM;;;0;0;27"},
+    {"Foo,7,Cat", "Foo;7;Cat;;1;1;0;NO_PARALLELISM;;;0;0;27"},
+    {" Foo , 2 ,\tCat ,{{A}-B},Linked Always,yes,yes,g,s,5,-,yes,36",
+     "Foo;2;Cat;A-B;4;0;1;NO_PARALLELISM;g;s;5;1;36"},
+    {"Foo,2,Cat,A,Linked by Default,no,MODERATE,,,x,,no,", "Foo;2;Cat;A;2;1;0;MODERATE;;;0;0;"},
+    {"Foo,2,Cat,A,Embedded Always,Yes,no", "Foo;2;Cat;A;3;1;0;NO_PARALLELISM;;;0;0;27"},
+    {"Foo,2,Cat,A,Anything", "Foo;2;Cat;A;1;1;0;NO_PARALLELISM;;;0;0;27"},
+    {"Foo,2", ";1;;;1;1;0;NO_PARALLELISM;;;0;0;27"},
+};
+
+TEST_F(DocumentNetwork, ReadsHeaders) {
+  for (const Header& row : kHeaders) {
+    const QString file =
+        write("h.ort",
+              QByteArray("# ORW custom transformers\n#! <?xml version=\"1.0\"?> # TRANSFORMER_BEGIN A,1,B\n"
+                         "# TRANSFORMER_BEGIN ") +
+                  row.line + "\r\n# one\n#two\n# TRANSFORMER_END\nrest\n");
+    const ExternalTransformerNetwork network(file, -1, nullptr);
+    const ParallelSettings parallel = network.getParallelSettings();
+    const QStringList answers{network.getName(),
+                              QString::number(network.getVersion()),
+                              network.getCategory(),
+                              network.getGUID(),
+                              QString::number(network.getInsertMode()),
+                              QString::number(network.getIsEmbeddable()),
+                              QString::number(network.blockedLooping()),
+                              parallel.parallelism,
+                              parallel.groupBy,
+                              parallel.processSetting,
+                              QString::number(parallel.countSetting),
+                              QString::number(network.isDeprecated()),
+                              network.getPythonVersion()};
+    EXPECT_EQ(answers.join(QLatin1Char(';')), QLatin1String(row.answers)) << row.line;
+    EXPECT_EQ(network.isLoaded(), !network.getName().isEmpty());
+    EXPECT_EQ(network.getStartLine(), network.isLoaded() ? 6 : 0);
+    EXPECT_EQ(network.definitionLines(),
+              network.isLoaded() ? names(QStringLiteral("one,#two")) : QStringList());
+  }
+}
+
+TEST_F(DocumentNetwork, PicksTheVersionAndLoadsItsBodyLate) {
+  store("v.ort", names(QStringLiteral("Net,1,Cat")), {{QStringLiteral("Net"), split("in OLD")}});
+  const QString file =
+      store("v.ort", names(QStringLiteral("Net,2,Cat,{G}")),
+            {{QStringLiteral("Net"),
+              split("set TITLE T;gui GUI TEXT P P | d;in NEW;out O;use I Inner;NEW -> I;I -> O Y")},
+             {QStringLiteral("Inner"), split("in X;out Y;t T Adder;parm T ATTR x;X -> T;T -> Y OUT")}});
+  const struct {
+    int wanted;
+    int version;
+    const char* input;
+  } rows[] = {{-1, 2, "NEW"}, {-2, 2, "NEW"}, {1, 1, "OLD"}, {2, 2, "NEW"}, {3, 1, ""}};
+  for (const auto& row : rows) {
+    ExternalTransformerNetwork network(file, row.wanted, &definitions);
+    EXPECT_EQ(network.isLoaded(), row.wanted != 3);
+    EXPECT_EQ(network.isBodyLoaded(), row.wanted == 3);
+    EXPECT_EQ(network.getVersion(), row.version) << row.wanted;
+    EXPECT_EQ(network.getInputs(), names(QLatin1String(row.input))) << row.wanted;
+    EXPECT_TRUE(network.isBodyLoaded());
+    EXPECT_TRUE(network.problems().empty());
+  }
+  ExternalTransformerNetwork network(file, 2, &definitions);
+  CompoundTransformerCfg prototype(&network, CompoundTransformerCfg::Body::Deferred);
+  EXPECT_FALSE(network.isBodyLoaded());
+  EXPECT_EQ(prototype.getName(), QStringLiteral("Net"));
+  EXPECT_EQ(prototype.getVersion(), 2);
+  const std::unique_ptr<TransformerCfg> copy(prototype.getCopy());
+  EXPECT_TRUE(network.isBodyLoaded());
+  EXPECT_EQ(copy->getParameters(), names(QStringLiteral("XFORMER_NAME,P")));
+  EXPECT_EQ(copy->getParameterValue(QStringLiteral("P")), QStringLiteral("d"));
+  copy->setInputAttributes(QStringLiteral("NEW"), {QStringLiteral("a")});
+  EXPECT_EQ(copy->getOutputAttributes(QStringLiteral("O")), names(QStringLiteral("a,x")));
+  EXPECT_EQ(network.getProperties().value(QStringLiteral("TITLE")), QStringLiteral("T"));
+  EXPECT_TRUE(copy->getIsDefinitionValid());
+  QFile::remove(file);
+  EXPECT_FALSE(copy->getIsDefinitionValid());
+}
+
+TEST_F(DocumentNetwork, KeepsHeadersWhenBodiesAreBad) {
+  const struct {
+    const char* what;
+    QByteArray behind;
+  } rows[] = {
+      {"no document", ""},
+      {"broken XML", "#! <?xml version=\"1.0\"?>\n#! <TRANSFORMER>\n#! <SUBDOCUMENTS>\n"},
+  };
+  for (const auto& row : rows) {
+    const QString file = write("bad.ort",
+                               "# ORW custom transformers\n# TRANSFORMER_BEGIN Net,1,Cat\n"
+                               "# TRANSFORMER_END\n" +
+                                   row.behind);
+    ExternalTransformerNetwork network(file, -1, &definitions);
+    EXPECT_TRUE(network.isLoaded());
+    EXPECT_EQ(network.getInputs(), QStringList()) << row.what;
+    ASSERT_EQ(network.problems().size(), 1U) << row.what;
+    EXPECT_EQ(network.problems().front().kind, Kind::NoBody);
+    network.getOutputs();
+    EXPECT_EQ(network.problems().size(), 1U) << "not read again and again";
+  }
+  const ExternalTransformerNetwork missing(path("missing.ort"), -1, &definitions);
+  EXPECT_FALSE(missing.isLoaded());
+  EXPECT_EQ(missing.problems().size(), 1U);
+  EXPECT_FALSE(missing.getIsDefinitionValid());
+}
+
+QByteArray bytesOf(const QString& fileName) {
+  QFile file(fileName);
+  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
+}
+
+TEST_F(DocumentNetwork, ExtractsAndDeletesVersions) {
+  store("v.ort", names(QStringLiteral("Net,1,Cat")), {{QStringLiteral("Net"), split("in OLD")}});
+  const QByteArray onlyFirst = bytesOf(path("v.ort"));
+  const QString file = store("v.ort", names(QStringLiteral("Net,2,Cat,{G},Linked by Default,no,HIGH,g")),
+                             {{QStringLiteral("Net"), split("in NEW")}});
+  ExternalTransformerNetwork first(file, 1, &definitions);
+  EXPECT_TRUE(first.extractToFile(path("copy.ort"))) << qPrintable(first.extractError());
+  EXPECT_EQ(bytesOf(path("copy.ort")), onlyFirst);
+
+  ExternalTransformerNetwork network(file, 2, &definitions);
+  network.turnOffMultiProcessing();
+  network.setBlockedLooping(true);
+  EXPECT_TRUE(network.extractToFile(path("copy.ort")));
+  const ExternalTransformerNetwork copy(path("copy.ort"), -1, &definitions);
+  EXPECT_EQ(copy.getVersion(), 2);
+  EXPECT_EQ(copy.getGUID(), QStringLiteral("G"));
+  EXPECT_EQ(copy.getInsertMode(), 2);
+  EXPECT_TRUE(copy.blockedLooping());
+  EXPECT_FALSE(copy.getParallelSettings().isEnabled());
+  EXPECT_EQ(copy.getInputs(), names(QStringLiteral("NEW")));
+  EXPECT_EQ(copy.definitionLines(), network.definitionLines());
+  EXPECT_FALSE(network.extractToFile(path("none/copy.ort")));
+  EXPECT_FALSE(network.extractError().isEmpty());
+
+  EXPECT_TRUE(network.isDefinitionDeletable());
+  EXPECT_TRUE(network.deleteDefinition());
+  EXPECT_EQ(bytesOf(file), onlyFirst);
+  EXPECT_FALSE(network.deleteDefinition()) << "it is gone already";
+  EXPECT_FALSE(network.extractToFile(path("copy.ort")));
+  EXPECT_TRUE(ExternalTransformerNetwork(file, 1, &definitions).deleteDefinition());
+  EXPECT_FALSE(QFile::exists(file));
+}
+
+// A registry of linked files: each name is a file of the folder.
+class LinkedFiles : public Definitions {
+ public:
+  explicit LinkedFiles(const QString& folder) : m_folder(folder) {}
+  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override {
+    auto& network = m_networks[name];
+    if (!network)
+      network = std::make_shared<ExternalTransformerNetwork>(
+          QDir(m_folder).filePath(name + QLatin1String(".ort")), version, this);
+    if (!network->isLoaded())
+      return nullptr;
+    return std::make_unique<CompoundTransformerCfg>(network.get());
+  }
+
+ private:
+  QString m_folder;
+  QHash<QString, std::shared_ptr<ExternalTransformerNetwork>> m_networks;
+};
+
+TEST_F(DocumentNetwork, LinkedFilesMayNotNameEachOtherInACircle) {
+  const auto link = [&](const QString& name, const QString& next) {
+    store(qPrintable(name + QLatin1String(".ort")), {name, QStringLiteral("1"), QStringLiteral("Cat")},
+          {{name, {QStringLiteral("in A"), QStringLiteral("t T ") + next}}});
+  };
+  link(QStringLiteral("One"), QStringLiteral("Two"));
+  link(QStringLiteral("Two"), QStringLiteral("One"));
+  LinkedFiles files(folder.path());
+  auto instance = files.makeTransformer(QStringLiteral("One"), 1);
+  ASSERT_NE(instance, nullptr);
+  const auto fault = static_cast<CompoundTransformerCfg&>(*instance).instantiationFault();
+  EXPECT_TRUE(fault.contains(QStringLiteral("One > Two > One"))) << qPrintable(fault);
+
+  for (int level = 0; level < 200; ++level)
+    link(QStringLiteral("F%1").arg(level), QStringLiteral("F%1").arg(level + 1));
+  LinkedFiles chain(folder.path());
+  instance = chain.makeTransformer(QStringLiteral("F0"), 1);
+  ASSERT_NE(instance, nullptr);
+  EXPECT_FALSE(static_cast<CompoundTransformerCfg&>(*instance).instantiationFault().isEmpty());
+}
+
+}  // namespace
