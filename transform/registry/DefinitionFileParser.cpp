@@ -74,6 +74,16 @@ QStringList textsOf(const std::vector<DefinitionLine>& lines) {
   return result;
 }
 
+int DefinitionText::firstLine() const {
+  int first = 0;
+  for (const auto* lines : {&header, &templateLines, &description, &tooltip, &changeLog}) {
+    if (!lines->empty() && (first == 0 || lines->front().number < first)) {
+      first = lines->front().number;
+    }
+  }
+  return first;
+}
+
 TransformerDefinition DefinitionFileParser::interpret(const DefinitionText& text) {
   TransformerDefinition definition;
   definition.filePath = text.filePath;

@@ -126,8 +126,7 @@ void DefinitionLint::readDefinitions(const QString& path, bool isGiven) {
     report.add(kOpenBlock, path, parser.openBlockLine(), QStringLiteral("This block has no end"));
   }
   if (!parser.unfinished().isEmpty()) {
-    const std::vector<DefinitionLine>& header = parser.unfinished().header;
-    report.add(kUnfinished, path, header.empty() ? 0 : header.front().number,
+    report.add(kUnfinished, path, parser.unfinished().firstLine(),
                QStringLiteral("What stands behind the last TEMPLATE_END is no definition and is lost"));
   }
   for (const CategoryText& category : parser.categories()) {
@@ -169,9 +168,10 @@ void DefinitionLint::checkDefinition(const LintedDefinition& definition) {
   }
   m_defined.insert(key);
   HeaderLint(definition, m_report).check();
-  ParameterLint(definition, m_report).check();
-  TemplateLint(definition, m_report).check();
-  m_scripts->check(definition, m_report);
+  if (ParameterLint(definition, m_report).check()) {
+    TemplateLint(definition, m_report).check();
+    m_scripts->check(definition, m_report);
+  }
 }
 
 void DefinitionLint::checkCompanion(const QString& path) {

@@ -25,6 +25,8 @@ struct DefinitionText {
     return header.empty() && templateLines.empty() && description.empty() && tooltip.empty() &&
            changeLog.empty();
   }
+  // Of what was collected; 0 when nothing was.
+  int firstLine() const;
 };
 
 QStringList textsOf(const std::vector<DefinitionLine>& lines);

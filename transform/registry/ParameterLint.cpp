@@ -41,8 +41,10 @@ void ParameterLint::add(const LintRule& rule, int line, const QString& text) {
   m_report.add(rule, m_definition.file(), line, text);
 }
 
-void ParameterLint::check() {
-  checkLines();
+bool ParameterLint::check() {
+  if (!checkLines()) {
+    return false;
+  }
   QHash<QString, int> seen;
   for (const LintedParameter& parameter : m_definition.parameters()) {
     if (parameter.name.isEmpty()) {
@@ -58,9 +60,6 @@ void ParameterLint::check() {
     if (parameter.prompt.isEmpty() && parameter.type.getType() != kDividerType) {
       add(kMissingText, parameter.line, QStringLiteral("Parameter '%1' has no prompt").arg(parameter.name));
     }
-    if (parameter.type.isNull()) {
-      continue;  // told by checkLines()
-    }
     checkType(parameter, parameter.type);
     const MemberList members(parameter.type);
     for (const GUIType& member : members.members()) {
@@ -71,17 +70,18 @@ void ParameterLint::check() {
     }
     checkDefault(parameter);
   }
+  return true;
 }
 
 // The n-th line of each keyword belongs to the n-th name, so that one left out shifts all that follow.
-void ParameterLint::checkLines() {
+bool ParameterLint::checkLines() {
+  bool isSound = true;
   struct Kind {
     QLatin1String word;
-    bool isNeeded;
     int count = 0;
     bool isTold = false;
   };
-  Kind kinds[] = {{kParameterType, true}, {kParameterPrompt, false}, {kParameterDefault, false}};
+  Kind kinds[] = {{kParameterType}, {kParameterPrompt}, {kParameterDefault}};
   int names = 0;
   QString name;
   for (const LintedDefinition::HeaderLine& line : m_definition.header()) {
@@ -92,6 +92,7 @@ void ParameterLint::checkLines() {
       ++names;
       name = line.value;
     } else if (line.keyword->word == kParameterLookup && names == 0) {
+      isSound = false;
       add(kParameterLines, line.line.number, QStringLiteral("No parameter is named above this line"));
     }
     for (Kind& kind : kinds) {
@@ -103,6 +104,7 @@ void ParameterLint::checkLines() {
         continue;
       }
       kind.isTold = true;
+      isSound = false;
       const QString taken = m_definition.fields().parameterNames.value(kind.count - 1);
       add(kParameterLines, line.line.number,
           taken.isEmpty() ? QStringLiteral("No parameter is named for this %1").arg(kind.word)
@@ -113,11 +115,15 @@ void ParameterLint::checkLines() {
     }
   }
   for (const LintedParameter& parameter : m_definition.parameters()) {
-    if (parameter.type.isNull() && !kinds[0].isTold) {
-      add(kParameterLines, parameter.typeLine,
-          QStringLiteral("Parameter '%1' has no type").arg(parameter.name));
+    if (parameter.type.isNull()) {
+      isSound = false;
+      if (!kinds[0].isTold) {
+        add(kParameterLines, parameter.typeLine,
+            QStringLiteral("Parameter '%1' has no type").arg(parameter.name));
+      }
     }
   }
+  return isSound;
 }
 
 void ParameterLint::checkType(const LintedParameter& parameter, const GUIType& type) {

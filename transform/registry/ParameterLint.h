@@ -10,11 +10,13 @@ class ParameterLint {
   ParameterLint(const LintedDefinition& definition, LintReport& report)
       : m_definition(definition), m_report(report) {}
 
-  void check();
+  // False when lines are missing, so that types and defaults belong to the wrong parameters: nothing else is
+  // told of them then.
+  bool check();
 
  private:
   void add(const LintRule& rule, int line, const QString& text);
-  void checkLines();
+  bool checkLines();
   void checkType(const LintedParameter& parameter, const GUIType& type);
   void checkGroup(const LintedParameter& parameter);
   void checkDefault(const LintedParameter& parameter);

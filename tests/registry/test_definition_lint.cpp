@@ -1,0 +1,373 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <tests/registry/RegistryFolders.h>
+#include <transform/registry/DefinitionLint.h>
+
+#include <QHash>
+#include <QSet>
+#include <gtest/gtest.h>
+
+namespace {
+
+// Nothing in it is worth a word. Each case below spoils one piece.
+const char* const kSound =
+    "# A definition.\n"
+    "TRANSFORMER_NAME: Sound\n"
+    "VERSION: 2\n"
+    "CATEGORY: Tests\n"
+    "FEATURE_HOLDING: GROUPED\n"
+    "INPUT_TAGS: BASE EXTRA::More<space>Features\n"
+    "OUTPUT_TAGS: DONE LEFT\n"
+    "TAG_DESCRIPTION BASE features\n"
+    "TAG_DESCRIPTION EXTRA more\n"
+    "TAG_DESCRIPTION DONE what is done\n"
+    "TAG_DESCRIPTION LEFT what is left\n"
+    "PRESERVES_ATTRIBUTES: DONE:BASE LEFT =id\n"
+    "ATTRIBUTES_ADDED: DONE:$(RESULT) xml:lang\n"
+    "LIST_ACTION: DONE COLLECT EXTRA $(RESULT)\n"
+    "LIST_ACTION: <ALL> KEEP\n"
+    "PARAMETER_MAPPING: 1:OLD=TEXT\n"
+    "TAG_MAPPING: 2:O:GOOD=DONE\n"
+    "DEPENDENCY: if {![orx_fileExists /]} {return [join {no root}]}\n"
+    "MULTIPROCESS: GROUP_BY\n"
+    "PARAMETER_NAME: TEXT\n"
+    "PARAMETER_TYPE: TEXT_OR_ATTR_ENCODED\n"
+    "PARAMETER_PROMPT: Text\n"
+    "PARAMETER_DEFAULT: two<space>words\n"
+    "PARAMETER_NAME: RESULT\n"
+    "PARAMETER_TYPE: OPTIONAL OMITTABLE NEW_ATTR_ENCODED\n"
+    "PARAMETER_PROMPT: Result\n"
+    "PARAMETER_DEFAULT:\n"
+    "PARAMETER_NAME: GROUP_BY\n"
+    "PARAMETER_TYPE: OPTIONAL OMITTABLE ATTR_LIST_ENCODED\n"
+    "PARAMETER_PROMPT: Group By\n"
+    "PARAMETER_DEFAULT: <UNUSED>\n"
+    "PARAMETER_NAME: MODE\n"
+    "PARAMETER_TYPE: LOOKUP_CHOICE \"All of it\",ALL%Some,SOME\n"
+    "PARAMETER_PROMPT: Mode\n"
+    "PARAMETER_DEFAULT: ALL\n"
+    "PARAMETER_NAME: FRAME\n"
+    "PARAMETER_TYPE: OPTIONAL GROUP MODE%RESULT\n"
+    "PARAMETER_PROMPT: Frame\n"
+    "PARAMETER_DEFAULT:\n"
+    "PARAMETER_NAME: SIZE\n"
+    "PARAMETER_TYPE: MULTIPARAMETER "
+    "<semicolon>,GUI<space>FLOAT<space>WIDTH<space>Width,GUI<space>INT<space>STEPS<space>Steps\n"
+    "PARAMETER_PROMPT: Size\n"
+    "PARAMETER_DEFAULT: WIDTH;2.5;STEPS;3\n"
+    "PARAMETER_NAME: TESTS\n"
+    "PARAMETER_TYPE: LISTBOX A%B%\"C D\"\n"
+    "PARAMETER_PROMPT: Tests\n"
+    "PARAMETER_DEFAULT: A \"C D\"\n"
+    "PARAMETER_NAME: SCRIPT\n"
+    "PARAMETER_TYPE: OPTIONAL OMITTABLE TEXT_EDIT_PYTHON\n"
+    "PARAMETER_PROMPT: Script\n"
+    "PARAMETER_DEFAULT: a<space>=<space>1\n"
+    "DESCRIPTION_START\nWhat it does.\nDESCRIPTION_END\n"
+    "TOOLTIP_START\n$(TEXT) $(WIDTH)\nTOOLTIP_END\n"
+    "CHANGE_LOG_START\nFirst.\nCHANGE_LOG_END\n"
+    "TEMPLATE_START\n"
+    "Tcl2 proc $(ORX_UUID)_f {a} { if {$a eq {}} { return 1 } else { return [string length $a] } }\n"
+    "MACRO own_macro $(MODE)\n"
+    "FACTORY_DEF * SoundFactory FACTORY_NAME $(XFORMER_NAME) $(INPUT_LINES) TEXT $(TEXT) W $(WIDTH) S "
+    "$(STEPS) T "
+    "$(TESTS) M $(own_macro) OUTPUT DONE FEATURE_TYPE $(XFORMER_NAME_ENCODED)|DONE\n"
+    "FACTORY_OPTION $(XFORMER_NAME_ENCODED) RESULT $(RESULT)\n"
+    "FACTORY_OPTION $(XFORMER_NAME_ENCODED) SCRIPT $(SCRIPT)\n"
+    "FACTORY_DEF * TeeFactory INPUT FEATURE_TYPE $(XFORMER_NAME_ENCODED)|DONE OUTPUT FEATURE_TYPE "
+    "$(OUTPUT_DONE_FTYPE) $(OUTPUT_DONE_FUNCS)\n"
+    "FACTORY_DEF * TeeFactory INPUT FEATURE_TYPE $(XFORMER_NAME_ENCODED)|LEFT OUTPUT FEATURE_TYPE "
+    "$(OUTPUT_LEFT_FTYPE) $(OUTPUT_LEFT_FUNCS)\n"
+    "TEMPLATE_END\n";
+
+struct Case {
+  const char* rule;
+  const char* sound;  // the piece of the definition
+  const char* spoilt;
+};
+
+const Case kDefinitionCases[] = {
+    {"not-utf8", "What it does.", "What \xff it does."},
+    {"workspace-mark", "# A definition.", "# A definition for the ORW format."},
+    {"workspace-mark", "# A definition.", "# <WORKSPACE"},
+    {"open-block", "CATEGORY: Tests\n",
+     "CATEGORY: Tests\nCATEGORY_DESCRIPTION_START Tests\nCATEGORY_DESCRIPTION_END\n"},
+    {"unfinished-definition", "TEMPLATE_END\n", "TEMPLATE_END\nTRANSFORMER_NAME: Lost\n"},
+    {"unknown-keyword", "CATEGORY: Tests", "CATEGORY: Tests\nCOLOUR: blue"},
+    {"unknown-keyword", "DESCRIPTION_END\n", "DESCRIPTION_END\nDESCRIPTION_END\n"},
+    {"unknown-keyword", "CATEGORY: Tests", "CATEGORY: Tests\nLOCALIZED_NAME: Ton"},
+    {"repeated-keyword", "CATEGORY: Tests", "CATEGORY: Tests\nCATEGORY: Tests"},
+    {"bad-value", "VERSION: 2", "VERSION: two"},
+    {"bad-value", "CATEGORY: Tests", "CATEGORY: Tests\nVISIBLE: perhaps"},
+    {"bad-value", "FEATURE_HOLDING: GROUPED", "FEATURE_HOLDING: GROUP"},
+    {"bad-value", "TRANSFORMER_NAME: Sound\n", ""},
+    {"bad-value", "TAG_DESCRIPTION BASE features", "TAG_DESCRIPTION BASE features\nTAG_DESCRIPTION BASE"},
+    {"missing-text", "CATEGORY: Tests\n", ""},
+    {"missing-text", "What it does.\n", "\n"},
+    {"missing-text", "$(TEXT) $(WIDTH)\n", ""},
+    {"missing-text", "CHANGE_LOG_START\nFirst.\nCHANGE_LOG_END\n", ""},
+    {"missing-text", "TAG_DESCRIPTION EXTRA more\n", ""},
+    {"missing-text", "PARAMETER_PROMPT: Mode", "PARAMETER_PROMPT:"},
+    {"duplicate-definition", nullptr, nullptr},
+    {"unknown-port", "PRESERVES_ATTRIBUTES: DONE:BASE", "PRESERVES_ATTRIBUTES: DONE:OTHER"},
+    {"unknown-port", "LEFT =id", "RIGHT =id"},
+    {"unknown-port", "ATTRIBUTES_ADDED: DONE:", "ATTRIBUTES_ADDED: BASE:"},
+    {"unknown-port", "LIST_ACTION: <ALL> KEEP", "LIST_ACTION: SOME KEEP"},
+    {"unknown-port", "COLLECT EXTRA", "COLLECT MORE"},
+    {"unknown-port", "2:O:GOOD=DONE", "2:I:GOOD=DONE"},
+    {"unknown-port", "TAG_DESCRIPTION BASE features",
+     "TAG_DESCRIPTION BASE features\nTAG_DESCRIPTION BASIS x"},
+    {"unknown-port", "$(INPUT_LINES)", "$(INPUT_LINES) $(INPUT_OTHER_LINES)"},
+    {"unknown-port", "TEMPLATE_END", "X $(OUTPUT_NO_FTYPE) $(OUTPUT_NO_FUNCS)\nTEMPLATE_END"},
+    {"bad-list-action", "<ALL> KEEP", "<ALL> HOLD"},
+    {"bad-list-action", "COLLECT EXTRA $(RESULT)", "COLLECT EXTRA"},
+    {"bad-mapping", "1:OLD=TEXT", "OLD->TEXT"},
+    {"bad-mapping", "1:OLD=TEXT", "3:OLD=TEXT"},
+    {"bad-mapping", "2:O:GOOD=DONE", "2:GOOD=DONE"},
+    {"parameter-lines", "PARAMETER_PROMPT: Text\n", ""},
+    {"parameter-lines", "PARAMETER_TYPE: TEXT_OR_ATTR_ENCODED\n", ""},
+    {"parameter-lines", "PARAMETER_DEFAULT: ALL\n", "PARAMETER_DEFAULT: ALL\nPARAMETER_DEFAULT: SOME\n"},
+    {"parameter-lines", "CATEGORY: Tests", "CATEGORY: Tests\nPARAMETER_LOOKUP: a,b"},
+    {"duplicate-parameter", "PARAMETER_NAME: FRAME", "PARAMETER_NAME: MODE"},
+    {"unknown-parameter", "MULTIPROCESS: GROUP_BY", "MULTIPROCESS: GROUPING"},
+    {"unknown-parameter", "DONE:$(RESULT)", "DONE:$(RESULTS)"},
+    {"unknown-parameter", "COLLECT EXTRA $(RESULT)", "COLLECT EXTRA $(LIST)"},
+    {"unknown-parameter", "1:OLD=TEXT", "1:OLD=TEXTS"},
+    {"unknown-parameter", "GROUP MODE%RESULT", "GROUP MODE%RESULTS"},
+    {"unknown-parameter", "$(TEXT) $(WIDTH)\n", "$(TEXT) $(HEIGHT)\n"},
+    {"unknown-parameter", "STEPS;3", "STEPS;3;HEIGHT;1"},
+    {"unknown-type", "LOOKUP_CHOICE \"All of it\",ALL%Some,SOME", "SELECTION"},
+    {"unknown-type", "GUI<space>INT<space>STEPS", "GUI<space>COUNT<space>STEPS"},
+    {"plain-text-type", "PARAMETER_TYPE: TEXT_OR_ATTR_ENCODED", "PARAMETER_TYPE: TEXT_OR_ATTR"},
+    {"plain-text-type", "GUI<space>FLOAT<space>WIDTH", "GUI<space>STRING<space>WIDTH"},
+    {"bad-default", "PARAMETER_DEFAULT: ALL", "PARAMETER_DEFAULT: NONE"},
+    {"bad-default", "A \"C D\"", "A C"},
+    {"bad-default", "WIDTH;2.5", "WIDTH;wide"},
+    {"bad-default", "STEPS;3", "STEPS;3.5"},
+    {"bad-default", "two<space>words", "two words"},
+    {"bad-statement", "FACTORY_OPTION $(XFORMER_NAME_ENCODED) RESULT",
+     "  FACTORY_OPTION $(XFORMER_NAME_ENCODED) RESULT"},
+    {"bad-statement", "MACRO own_macro $(MODE)", "MACRO own_macro $(MODE) \\"},
+    {"bad-statement", "OUTPUT DONE FEATURE", "FACTORY_DEF * OUTPUT DONE FEATURE"},
+    {"unknown-token", "TEXT $(TEXT)", "TEXT $(TEXT) $(OTHER)"},
+    {"output-route", " $(OUTPUT_DONE_FUNCS)", ""},
+    {"output-route", "$(OUTPUT_DONE_FTYPE)", "$(TESTS) $(OUTPUT_DONE_FTYPE)"},
+    {"output-route", "$(OUTPUT_DONE_FTYPE) $(OUTPUT_DONE_FUNCS)",
+     "$(OUTPUT_DONE_FTYPE) $(OUTPUT_DONE_FUNCS) $(OUTPUT_LEFT_FTYPE) $(OUTPUT_LEFT_FUNCS)"},
+    {"omittable-line", "TEXT $(TEXT)", "TEXT $(TEXT) R $(RESULT)"},
+    {"omittable-line", "RESULT $(RESULT)", "RESULT $(RESULT) $(TEXT)"},
+    {"unused-port", "$(INPUT_LINES)", "$(INPUT_BASE_LINES)"},
+    {"unused-port", "OUTPUT_TAGS: DONE LEFT\n", "OUTPUT_TAGS: DONE LEFT REST\nTAG_DESCRIPTION REST x\n"},
+    {"unused-parameter", " S $(STEPS)", ""},
+    {"unused-parameter", "MACRO own_macro $(MODE)", "MACRO own_macro 1"},
+    {"tcl-syntax", "[join {no root}]}", "[join {no root}}"},
+    {"tcl-syntax", "{$a eq {}}", "{$a eq}"},
+    {"tcl-syntax", "[string length $a]", "[string length \"$a]"},
+    {"python-syntax", "a<space>=<space>1", "a<space>=<space>"},
+};
+
+QByteArray spoil(const Case& c) {
+  QByteArray text = kSound;
+  EXPECT_EQ(text.count(c.sound), 1) << c.sound;
+  return text.replace(c.sound, c.spoilt);
+}
+
+QStringList rulesOf(DefinitionLint& lint) {
+  QStringList rules;
+  for (const LintFinding& finding : lint.findings()) {
+    rules.append(finding.rule);
+  }
+  return rules;
+}
+
+std::string describe(DefinitionLint& lint) {
+  std::string text;
+  for (const LintFinding& finding : lint.findings()) {
+    text += std::to_string(finding.line) + ": " + finding.text.toStdString() + " [" +
+            finding.rule.toStdString() + "]\n";
+  }
+  return text;
+}
+
+}  // namespace
+
+TEST(DefinitionLint, FindsExactlyWhatIsWrong) {
+  RegistryFolders folders;
+  DefinitionLint lint;
+  // One folder each, so that they are no duplicates of each other.
+  QHash<QString, const Case*> cases;
+  for (const Case& c : kDefinitionCases) {
+    if (c.sound) {
+      const QString name = QStringLiteral("%1/spoilt.ort").arg(cases.size());
+      QByteArray text = spoil(c);
+      if (c.rule == QLatin1String("open-block")) {
+        text.append("DESCRIPTION_START\nno end");
+      }
+      cases.insert(folders.write(name, text), &c);
+    }
+  }
+  const QString sound = folders.write("sound/sound.ort", kSound);
+  lint.checkPath(folders.path(""));
+  QHash<QString, QSet<QString>> rules;
+  for (const LintFinding& finding : lint.findings()) {
+    EXPECT_NE(finding.file, sound) << finding.text.toStdString();
+    EXPECT_TRUE(finding.line > 0 || finding.rule == "not-utf8") << finding.text.toStdString();
+    rules[finding.file].insert(finding.rule);
+  }
+  for (auto c = cases.cbegin(); c != cases.cend(); ++c) {
+    const QSet<QString> found = rules.value(c.key());
+    SCOPED_TRACE(std::string(c.value()->rule) + ": " + c.value()->spoilt);
+    EXPECT_TRUE(found.contains(c.value()->rule)) << QStringList(found.values()).join(' ').toStdString();
+    // What is wrong may leave something else unused or unknown, no more.
+    EXPECT_LE(found.size(), 2) << QStringList(found.values()).join(' ').toStdString();
+  }
+}
+
+TEST(DefinitionLint, FindingsStandAtTheirLines) {
+  struct Line {
+    const char* rule;
+    const char* sound;
+    const char* spoilt;
+    const char* at;  // the beginning of the line
+  };
+  const Line lines[] = {
+      {"bad-default", "PARAMETER_DEFAULT: ALL", "PARAMETER_DEFAULT: NONE", "PARAMETER_DEFAULT: NONE"},
+      {"unknown-type", "PARAMETER_TYPE: LISTBOX A%B%\"C D\"", "PARAMETER_TYPE: LISTS",
+       "PARAMETER_TYPE: LISTS"},
+      {"unknown-token", "MACRO own_macro", "MACRO own_macro $(X)", "MACRO own_macro"},
+      {"tcl-syntax", "DEPENDENCY: if", "DEPENDENCY: \"if", "DEPENDENCY:"},
+      {"python-syntax", "a<space>=<space>1", "class", "PARAMETER_DEFAULT: class"},
+      {"missing-text", "First.\n", "", "TRANSFORMER_NAME"},
+  };
+  RegistryFolders folders;
+  DefinitionLint lint;
+  for (const Line& line : lines) {
+    lint.checkPath(folders.write(QString::fromLatin1(line.rule) + "/s.ort",
+                                 spoil({line.rule, line.sound, line.spoilt})));
+  }
+  for (const Line& line : lines) {
+    const QByteArray text = spoil({line.rule, line.sound, line.spoilt});
+    const int wanted = text.left(text.indexOf(line.at)).count('\n') + 1;
+    const QString file = folders.path(QString::fromLatin1(line.rule) + "/s.ort");
+    bool isFound = false;
+    for (const LintFinding& finding : lint.findings()) {
+      isFound = isFound || (finding.file == file && finding.rule == line.rule && finding.line == wanted);
+    }
+    EXPECT_TRUE(isFound) << line.rule << " at " << wanted << "\n" << describe(lint);
+  }
+}
+
+TEST(DefinitionLint, Companions) {
+  const QByteArray sound =
+      "TRANSFORMER_NAME: Sound\nVERSION: 2\nLOCALIZED_NAME: Ton\nPARAMETER_NAME: TEXT\nPARAMETER_PROMPT: "
+      "Text\n"
+      "TAG_DESCRIPTION BASE alles\nCATEGORY_NAME: Tests,Prüfungen\nCATEGORY_DESCRIPTION_START Tests\nx\n"
+      "CATEGORY_DESCRIPTION_END\nDESCRIPTION_START\nText\nDESCRIPTION_END\n";
+  const Case cases[] = {
+      {"", "Text", "Text"},
+      {"unknown-in-companion", "TRANSFORMER_NAME: Sound", "TRANSFORMER_NAME: Sounds"},
+      {"unknown-in-companion", "VERSION: 2", "VERSION: 1"},
+      {"unknown-in-companion", "PARAMETER_NAME: TEXT", "PARAMETER_NAME: TEXTE"},
+      {"unknown-in-companion", "TAG_DESCRIPTION BASE", "TAG_DESCRIPTION BASIS"},
+      {"unknown-in-companion", "CATEGORY_NAME: Tests", "CATEGORY_NAME: Test"},
+      {"unknown-in-companion", "CATEGORY_DESCRIPTION_START Tests", "CATEGORY_DESCRIPTION_START Test"},
+      {"unknown-keyword", "CATEGORY_NAME: Tests,", "CATEGORY_NAME: Tests "},
+      {"unknown-keyword", "LOCALIZED_NAME:", "LOCALISED_NAME:"},
+      {"open-block", "\nDESCRIPTION_END\n", "\n"},
+      {"not-utf8", "alles", "alles \xc3"},
+  };
+  RegistryFolders folders;
+  folders.write("x/sound.ort", kSound);
+  for (const Case& c : cases) {
+    QByteArray text = sound;
+    text.replace(c.sound, c.spoilt);
+    DefinitionLint lint;
+    lint.checkPath(folders.write("x/sound-localized.de", text));
+    EXPECT_EQ(rulesOf(lint).join(' '), c.rule) << c.spoilt << "\n" << describe(lint);
+  }
+}
+
+TEST(DefinitionLint, ShippedDefinitionsAreTranslated) {
+  RegistryFolders folders;
+  const QString file = folders.define("sound.ort", kSound);
+  {
+    DefinitionLint lint;
+    lint.checkPath(file);
+    EXPECT_EQ(rulesOf(lint), QStringList("missing-translation")) << describe(lint);
+  }
+  folders.define("sound-localized.de", "TRANSFORMER_NAME: Sound\nVERSION: 2\nLOCALIZED_NAME: Ton\n");
+  {
+    DefinitionLint lint;
+    lint.checkPath(file);
+    EXPECT_EQ(describe(lint), "") << "the companion beside it counts";
+  }
+  DefinitionLint lint;
+  lint.checkPath(folders.path("home"));
+  QStringList rules = rulesOf(lint);
+  // Description, tooltip, change log and eight prompts.
+  EXPECT_EQ(rules.size(), 11) << describe(lint);
+  rules.removeDuplicates();
+  EXPECT_EQ(rules, QStringList("missing-translation"));
+}
+
+TEST(DefinitionLint, FoldersAndOddFiles) {
+  RegistryFolders folders;
+  folders.write("x/a.ort", kSound);
+  folders.write("x/deep/b.ort", kSound);
+  folders.write("x/readme.txt", "TRANSFORMER_NAME: none of ours\n");
+  folders.write("x/custom.ort", "# ORW custom transformers\n# TRANSFORMER_BEGIN x\n");
+  DefinitionLint lint;
+  lint.checkPath(folders.path("x"));
+  lint.checkPath(folders.path("x/a.ort"));
+  EXPECT_EQ(describe(lint), "") << "one name in two folders is no fault, nor is a file given twice";
+  folders.write("x/c.ort", kSound);
+  lint.checkPath(folders.path("x/c.ort"));
+  EXPECT_EQ(rulesOf(lint), QStringList("duplicate-definition"));
+  DefinitionLint missing;
+  missing.checkPath(folders.path("nothing.ort"));
+  EXPECT_EQ(rulesOf(missing), QStringList("unreadable-file"));
+}
+
+TEST(DefinitionLint, ScriptsFromStrangers) {
+  RegistryFolders folders;
+  const QByteArray many(200000, '[');
+  const QByteArray scripts[] = {many, QByteArray(200000, '{'), QByteArray("expr {").append(many),
+                                QByteArray("a\"").append(QByteArray(300000, '(')),
+                                QByteArray(5000, '[') + "\xff\x00"};
+  for (const QByteArray& script : scripts) {
+    DefinitionLint lint;
+    lint.checkPath(
+        folders.write("x/s.ort", QByteArray(kSound).replace("DEPENDENCY: ", "DEPENDENCY: " + script)));
+    EXPECT_TRUE(rulesOf(lint).contains("tcl-syntax"));
+  }
+  const QString deep = QORXWwjdEncode(QString(100000, QLatin1Char('(')));
+  const QString nothing = QORXWwjdEncode(QString::fromLatin1("x = '") + QChar(0xd800) + QLatin1Char('\''));
+  for (const QString& script : {deep, nothing}) {
+    DefinitionLint lint;
+    lint.checkPath(
+        folders.write("x/s.ort", QByteArray(kSound).replace("a<space>=<space>1", script.toUtf8())));
+    const QStringList rules = rulesOf(lint);
+    EXPECT_TRUE(rules.contains("python-syntax") || rules.contains("unchecked-python") || script == nothing);
+  }
+  // Without an interpreter nothing passes for checked.
+  const QByteArray path = qgetenv("PATH");
+  qputenv("PATH", "");
+  DefinitionLint lint;
+  lint.checkPath(folders.write("x/s.ort", kSound));
+  const QStringList rules = rulesOf(lint);
+  qputenv("PATH", path);
+  EXPECT_EQ(rules, QStringList("unchecked-python"));
+}
+
+TEST(DefinitionLint, EveryRuleIsTested) {
+  QSet<QString> tested = {"unreadable-file", "unknown-in-companion", "missing-translation",
+                          "unchecked-python"};
+  for (const Case& c : kDefinitionCases) {
+    tested.insert(c.rule);
+  }
+  QSet<QString> known;
+  for (const LintRule& rule : lintRules()) {
+    EXPECT_TRUE(tested.contains(rule.name)) << rule.name.data();
+    EXPECT_FALSE(known.contains(rule.name)) << rule.name.data();
+    known.insert(rule.name);
+  }
+}

@@ -1,0 +1,413 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <platform/session/session.h>
+#include <tests/registry/RegistryFolders.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/TransformerCfgFactory.h>
+
+#include <QFile>
+#include <gtest/gtest.h>
+
+#include <memory>
+#include <set>
+
+namespace {
+
+using Copy = std::unique_ptr<TransformerCfg>;
+
+QStringList list(std::initializer_list<const char*> items) {
+  QStringList result;
+  for (const char* item : items) {
+    result.append(QString::fromUtf8(item));
+  }
+  return result;
+}
+
+class LanguageGuard {
+ public:
+  explicit LanguageGuard(const char* language) : m_before(QORXLanguage()) {
+    QORXSetLanguage(QString::fromLatin1(language));
+  }
+  ~LanguageGuard() { QORXSetLanguage(m_before); }
+
+ private:
+  QString m_before;
+};
+
+}  // namespace
+
+TEST(Registry, OneBadFileCostsNothingElse) {
+  struct Case {
+    const char* name;
+    QByteArray content;
+    bool isRefused;
+  };
+  QByteArray binary;
+  for (int i = 0; i < 4096; ++i) {
+    binary.append(static_cast<char>(i * 37));
+  }
+  const Case cases[] = {
+      {"bad.ort", binary, false},
+      {"bad.ort", "TRANSFORMER_NAME: Lost\nTEMPLATE_START\nnever ends\n", false},
+      {"bad.ort", QByteArray(), false},
+      {"bad.ort", QByteArray(1000000, '\n'), false},
+      {"bad.ort", QByteArray(3000000, 'x'), false},
+      {"bad.ort", "TEMPLATE_START\nTEMPLATE_END\n", true},
+      {"bad.ort", QByteArray(65 * 1024 * 1024, '#'), true},
+      {"bad-localized.en", binary, false},
+      {"bad.txt", definitionText("Text", 1), false},
+      {"bad-localized.xx", definitionText("Companion", 1), false},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(std::string(c.name) + " " + c.content.left(30).toStdString());
+    RegistryFolders folders;
+    folders.define("a.ort", definitionText("A", 1));
+    folders.define(QString::fromLatin1(c.name), c.content);
+    folders.define("z.ort", definitionText("Z", 1));
+    TransformerMgr& registry = folders.load();
+    EXPECT_TRUE(registry.isLoaded());
+    EXPECT_EQ(registry.transformerNames(), list({"A", "Z"}));
+    EXPECT_EQ(!registry.lastError().isEmpty(), c.isRefused) << registry.lastError().toStdString();
+  }
+}
+
+TEST(Registry, UnreadableFilesAndEmptyFoldersAreTold) {
+  RegistryFolders folders;
+  folders.define("a.ort", definitionText("A", 1));
+  const QString hidden = folders.define("b.ort", definitionText("B", 1));
+  QFile::remove(hidden);
+  // A link to itself can be opened by nobody, whoever runs the test.
+  ASSERT_TRUE(QFile::link(hidden, hidden));
+  TransformerMgr& registry = folders.load();
+  EXPECT_EQ(registry.transformerNames(), list({"A"}));
+  folders.write("home/transformers/dir/readme", "no definition");
+  EXPECT_EQ(folders.load().transformerNames(), list({"A"}));
+  // A file that only its owner's rights keep from being read; pointless for who may read everything.
+  const QString locked = folders.define("c.ort", definitionText("C", 1));
+  QFile::setPermissions(locked, QFileDevice::WriteOwner);
+  if (!QFile(locked).open(QIODevice::ReadOnly)) {
+    EXPECT_EQ(folders.load().lastError(), QLatin1String("Could not open file ") + locked);
+  }
+}
+
+TEST(Registry, LaterFoldersAndFilesReplace) {
+  RegistryFolders folders;
+  folders.define("a.ort", definitionText("Same", 3, "CATEGORY: First") +
+                              definitionText("Twice", 1, "CATEGORY: A") +
+                              definitionText("Twice", 1, "CATEGORY: B"));
+  folders.define("b.ort", definitionText("Same", 2, "CATEGORY: Older"));
+  folders.define("sub/c.ort", definitionText("Sub", 0));
+  const QString extra = folders.write("extra/e.ort", definitionText("Same", 3, "CATEGORY: Extra"));
+  TransformerMgr& registry = folders.load();
+  EXPECT_EQ(registry.lastError(), "");
+  EXPECT_EQ(registry.transformerNames(), list({"Same", "Twice", "Sub"}));
+  EXPECT_EQ(registry.transformerVersions("Same"), (QList<int>{2, 3}));
+  EXPECT_EQ(Copy(registry.getTransformer("Same", -1))->getFileName(), extra);
+  EXPECT_EQ(Copy(registry.getTransformer("Same", -1))->transformerType(), TransformerCfg::kOrdinary);
+  EXPECT_EQ(Copy(registry.getTransformer("Same", 2))->transformerType(), TransformerCfg::kBuiltIn);
+  EXPECT_EQ(Copy(registry.getTransformer("Twice", 1))->category(), "B");
+  ORXString file;
+  registry.getDefinitionFileName(ORXString("Same"), file);
+  EXPECT_EQ(ORXToQString(file), extra);
+  registry.getDefinitionFileName(ORXString("Unknown"), file);
+  EXPECT_EQ(ORXToQString(file), "");
+  // An older version is in no category; the name stays where a newer definition put it before.
+  EXPECT_EQ(registry.getCategories(), list({"First", "A", "B", "Extra"}));
+  EXPECT_EQ(registry.getCategoryTransformers("Extra"), list({"Same"}));
+  EXPECT_EQ(registry.getCategoryTransformers("Older"), QStringList());
+  EXPECT_EQ(folders.load().transformerNames().size(), 3) << "a second load begins anew";
+}
+
+TEST(Registry, Versions) {
+  RegistryFolders folders;
+  folders.define("a.ort", definitionText("T", 5) + definitionText("T", 2) +
+                              definitionText("Far", 2000000000) + definitionText("Odd", -7));
+  TransformerMgr& registry = folders.load();
+  struct Case {
+    const char* name;
+    int asked;
+    int got;  // -1: none
+  };
+  const Case cases[] = {{"T", -1, 5},           {"T", -2, 2},  {"T", 5, 5},
+                        {"T", 3, -1},           {"T", -3, -1}, {"t", -1, -1},
+                        {"", -1, -1},           {"U", -2, -1}, {"Far", -2, 2000000000},
+                        {"Far", -1, 2000000000}};
+  for (const Case& c : cases) {
+    SCOPED_TRACE(std::string(c.name) + " " + std::to_string(c.asked));
+    const Copy copy(registry.getTransformer(QString::fromLatin1(c.name), c.asked));
+    EXPECT_EQ(copy ? copy->getVersion() : -1, c.got);
+    EXPECT_EQ(registry.transformerExists(QString::fromLatin1(c.name), c.asked), c.got != -1);
+    EXPECT_EQ(copy ? copy->getIdentifier() : QString::fromLatin1(c.name), c.name);
+  }
+  EXPECT_EQ(registry.currentTransformerVersion("T"), 5);
+  EXPECT_EQ(registry.currentTransformerVersion("U"), -1);
+  EXPECT_FALSE(registry.isTransformerIgnored(QStringLiteral("T"), -1));
+  // Copies are the caller's own.
+  const Copy one(registry.getTransformer("T", 5));
+  one->setIdentifier(QStringLiteral("changed"));
+  EXPECT_EQ(Copy(registry.getTransformer("T", 5))->getIdentifier(), "T");
+  // Through the interface.
+  ITransformerMgr& face = ITransformerMgr::getTransformerMgr();
+  const std::unique_ptr<ITransformerCfg> copy(
+      face.getTransformer(ORXString("T"), ITransformerMgr::OLDEST_VERSION));
+  ASSERT_TRUE(copy);
+  EXPECT_FALSE(std::unique_ptr<ITransformerCfg>(face.getTransformer(ORXString("U"), 1)));
+  face.resetIteration();
+  QStringList names;
+  while (const std::unique_ptr<ITransformerCfg> next{face.getNextTransformer()}) {
+    ORXString name;
+    next->getName(name);
+    names.append(ORXToQString(name));
+  }
+  EXPECT_EQ(names, list({"T", "Far", "Odd"}));
+  EXPECT_EQ(face.getNextTransformer(), nullptr);
+  face.resetIteration();
+  EXPECT_TRUE(std::unique_ptr<ITransformerCfg>(face.getNextTransformer()));
+}
+
+TEST(Registry, Aliases) {
+  RegistryFolders folders;
+  folders.define("a.ort", definitionText("A", 1, "ALIASES: Old Shared") + definitionText("A", 2) +
+                              definitionText("B", 1, "ALIASES: Shared zwei A Middle") +
+                              definitionText("H", 1, "VISIBLE: no\nALIASES: Hidden") +
+                              definitionText("Loop", 4, "ALIASES: Circle") +
+                              definitionText("C", 1, "ALIASES: Old"));
+  // "Middle" stands for B; "Far" for "Middle"; two that stand for each other.
+  folders.define("b.ort",
+                 definitionText("Middle", 9, "ALIASES: Far") + definitionText("Circle", 3, "ALIASES: Loop"));
+  TransformerMgr& registry = folders.load();
+  struct Case {
+    const char* asked;
+    int version;
+    const char* name;  // null: none
+  };
+  const Case cases[] = {{"Old", -1, "A"},       {"Old", 1, "A"},      {"Old", 7, nullptr},
+                        {"Shared", -2, "A"},    {"Far", 9, "Middle"}, {"Far", 1, "B"},
+                        {"Far", 8, nullptr},    {"Hidden", 1, "H"},   {"Circle", 4, "Loop"},
+                        {"Circle", 5, nullptr}, {"Loop", 3, "Circle"}};
+  for (const Case& c : cases) {
+    SCOPED_TRACE(std::string(c.asked) + " " + std::to_string(c.version));
+    const Copy copy(registry.getTransformer(QString::fromLatin1(c.asked), c.version));
+    EXPECT_EQ(copy != nullptr, c.name != nullptr);
+    EXPECT_EQ(registry.transformerExists(QString::fromLatin1(c.asked), c.version), c.name != nullptr);
+    if (copy && c.name) {
+      EXPECT_EQ(copy->getName(), c.name);
+      EXPECT_EQ(copy->getRequestedAlias(), c.asked);
+    }
+  }
+  EXPECT_EQ(Copy(registry.getTransformer("A", 1))->getRequestedAlias(), "");
+  EXPECT_EQ(registry.getTransformerNameFromAlias("Shared"), "A");
+  EXPECT_EQ(registry.getTransformerNameFromAlias("B"), "");
+  EXPECT_EQ(registry.currentTransformerVersion("Old"), -1);
+  EXPECT_EQ(registry.getVisibleTransformerAliases(),
+            list({"A", "Circle", "Far", "Loop", "Middle", "Old", "Shared", "zwei"}));
+  EXPECT_TRUE(registry.isVisibleAlias("Shared"));
+  EXPECT_FALSE(registry.isVisibleAlias("A")) << "a visible transformer's own name";
+  EXPECT_FALSE(registry.isVisibleAlias("Hidden"));
+  EXPECT_EQ(registry.visibleTransformerNames(), list({"A", "B", "Loop", "C", "Middle", "Circle"}));
+}
+
+TEST(Registry, ExceptionList) {
+  struct Case {
+    const char* text;
+    std::set<std::string> refused;
+  };
+  const Case cases[] = {
+      {"XFORMER_NAME|PLATFORM|SHOULD_CREATE_TRANSFORMER\nA|ALL|NO\nB|WIN64|NO\nC|WINDOWS|no\nD|MAC|NO\n",
+       {"A", "B", "C"}},
+      {"SHOULD_CREATE_TRANSFORMER|X|PLATFORM|XFORMER_NAME\r\nYES||ALL|A\r\nNO||ALL|B\r\nNO||ALL\r\n|z|ALL|B",
+       {"B"}},
+      {"XFORMER_NAME|PLATFORM\nA|ALL|NO\n", {}},
+      {"XFORMER_NAME|PLATFORM|SHOULD_CREATE_TRANSFORMER\nA|ALL|NO\nA|ALL|YES\nB|ALL|\n", {}},
+      {"", {}},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.text);
+    RegistryFolders folders;
+    for (const char* name : {"A", "B", "C", "D"}) {
+      folders.define(QString::fromLatin1(name) + QLatin1String(".ort"), definitionText(name, 1));
+    }
+    folders.write("home/pluginsinfo/transformer/exceptions.db", c.text);
+    TransformerMgr& registry = folders.load();
+    for (const char* name : {"A", "B", "C", "D"}) {
+      const Copy copy(registry.getTransformer(QString::fromLatin1(name), 1));
+      ASSERT_TRUE(copy);
+      EXPECT_EQ(copy->platformSupported(), c.refused.count(name) == 0) << name;
+    }
+    // The list is read for a session alone.
+    registry.loadTransformers(nullptr);
+    EXPECT_TRUE(Copy(registry.getTransformer("B", 1))->platformSupported());
+  }
+}
+
+TEST(Registry, CompanionsOfTheLanguage) {
+  const QByteArray companion =
+      "TRANSFORMER_NAME: T\nVERSION: 2\nLOCALIZED_NAME: Ländermühle\nPARAMETER_NAME: P\nPARAMETER_PROMPT: "
+      "Größe\n"
+      "PARAMETER_NAME: NONE\nPARAMETER_PROMPT: x\nTOOLTIP_START\nHinweis $(P)\nTOOLTIP_END\n"
+      "CATEGORY_NAME: Attributes,Merkmale\nCATEGORY_DESCRIPTION_START Attributes\nüber Merkmale\n"
+      "CATEGORY_DESCRIPTION_END\nTRANSFORMER_NAME: U\nLOCALIZED_NAME: Uhr\nTRANSFORMER_NAME: "
+      "Unknown\nVERSION: 1\n";
+  const QByteArray parameter =
+      "CATEGORY: Attributes\nPARAMETER_NAME: P\nPARAMETER_TYPE: INT\nPARAMETER_PROMPT: Size\n";
+  RegistryFolders folders;
+  folders.define("a.ort", definitionText("T", 1, parameter) + definitionText("T", 2, parameter) +
+                              definitionText("U", 7, "CATEGORY: Attributes"));
+  folders.define("b-localized.de", companion);
+  folders.define("b-localized.fr", "TRANSFORMER_NAME: T\nVERSION: 2\nLOCALIZED_NAME: falsch\n");
+  folders.define("CategoryDefinitions",
+                 "CATEGORY_DESCRIPTION_START Attributes\nabout them\nCATEGORY_DESCRIPTION_END\n");
+  QStringList lines;
+  {
+    const LanguageGuard german("de");
+    TransformerMgr& registry = folders.load();
+    EXPECT_EQ(registry.lastError(), "");
+    const Copy copy(registry.getTransformer("T", 2));
+    EXPECT_EQ(copy->getLocalizedName(), QString::fromUtf8("Ländermühle"));
+    EXPECT_EQ(copy->getIdentifier(), QString::fromUtf8("Ländermühle"));
+    EXPECT_EQ(copy->getName(), "T");
+    EXPECT_EQ(copy->getParameterPrompt("P"), QString::fromUtf8("Größe"));
+    EXPECT_FALSE(copy->hasParameter("NONE"));
+    EXPECT_EQ(Copy(registry.getTransformer("T", 1))->getParameterPrompt("P"), "Size");
+    EXPECT_EQ(Copy(registry.getTransformer("U", 7))->getLocalizedName(), "Uhr");
+    EXPECT_EQ(registry.getLocalizedCategoryName("Attributes"), "Merkmale");
+    EXPECT_EQ(registry.getCategoryNameFromLocalizedCategoryName("Merkmale"), "Attributes");
+    EXPECT_EQ(registry.getCategoryNameFromLocalizedCategoryName("Attributes"), "Attributes");
+    EXPECT_EQ(registry.getCategoryTransformers("Merkmale"), list({"T", "U"}));
+    EXPECT_TRUE(registry.getCategoryDesc("Attributes", lines));
+    EXPECT_EQ(lines, list({"über Merkmale"}));
+  }
+  const LanguageGuard english("en");
+  TransformerMgr& registry = folders.load();
+  EXPECT_EQ(Copy(registry.getTransformer("T", 2))->getLocalizedName(), "T");
+  EXPECT_EQ(registry.getLocalizedCategoryName("Attributes"), "Attributes");
+  EXPECT_TRUE(registry.getCategoryDesc("Attributes", lines));
+  EXPECT_EQ(lines, list({"about them"}));
+  EXPECT_FALSE(registry.getCategoryDesc("Merkmale", lines));
+}
+
+TEST(Registry, ChangeLogPages) {
+  const auto change = [](const char* entry) {
+    return QByteArray("CHANGE_LOG_START\n\n") + entry + "\nCHANGE_LOG_END\n";
+  };
+  RegistryFolders folders;
+  folders.define(
+      "a.ort",
+      definitionText("T", 0, change("zero")) + definitionText("T", 2, change("a < b & \"c\"")) +
+          definitionText("T", 3, change("three\x01")) + definitionText("New<T>", 1, change("fresh")) +
+          definitionText("Old", 4, "VISIBLE: no\nREPLACED_BY: New<T>\n" + change("last")) +
+          definitionText("Quiet", 1) + definitionText("Gone", 1, "VISIBLE: no\nREPLACED_BY: Nobody"));
+  TransformerMgr& registry = folders.load();
+  const LanguageGuard english("en");
+  struct Case {
+    const char* name;
+    int from;
+    const char* newName;
+    int to;
+    const char* body;
+  };
+  const Case cases[] = {
+      {"T", 0, "T", 3,
+       "<h2 class=\"headline\">Changes from T (version 0) to T (version 3)</h2>\n<h3>Version "
+       "3</h3>\n<ul>\n<li>three "
+       "</li>\n</ul>\n<h3>Version 2</h3>\n<ul>\n<li>a &lt; b &amp; &quot;c&quot;</li>\n</ul>"},
+      {"T", 2, "T", 2,
+       "<h2 class=\"headline\">Changes from T (version 2) to T (version 2)</h2>\n<h3>Version "
+       "2</h3>\n<ul>\n<li>a &lt; b "
+       "&amp; &quot;c&quot;</li>\n</ul>"},
+      {"T", -1, "T", 0,
+       "<h2 class=\"headline\">All changes of T up to version 0</h2>\n<h3>Version "
+       "0</h3>\n<ul>\n<li>zero</li>\n</ul>"},
+      {"T", 3, "T", 2,
+       "<h2 class=\"headline\">Changes from T (version 3) to T (version 2)</h2>\n<p>No changes are "
+       "recorded.</p>"},
+      {"Old", 3, "New<T>", -1,
+       "<h2 class=\"headline\">Changes from Old (version 3) to New&lt;T&gt; (version "
+       "1)</h2>\n<h3>New&lt;T&gt;, version "
+       "1</h3>\n<ul>\n<li>fresh</li>\n</ul>\n<h3>Old, version 4</h3>\n<ul>\n<li>last</li>\n</ul>"},
+      {"Quiet", 0, "Quiet", 2147483647,
+       "<h2 class=\"headline\">Changes from Quiet (version 0) to Quiet (version 2147483647)</h2>\n<p>No "
+       "changes are "
+       "recorded.</p>"},
+  };
+  for (const Case& c : cases) {
+    const QStringList page =
+        registry.changeLog(QString::fromLatin1(c.name), c.from, QString::fromLatin1(c.newName), c.to);
+    const QString text = page.join('\n');
+    EXPECT_EQ(text.section("<body>\n", 1).section("\n</body>\n</html>", 0, 0).toStdString(), c.body);
+    EXPECT_TRUE(
+        text.startsWith("<!DOCTYPE html>\n<html lang=\"en\">\n<head>\n<meta charset=\"UTF-8\">\n<title>"));
+  }
+  const Copy old(registry.getTransformer("Old", 4));
+  EXPECT_EQ(registry.changeLog(old.get()), registry.changeLog("Old", 4, "New<T>", 1).join('\n'));
+  const Copy newest(registry.getTransformer("T", 0));
+  EXPECT_EQ(registry.changeLog(newest.get()), registry.changeLog("T", 0, "T", 3).join('\n'));
+  EXPECT_EQ(registry.changeLog(Copy(registry.getTransformer("Gone", 1)).get()), "");
+  EXPECT_EQ(registry.changeLog(nullptr), "");
+  ORXString page;
+  registry.getChangeLog(newest.get(), page);
+  EXPECT_EQ(ORXToQString(page), registry.changeLog(newest.get()));
+}
+
+TEST(Registry, Deserialize) {
+  RegistryFolders folders;
+  folders.define("a.ort",
+                 definitionText("T", 2, "ALIASES: Old\nPARAMETER_NAME: P\nPARAMETER_TYPE: TEXT_ENCODED\n"));
+  TransformerMgr& registry = folders.load();
+  const Copy copy(registry.getTransformer("T", 2));
+  copy->setParameterValue("P", "a,\"b\"", false);
+  const Copy restored(registry.deserialize(copy->serialize()));
+  ASSERT_TRUE(restored);
+  EXPECT_EQ(restored->getParameterValue("P"), "a,\"b\"");
+  struct Case {
+    const char* text;
+    bool isKnown;
+  };
+  const Case cases[] = {{"", false},
+                        {"NAME", false},
+                        {"NAME,T", false},
+                        {"NAME,T,VERSION,3", false},
+                        {"VERSION,2,NAME,Old,PARAMETER_VALUES", true},
+                        {"NAME,T,VERSION,-1,PARAMETER_VALUES,\"P,\"\"", true},
+                        {"\"NAME,T,VERSION,2", false}};
+  for (const Case& c : cases) {
+    EXPECT_EQ(Copy(registry.deserialize(QString::fromLatin1(c.text))) != nullptr, c.isKnown) << c.text;
+  }
+}
+
+TEST(Registry, NamedConnectionsAndMembers) {
+  RegistryFolders folders;
+  folders.define("a.ort", definitionText("T", 1));
+  folders.write("home/connections.list", "# shipped\nParcel Store\n\nwell<space>known\n");
+  folders.write("user/orx/connections.list", QString::fromUtf8("Straßen").toUtf8());
+  const TransformerMgr& registry = folders.load();
+  EXPECT_TRUE(registry.isConnectionKnown("Parcel<space>Store"));
+  EXPECT_TRUE(registry.isConnectionKnown("well<space>known"));
+  EXPECT_TRUE(registry.isConnectionKnown(QORXWwjdEncode(QString::fromUtf8("Straßen"))));
+  EXPECT_FALSE(registry.isConnectionKnown("Parcel"));
+  EXPECT_FALSE(registry.isConnectionKnown("<numbersign><space>shipped"));
+  EXPECT_EQ(registry.parameterNotSetDisplayString(), "<not set>");
+  const Copy copy(TransformerMgr::getTransformerMgr().getTransformer("T", 1));
+  EXPECT_EQ(copy->definitionDirectory(), &registry);
+}
+
+TEST(Factory, TheFirstFittingRuleDecides) {
+  const auto make = [] { return new TransformerCfg; };
+  const std::vector<TransformerCfgRule> rules = {
+      {QLatin1String("A"), 0, 1, QLatin1String("Old"), make},
+      {QLatin1String("A"), 3, TransformerCfgRule::kAnyVersion, QLatin1String("New"), make},
+      {QLatin1String("A"), 0, TransformerCfgRule::kAnyVersion, QLatin1String("Rest"), make},
+      {QLatin1String("B"), 2, 2, QLatin1String("Two"), make},
+  };
+  struct Case {
+    const char* name;
+    int version;
+    const char* className;
+  };
+  const Case cases[] = {
+      {"A", 0, "Old"}, {"A", 1, "Old"}, {"A", 2, "Rest"}, {"A", 3, "New"}, {"A", 2147483647, "New"},
+      {"B", 1, ""},    {"B", 2, "Two"}, {"B", 3, ""},     {"a", 0, ""},    {"", 0, ""}};
+  for (const Case& c : cases) {
+    const TransformerCfgRule* rule = findTransformerCfgRule(rules, QString::fromLatin1(c.name), c.version);
+    EXPECT_STREQ(rule ? rule->className.data() : "", c.className) << c.name << " " << c.version;
+  }
+}
