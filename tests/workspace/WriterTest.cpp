@@ -52,7 +52,7 @@ TEST(Writer, LayoutIsExact) {
   DocumentContent content;
   content.type = kTransformerDocument;
   DatasetStruct dataset;
-  dataset.metafileParameters = {{}};
+  dataset.metafileParameters.resize(1);
   dataset.metafileParameters[0].name = QStringLiteral("M");
   content.datasets = {dataset};
   content.server.services.resize(1);

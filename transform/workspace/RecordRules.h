@@ -1,13 +1,13 @@
 // How the table of one record is put together; see RecordTables.h.
 #pragma once
 
+#include <transform/workspace/RecordList.h>
 #include <transform/workspace/Vocabulary.h>
 
 #include <QPointF>
 #include <QRectF>
 #include <QSizeF>
 #include <QString>
-#include <QVector>
 
 #include <array>
 #include <tuple>
@@ -56,7 +56,7 @@ void visitField(const AttributeRule<R>& rule, Visitor&& visit) {
 template <class R, class ChildTable>
 struct ChildRule {
   using Table = ChildTable;
-  QVector<typename ChildTable::Record> R::*list;
+  RecordList<typename ChildTable::Record> R::*list;
   const Word* wrapper = nullptr;
   Emission emission = Emission::Always;
 };

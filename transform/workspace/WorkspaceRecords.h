@@ -9,12 +9,12 @@
 
 #include <platform/Export.h>
 #include <transform/workspace/DynamicSchemaInfo.h>
+#include <transform/workspace/RecordList.h>
 
 #include <QPointF>
 #include <QRectF>
 #include <QSizeF>
 #include <QString>
-#include <QVector>
 
 #include <vector>
 
@@ -59,7 +59,7 @@ struct DatasetStruct {
   int generateOrxBuildNum = 0;
   QString name;
   QString alwaysPromptParms;  // read, never written
-  QVector<MetafileParameterStruct> metafileParameters;
+  RecordList<MetafileParameterStruct> metafileParameters;
   int line = 0;
 };
 
@@ -128,9 +128,9 @@ struct FeatureTypeStruct {
   bool fanout = false;   // read, never written
   QString fanoutIdAttr;  // read, never written
   bool merge = false;    // read, never written
-  QVector<FeatAttributeStruct> attributes;
-  QVector<NonGuiDeflineParmStruct> nonGuiDeflineParms;
-  QVector<DeflineParmStruct> deflineParms;
+  RecordList<FeatAttributeStruct> attributes;
+  RecordList<NonGuiDeflineParmStruct> nonGuiDeflineParms;
+  RecordList<DeflineParmStruct> deflineParms;
   int line = 0;
 };
 
@@ -185,7 +185,7 @@ struct BookmarkStruct {
   int navBehavior = 0;
   QString colour;
   QString contents = QStringLiteral("<OLD_BOOKMARK>");  // the default marks one saved before contents existed
-  QVector<BookmarkFeatStruct> bookmarkFeats;
+  RecordList<BookmarkFeatStruct> bookmarkFeats;
   int line = 0;
 };
 
@@ -239,10 +239,10 @@ struct TransformerStruct {
   int lastParmEdit = 0;
   QString inputFtOrder;
   QString outputFtOrder;
-  QVector<OutputFeatStruct> outputFeats;
-  QVector<FeatCollapsedStruct> featCollapsed;
-  QVector<XformAttrStruct> attributes;
-  QVector<XformParmStruct> parameters;
+  RecordList<OutputFeatStruct> outputFeats;
+  RecordList<FeatCollapsedStruct> featCollapsed;
+  RecordList<XformAttrStruct> attributes;
+  RecordList<XformParmStruct> parameters;
   QString name;                                      // derived: the value of the parameter "XFORMER_NAME"
   TransformerKind kind = TransformerKind::Ordinary;  // derived from type
   int line = 0;
@@ -266,7 +266,7 @@ struct SubDocumentIOStruct {
   SubDocumentIOKind isSource =
       SubDocumentIOKind::Output;  // "true" is an input, "false" an output, "loop" a loop
   int attrMode = 0;
-  QVector<SubDocumentIOAttrStruct> attributes;
+  RecordList<SubDocumentIOAttrStruct> attributes;
   int line = 0;
 };
 
@@ -314,7 +314,7 @@ struct ServicePropertyStruct {
 
 struct ServiceStruct {
   QString name;
-  QVector<ServicePropertyStruct> properties;
+  RecordList<ServicePropertyStruct> properties;
   int line = 0;
 };
 
@@ -331,11 +331,11 @@ struct ModificationStruct {
 };
 
 struct ServerParameterStruct {
-  QVector<ServiceStruct> services;
-  QVector<ServerNameStruct> repositories;
-  QVector<ServerNameStruct> items;
-  QVector<ModificationStruct> modifications;
-  QVector<ServerNameStruct> documents;  // read, never written
+  RecordList<ServiceStruct> services;
+  RecordList<ServerNameStruct> repositories;
+  RecordList<ServerNameStruct> items;
+  RecordList<ModificationStruct> modifications;
+  RecordList<ServerNameStruct> documents;  // read, never written
   int line = 0;
 };
 

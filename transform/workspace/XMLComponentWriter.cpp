@@ -99,8 +99,7 @@ void XMLComponentWriter::addSubDocumentIO(const QString& document, const SubDocu
 
 void XMLComponentWriter::setServerParameters(const ServerParameterStruct& record) {
   refuse(recordRefusal<tables::ServerParameter>(record));
-  // Moved from a copy: GCC sees a null dereference in the assignment of a QVector.
-  m_serverParameters = ServerParameterStruct(record);
+  m_serverParameters = record;
 }
 
 void XMLComponentWriter::setMiscParms(const QString& document, const QHash<QString, QString>& parameters) {
