@@ -94,6 +94,8 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
       {{"transformers", "show", "NoSuchThing"}, 1, "", "NoSuchThing"},
       {{"transformers", "show", "GeometryBufferer", "--version", "99"}, 1, "", "99"},
       {{"transformers", "show", "GeometryBufferer", "--version", "new"}, 2, "", "new"},
+      {{"lint", QStringLiteral(ORX_SOURCE_DIR) + "/resources/transformers"}, 0, "", ""},
+      {{"lint", "missing.ort"}, 3, "", "missing.ort"},
   };
   for (const auto& test : cases) {
     const Outcome run = orxt(test.arguments, folder.path());
