@@ -1,0 +1,124 @@
+// The reference for whoever writes definitions says all there is to say, and nothing else.
+#include <platform/orxparameter/GUITypeTable.h>
+#include <tests/registry/RegistryFolders.h>
+#include <transform/registry/DefinitionKeywords.h>
+#include <transform/registry/DefinitionLint.h>
+
+#include <QFile>
+#include <QStringList>
+#include <gtest/gtest.h>
+
+namespace {
+
+QString reference() {
+  QFile file(QStringLiteral(ORX_SOURCE_DIR "/docs/definition-files.md"));
+  EXPECT_TRUE(file.open(QIODevice::ReadOnly));
+  return QString::fromUtf8(file.readAll());
+}
+
+// The rows of the table under a heading, without its head: cells of each, without code marks.
+QList<QStringList> tableUnder(const QString& heading) {
+  QList<QStringList> rows;
+  bool isUnder = false;
+  for (const QString& line : reference().split('\n')) {
+    if (line.startsWith('#')) {
+      isUnder = line == heading;
+    } else if (isUnder && line.startsWith("| `")) {
+      QStringList cells;
+      for (const QString& cell : line.mid(1, line.lastIndexOf('|') - 1).split(" | ")) {
+        cells.append(cell.trimmed());
+      }
+      cells.first().remove('`');
+      rows.append(cells);
+    }
+  }
+  EXPECT_FALSE(rows.isEmpty()) << heading.toStdString();
+  return rows;
+}
+
+const char* kindName(KeywordKind kind) {
+  switch (kind) {
+    case KeywordKind::Text:
+      return "text";
+    case KeywordKind::Number:
+      return "number";
+    case KeywordKind::Flag:
+      return "flag";
+    case KeywordKind::List:
+      return "list";
+    case KeywordKind::EncodedList:
+      return "encoded list";
+    case KeywordKind::InputList:
+      return "input list";
+    case KeywordKind::Modes:
+      return "modes";
+    case KeywordKind::ParallelList:
+      return "line list";
+    case KeywordKind::Lookup:
+      return "lookup";
+    case KeywordKind::TagDescription:
+      return "tag and text";
+    case KeywordKind::NamePair:
+      return "name pair";
+  }
+  return "";
+}
+
+// Of each row the cells that are compared.
+QStringList documented(const QString& heading, int cells) {
+  QStringList rows;
+  for (const QStringList& row : tableUnder(heading)) {
+    rows.append(row.mid(0, cells).join(" | "));
+    for (const QString& cell : row) {
+      EXPECT_FALSE(cell.isEmpty()) << row.join(" | ").toStdString();
+    }
+  }
+  return rows;
+}
+
+QStringList keywordRows(unsigned place) {
+  QStringList rows;
+  for (const DefinitionKeyword& keyword : definitionKeywords()) {
+    if (keyword.places & place) {
+      rows.append(QString(keyword.word) + " | " + kindName(keyword.kind));
+    }
+  }
+  return rows;
+}
+
+}  // namespace
+
+// What people copy first.
+TEST(DefinitionReference, ShowsASoundDefinition) {
+  RegistryFolders folders;
+  DefinitionLint lint;
+  lint.checkPath(folders.write("example.ort", reference().section("```\n", 1, 1).toUtf8()));
+  for (const LintFinding& finding : lint.findings()) {
+    ADD_FAILURE() << finding.line << ": " << finding.text.toStdString();
+  }
+  folders.define("example.ort", reference().section("```\n", 1, 1).toUtf8());
+  EXPECT_EQ(folders.load().transformerNames(), QStringList("SampleTaker"));
+}
+
+TEST(DefinitionReference, ListsEveryKeyword) {
+  EXPECT_EQ(documented("## 3. Keywords", 2), keywordRows(DefinitionKeyword::kDefinition));
+  EXPECT_EQ(documented("## 9. Localised companions", 2), keywordRows(DefinitionKeyword::kCompanion));
+}
+
+TEST(DefinitionReference, ListsEveryType) {
+  QStringList rows;
+  for (const GUITypeEntry& type : ORX_guiTypes()) {
+    rows.append(QStringList{type.word, type.takesConfig ? "yes" : "no", type.valueIsEncoded ? "yes" : "no",
+                            type.purpose}
+                    .join(" | "));
+  }
+  EXPECT_EQ(documented("## 5. Types of parameters", 4), rows);
+}
+
+TEST(DefinitionReference, ListsEveryRule) {
+  QStringList rows;
+  for (const LintRule& rule : lintRules()) {
+    rows.append(QString(rule.name) + " | " + (rule.isError ? "error" : "warning"));
+  }
+  EXPECT_EQ(documented("## 10. Checks", 2), rows);
+}
