@@ -213,7 +213,7 @@ QByteArray XMLComponentParser::captureEncoding(const QByteArray& firstBytes) {
     m_parser->parseReset(token);
   } catch (const XMLException&) {
   }
-  const QByteArray name = fromXml(m_parser->getEncodingName()).toLatin1();
+  QByteArray name = fromXml(m_parser->getEncodingName()).toLatin1();
   m_parser->forget();
   m_parser->resetDocumentPool();
   return name;
