@@ -2,9 +2,12 @@
 #include <tests/registry/RegistryFolders.h>
 #include <transform/registry/DefinitionLint.h>
 
+#include <QElapsedTimer>
 #include <QHash>
 #include <QSet>
 #include <gtest/gtest.h>
+
+#include <random>
 
 namespace {
 
@@ -331,7 +334,7 @@ TEST(DefinitionLint, ScriptsFromStrangers) {
   RegistryFolders folders;
   const QByteArray many(200000, '[');
   const QByteArray scripts[] = {many, QByteArray(200000, '{'), QByteArray("expr {").append(many),
-                                QByteArray("a\"").append(QByteArray(300000, '(')),
+                                QByteArray("a\"").append(QByteArray(600000, '(')),
                                 QByteArray(5000, '[') + "\xff\x00"};
   for (const QByteArray& script : scripts) {
     DefinitionLint lint;
@@ -356,6 +359,64 @@ TEST(DefinitionLint, ScriptsFromStrangers) {
   const QStringList rules = rulesOf(lint);
   qputenv("PATH", path);
   EXPECT_EQ(rules, QStringList("unchecked-python"));
+}
+
+// Whatever was cut, doubled or changed, every finding has its place and the checks come to an end.
+TEST(DefinitionLint, DamagedDefinitions) {
+  RegistryFolders folders;
+  std::mt19937 random(11);
+  for (int round = 0; round < 150; ++round) {
+    QList<QByteArray> lines = QByteArray(kSound).split('\n');
+    for (int i = 0; i < 6; ++i) {
+      const int at = static_cast<int>(random() % static_cast<unsigned>(lines.size()));
+      QByteArray& line = lines[at];
+      switch (random() % 5) {
+        case 0:
+          lines.removeAt(at);
+          break;
+        case 1:
+          lines.insert(at, lines[static_cast<int>(random() % static_cast<unsigned>(lines.size()))]);
+          break;
+        case 2:
+          line = line.left(static_cast<int>(random() % 20));
+          break;
+        case 3:
+          line += line.mid(line.size() / 2);
+          break;
+        default:
+          line.insert(static_cast<int>(random() % static_cast<unsigned>(line.size() + 1)),
+                      "$(<%,\"{}[]:=@\\\xff"[random() % 14]);
+      }
+    }
+    folders.write(QStringLiteral("x%1/damaged.ort").arg(round), lines.join('\n'));
+  }
+  DefinitionLint lint;
+  lint.checkPath(folders.path(""));
+  EXPECT_GT(lint.findings().size(), 150u);
+  for (const LintFinding& finding : lint.findings()) {
+    EXPECT_FALSE(finding.text.isEmpty());
+    EXPECT_GE(finding.line, 0);
+    EXPECT_LE(finding.line, 100);
+  }
+}
+
+// Nothing is looked up by walking over the rest, which would take minutes here.
+TEST(DefinitionLint, LargeDefinitions) {
+  RegistryFolders folders;
+  QByteArray text = "TRANSFORMER_NAME: Large\n";
+  for (int i = 0; i < 60000; ++i) {
+    const QByteArray number = QByteArray::number(i);
+    text += "INPUT_TAGS: I" + number + " <NO_INPUT>\nTAG_DESCRIPTION I" + number + " x\nPARAMETER_NAME: P" +
+            number + "\nPARAMETER_TYPE: INT\nPARAMETER_PROMPT: x\nPARAMETER_DEFAULT: 1\n";
+  }
+  text += "TEMPLATE_START\n" + QByteArray("X $(P1) $(I)\n").repeated(60000) + "TEMPLATE_END\n";
+  QElapsedTimer timer;
+  timer.start();
+  DefinitionLint lint;
+  lint.checkPath(folders.define("large.ort", text));
+  EXPECT_GT(lint.findings().size(), 60000u);
+  EXPECT_EQ(folders.load().transformerNames().size(), 1);
+  EXPECT_LT(timer.elapsed(), 30 * 1000);
 }
 
 TEST(DefinitionLint, EveryRuleIsTested) {

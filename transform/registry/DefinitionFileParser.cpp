@@ -28,8 +28,11 @@ void takeValue(const DefinitionKeyword& keyword, const QString& value, Transform
       }
       break;
     case KeywordKind::InputList:
-      definition.*keyword.list += splitDefinitionList(value);
-      (definition.*keyword.list).removeAll(kNoInput);
+      for (const QString& entry : splitDefinitionList(value)) {
+        if (entry != kNoInput) {
+          (definition.*keyword.list).append(entry);
+        }
+      }
       break;
     case KeywordKind::Modes:
       for (const QString& mode : splitDefinitionList(value)) {

@@ -197,7 +197,8 @@ void DefinitionLint::readTranslations() {
     for (const QString& name : listing.names()) {
       const QString path = folder + QLatin1Char('/') + name;
       QFile file(path);
-      if (isCompanionName(name) && !m_companions.contains(path) && file.open(QIODevice::ReadOnly)) {
+      if (isCompanionName(name) && !m_given.contains(QFileInfo(path).canonicalFilePath()) &&
+          file.open(QIODevice::ReadOnly)) {
         CompanionLint lint(path, *m_catalogue, ignored);
         lint.check(file, false);
         noteTranslated(path, lint);

@@ -115,7 +115,7 @@ void HeaderLint::checkReferences(const LintedDefinition::HeaderLine& line) {
   const DefinitionKeyword& keyword = *line.keyword;
   const int number = line.line.number;
   if (keyword.text == &Fields::multiProcess) {
-    if (!m_definition.fields().parameterNames.contains(line.value)) {
+    if (!m_definition.parameterNames().contains(line.value)) {
       add(kUnknownParameter, number,
           QStringLiteral("There is no parameter '%1' to group by").arg(line.value));
     }

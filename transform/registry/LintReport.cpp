@@ -3,6 +3,13 @@
 #include <algorithm>
 #include <tuple>
 
+namespace {
+
+// Texts quote what they find, which may be a line of any length.
+constexpr int kLongestText = 400;
+
+}  // namespace
+
 const std::vector<LintRule>& lintRules() {
   using namespace lint_rules;
   static const std::vector<LintRule> rules = {
@@ -26,7 +33,9 @@ const std::vector<LintRule>& lintRules() {
 }
 
 void LintReport::add(const LintRule& rule, const QString& file, int line, const QString& text) {
-  m_findings.push_back({file, line, rule.isError, rule.name, text});
+  const bool isLong = text.size() > kLongestText;
+  m_findings.push_back(
+      {file, line, rule.isError, rule.name, isLong ? text.left(kLongestText) + QLatin1String("...") : text});
 }
 
 void LintReport::sort() {

@@ -6,6 +6,18 @@
 #include <transform/registry/LintedDefinition.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 
+namespace {
+
+QSet<QString> withHidden(const QStringList& tags, const QString& hidden) {
+  QSet<QString> all(tags.begin(), tags.end());
+  if (!hidden.isEmpty()) {
+    all.insert(hidden);
+  }
+  return all;
+}
+
+}  // namespace
+
 LintedDefinition::LintedDefinition(DefinitionText text)
     : m_text(std::move(text)), m_fields(DefinitionFileParser::interpret(m_text)) {
   m_hasOwnClass = findTransformerCfgRule(m_fields.name, m_fields.version) != nullptr;
@@ -15,6 +27,8 @@ LintedDefinition::LintedDefinition(DefinitionText text)
   }
   m_inputs = TagList::parse(m_fields.inputTags).tags + TagList::parse(m_fields.dynamicInputTags).tags;
   m_outputs = TagList::parse(m_fields.outputTags).tags;
+  m_inputSet = withHidden(m_inputs, m_fields.hiddenInputTag);
+  m_outputSet = withHidden(m_outputs, m_fields.hiddenOutputTag);
   collectParameters();
 }
 
@@ -72,12 +86,4 @@ int LintedDefinition::nameLine() const {
     }
   }
   return line();
-}
-
-bool LintedDefinition::isInput(const QString& tag) const {
-  return m_inputs.contains(tag) || (!tag.isEmpty() && tag == m_fields.hiddenInputTag);
-}
-
-bool LintedDefinition::isOutput(const QString& tag) const {
-  return m_outputs.contains(tag) || (!tag.isEmpty() && tag == m_fields.hiddenOutputTag);
 }

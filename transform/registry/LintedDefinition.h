@@ -45,10 +45,12 @@ class LintedDefinition {
   const std::vector<LintedParameter>& parameters() const { return m_parameters; }
   // Of the parameters and the members of multi-parameters, and those that the system adds.
   const QSet<QString>& parameterNames() const { return m_parameterNames; }
-  QStringList inputs() const { return m_inputs; }    // without the hidden one
-  QStringList outputs() const { return m_outputs; }  // without the hidden one
-  bool isInput(const QString& tag) const;
-  bool isOutput(const QString& tag) const;
+  // Without the hidden ones.
+  const QStringList& inputs() const { return m_inputs; }
+  const QStringList& outputs() const { return m_outputs; }
+  // With the hidden ones.
+  bool isInput(const QString& tag) const { return m_inputSet.contains(tag); }
+  bool isOutput(const QString& tag) const { return m_outputSet.contains(tag); }
   // Whether a class of its own serves the transformer, which may use parameters and ports by itself.
   bool hasOwnClass() const { return m_hasOwnClass; }
 
@@ -62,5 +64,7 @@ class LintedDefinition {
   QSet<QString> m_parameterNames;
   QStringList m_inputs;
   QStringList m_outputs;
+  QSet<QString> m_inputSet;
+  QSet<QString> m_outputSet;
   bool m_hasOwnClass;
 };
