@@ -1,6 +1,8 @@
 // orxt: the library from the command line.
 #include <apps/orxt/Console.h>
+#include <apps/orxt/FormatCommand.h>
 #include <apps/orxt/GenerateCommand.h>
+#include <apps/orxt/InfoCommand.h>
 #include <apps/orxt/LintCommand.h>
 #include <apps/orxt/TransformersCommand.h>
 #include <translation/ProgramVersion.h>
@@ -18,6 +20,8 @@ namespace {
 std::vector<std::unique_ptr<Command>> makeCommands() {
   std::vector<std::unique_ptr<Command>> commands;
   commands.push_back(std::make_unique<GenerateCommand>());
+  commands.push_back(std::make_unique<InfoCommand>());
+  commands.push_back(std::make_unique<FormatCommand>());
   commands.push_back(std::make_unique<LintCommand>());
   commands.push_back(std::make_unique<TransformersCommand>());
   return commands;

@@ -1,4 +1,5 @@
 // The command as a person runs it: what it prints where, and with which exit status it ends.
+#include <tests/cli/OrxtProcess.h>
 #include <tests/support/QtPrinters.h>
 
 #include <QDir>
@@ -6,57 +7,10 @@
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
-#include <QProcess>
 #include <QTemporaryDir>
 #include <gtest/gtest.h>
 
 namespace {
-
-struct Outcome {
-  int status;
-  QString out;
-  QString err;
-};
-
-Outcome orxt(const QStringList& arguments, const QString& folder = QString(),
-             const QString& outputFile = QString()) {
-  QProcess process;
-  QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-  environment.insert("LC_ALL", "C.UTF-8");
-  process.setProcessEnvironment(environment);
-  if (!folder.isEmpty())
-    process.setWorkingDirectory(folder);
-  if (!outputFile.isEmpty())
-    process.setStandardOutputFile(outputFile);
-  process.start(QStringLiteral(ORX_BINARY_DIR) + "/bin/orxt", arguments);
-  process.closeWriteChannel();
-  EXPECT_TRUE(process.waitForFinished(120000)) << arguments.join(' ').toStdString();
-  EXPECT_EQ(process.exitStatus(), QProcess::NormalExit) << arguments.join(' ').toStdString();
-  return {process.exitCode(), QString::fromUtf8(process.readAllStandardOutput()),
-          QString::fromUtf8(process.readAllStandardError())};
-}
-
-QString sample(const QString& name) {
-  return QStringLiteral(ORX_SOURCE_DIR) + "/samples/" + name;
-}
-
-QStringList samples() {
-  QStringList result;
-  for (const QString& name : QDir(QStringLiteral(ORX_SOURCE_DIR) + "/samples").entryList({"*.orw"}))
-    result << sample(name);
-  return result;
-}
-
-QByteArray readAll(const QString& path) {
-  QFile file(path);
-  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}
-
-void write(const QString& path, const QByteArray& bytes) {
-  QFile file(path);
-  ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-  ASSERT_EQ(file.write(bytes), bytes.size());
-}
 
 TEST(CommandLine, EndsWithTheStatusThatFits) {
   QTemporaryDir folder;

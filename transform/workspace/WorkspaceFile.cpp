@@ -241,33 +241,41 @@ bool WorkspaceFile::writeXml(QIODevice& device, DocumentType type,
   return true;
 }
 
-bool WorkspaceFile::save(const QString& fileName, DocumentType type,
-                         const std::function<void(XMLComponentWriter&)>& fill, QString& error) const {
+bool WorkspaceFile::write(QIODevice& device, DocumentType type,
+                          const std::function<void(XMLComponentWriter&)>& fill, QString& error) const {
   error.clear();
-  const auto fail = [&](const QString& reason) {
-    error = QStringLiteral("Could not write workspace file %1: %2").arg(fileName, reason);
-    return false;
-  };
   QByteArray header;
   if (m_hasHeader) {
-    if (m_form == Form::PlainXml)
-      return fail(QStringLiteral("a file of plain XML has no header"));
+    if (m_form == Form::PlainXml) {
+      error = QStringLiteral("a file of plain XML has no header");
+      return false;
+    }
     header = encodedHeader(error);
     if (!error.isEmpty())
-      return fail(error);
+      return false;
   }
-  AtomicFile file(fileName);
-  if (!file.open())
-    return fail(file.errorString());
-  QIODevice& device = file.device();
   device.write(m_mark);
   device.write(m_before);
   if (!writeXml(device, type, fill, error))
-    return fail(error);
+    return false;
   device.write(m_between);
   if (!m_between.isEmpty() && !m_between.endsWith(encodedAscii("\n")) && m_hasHeader)
     device.write(encodedAscii(m_lineEnd));
   device.write(header);
   device.write(m_behind);
+  return true;
+}
+
+bool WorkspaceFile::save(const QString& fileName, DocumentType type,
+                         const std::function<void(XMLComponentWriter&)>& fill, QString& error) const {
+  const auto fail = [&](const QString& reason) {
+    error = QStringLiteral("Could not write workspace file %1: %2").arg(fileName, reason);
+    return false;
+  };
+  AtomicFile file(fileName);
+  if (!file.open())
+    return fail(file.errorString());
+  if (!write(file.device(), type, fill, error))
+    return fail(error);
   return file.commit() || fail(file.errorString());
 }

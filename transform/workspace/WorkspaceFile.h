@@ -50,6 +50,10 @@ class ORX_EXPORT WorkspaceFile {
   // written; `error` says why, and what stood there is untouched.
   bool save(const QString& fileName, DocumentType type, const std::function<void(XMLComponentWriter&)>& fill,
             QString& error) const;
+  // The same file to a device that is open for writing. False when the writer or the header is refused;
+  // failures of the device show in the device.
+  bool write(QIODevice& device, DocumentType type, const std::function<void(XMLComponentWriter&)>& fill,
+             QString& error) const;
 
  private:
   bool isWide() const;

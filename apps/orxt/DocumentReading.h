@@ -1,0 +1,11 @@
+// The first step of every command that takes a document without translating it.
+#pragma once
+
+#include <apps/orxt/Command.h>
+
+#include <QString>
+
+class WorkspaceDocument;
+
+// Reads the document and says on the console what is wrong with it.
+ExitStatus readDocument(WorkspaceDocument& document, const QString& fileName, Console& console);

@@ -1,0 +1,36 @@
+#include <apps/orxt/PrintableText.h>
+
+QString onOneLine(const QString& text, int limit) {
+  QString line;
+  bool blankWaits = false;
+  for (const QChar character : text) {
+    if (character.isSpace()) {
+      blankWaits = !line.isEmpty();
+      continue;
+    }
+    if (character.category() == QChar::Other_Control || character.category() == QChar::Other_Format)
+      continue;
+    if (line.size() + (blankWaits ? 2 : 1) > limit) {
+      line.truncate(limit - 1);
+      if (line.endsWith(QLatin1Char(' ')) || (!line.isEmpty() && line.at(line.size() - 1).isHighSurrogate()))
+        line.chop(1);
+      return line + QChar(0x2026);
+    }
+    if (blankWaits)
+      line += QLatin1Char(' ');
+    blankWaits = false;
+    line += character;
+  }
+  return line;
+}
+
+QStringList wrapped(const QString& line, int width) {
+  QStringList lines;
+  for (const QString& word : line.split(QLatin1Char(' '))) {
+    if (lines.isEmpty() || lines.last().size() + 1 + word.size() > width)
+      lines << word;
+    else
+      lines.last() += QLatin1Char(' ') + word;
+  }
+  return lines;
+}

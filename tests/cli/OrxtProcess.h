@@ -1,0 +1,57 @@
+// Runs the command and gives back what it did.
+#pragma once
+
+#include <QDir>
+#include <QFile>
+#include <QProcess>
+#include <QString>
+#include <QStringList>
+#include <gtest/gtest.h>
+
+struct Outcome {
+  int status;
+  QString out;
+  QString err;
+};
+
+// `outputFile` receives standard output when it is given; `input` is what stands on standard input.
+inline Outcome orxt(const QStringList& arguments, const QString& folder = QString(),
+                    const QString& outputFile = QString(), const QByteArray& input = QByteArray()) {
+  QProcess process;
+  QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+  environment.insert("LC_ALL", "C.UTF-8");
+  process.setProcessEnvironment(environment);
+  if (!folder.isEmpty())
+    process.setWorkingDirectory(folder);
+  if (!outputFile.isEmpty())
+    process.setStandardOutputFile(outputFile);
+  process.start(QStringLiteral(ORX_BINARY_DIR) + "/bin/orxt", arguments);
+  process.write(input);
+  process.closeWriteChannel();
+  EXPECT_TRUE(process.waitForFinished(120000)) << arguments.join(' ').toStdString();
+  EXPECT_EQ(process.exitStatus(), QProcess::NormalExit) << arguments.join(' ').toStdString();
+  return {process.exitCode(), QString::fromUtf8(process.readAllStandardOutput()),
+          QString::fromUtf8(process.readAllStandardError())};
+}
+
+inline QString sample(const QString& name) {
+  return QStringLiteral(ORX_SOURCE_DIR) + "/samples/" + name;
+}
+
+inline QStringList samples() {
+  QStringList result;
+  for (const QString& name : QDir(QStringLiteral(ORX_SOURCE_DIR) + "/samples").entryList({"*.orw"}))
+    result << sample(name);
+  return result;
+}
+
+inline QByteArray readAll(const QString& path) {
+  QFile file(path);
+  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+inline void write(const QString& path, const QByteArray& bytes) {
+  QFile file(path);
+  ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+  ASSERT_EQ(file.write(bytes), bytes.size());
+}

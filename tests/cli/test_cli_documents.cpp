@@ -1,0 +1,296 @@
+// The commands that look at documents or rewrite them.
+#include <tests/cli/OrxtProcess.h>
+#include <tests/support/QtPrinters.h>
+
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QTemporaryDir>
+
+#include <sys/stat.h>
+
+namespace {
+
+const char* const kSmall =
+    R"(#! <?xml version="1.0" encoding="UTF-8" ?>
+#! <WORKSPACE TITLE="Small" USAGE="none">
+#! <DATASETS><DATASET IS_SOURCE="true" FORMAT="CSV" DATASET="in.csv" KEYWORD="CSV_1" NAME="in"/></DATASETS>
+#! <FEATURE_TYPES><FEATURE_TYPE IS_SOURCE="true" FEATURE_TYPE_NAME="row" KEYWORD="CSV_1" ENABLED="false">
+#! <FEAT_ATTRIBUTE ATTR_NAME="a"/><FEAT_ATTRIBUTE ATTR_NAME="b"/></FEATURE_TYPE></FEATURE_TYPES>
+#! <GLOBAL_PARAMETERS>
+#! <GLOBAL_PARAMETER GUI_LINE="GUI OPTIONAL TEXT_ENCODED PLACE Where It Is" DEFAULT_VALUE="an&lt;space&gt;der"/>
+#! <GLOBAL_PARAMETER GUI_LINE="GUI PASSWORD SECRET Pass Word" DEFAULT_VALUE="hunter2" IS_STAND_ALONE="ORX_SERVER"/>
+#! </GLOBAL_PARAMETERS>
+#! <TRANSFORMERS>
+#! <TRANSFORMER IDENTIFIER="2" TYPE="ValueAssigner" VERSION="10"/>
+#! <TRANSFORMER IDENTIFIER="3" TYPE="ValueAssigner" VERSION="2" ENABLED="false"/>
+#! <TRANSFORMER IDENTIFIER="4" TYPE="ValueAssigner" VERSION="10"/>
+#! <TRANSFORMER IDENTIFIER="5" TYPE="SubDocumentTransformer">
+#! <XFORM_PARM PARM_NAME="SUB_DOC_NAME" PARM_VALUE="Inner"/></TRANSFORMER>
+#! </TRANSFORMERS>
+#! <FEAT_LINKS><FEAT_LINK IDENTIFIER="6"/><FEAT_LINK IDENTIFIER="7" ENABLED="false"/></FEAT_LINKS>
+#! <BREAKPOINTS><BREAKPOINT FEAT_LINK="6" NAME="stop" ENABLED="true"/></BREAKPOINTS>
+#! <BOOKMARKS><BOOKMARK NAME="Start"/></BOOKMARKS>
+#! <SUBDOCUMENTS><SUBDOCUMENT NAME="Inner" VERSION="4"><SUBDOCUMENT_IOS><SUBDOCUMENT_IO NAME="IN" IS_SOURCE="true"/>
+#! <SUBDOCUMENT_IO NAME="ROUND" IS_SOURCE="loop" PUBLISHED="false"/></SUBDOCUMENT_IOS>
+#! <COMMENTS><COMMENT COMMENT_VALUE="well"/></COMMENTS></SUBDOCUMENT></SUBDOCUMENTS>
+#! </WORKSPACE>
+#! START_HEADER
+MACRO A b
+# kept
+#! END_HEADER
+behind the header
+)";
+
+const char* const kVersions =
+    R"(# ORW custom transformers
+# TRANSFORMER_BEGIN Cleaner,2,Cleaning,{aa-bb}
+# FACTORY_DEF
+# TRANSFORMER_END
+#! <?xml version="1.0" encoding="UTF-8" ?>
+#! <TRANSFORMER TITLE="second"/>
+# TRANSFORMER_BEGIN Cleaner,1,Cleaning,{aa-bb}
+# TRANSFORMER_END
+#! <?xml version="1.0" encoding="UTF-8" ?>
+#! <TRANSFORMER TITLE="first"/>
+)";
+
+// The small document with something in it that no canonical form holds.
+QByteArray withLosses() {
+  return QByteArray(kSmall)
+      .replace(
+          "#! <TRANSFORMERS>\n",
+          "#! <CONSTANTS><CONSTANT IDENTIFIER=\"9\" CONST_VALUE=\"x\"/></CONSTANTS>\n#! <TRANSFORMERS>\n")
+      .replace("IDENTIFIER=\"2\"", "IDENTIFIER=\"2\" WHIM=\"x\"")
+      .replace("KEYWORD=\"CSV_1\" ENABLED", "KEYWORD=\"CSV_1\" FANOUT=\"true\" ENABLED")
+      .replace("#! <BOOKMARKS>", "#! <ODDITIES/><BOOKMARKS>");
+}
+
+QJsonArray infoJson(const QStringList& files, const QString& folder = QString(),
+                    const QByteArray& input = QByteArray()) {
+  const Outcome run = orxt(QStringList{"info", "--json"} + files, folder, QString(), input);
+  EXPECT_EQ(run.status, 0) << run.err.toStdString();
+  QJsonParseError error;
+  const QJsonDocument json = QJsonDocument::fromJson(run.out.toUtf8(), &error);
+  EXPECT_EQ(error.error, QJsonParseError::NoError) << error.errorString().toStdString();
+  return json.array();
+}
+
+TEST(DocumentCommands, EndWithTheStatusThatFits) {
+  QTemporaryDir folder;
+  const QString good = samples().first();
+  write(folder.filePath("empty.orw"), "");
+  write(folder.filePath("cut.orw"), readAll(good).left(3000));
+  write(folder.filePath("noise.orw"), QByteArray("\xff\x00\x1b[2J#!", 9).repeated(5000));
+  write(folder.filePath("lossy.orw"), withLosses());
+  write(folder.filePath("small.orw"), kSmall);
+  write(folder.filePath("other.orw"), "<FOO/>");
+  write(folder.filePath("versions.ort"), kVersions);
+  write(folder.filePath("hollow.ort"), "# ORW custom transformers\n");
+  const struct {
+    QStringList arguments;
+    int status;
+    const char* out;  // a piece of what is printed; empty: nothing may be printed
+    const char* err;
+  } cases[] = {
+      {{"info", "--help"}, 0, "Example:", ""},
+      {{"format", "--help"}, 0, "--drop", ""},
+      {{"info"}, 2, "", "workspace"},
+      {{"format"}, 2, "", "workspace"},
+      {{"format", good, good}, 2, "", "give -i or --check"},
+      {{"format", "-i", "-o", "x", good}, 2, "", "excludes"},
+      {{"format", "--check", "-o", "x", good}, 2, "", "excludes"},
+      {{"format", "-i", "-"}, 2, "", "in place"},
+      {{"info", "missing.orw"}, 3, "", "missing.orw: error: "},
+      {{"info", "."}, 3, "", ".: error: "},
+      {{"info", "empty.orw"}, 1, "", "empty.orw: error: "},
+      {{"info", "cut.orw"}, 1, "", "cut.orw:"},
+      {{"info", "noise.orw"}, 1, "", "noise.orw: error: "},
+      {{"info", "hollow.ort"}, 1, "", "hollow.ort: error: "},
+      {{"info", "-"}, 1, "", "standard input: error: "},
+      {{"info", "missing.orw", "small.orw", "empty.orw"}, 3, "TITLE  Small", "empty.orw: error: "},
+      {{"info", "small.orw"}, 0, "Custom transformer Inner, version 4", ""},
+      {{"info", "versions.ort"}, 0, "Cleaner 1  Cleaning  aa-bb  line 9", ""},
+      {{"format", "missing.orw"}, 3, "", "missing.orw: error: "},
+      {{"format", "-i", "cut.orw"}, 1, "", "cut.orw:"},
+      {{"format", "-i", "noise.orw"}, 1, "", "noise.orw: error: "},
+      {{"format", "-i", "versions.ort"}, 1, "", "versions.ort: error: "},
+      {{"format", "other.orw"}, 1, "", "FOO"},
+      {{"format", "--drop", "other.orw"}, 0, "<WORKSPACE", "warning"},
+      {{"format", "small.orw", "-o", "/dev/full"}, 3, "", "/dev/full"},
+      {{"format", "small.orw", "-o", "no/such/folder/x.orw"}, 3, "", "no/such/folder/x.orw"},
+      {{"format", "--check", "small.orw"}, 1, "", "small.orw:2: error: "},
+      {{"format", "--check", "lossy.orw"}, 1, "", "lossy.orw:4: error: "},
+      {{"format", "--check", good, "small.orw", "missing.orw"}, 3, "", "small.orw:2: error: "},
+  };
+  const QByteArray cut = readAll(folder.filePath("cut.orw"));
+  for (const auto& test : cases) {
+    const Outcome run = orxt(test.arguments, folder.path());
+    const std::string line = test.arguments.join(' ').toStdString();
+    EXPECT_EQ(run.status, test.status) << line << "\n" << run.err.toStdString();
+    EXPECT_TRUE(*test.out ? run.out.contains(test.out) : run.out.isEmpty()) << line << "\n"
+                                                                            << run.out.toStdString();
+    EXPECT_TRUE(*test.err ? run.err.contains(test.err) : run.err.isEmpty()) << line << "\n"
+                                                                            << run.err.toStdString();
+  }
+  EXPECT_EQ(readAll(folder.filePath("cut.orw")), cut);
+  EXPECT_EQ(readAll(folder.filePath("small.orw")), QByteArray(kSmall));
+  EXPECT_EQ(readAll(folder.filePath("versions.ort")), QByteArray(kVersions));
+  EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files | QDir::Hidden).size(), 8) << "a file was left behind";
+}
+
+TEST(DocumentCommands, StandardOutputThatTakesNothingIsAnError) {
+  for (const char* const command : {"info", "format"}) {
+    const Outcome run = orxt({command, samples().first()}, QString(), "/dev/full");
+    EXPECT_EQ(run.status, 3) << command;
+    EXPECT_TRUE(run.err.contains("standard output")) << run.err.toStdString();
+  }
+}
+
+TEST(FormatCommand, TheSamplesAreCanonical) {
+  const Outcome check = orxt(QStringList{"format", "--check"} + samples());
+  EXPECT_EQ(check.status, 0) << check.err.toStdString();
+  for (const QString& name : samples()) {
+    const QByteArray bytes = readAll(name);
+    EXPECT_EQ(orxt({"format", "-"}, QString(), QString(), bytes).out.toUtf8(), bytes) << name.toStdString();
+  }
+}
+
+TEST(FormatCommand, ListsEveryLossAndWritesNothingUnlessTold) {
+  QTemporaryDir folder;
+  const QString file = folder.filePath("lossy.orw");
+  write(file, withLosses());
+  const char* const losses[] = {"lossy.orw:4: %1: the attribute FANOUT ", "lossy.orw:10: %1: the constant ",
+                                "lossy.orw:12: %1: the attribute WHIM ",
+                                "lossy.orw:20: %1: the element ODDITIES "};
+  for (const QStringList& arguments :
+       {QStringList{"-i"}, QStringList{"-o", "out.orw"}, QStringList{"--check"}, QStringList()}) {
+    const Outcome run = orxt(QStringList{"format", "lossy.orw"} + arguments, folder.path());
+    EXPECT_EQ(run.status, 1);
+    EXPECT_TRUE(run.out.isEmpty());
+    for (const char* const loss : losses)
+      EXPECT_TRUE(run.err.contains(QString(loss).arg("error"))) << loss << "\n" << run.err.toStdString();
+    EXPECT_EQ(run.err.count('\n'), 5) << run.err.toStdString();
+  }
+  EXPECT_EQ(readAll(file), withLosses());
+  EXPECT_FALSE(QFile::exists(folder.filePath("out.orw")));
+
+  const Outcome dropped = orxt({"format", "--drop", "-i", "lossy.orw"}, folder.path());
+  EXPECT_EQ(dropped.status, 0);
+  for (const char* const loss : losses)
+    EXPECT_TRUE(dropped.err.contains(QString(loss).arg("warning"))) << loss << "\n"
+                                                                    << dropped.err.toStdString();
+  const Outcome small = orxt({"format", "-"}, QString(), QString(), kSmall);
+  EXPECT_EQ(readAll(file), small.out.toUtf8());
+}
+
+TEST(FormatCommand, KeepsWhatStandsAroundTheDocument) {
+  QTemporaryDir folder;
+  const QByteArray canonical = orxt({"format", "-"}, QString(), QString(), kSmall).out.toUtf8();
+  ASSERT_TRUE(canonical.contains("#!   TITLE=\"Small\"\n"));
+  ASSERT_TRUE(canonical.endsWith("MACRO A b\n# kept\n#! END_HEADER\nbehind the header\n"));
+  const QByteArray latin = QByteArray(kSmall)
+                               .replace("UTF-8", "ISO-8859-1")
+                               .replace("Small",
+                                        "Gr\xf6\xdf"
+                                        "e");
+  const QByteArray latinCanonical = QByteArray(canonical)
+                                        .replace("UTF-8", "ISO-8859-1")
+                                        .replace("Small",
+                                                 "Gr\xf6\xdf"
+                                                 "e");
+  const struct {
+    const char* name;
+    QByteArray before;
+    QByteArray after;
+  } cases[] = {
+      {"line feeds", kSmall, canonical},
+      {"carriage returns", QByteArray(kSmall).replace("\n", "\r\n"),
+       QByteArray(canonical).replace("\n", "\r\n")},
+      {"lines in front", QByteArray("front\n") + kSmall, "front\n" + canonical},
+      {"byte order mark", QByteArray("\xef\xbb\xbf") + kSmall, "\xef\xbb\xbf" + canonical},
+      {"an 8-bit encoding", latin, latinCanonical},
+  };
+  for (const auto& test : cases) {
+    const QString file = folder.filePath("file.orw");
+    write(file, test.before);
+    ASSERT_TRUE(QFile::setPermissions(file, QFile::ReadOwner | QFile::WriteOwner));
+    EXPECT_EQ(orxt({"format", "-i", file}).status, 0) << test.name;
+    EXPECT_EQ(readAll(file), test.after) << test.name;
+    struct stat first {};
+    struct stat second {};
+    ASSERT_EQ(stat(file.toLocal8Bit().constData(), &first), 0);
+    EXPECT_EQ(first.st_mode & 0777, 0600u) << test.name;
+    EXPECT_EQ(orxt({"format", "--check", file}).status, 0) << test.name;
+    EXPECT_EQ(orxt({"format", "-i", file}).status, 0) << test.name;
+    ASSERT_EQ(stat(file.toLocal8Bit().constData(), &second), 0);
+    EXPECT_EQ(first.st_ino, second.st_ino) << test.name << ": a canonical file was replaced";
+  }
+}
+
+TEST(InfoCommand, DescribesADocumentAsJson) {
+  const QJsonArray entries = infoJson({"-"}, QString(), kSmall);
+  const char* const expected = R"([{
+    "file": "standard input", "form": "workspace", "documentType": "WORKSPACE", "encoding": "UTF-8",
+    "headerLines": 2, "attributes": {"TITLE": "Small", "USAGE": "none"}, "versions": [],
+    "datasets": [{"role": "READER", "keyword": "CSV_1", "format": "CSV", "dataset": "in.csv", "name": "in",
+                  "enabled": true, "line": 3}],
+    "featureTypes": [{"role": "READER", "name": "row", "node": "", "keyword": "CSV_1", "geometry": "",
+                      "attributes": 2, "enabled": false, "line": 4}],
+    "dataTypes": 0, "geometryTypes": 0, "server": {"services": [], "repositories": [], "items": []},
+    "globalParameters": [
+      {"name": "PLACE", "type": "TEXT_ENCODED", "prompt": "Where It Is", "optional": true, "password": false,
+       "standAlone": false, "server": false, "default": "an<space>der", "line": 7},
+      {"name": "SECRET", "type": "PASSWORD", "prompt": "Pass Word", "optional": false, "password": true,
+       "standAlone": false, "server": true, "default": null, "line": 8}],
+    "transformers": [
+      {"type": "SubDocumentTransformer", "subDocument": "Inner", "count": 1, "disabled": 0, "versions": [0]},
+      {"type": "ValueAssigner", "count": 3, "disabled": 1, "versions": [2, 10]}],
+    "featureLinks": {"count": 2, "disabled": 1}, "attributeLinks": 0, "constants": 0, "comments": [],
+    "bookmarks": [{"name": "Start", "description": "", "line": 19}],
+    "breakpoints": [{"name": "stop", "link": 6, "enabled": true, "line": 18}],
+    "subDocuments": [{
+      "name": "Inner", "version": 4, "attributes": {"VERSION": "4"},
+      "ports": [{"name": "IN", "kind": "input", "published": true},
+                {"name": "ROUND", "kind": "loop", "published": false}],
+      "globalParameters": [], "transformers": [], "featureLinks": {"count": 0, "disabled": 0},
+      "attributeLinks": 0, "constants": 0, "comments": [{"text": "well", "line": 22}], "bookmarks": [],
+      "breakpoints": []}]
+  }])";
+  const QJsonDocument wanted = QJsonDocument::fromJson(expected);
+  ASSERT_FALSE(wanted.isNull());
+  EXPECT_EQ(QJsonDocument(entries).toJson().toStdString(), wanted.toJson().toStdString());
+}
+
+TEST(InfoCommand, NeverPrintsPasswordsOrTerminalControls) {
+  const QByteArray evil = QByteArray(kSmall).replace("Small",
+                                                     "a\xc2\x9b"
+                                                     "31m\xe2\x80\xae b&#10;c");
+  const Outcome run = orxt({"info", "-"}, QString(), QString(), evil);
+  EXPECT_EQ(run.status, 0);
+  EXPECT_TRUE(run.out.contains("TITLE  a31m b c\n")) << run.out.toStdString();
+  EXPECT_TRUE(run.out.contains("PLACE   TEXT_ENCODED  an der    Where It Is\n")) << run.out.toStdString();
+  EXPECT_TRUE(run.out.contains("SECRET  PASSWORD      ********  Pass Word\n")) << run.out.toStdString();
+  EXPECT_FALSE(run.out.contains("hunter2"));
+}
+
+TEST(InfoCommand, ListsStoredVersionsAndSkipsWhatCannotBeRead) {
+  QTemporaryDir folder;
+  write(folder.filePath("cleaner.ort"), kVersions);
+  const QJsonObject info = infoJson({"cleaner.ort"}, folder.path()).at(0).toObject();
+  EXPECT_EQ(info.value("form").toString(), QString("versions"));
+  EXPECT_EQ(info.value("documentType").toString(), QString("TRANSFORMER"));
+  EXPECT_EQ(info.value("attributes").toObject().value("TITLE").toString(), QString("second"));
+  const QJsonArray versions = info.value("versions").toArray();
+  ASSERT_EQ(versions.size(), 2);
+  EXPECT_EQ(versions.at(0).toObject().value("version").toInt(), 2);
+  EXPECT_EQ(versions.at(1).toObject().value("version").toInt(), 1);
+  EXPECT_EQ(versions.at(1).toObject().value("guid").toString(), QString("aa-bb"));
+  EXPECT_EQ(versions.at(1).toObject().value("line").toInt(), 9);
+
+  const Outcome mixed = orxt({"info", "--json", "missing.ort", "cleaner.ort"}, folder.path());
+  EXPECT_EQ(mixed.status, 3);
+  EXPECT_EQ(QJsonDocument::fromJson(mixed.out.toUtf8()).array().size(), 1);
+}
+
+}  // namespace

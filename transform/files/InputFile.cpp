@@ -1,0 +1,74 @@
+#include <transform/files/InputFile.h>
+
+#include <QFile>
+#include <QFileInfo>
+
+#include <fcntl.h>
+#include <unistd.h>
+
+namespace {
+
+constexpr qint64 kLargestStream = qint64(1) << 30;
+constexpr int kPieceSize = 1 << 16;
+
+}  // namespace
+
+bool InputFile::isStandardInput(const QString& fileName) {
+  return fileName == QLatin1String("-");
+}
+
+QString InputFile::shownName(const QString& fileName) {
+  return isStandardInput(fileName) ? QStringLiteral("standard input") : fileName;
+}
+
+QString InputFile::path() const {
+  return m_copy ? m_copy->fileName() : m_fileName;
+}
+
+bool InputFile::open() {
+  m_copy.reset();
+  m_error.clear();
+  // A closed descriptor would be taken by the next file that is opened.
+  if (isStandardInput(m_fileName) && fcntl(STDIN_FILENO, F_GETFD) < 0)
+    return fail(QStringLiteral("it is closed"));
+  QFile file(m_fileName);
+  const bool isOpen = isStandardInput(m_fileName)
+                          ? file.open(STDIN_FILENO, QIODevice::ReadOnly | QIODevice::Unbuffered)
+                          : file.open(QIODevice::ReadOnly | QIODevice::Unbuffered);
+  if (!isOpen)
+    return fail(file.errorString());
+  if (isStandardInput(m_fileName) || !QFileInfo(m_fileName).isFile())
+    return copy(file);
+  char first;
+  return file.read(&first, 1) >= 0 || fail(file.errorString());
+}
+
+bool InputFile::copy(QFile& stream) {
+  auto copy = std::make_unique<TemporaryFile>(QStringLiteral("kx-stream-XXXXXX"));
+  if (!copy->open())
+    return fail(QStringLiteral("no temporary copy can be made: %1").arg(copy->errorString()));
+  QByteArray piece(kPieceSize, '\0');
+  qint64 total = 0;
+  for (;;) {
+    const qint64 count = stream.read(piece.data(), piece.size());
+    if (count < 0)
+      return fail(stream.errorString());
+    if (count == 0)
+      break;
+    total += count;
+    if (total > kLargestStream)
+      return fail(QStringLiteral("it gives more than %1 MiB").arg(kLargestStream >> 20));
+    if (copy->write(piece.constData(), count) != count)
+      return fail(QStringLiteral("no temporary copy can be made: %1").arg(copy->errorString()));
+  }
+  if (!copy->flush())
+    return fail(QStringLiteral("no temporary copy can be made: %1").arg(copy->errorString()));
+  copy->close();
+  m_copy = std::move(copy);
+  return true;
+}
+
+bool InputFile::fail(const QString& reason) {
+  m_error = reason;
+  return false;
+}

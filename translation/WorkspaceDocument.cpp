@@ -1,0 +1,73 @@
+#include <transform/workspace/DocumentCopy.h>
+#include <transform/workspace/VersionStore.h>
+#include <transform/workspace/WorkspaceLoaderException.h>
+#include <translation/WorkspaceDocument.h>
+
+#include <QBuffer>
+#include <QFile>
+
+WorkspaceDocument::Reading WorkspaceDocument::read(Diagnostics& diagnostics, QString& error) {
+  // Asked before the reader is, because its exceptions do not tell a missing file from a malformed one.
+  if (!m_input.open()) {
+    error = m_input.errorString();
+    return Reading::Unreadable;
+  }
+  try {
+    return readOpened(diagnostics, error);
+  } catch (const WorkspaceLoaderException& exception) {
+    QString text = exception.getMessage();
+    if (m_input.isCopy())
+      text.replace(m_input.path(), InputFile::shownName(m_fileName));
+    diagnostics.reportText(Rule::MalformedDocument, exception.line(), QString(), text);
+    return Reading::Refused;
+  }
+}
+
+WorkspaceDocument::Reading WorkspaceDocument::readOpened(Diagnostics& diagnostics, QString& error) {
+  m_form = WorkspaceFile::recognise(m_input.path());
+  if (m_form == WorkspaceFile::Form::Versioned) {
+    m_versions = VersionStore(m_input.path()).versions(error);
+    if (!error.isEmpty())
+      return Reading::Unreadable;
+  } else if (m_form != WorkspaceFile::Form::Unknown) {
+    m_file = WorkspaceFile(m_input.path());
+  }
+  const bool hasDocument = m_form == WorkspaceFile::Form::Versioned ? !m_versions.isEmpty()
+                                                                    : m_form != WorkspaceFile::Form::Unknown;
+  if (hasDocument)
+    WorkspaceFile::read(m_reader, m_input.path(), m_headerLines);
+  if (m_reader.getRootNode())
+    return Reading::Done;
+  diagnostics.report(Rule::NoDocument, 0, QString());
+  return Reading::Refused;
+}
+
+bool WorkspaceDocument::originalBytes(QByteArray& bytes, QString& error) const {
+  QFile file(m_input.path());
+  if (!file.open(QIODevice::ReadOnly)) {
+    error = file.errorString();
+    return false;
+  }
+  bytes = file.readAll();
+  error = file.errorString();
+  return file.error() == QFileDevice::NoError;
+}
+
+std::vector<WorkspaceLossReport::Loss> WorkspaceDocument::losses() const {
+  return WorkspaceLossReport(m_reader).losses();
+}
+
+bool WorkspaceDocument::canonicalBytes(QByteArray& bytes, QString& error) const {
+  return bytesWith([this](XMLComponentWriter& writer) { copyDocument(m_reader, writer); }, bytes, error);
+}
+
+bool WorkspaceDocument::bytesWith(const Fill& fill, QByteArray& bytes, QString& error) const {
+  if (m_form == WorkspaceFile::Form::Versioned) {
+    error = QStringLiteral(
+        "the file holds versions of a custom transformer, of which none is rewritten once it is stored");
+    return false;
+  }
+  QBuffer buffer(&bytes);
+  buffer.open(QIODevice::WriteOnly);
+  return m_file.write(buffer, m_reader.GetDocumentType(), fill, error);
+}
