@@ -23,6 +23,10 @@ const std::vector<DiagnosticRule>& diagnosticRules() {
       {Rule::BadPromptLine, QLatin1String("bad-prompt-line"), Severity::Error, 370796},
       {Rule::UnmetDependency, QLatin1String("unmet-dependency"), Severity::Warning, 370797},
       {Rule::Upgraded, QLatin1String("upgraded"), Severity::Hint, 370798},
+      {Rule::TakenName, QLatin1String("taken-name"), Severity::Error, 370799},
+      // The texts of these come from the custom transformer.
+      {Rule::Nesting, QLatin1String("nesting"), Severity::Error, 0},
+      {Rule::CustomTransformerFault, QLatin1String("custom-transformer-fault"), Severity::Error, 0},
   };
   return rules;
 }

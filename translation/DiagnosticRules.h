@@ -31,6 +31,9 @@ enum class Rule {
   BadPromptLine,
   UnmetDependency,
   Upgraded,
+  TakenName,
+  Nesting,
+  CustomTransformerFault,
 };
 
 struct DiagnosticRule {

@@ -1,11 +1,13 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/TextHelpers.h>
 #include <translation/FlowNames.h>
 #include <translation/FlowOrder.h>
 #include <translation/MappingFileWriter.h>
 #include <translation/ProgramVersion.h>
+#include <translation/RouteStatement.h>
 
 #include <QSet>
 
@@ -40,6 +42,14 @@ bool MappingFileWriter::prepare() {
     pushAttributes();
   }
   check();
+  return !m_diagnostics.hasErrors() && prepareDefinitions();
+}
+
+bool MappingFileWriter::prepareDefinitions() {
+  for (const ExternalDocNetwork* network : m_workspace.customTransformers()) {
+    m_definitions.emplace_back(*network);
+    m_definitions.back().prepare(m_diagnostics);
+  }
   return !m_diagnostics.hasErrors();
 }
 
@@ -65,8 +75,7 @@ bool MappingFileWriter::order() {
 
 void MappingFileWriter::nameFlows() {
   for (const AttributeLink& link : m_workspace.attributeLinks) {
-    const QString function =
-        QStringLiteral("@CopyAttribute(%1,%2)").arg(QORXWwjdEncode(link.to), QORXWwjdEncode(link.from));
+    const QString function = copyAttributeFunction(link.to, link.from);
     QStringList& functions = m_functions[at(link.source)][link.output];
     if (functions.contains(function))
       continue;
@@ -80,13 +89,20 @@ void MappingFileWriter::nameFlows() {
 
   FlowNames names;
   const int count = static_cast<int>(m_workspace.nodes.size());
-  // What a writer takes keeps the writer's own name, so those come first.
-  for (const WorkspaceNode::Kind kind : {WorkspaceNode::Kind::Writer, WorkspaceNode::Kind::Reader}) {
+  const auto claimTypes = [&](WorkspaceNode::Kind kind) {
     for (int node = 0; node < count; ++node) {
       if (m_workspace.nodes[at(node)].kind == kind)
         m_flows[at(node)].insert(QString(), names.claim(m_workspace.nodes[at(node)].name));
     }
+  };
+  // What a writer takes keeps the writer's own name, and the inner names of custom transformers are fixed, so
+  // those come first.
+  claimTypes(WorkspaceNode::Kind::Writer);
+  for (int node = 0; node < count; ++node) {
+    if (isCustom(node))
+      reserveInnerNames(m_workspace.nodes[at(node)], names);
   }
+  claimTypes(WorkspaceNode::Kind::Reader);
   for (int node = 0; node < count; ++node) {
     const WorkspaceNode& place = m_workspace.nodes[at(node)];
     if (place.kind == WorkspaceNode::Kind::Reader && m_functions[at(node)].contains(QString())) {
@@ -94,11 +110,29 @@ void MappingFileWriter::nameFlows() {
     } else if (place.isTransformer()) {
       QStringList tags;
       place.cfg->getOutputTags(tags);
+      // The plain names of a custom transformer's ports are those that its inside uses.
+      const QString end = isCustom(node) ? QStringLiteral("_OUT") : QString();
       for (const QString& tag : tags) {
         if (connected[at(node)].contains(tag))
-          m_flows[at(node)].insert(tag, names.claim(place.name + QLatin1Char('_') + tag));
+          m_flows[at(node)].insert(tag, names.claim(place.name + QLatin1Char('_') + tag + end));
       }
     }
+  }
+}
+
+bool MappingFileWriter::isCustom(int node) const {
+  return dynamic_cast<const CompoundTransformerCfg*>(m_workspace.nodes[at(node)].cfg.get()) != nullptr;
+}
+
+void MappingFileWriter::reserveInnerNames(const WorkspaceNode& node, FlowNames& names) {
+  QStringList inputs;
+  QStringList outputs;
+  node.cfg->getInputTags(inputs);
+  node.cfg->getOutputTags(outputs);
+  for (const QString& tag : inputs + outputs) {
+    const QString wanted = node.name + QLatin1Char('_') + tag;
+    if (names.claim(wanted) != wanted)
+      m_diagnostics.report(Rule::TakenName, node.line, node.name, {wanted});
   }
 }
 
@@ -190,7 +224,11 @@ void MappingFileWriter::check() {
     checkText(node.name, node.name, node.line, node.name);
     if (!node.isTransformer())
       continue;
-    const QHash<QString, QString> faults = node.cfg->findUnwritableValues();
+    const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(node.cfg.get());
+    const QHash<QString, QString> faults =
+        custom ? custom->findUnwritableParameters() : node.cfg->findUnwritableValues();
+    if (custom && !custom->instantiationFault().isEmpty())
+      m_diagnostics.reportText(Rule::Nesting, node.line, node.name, custom->instantiationFault());
     for (const QString& parameter : node.cfg->getParameters()) {
       const auto fault = faults.constFind(parameter);
       if (fault != faults.constEnd())
@@ -208,6 +246,8 @@ void MappingFileWriter::write(MFBuffer& buffer) {
   }
   writeParameters(buffer);
   writeFeatureTypes(buffer);
+  for (const CustomDefinition& definition : m_definitions)
+    definition.write(buffer);
   for (const int node : m_order)
     m_workspace.nodes[at(node)].cfg->instantiate(buffer, m_workspace.fileName);
   writeWriterRoutes(buffer);
@@ -239,15 +279,8 @@ void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer) const {
                       (isReader ? type + QLatin1Char(' ') + shownFlow : shownFlow + QLatin1Char(' ') + type));
     }
     if (!m_copiedFlows[node].isEmpty()) {
-      buffer.add(QStringLiteral("FACTORY_DEF * TeeFactory"));
-      buffer.add(QLatin1String("  FACTORY_NAME ") +
-                 quotifyStringForMF(place.keyword + QLatin1Char(' ') + place.name +
-                                    QLatin1String(" Attribute Copier")));
-      buffer.add(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(flow));
-      buffer.add(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(m_copiedFlows[node]));
-      for (const QString& function : m_functions[node].value(QString()))
-        buffer.add(QLatin1String("    ") + function);
-      buffer.flush();
+      writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + QLatin1String(" Attribute Copier"),
+                 {flow}, m_copiedFlows[node], m_functions[node].value(QString()));
     }
   }
 }
@@ -257,20 +290,12 @@ void MappingFileWriter::writeWriterRoutes(MFBuffer& buffer) const {
     const WorkspaceNode& place = m_workspace.nodes[node];
     if (place.kind != WorkspaceNode::Kind::Writer || m_incoming[node].empty())
       continue;
-    buffer.add(QStringLiteral("FACTORY_DEF * TeeFactory"));
-    buffer.add(QLatin1String("  FACTORY_NAME ") +
-               quotifyStringForMF(place.keyword + QLatin1Char(' ') + place.name +
-                                  QLatin1String(" Output Renamer/Nuker")));
-    QSet<QString> named;
+    QStringList flows;
     for (const int number : m_incoming[node]) {
       const WorkspaceLink& link = m_workspace.links[at(number)];
-      const QString& flow = flowOf(link.source, link.output);
-      if (named.contains(flow))
-        continue;
-      named.insert(flow);
-      buffer.add(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(flow));
+      flows.append(flowOf(link.source, link.output));
     }
-    buffer.add(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(m_flows[node].value(QString())));
-    buffer.flush();
+    writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + QLatin1String(" Output Renamer/Nuker"),
+               flows, m_flows[node].value(QString()), {});
   }
 }

@@ -15,6 +15,8 @@
 #include <memory>
 #include <vector>
 
+class ExternalDocNetwork;
+class SubDocumentLibrary;
 class TransformerCfg;
 
 struct WorkspaceNode {
@@ -67,6 +69,10 @@ class ORX_EXPORT Workspace {
   int firstHeaderLine = 0;
   GlobalParameters parameters;
   WorkspaceListener listener{parameters};
+  // The custom transformers that the document embeds; outlives the nodes that are their instances.
+  std::unique_ptr<SubDocumentLibrary> library;
+  // Those in use, each behind the ones that stand inside it.
+  const std::vector<ExternalDocNetwork*>& customTransformers() const;
   std::vector<WorkspaceNode> nodes;
   std::vector<WorkspaceLink> links;
   std::vector<AttributeLink> attributeLinks;

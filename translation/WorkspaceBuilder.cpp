@@ -2,12 +2,25 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerSource.h>
+#include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/SubDocumentLibrary.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <translation/InstanceIdentity.h>
 #include <translation/WorkspaceBuilder.h>
 
 namespace {
+
+// The parameter of an instance that names its custom transformer.
+const QLatin1String kSubDocumentName("SUB_DOC_NAME");
+
+QString subDocumentName(const TransformerStruct& record) {
+  for (const XformParmStruct& parameter : record.parameters) {
+    if (parameter.parmName == kSubDocumentName)
+      return parameter.parmValue;
+  }
+  return QString();
+}
 
 QString nodeTitle(const TransformerStruct& record) {
   return record.name.isEmpty() ? record.type + QLatin1Char('_') + QString::number(record.identifier)
@@ -37,6 +50,7 @@ std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& re
   m_places.clear();
   m_linesByName.clear();
 
+  m_workspace->library = std::make_unique<SubDocumentLibrary>(reader, &m_source);
   const QString mainDocument;
   addGlobalParameters(reader);
   for (const FeatureTypeStruct& record : reader.GetFeatureTypeList())
@@ -47,6 +61,8 @@ std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& re
     addLink(record);
   for (const LinkStruct& record : reader.GetAttributeLinkList(mainDocument))
     addAttributeLink(record);
+  reportCustomTransformers();
+  m_workspace->library->forgetReader();
   return std::move(m_workspace);
 }
 
@@ -114,23 +130,46 @@ void WorkspaceBuilder::addTransformer(const TransformerStruct& record) {
 
 std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const TransformerStruct& record,
                                                                   const QString& nodeName) {
+  QString type = record.type;
   if (record.kind == TransformerKind::SubDocument) {
-    m_diagnostics.report(Rule::CustomTransformer, record.line, nodeName);
-    return nullptr;
+    type = subDocumentName(record);
+    if (type.isEmpty()) {
+      m_diagnostics.report(Rule::CustomTransformer, record.line, nodeName);
+      return nullptr;
+    }
   }
-  std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(record.type, record.version);
+  TransformerSource& source = *m_workspace->library;
+  std::unique_ptr<TransformerCfg> cfg = source.makeTransformer(type, record.version);
   if (cfg)
     return cfg;
+  const QString refusal = source.refusalReason();
+  if (!refusal.isEmpty()) {
+    m_diagnostics.reportText(Rule::Nesting, record.line, nodeName, refusal);
+    return nullptr;
+  }
   const std::unique_ptr<TransformerCfg> newest =
-      m_source.makeTransformer(record.type, TransformerSource::kNewestVersion);
+      source.makeTransformer(type, TransformerSource::kNewestVersion);
   if (newest) {
-    m_diagnostics.report(
-        Rule::UnknownVersion, record.line, nodeName,
-        {record.type, QString::number(record.version), QString::number(newest->getVersion())});
+    m_diagnostics.report(Rule::UnknownVersion, record.line, nodeName,
+                         {type, QString::number(record.version), QString::number(newest->getVersion())});
   } else {
-    m_diagnostics.report(Rule::UnknownTransformer, record.line, nodeName, {record.type});
+    m_diagnostics.report(Rule::UnknownTransformer, record.line, nodeName, {type});
   }
   return nullptr;
+}
+
+void WorkspaceBuilder::reportCustomTransformers() {
+  for (const ExternalDocNetwork* network : m_workspace->customTransformers()) {
+    for (const NetworkProblem& problem : network->problems()) {
+      const Rule rule = problem.kind == NetworkProblem::Kind::Upgraded ? Rule::Upgraded
+                        : problem.kind == NetworkProblem::Kind::UnmetDependency
+                            ? Rule::UnmetDependency
+                            : Rule::CustomTransformerFault;
+      const QString node =
+          problem.node.isEmpty() ? network->getName() : network->getName() + QLatin1Char('/') + problem.node;
+      m_diagnostics.reportText(rule, problem.line, node, problem.text);
+    }
+  }
 }
 
 void WorkspaceBuilder::applyRecord(const TransformerStruct& record, WorkspaceNode& node) {
@@ -141,6 +180,8 @@ void WorkspaceBuilder::applyRecord(const TransformerStruct& record, WorkspaceNod
   cfg.setBaseGuid(instanceStem(QStringList(), record.identifier, node.name));
   cfg.setParameterDirectory(&m_workspace->parameters);
   for (const XformParmStruct& parameter : record.parameters) {
+    if (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentName)
+      continue;
     if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
       m_diagnostics.report(Rule::UnknownParameter, parameter.line, node.name,
                            {cfg.getName(), parameter.parmName});

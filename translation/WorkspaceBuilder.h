@@ -37,6 +37,7 @@ class ORX_EXPORT WorkspaceBuilder {
   void addFeatureType(const FeatureTypeStruct& record);
   void addTransformer(const TransformerStruct& record);
   std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& nodeName);
+  void reportCustomTransformers();
   void applyRecord(const TransformerStruct& record, WorkspaceNode& node);
   bool placeNode(int identifier, int line, const QString& name, int node);
   // False when the link cannot be placed; `source` and `target` are -1 when it leads to a node that is left

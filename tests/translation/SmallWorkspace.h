@@ -50,12 +50,35 @@ class SmallWorkspace {
     return *this;
   }
 
+  // Everything added behind this stands in a sub-document of that name; `settings` are further attributes.
+  SmallWorkspace& beginCustom(const QString& name, const QStringList& settings = {}) {
+    m_main = QStringList{m_parameters, m_transformers, m_links, m_attributeLinks};
+    m_parameters = m_transformers = m_links = m_attributeLinks = m_ports = QString();
+    m_customName = name;
+    m_customSettings = settings;
+    return *this;
+  }
+  // `kind` is "true" for an input, "false" for an output, "loop" for a loop point.
+  SmallWorkspace& port(int id, const QString& name, const QString& kind) {
+    m_ports +=
+        element("SUBDOCUMENT_IO", {"IDENTIFIER", QString::number(id), "NAME", name, "IS_SOURCE", kind});
+    return *this;
+  }
+  SmallWorkspace& endCustom() {
+    m_subDocuments +=
+        element("SUBDOCUMENT", QStringList{"NAME", m_customName} + m_customSettings, sections());
+    m_parameters = m_main.at(0);
+    m_transformers = m_main.at(1);
+    m_links = m_main.at(2);
+    m_attributeLinks = m_main.at(3);
+    m_ports = QString();
+    return *this;
+  }
+
   QString text() const {
     const QString xml = "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n<WORKSPACE>\n<FEATURE_TYPES>\n" +
-                        m_featureTypes + "</FEATURE_TYPES>\n<GLOBAL_PARAMETERS>\n" + m_parameters +
-                        "</GLOBAL_PARAMETERS>\n<TRANSFORMERS>\n" + m_transformers +
-                        "</TRANSFORMERS>\n<FEAT_LINKS>\n" + m_links + "</FEAT_LINKS>\n<ATTR_LINKS>\n" +
-                        m_attributeLinks + "</ATTR_LINKS>\n</WORKSPACE>\n";
+                        m_featureTypes + "</FEATURE_TYPES>\n" + sections() + "<SUBDOCUMENTS>\n" +
+                        m_subDocuments + "</SUBDOCUMENTS>\n</WORKSPACE>\n";
     QString result;
     for (const QString& line : xml.split('\n', Qt::SkipEmptyParts))
       result += "#! " + line + "\n";
@@ -78,6 +101,12 @@ class SmallWorkspace {
           " " + attributes.at(i) + "=\"" + attributes.at(i + 1).toHtmlEscaped().replace("\n", "&#10;") + "\"";
     return inner.isEmpty() ? result + "/>\n" : result + ">\n" + inner + "</" + name + ">\n";
   }
+  QString sections() const {
+    return "<GLOBAL_PARAMETERS>\n" + m_parameters + "</GLOBAL_PARAMETERS>\n<TRANSFORMERS>\n" +
+           m_transformers + "</TRANSFORMERS>\n<SUBDOCUMENT_IOS>\n" + m_ports +
+           "</SUBDOCUMENT_IOS>\n<FEAT_LINKS>\n" + m_links + "</FEAT_LINKS>\n<ATTR_LINKS>\n" +
+           m_attributeLinks + "</ATTR_LINKS>\n";
+  }
   SmallWorkspace& featureType(int id, const QString& name, const QString& isSource,
                               const QStringList& attributes) {
     QString inner;
@@ -96,6 +125,11 @@ class SmallWorkspace {
   QString m_transformers;
   QString m_links;
   QString m_attributeLinks;
+  QString m_ports;
+  QString m_subDocuments;
+  QString m_customName;
+  QStringList m_customSettings;
+  QStringList m_main;
   int m_linkCount = 0;
 };
 

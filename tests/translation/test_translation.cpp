@@ -41,7 +41,7 @@ Outcome translate(const SmallWorkspace& workspace, const QHash<QString, QString>
   outcome.diagnostics = describe(diagnostics);
   // Continuation lines joined and padding dropped: what is compared is the statements.
   outcome.text = readAll(output)
-                     .replace(QRegularExpression(" +\\\\\n"), " ")
+                     .replace(QRegularExpression(" +\\\\\n(# )?"), " ")
                      .replace(QRegularExpression(" +"), " ")
                      .replace("\n\n", "\n");
   return outcome;
@@ -183,6 +183,124 @@ TEST(Translation, RunTimeLookupsComeBeforeTheStatementThatUsesThem) {
   EXPECT_GT(text.indexOf("PickFactory"), lookup);
 }
 
+// A custom transformer with a parameter, an inner "Copy" and an output fed by two inner ports.
+SmallWorkspace withCustom(const std::function<void(SmallWorkspace&)>& change = {}) {
+  SmallWorkspace workspace;
+  workspace.reader(1, "Parcels", {"id"}).writer(2, "Flooded");
+  workspace.transformer(3, "SubDocumentTransformer",
+                        {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", "First", "LIMIT", "7"});
+  workspace.link(1, "fo 0", 3, "fi 0 IN").link(3, "fo 0 OUT", 2, "fi 0");
+  workspace.beginCustom("Cleaner", {"CATEGORY", "Mine"}).port(1, "IN", "true").port(2, "OUT", "false");
+  workspace.parameter("GUI TEXT LIMIT Limit", "5");
+  workspace.transformer(3, "Copy", {"XFORMER_NAME", "C", "VALUE", "$(LIMIT)"});
+  workspace.link(1, "fo 0", 3, "fi 0 INPUT")
+      .link(3, "fo 0 OUTPUT", 2, "fi 0")
+      .link(3, "fo 1 REST", 2, "fi 0");
+  if (change)
+    change(workspace);
+  workspace.endCustom();
+  return workspace;
+}
+
+TEST(Translation, AnEmbeddedCustomTransformerIsDefinedOnceAndIncludedByEachInstance) {
+  SmallWorkspace workspace = withCustom();
+  workspace.transformer(4, "SubDocumentTransformer", {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", "Second"});
+  workspace.link(1, "fo 0", 4, "fi 0 IN");
+  const Outcome outcome = translate(workspace);
+  EXPECT_EQ(outcome.diagnostics, QStringList());
+  EXPECT_EQ(outcome.text.count("# TRANSFORMER_BEGIN Cleaner,1,Mine,"), 1) << outcome.text.toStdString();
+  EXPECT_EQ(outcome.text.count("# TRANSFORMER_END\n"), 1);
+  EXPECT_EQ(outcome.text.count("INCLUDE_CUSTOM_TRANSFORMER_VER Cleaner:1\n"), 2);
+  for (const char* statement :
+       {"# FACTORY_DEF * CopyFactory FACTORY_NAME $(Cleaner_WORKSPACE_NAME)_C INPUT INPUT FEATURE_TYPE "
+        "\"$(Cleaner_WORKSPACE_NAME)_IN\" ",
+        "P $($(Cleaner_WORKSPACE_NAME)_LIMIT)\n",
+        "OUTPUT FEATURE_TYPE \"$(Cleaner_WORKSPACE_NAME)_C_OUTPUT\" ",
+        "INPUT FEATURE_TYPE \"$(Cleaner_WORKSPACE_NAME)_C_REST\" ",
+        "OUTPUT FEATURE_TYPE \"$(Cleaner_WORKSPACE_NAME)_OUT\"\n", "MACRO Cleaner_WORKSPACE_NAME First\n",
+        "MACRO $(Cleaner_WORKSPACE_NAME)_LIMIT 7\n", "MACRO Cleaner_WORKSPACE_NAME Second\n",
+        "MACRO $(Cleaner_WORKSPACE_NAME)_LIMIT 5\n",
+        "INPUT FEATURE_TYPE Parcels OUTPUT FEATURE_TYPE First_IN\n",
+        "INPUT FEATURE_TYPE First_OUT OUTPUT FEATURE_TYPE First_OUT_OUT\n",
+        "INPUT FEATURE_TYPE First_OUT_OUT OUTPUT FEATURE_TYPE Flooded\n"})
+    EXPECT_TRUE(outcome.text.contains(statement)) << statement << "\n" << outcome.text.toStdString();
+  EXPECT_LT(outcome.text.indexOf("# TRANSFORMER_END"), outcome.text.indexOf("MACRO Cleaner_WORKSPACE_NAME"));
+}
+
+TEST(Translation, NestedCustomTransformersAreDefinedInnermostFirst) {
+  SmallWorkspace workspace = withCustom([](SmallWorkspace& inner) {
+    inner.transformer(5, "SubDocumentTransformer", {"SUB_DOC_NAME", "Inside", "XFORMER_NAME", "I"});
+    inner.link(1, "fo 0", 5, "fi 0 A").link(5, "fo 0 B", 2, "fi 0");
+  });
+  workspace.beginCustom("Inside")
+      .port(1, "A", "true")
+      .port(2, "B", "false")
+      .link(1, "fo 0", 2, "fi 0")
+      .endCustom();
+  const Outcome outcome = translate(workspace);
+  EXPECT_EQ(outcome.diagnostics, QStringList());
+  const int inside = outcome.text.indexOf("# TRANSFORMER_BEGIN Inside,1,");
+  EXPECT_GT(inside, 0);
+  EXPECT_GT(outcome.text.indexOf("# TRANSFORMER_BEGIN Cleaner,1,"), inside);
+  for (const char* statement : {"# MACRO Inside_WORKSPACE_NAME $(Cleaner_WORKSPACE_NAME)_I\n",
+                                "# INCLUDE_CUSTOM_TRANSFORMER_VER Inside:1\n",
+                                "OUTPUT FEATURE_TYPE \"$(Cleaner_WORKSPACE_NAME)_I_B_OUT\"\n"})
+    EXPECT_TRUE(outcome.text.contains(statement)) << statement << "\n" << outcome.text.toStdString();
+}
+
+TEST(Translation, ALoopingCustomTransformerIsWrittenAsALoop) {
+  SmallWorkspace workspace;
+  workspace.reader(1, "Parcels")
+      .transformer(3, "SubDocumentTransformer",
+                   {"SUB_DOC_NAME", "Looper", "XFORMER_NAME", "L", "MAX_LOOP_ITERATIONS", "4"});
+  workspace.link(1, "fo 0", 3, "fi 0 IN");
+  workspace.beginCustom("Looper", {"BLOCKED_LOOPING", "yes"});
+  workspace.port(1, "IN", "true").port(2, "OUT", "false").port(4, "AGAIN", "loop");
+  workspace.transformer(3, "Copy", {"XFORMER_NAME", "C"});
+  workspace.link(1, "fo 0", 3, "fi 0 INPUT")
+      .link(4, "fo 0", 3, "fi 0 INPUT")
+      .link(3, "fo 0 OUTPUT", 2, "fi 0");
+  workspace.link(3, "fo 1 REST", 4, "fi 0").endCustom();
+  const Outcome outcome = translate(workspace);
+  EXPECT_EQ(outcome.diagnostics, QStringList());
+  for (const char* statement :
+       {"FACTORY_DEF * TransformFact:1:Looper FACTORY_NAME L ", "LOOPBACK_INPUT_TAG:AGAIN ",
+        "LOOPBACK_OUTPUT_TAG:INCOMPLETE ", "MAX_LOOP_ITERATIONS:4 ",
+        "INPUT INPUT FEATURE_TYPE \"$(Looper_WORKSPACE_NAME)_AGAIN\" ",
+        "INPUT FEATURE_TYPE \"$(Looper_WORKSPACE_NAME)_C_REST\" OUTPUT FEATURE_TYPE "
+        "\"$(Looper_WORKSPACE_NAME)_INCOMPLETE\"\n"})
+    EXPECT_TRUE(outcome.text.contains(statement)) << statement << "\n" << outcome.text.toStdString();
+}
+
+TEST(Translation, RefusesFaultyCustomTransformers) {
+  const struct {
+    SmallWorkspace workspace;
+    QStringList diagnostics;
+  } cases[] = {
+      {withCustom([](auto& w) {
+         w.transformer(9, "Nothing", {"XFORMER_NAME", "N"});
+       }),
+       {"custom-transformer-fault Cleaner/N"}},
+      {withCustom([](auto& w) { w.link(1, "fo 0", 77, "fi 0"); }), {"custom-transformer-fault Cleaner"}},
+      {withCustom([](auto& w) {
+         w.transformer(9, "SubDocumentTransformer", {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", "N"});
+       }),
+       {"custom-transformer-fault Cleaner/N"}},
+      {withCustom([](auto& w) { w.link(3, "fo 0 OUTPUT", 3, "fi 0 INPUT"); }), {"cycle Cleaner"}},
+      {withCustom([](auto& w) {
+         w.transformer(9, "Copy", {"XFORMER_NAME", "N", "VALUE", "$[x"});
+       }),
+       {"unwritable-value Cleaner/N"}},
+      {withCustom([](auto& w) { w.port(9, "IN", "false"); }), {"custom-transformer-fault Cleaner/IN"}},
+  };
+  for (const auto& test : cases) {
+    const Outcome outcome = translate(test.workspace);
+    EXPECT_EQ(outcome.diagnostics.mid(0, 1), test.diagnostics);
+    EXPECT_EQ(outcome.result, TranslationResult::Refused);
+    EXPECT_EQ(outcome.text, QString());
+  }
+}
+
 TEST(Translation, RefusesWhatItCannotTranslate) {
   const auto with = [](const std::function<void(SmallWorkspace&)>& change) {
     SmallWorkspace workspace = copyBetween();
@@ -258,7 +376,7 @@ TEST(Translation, EveryRuleHasItsTextInEveryLanguage) {
     for (const char* language : {"en", "de", "fr"}) {
       QORXSetLanguage(language);
       Diagnostics diagnostics("f");
-      diagnostics.report(rule.rule, 1, "n", {"one", "two", "three"});
+      diagnostics.report(rule.rule, 1, "n");
       texts << diagnostics.all().front().text;
     }
     QORXSetLanguage("en");

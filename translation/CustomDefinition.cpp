@@ -1,0 +1,218 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerCfg.h>
+#include <transform/custom/CustomTransformerHeader.h>
+#include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/SubDocNetworkObjInput.h>
+#include <transform/custom/SubDocNetworkObjLoop.h>
+#include <transform/custom/SubDocNetworkObjOutput.h>
+#include <transform/custom/SubDocNetworkObjXformer.h>
+#include <transform/text/TextHelpers.h>
+#include <translation/CustomDefinition.h>
+#include <translation/FlowOrder.h>
+#include <translation/InstanceIdentity.h>
+#include <translation/MFDeviceBuffer.h>
+#include <translation/MacroReferences.h>
+#include <translation/RouteStatement.h>
+
+#include <QBuffer>
+
+// Inside a definition the published parameters are macros whose values only the instance knows.
+class CustomDefinition::Listener : public TransformerCfgListener {
+ public:
+  explicit Listener(const QString& prefixReference)
+      : m_start(QLatin1String("$(") + prefixReference + QLatin1Char('_')) {}
+
+  QString unpackValue(const TransformerCfg&, const QString& value, bool isEncoded,
+                      UnpackLevel level) const override {
+    return level == UnpackLevel::Decoded && isEncoded ? QORXWwjdDecode(value) : value;
+  }
+  bool isRunTimeValue(const TransformerCfg&, const QString& value) const override {
+    return value.contains(m_start);
+  }
+  bool isDeferredValue(const TransformerCfg& cfg, const QString& value) const override {
+    MacroReferences references(value);
+    while (references.next()) {
+      if (cfg.getParameterByMacroName(references.name()))
+        return true;
+    }
+    return false;
+  }
+  bool acceptsValue(const TransformerCfg& cfg, const QString&, const QString& value) const override {
+    return isRunTimeValue(cfg, value);
+  }
+
+ private:
+  const QString m_start;
+};
+
+CustomDefinition::CustomDefinition(const ExternalDocNetwork& network)
+    : m_network(network),
+      m_prefix(makePrefixMacro(network.getName())),
+      m_reference(QLatin1String("$(") + m_prefix + QLatin1Char(')')),
+      m_listener(std::make_unique<Listener>(m_reference)) {}
+
+CustomDefinition::~CustomDefinition() = default;
+
+QString CustomDefinition::innerName(const QString& name) const {
+  return m_reference + QLatin1Char('_') + name;
+}
+
+QString CustomDefinition::redirect(const QString& value) const {
+  MacroReferences references(value);
+  QString result;
+  int copied = 0;
+  while (references.next()) {
+    if (!m_network.hasParameter(references.name()))
+      continue;
+    result += value.midRef(copied, references.start() - copied);
+    result += QLatin1String("$(") + innerName(references.name()) + QLatin1Char(')');
+    copied = references.end();
+  }
+  return copied == 0 ? value : result + value.midRef(copied);
+}
+
+bool CustomDefinition::prepare(Diagnostics& diagnostics) {
+  if (!order(diagnostics))
+    return false;
+  for (const SubDocNetworkObjXformer* node : m_order)
+    makePart(*node);
+  for (Part& part : m_parts) {
+    connect(part);
+    check(part, diagnostics);
+  }
+  if (diagnostics.hasErrors())
+    return false;
+
+  QStringList fields = {m_network.getName(), QString::number(m_network.getVersion()), m_network.getCategory(),
+                        m_network.getGUID()};
+  m_block = QORXToLocal8Bit(CustomTransformerHeader::openingLine(fields)) + '\n';
+  for (const QByteArray& line : body().split('\n')) {
+    if (!line.isEmpty())
+      m_block += "# " + line + '\n';
+    else
+      m_block += "#\n";
+  }
+  m_block += "# TRANSFORMER_END\n\n";
+  return true;
+}
+
+void CustomDefinition::write(MFBuffer& buffer) const {
+  buffer.write(m_block);
+}
+
+bool CustomDefinition::order(Diagnostics& diagnostics) {
+  std::vector<const SubDocNetworkObjXformer*> nodes;
+  QHash<const SubDocNetworkObj*, int> places;
+  for (const SubDocNetworkObj* node : m_network.nodes()) {
+    if (const auto* transformer = dynamic_cast<const SubDocNetworkObjXformer*>(node)) {
+      places.insert(node, static_cast<int>(nodes.size()));
+      nodes.push_back(transformer);
+    }
+  }
+  std::vector<std::pair<int, int>> edges;
+  for (const SubDocNetworkObjXformer* node : nodes) {
+    for (const auto& [port, links] : node->feeders()) {
+      for (const SubDocNetworkObj::Link& link : links) {
+        if (places.contains(link.node))
+          edges.emplace_back(places.value(link.node), places.value(node));
+      }
+    }
+  }
+  const FlowOrder flow = flowOrder(static_cast<int>(nodes.size()), edges);
+  for (const std::vector<int>& cycle : flow.cycles) {
+    QStringList names;
+    for (const int member : cycle)
+      names.append(nodes[static_cast<std::size_t>(member)]->name());
+    diagnostics.report(Rule::Cycle, 0, m_network.getName(), {names.join(QLatin1String(", "))});
+  }
+  for (const int node : flow.order)
+    m_order.push_back(nodes[static_cast<std::size_t>(node)]);
+  return flow.cycles.empty();
+}
+
+void CustomDefinition::makePart(const SubDocNetworkObjXformer& node) {
+  Part part;
+  part.node = &node;
+  part.cfg.reset(node.getTransformer()->getCopy());
+  part.name = innerName(node.name());
+  for (const QString& parameter : part.cfg->getParameters()) {
+    const QString value = part.cfg->getParameterValue(parameter);
+    const QString redirected = redirect(value);
+    if (redirected != value)
+      part.cfg->setParameterValue(parameter, redirected, false);
+  }
+  part.cfg->setIdentifier(part.name);
+  part.cfg->setBaseGuid(instanceStem({m_network.getName()}, node.number(), node.name()));
+  part.cfg->setListener(m_listener.get());
+  m_parts.push_back(std::move(part));
+}
+
+QString CustomDefinition::flowFrom(const SubDocNetworkObj& node, const QString& port) const {
+  const auto* transformer = dynamic_cast<const SubDocNetworkObjXformer*>(&node);
+  // What enters by an input, and what a loop point sends back, arrives under the port's inner name.
+  if (!transformer)
+    return innerName(node.name());
+  const QString flow = innerName(node.name()) + QLatin1Char('_') + port;
+  const bool isCustom = dynamic_cast<const CompoundTransformerCfg*>(transformer->getTransformer()) != nullptr;
+  return isCustom ? flow + QLatin1String("_OUT") : flow;
+}
+
+void CustomDefinition::connect(Part& part) const {
+  for (const auto& [port, links] : part.node->feeders()) {
+    for (const SubDocNetworkObj::Link& link : links)
+      part.cfg->addInputFeatureType(port, flowFrom(*link.node, link.port));
+  }
+  for (const auto& [port, links] : part.node->consumers()) {
+    if (!links.empty())
+      part.cfg->setOutputFeatureType(port, flowFrom(*part.node, port));
+  }
+  for (const auto& [port, copies] : part.node->attributeCopies()) {
+    QStringList functions;
+    for (const SubDocNetworkObj::AttributeCopy& copy : copies)
+      functions.append(copyAttributeFunction(copy.to, copy.from));
+    part.cfg->setOutputTagFuncs(port, functions);
+  }
+}
+
+void CustomDefinition::check(const Part& part, Diagnostics& diagnostics) const {
+  const QString title = m_network.getName() + QLatin1Char('/') + part.node->name();
+  const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(part.cfg.get());
+  const QHash<QString, QString> faults =
+      custom ? custom->findUnwritableParameters() : part.cfg->findUnwritableValues();
+  for (const QString& parameter : part.cfg->getParameters()) {
+    const auto fault = faults.constFind(parameter);
+    if (fault != faults.constEnd())
+      diagnostics.report(Rule::UnwritableValue, 0, title, {parameter, fault.value()});
+  }
+}
+
+QByteArray CustomDefinition::body() {
+  QByteArray text;
+  QBuffer device(&text);
+  device.open(QIODevice::WriteOnly);
+  {
+    MFDeviceBuffer buffer(device);
+    for (Part& part : m_parts)
+      part.cfg->instantiate(buffer, m_network.getName());
+    // What reaches an output leaves under the port's inner name; what reaches a loop point leaves by the
+    // loop's output.
+    for (const SubDocNetworkObj* node : m_network.nodes()) {
+      const bool isOutput = dynamic_cast<const SubDocNetworkObjOutput*>(node) != nullptr;
+      if (!isOutput && !dynamic_cast<const SubDocNetworkObjLoop*>(node))
+        continue;
+      QStringList flows;
+      for (const auto& [port, links] : node->feeders()) {
+        for (const SubDocNetworkObj::Link& link : links)
+          flows.append(flowFrom(*link.node, link.port));
+      }
+      if (flows.isEmpty())
+        continue;
+      const QString port = isOutput ? node->name() : m_network.getLoopOutput();
+      writeRoute(buffer, innerName(node->name()) + QLatin1String(" Collector"), flows, innerName(port), {});
+    }
+  }
+  while (text.endsWith('\n'))
+    text.chop(1);
+  return text;
+}

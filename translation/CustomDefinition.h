@@ -1,0 +1,64 @@
+// The definition of one embedded custom transformer: the mapping-file text of its inside, as a block of
+// comments that every instance includes.
+//
+// The text serves all instances: every name of a transformer and of a feature type begins with the prefix
+// macro, and published parameters are read as "$($(PREFIX)_NAME)".
+#pragma once
+
+#include <platform/Export.h>
+#include <transform/core/TransformerCfgListener.h>
+#include <translation/Diagnostics.h>
+
+#include <QByteArray>
+#include <QHash>
+#include <QString>
+#include <QStringList>
+
+#include <memory>
+#include <vector>
+
+class ExternalDocNetwork;
+class MFBuffer;
+class SubDocNetworkObj;
+class SubDocNetworkObjXformer;
+class TransformerCfg;
+
+class ORX_EXPORT CustomDefinition {
+ public:
+  // `network` is not owned and is not changed: what is written are copies of its transformers.
+  explicit CustomDefinition(const ExternalDocNetwork& network);
+  ~CustomDefinition();
+
+  // Orders and connects the copies, checks what will be written, makes the text. False when anything was
+  // reported as an error.
+  bool prepare(Diagnostics& diagnostics);
+  // The block; call after prepare() answered true.
+  void write(MFBuffer& buffer) const;
+
+ private:
+  class Listener;
+
+  struct Part {
+    const SubDocNetworkObjXformer* node = nullptr;
+    std::unique_ptr<TransformerCfg> cfg;
+    QString name;  // with the prefix macro
+  };
+
+  bool order(Diagnostics& diagnostics);
+  void makePart(const SubDocNetworkObjXformer& node);
+  void connect(Part& part) const;
+  void check(const Part& part, Diagnostics& diagnostics) const;
+  QString innerName(const QString& name) const;
+  // The flow that a link's end brings, or takes, at that node and port.
+  QString flowFrom(const SubDocNetworkObj& node, const QString& port) const;
+  QByteArray body();
+  QString redirect(const QString& value) const;
+
+  const ExternalDocNetwork& m_network;
+  const QString m_prefix;     // the prefix macro's name
+  const QString m_reference;  // "$(PREFIX)"
+  std::unique_ptr<Listener> m_listener;
+  std::vector<const SubDocNetworkObjXformer*> m_order;
+  std::vector<Part> m_parts;
+  QByteArray m_block;
+};

@@ -1,0 +1,27 @@
+#include <platform/qorxcore/qorxcore.h>
+#include <transform/text/MFBuffer.h>
+#include <transform/text/TextHelpers.h>
+#include <translation/RouteStatement.h>
+
+#include <QSet>
+
+void writeRoute(MFBuffer& buffer, const QString& factoryName, const QStringList& from, const QString& to,
+                const QStringList& functions) {
+  buffer.add(QStringLiteral("FACTORY_DEF * TeeFactory"));
+  buffer.add(QLatin1String("  FACTORY_NAME ") + quotifyStringForMF(factoryName));
+  QSet<QString> named;
+  for (const QString& flow : from) {
+    if (named.contains(flow))
+      continue;
+    named.insert(flow);
+    buffer.add(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(flow));
+  }
+  buffer.add(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(to));
+  for (const QString& function : functions)
+    buffer.add(QLatin1String("    ") + function);
+  buffer.flush();
+}
+
+QString copyAttributeFunction(const QString& to, const QString& from) {
+  return QStringLiteral("@CopyAttribute(%1,%2)").arg(QORXWwjdEncode(to), QORXWwjdEncode(from));
+}
