@@ -71,6 +71,9 @@ TEST_F(DocumentNetwork, IsBuiltFromItsSubDocument) {
                "gui GUI TEXT LABEL The label | none;in A declared;in B;out O;own P x,y;loop L;t T Adder;"
                "parm T ATTR added;A -> T ;B -> T ;T -> O OUT;T -> P REST;T -> L REST")}});
   ExternalDocNetwork network;
+  Definitions none;
+  network.build(reader, QStringLiteral("Net"), none);
+  EXPECT_FALSE(network.problems().empty());
   network.build(reader, QStringLiteral("Net"), definitions);
   EXPECT_TRUE(network.problems().empty()) << qPrintable(network.problems().front().text);
   EXPECT_EQ(network.getName(), QStringLiteral("Net"));

@@ -69,6 +69,7 @@ ExternalDocNetwork::Builder::Builder(ExternalDocNetwork& network, const IXMLComp
 
 void ExternalDocNetwork::Builder::build() {
   m_network.clearNodes();
+  m_network.clearProblems();
   m_network.m_transformerNames.clear();
   m_network.takeSettings(m_reader.GetSubDocParms(m_document));
   addPorts();

@@ -10,6 +10,7 @@
 #include <transform/workspace/XMLComponentReader.h>
 
 #include <QFileInfo>
+#include <QScopeGuard>
 
 namespace {
 
@@ -118,6 +119,10 @@ void ExternalTransformerNetwork::forceLoad() {
     return;
   ++depth;
   m_isLoading = true;
+  const auto finish = qScopeGuard([this] {
+    m_isLoading = false;
+    --depth;
+  });
   try {
     loadBody();
   } catch (const WorkspaceLoaderException& exception) {
@@ -125,8 +130,6 @@ void ExternalTransformerNetwork::forceLoad() {
                TransformResString(custom_messages::kNoBody, {getName(), m_fileName, exception.getMessage()}));
     doneAdding(true);
   }
-  m_isLoading = false;
-  --depth;
 }
 
 void ExternalTransformerNetwork::loadBody() {
