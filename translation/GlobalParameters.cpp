@@ -117,8 +117,10 @@ QString GlobalParameters::resolve(const QString& text, QStringList& open, int& b
     result += resolve(parameter->currentValue(), open, budget);
     open.removeLast();
     copied = references.end();
-    if (result.size() > kMaximumLength)
+    if (result.size() > kMaximumLength) {
+      budget = 0;
       return text;
+    }
   }
   if (copied == 0)
     return text;

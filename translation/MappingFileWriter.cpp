@@ -1,7 +1,9 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/core/LookupChecks.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <translation/FlowNames.h>
 #include <translation/FlowOrder.h>
@@ -11,6 +13,7 @@
 
 #include <QSet>
 
+#include <algorithm>
 #include <limits>
 
 namespace {
@@ -22,6 +25,13 @@ std::size_t at(int number) {
 void writeStatement(MFBuffer& buffer, const QString& line) {
   buffer.add(line);
   buffer.flush();
+}
+
+// One word of a macro statement and of a reference.
+bool isMacroName(const QString& name) {
+  return !name.isEmpty() && std::none_of(name.begin(), name.end(), [](QChar c) {
+    return c.isSpace() || QStringLiteral("$()").contains(c);
+  });
 }
 
 }  // namespace
@@ -213,17 +223,33 @@ void MappingFileWriter::checkText(const QString& text, const QString& what, int 
     m_diagnostics.report(Rule::LineBreak, line, node, {what});
 }
 
+void MappingFileWriter::checkParameter(const GlobalParameters::Parameter& parameter, const QString& value) {
+  checkText(value, parameter.name, parameter.line, QString());
+  long reason = 0;
+  if (!isMacroName(parameter.name))
+    reason = lookup_checks::kNameInMacro;
+  else if (value.endsWith(QLatin1Char('\\')))
+    reason = lookup_checks::kEndsInBackslash;
+  if (reason != 0)
+    m_diagnostics.report(Rule::UnwritableValue, parameter.line, QString(),
+                         {parameter.name, TransformResString(reason)});
+}
+
 void MappingFileWriter::check() {
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
     if (!parameter.setInHeader)
-      checkText(parameter.value, parameter.name, parameter.line, QString());
+      checkParameter(parameter, parameter.value);
     if (parameter.isOverridden)
-      checkText(parameter.overridingValue, parameter.name, parameter.line, QString());
+      checkParameter(parameter, parameter.overridingValue);
   }
   for (const WorkspaceNode& node : m_workspace.nodes) {
     checkText(node.name, node.name, node.line, node.name);
-    if (!node.isTransformer())
+    if (!node.isTransformer()) {
+      checkText(node.keyword, node.keyword, node.line, node.name);
       continue;
+    }
+    for (const QString& line : node.cfg->getTemplateLines())
+      checkText(line, node.cfg->getName(), node.line, node.name);
     const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(node.cfg.get());
     const QHash<QString, QString> faults =
         custom ? custom->findUnwritableParameters() : node.cfg->findUnwritableValues();

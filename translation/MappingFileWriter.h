@@ -35,6 +35,7 @@ class ORX_EXPORT MappingFileWriter {
   void connect();
   void pushAttributes();
   void check();
+  void checkParameter(const GlobalParameters::Parameter& parameter, const QString& value);
   void checkText(const QString& text, const QString& what, int line, const QString& node);
 
   // The flow that leaves a link's source through its port.

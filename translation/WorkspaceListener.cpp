@@ -1,5 +1,6 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/text/MFBuffer.h>
 #include <translation/GlobalParameters.h>
 #include <translation/MacroReferences.h>
 #include <translation/WorkspaceListener.h>
@@ -13,7 +14,9 @@ QString WorkspaceListener::unpackValue(const TransformerCfg&, const QString& val
 }
 
 bool WorkspaceListener::isRunTimeValue(const TransformerCfg&, const QString& value) const {
-  return m_parameters.holdsReference(value);
+  // Deferred references are ordinary ones as soon as the value is written.
+  return m_parameters.holdsReference(value.contains(QLatin1String("$[")) ? MFBuffer::withOrdinaryMacros(value)
+                                                                         : value);
 }
 
 bool WorkspaceListener::isDeferredValue(const TransformerCfg& cfg, const QString& value) const {
@@ -36,4 +39,8 @@ QString WorkspaceListener::resolveUserTypedMacro(const TransformerCfg&, const QS
 
 QString WorkspaceListener::resolveDefaultValue(const TransformerCfg&, const QString& value) const {
   return m_parameters.resolve(value);
+}
+
+bool WorkspaceListener::expandMacros(const TransformerCfg& cfg, QString& text) const {
+  return expandByUnpacking(cfg, text);
 }

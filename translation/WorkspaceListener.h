@@ -21,6 +21,7 @@ class ORX_EXPORT WorkspaceListener : public TransformerCfgListener {
   QString resolveUserTypedMacro(const TransformerCfg& cfg, const QString& value,
                                 UnpackLevel level) const override;
   QString resolveDefaultValue(const TransformerCfg& cfg, const QString& value) const override;
+  bool expandMacros(const TransformerCfg& cfg, QString& text) const override;
 
  private:
   const GlobalParameters& m_parameters;

@@ -153,6 +153,10 @@ bool isOneLine(const QString& text) {
   return true;
 }
 
+bool fitsFragment(const QString& text) {
+  return fitsQuotes(text);
+}
+
 long refuseChoiceBox(const ChoiceList& choices, const BoxLookup& lookup) {
   if (!isPlainWord(lookup.macro)) {
     return kNameInMacro;

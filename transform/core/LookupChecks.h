@@ -14,6 +14,9 @@ ORX_EXPORT long refuseListBox(const ChoiceList& choices, const BoxLookup& lookup
 ORX_EXPORT long refuseChoiceProcedure(const ChoiceList& choices, const QString& procedure,
                                       const QString& value);
 
+// Whether a text means itself wherever it stands in a fragment.
+ORX_EXPORT bool fitsFragment(const QString& text);
+
 // Characters that no line of the mapping file can carry: line breaks, null characters, broken surrogate
 // pairs.
 ORX_EXPORT bool isOneLine(const QString& text);

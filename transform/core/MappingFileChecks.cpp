@@ -84,9 +84,18 @@ bool MappingFileChecks::growsWithoutEnd() const {
   return lines.isTooLarge();
 }
 
+// These values go into the statement that divides the work, whatever the template says.
+bool MappingFileChecks::isMultiProcessSetting(const QString& name) const {
+  const ConfiguredDefinition* definition = m_cfg.definition();
+  return definition && !definition->fields.multiProcess.isEmpty() &&
+         (name == definition->fields.multiProcess || name == kProcessCountParameter ||
+          name == kGroupsOrderedParameter);
+}
+
 bool MappingFileChecks::isReached(const TransformParamCfg& record, const CompiledTemplate* compiled) const {
   // Without a template the values are written as macros.
   return !compiled || m_bringsTokens || record.isMultiParameter() ||
+         isMultiProcessSetting(record.getName()) ||
          compiled->slotOf(record.getName()) != CompiledTemplate::kNoSlot ||
          (record.getName() == kIdentifierParameter &&
           compiled->slotOf(kEncodedNameToken) != CompiledTemplate::kNoSlot) ||
@@ -123,9 +132,17 @@ long MappingFileChecks::refuse(const TransformParamCfg& record, const CompiledTe
 }
 
 long MappingFileChecks::refuseIdentifier(const QString& value) const {
-  // Such a name is wrapped in quotes without a change to what stands inside.
-  const bool isBroken =
-      value.contains(kMacroOpen) && (value.contains(QLatin1Char('"')) || value.endsWith(QLatin1Char('\\')));
+  if (!value.contains(kMacroOpen)) {
+    return 0;
+  }
+  // Such a name is wrapped in quotes when it holds a blank itself, without a change to what stands inside.
+  QString expanded = value;
+  if (!expandMacros(expanded)) {
+    return kGrowsWithoutEnd;
+  }
+  const bool isSplit = !value.contains(QLatin1Char(' ')) && expanded.contains(QLatin1Char(' '));
+  const bool isBroken = isSplit || expanded.contains(QLatin1Char('\t')) ||
+                        expanded.contains(QLatin1Char('"')) || expanded.endsWith(QLatin1Char('\\'));
   return isBroken ? kIdentifierInScript : 0;
 }
 
@@ -145,10 +162,36 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
   if (!mapping_file_checks::closesDeferredMacros(choices, {value, record.getDescription(), identifier})) {
     return kUnclosedReference;
   }
-  const QString own = QLatin1Char('x') + record.getName();
-  if (isProcedure) {
-    return refuseChoiceProcedure(choices, own, value);
+  if (const long number = refuseChoices(choices)) {
+    return number;
   }
-  const BoxLookup lookup{value, record.getDescription(), own, identifier, record.getFlag(kGUITypeOptional)};
+  BoxLookup lookup{value, record.getDescription(), QLatin1Char('x') + record.getName(), identifier,
+                   record.getFlag(kGUITypeOptional)};
+  for (QString* text : {&lookup.value, &lookup.prompt, &lookup.identifier}) {
+    if (!expandMacros(*text)) {
+      return kGrowsWithoutEnd;
+    }
+  }
+  if (isProcedure) {
+    return refuseChoiceProcedure(choices, lookup.macro, lookup.value);
+  }
   return ORX_isListBoxType(record) ? refuseListBox(choices, lookup) : refuseChoiceBox(choices, lookup);
+}
+
+// Choices may refer to macros as well; those that do must fit wherever they stand.
+long MappingFileChecks::refuseChoices(const ChoiceList& choices) const {
+  for (const auto& [shown, stored] : choices.entries()) {
+    for (QString text : {shown, stored}) {
+      const bool refers = text.contains(kMacroOpen) || text.contains(kDeferredOpen);
+      if (refers && (!expandMacros(text) || !fitsFragment(text))) {
+        return kChoiceInScript;
+      }
+    }
+  }
+  return 0;
+}
+
+bool MappingFileChecks::expandMacros(QString& text) const {
+  text = MFBuffer::withOrdinaryMacros(text);
+  return !m_cfg.listener() || m_cfg.listener()->expandMacros(m_cfg, text);
 }

@@ -32,6 +32,10 @@ class MappingFileChecks {
   long refuse(const TransformParamCfg& record, const CompiledTemplate* compiled) const;
   long refuseIdentifier(const QString& value) const;
   long refuseLookup(const TransformParamCfg& record, const QString& value) const;
+  // As the engine sees the text when it runs a fragment; false when that has no end.
+  bool expandMacros(QString& text) const;
+  long refuseChoices(const ChoiceList& choices) const;
+  bool isMultiProcessSetting(const QString& name) const;
   bool isReached(const TransformParamCfg& record, const CompiledTemplate* compiled) const;
   bool growsWithoutEnd() const;
 

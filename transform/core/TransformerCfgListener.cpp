@@ -35,3 +35,23 @@ QString TransformerCfgListener::resolveUserTypedMacro(const TransformerCfg&, con
 QString TransformerCfgListener::resolveDefaultValue(const TransformerCfg&, const QString& value) const {
   return value;
 }
+
+bool TransformerCfgListener::expandMacros(const TransformerCfg&, QString&) const {
+  return true;
+}
+
+bool TransformerCfgListener::expandByUnpacking(const TransformerCfg& cfg, QString& text) const {
+  // A round takes values inside values; a further one is needed where a name is put together from values.
+  constexpr int kMostRounds = 8;
+  for (int round = 0; round < kMostRounds; ++round) {
+    if (!isRunTimeValue(cfg, text)) {
+      return true;
+    }
+    const QString unpacked = unpackValue(cfg, text, false, UnpackLevel::Resolved);
+    if (unpacked == text) {
+      return false;
+    }
+    text = unpacked;
+  }
+  return false;
+}

@@ -33,4 +33,12 @@ class ORX_EXPORT TransformerCfgListener {
                                         UnpackLevel level) const;
   // A parameter's default value, for its default macro line. Default: `value`.
   virtual QString resolveDefaultValue(const TransformerCfg& cfg, const QString& value) const;
+  // Puts the values of macros in the places of their references, as the engine does before it reads a
+  // statement; references to macros that only the engine knows stay. False when the references do not come to
+  // an end. Default: nothing is known.
+  virtual bool expandMacros(const TransformerCfg& cfg, QString& text) const;
+
+ protected:
+  // expandMacros() for a listener that unpacks every value that it calls a run-time value.
+  bool expandByUnpacking(const TransformerCfg& cfg, QString& text) const;
 };

@@ -78,3 +78,7 @@ QString InnerTransformerListener::resolveUserTypedMacro(const TransformerCfg&, c
 QString InnerTransformerListener::resolveDefaultValue(const TransformerCfg&, const QString& value) const {
   return resolve(value);
 }
+
+bool InnerTransformerListener::expandMacros(const TransformerCfg& cfg, QString& text) const {
+  return expandByUnpacking(cfg, text);
+}

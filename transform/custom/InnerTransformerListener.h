@@ -25,6 +25,7 @@ class ORX_EXPORT InnerTransformerListener : public TransformerCfgListener {
   QString resolveUserTypedMacro(const TransformerCfg& cfg, const QString& value,
                                 UnpackLevel level) const override;
   QString resolveDefaultValue(const TransformerCfg& cfg, const QString& value) const override;
+  bool expandMacros(const TransformerCfg& cfg, QString& text) const override;
 
  private:
   QString resolve(const QString& value) const;

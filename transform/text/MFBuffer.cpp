@@ -87,6 +87,12 @@ void MFBuffer::append(const QString& text) {
   }
 }
 
+QString MFBuffer::withOrdinaryMacros(const QString& text) {
+  QString replaced = text;
+  pairDeferredMacros(replaced);
+  return replaced;
+}
+
 bool MFBuffer::closesDeferredMacros(const QString& text) {
   QString copy = text;
   return pairDeferredMacros(copy);

@@ -33,6 +33,10 @@ class ORX_EXPORT MFBuffer : public IMFBuffer {
   void add(const char* text);
   void addLines(const QStringList& lines);
 
+  // The text with its deferred macro references made ordinary, as add() does it; a "$[" that is not closed
+  // stays.
+  static QString withOrdinaryMacros(const QString& text);
+
   // False when add() would not come to an end with deferred macros on: a "$[" has no "]" of its own behind
   // it.
   static bool closesDeferredMacros(const QString& text);
