@@ -301,6 +301,44 @@ TEST(Translation, RefusesFaultyCustomTransformers) {
   }
 }
 
+TEST(Translation, MacrosInLookupsAreJudgedByTheirValues) {
+  const struct {
+    QString value;        // of the choice
+    QStringList globals;  // name, value, name, value
+    bool isFine;
+  } cases[] = {
+      {"$(A)", {"A", "Slow one"}, true},
+      {"$(A)", {"A", "a {b} c"}, true},
+      {"$(A)", {"A", "}"}, false},
+      {"$(A)", {"A", "a [exit]"}, false},
+      {"$(A)", {"A", "say \"x\""}, false},
+      {"$(A)", {"A", "$x"}, false},
+      {"x$(A)$(B)", {"A", "cost$", "B", "x"}, false},  // a variable only together
+      {"$(A)", {"A", "$(B)", "B", "{"}, false},
+      {"$(X_$(A))", {"A", "B", "X_B", "{"}, false},
+      {"$[A]", {"A", "{"}, false},
+      {"$[A]", {"A", "Fast"}, true},
+      {"$(A)", {"A", "{" + QString("x").repeated(2 << 20)}, false},
+      {"$(A)", {"A", "$(B)", "B", "$(A)"}, false},
+      {"$(ORX_HOME) $(A)", {"A", "x"}, true},
+      {"Fast", {"A", "{"}, true},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace = copyBetween();
+    for (int i = 0; i < test.globals.size(); i += 2)
+      workspace.parameter("GUI TEXT " + test.globals.at(i) + " Prompt", test.globals.at(i + 1));
+    workspace.transformer(7, "Pick", {"XFORMER_NAME", "P", "MODE", test.value});
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.diagnostics, test.isFine ? QStringList() : QStringList("unwritable-value P"))
+        << test.value.toStdString() << ' ' << test.globals.join(' ').left(40).toStdString();
+  }
+  // A value that the header or the call gives counts.
+  SmallWorkspace workspace = copyBetween();
+  workspace.header("MACRO A {").transformer(7, "Pick", {"XFORMER_NAME", "P", "MODE", "$(A)"});
+  EXPECT_EQ(translate(workspace).diagnostics, QStringList("unwritable-value P"));
+  EXPECT_EQ(translate(workspace, {{"A", "Fast"}}).diagnostics, QStringList());
+}
+
 TEST(Translation, RefusesWhatItCannotTranslate) {
   const auto with = [](const std::function<void(SmallWorkspace&)>& change) {
     SmallWorkspace workspace = copyBetween();
@@ -345,6 +383,9 @@ TEST(Translation, RefusesWhatItCannotTranslate) {
       {with([](auto& w) { w.parameter("nonsense", ""); }), {"bad-prompt-line "}},
       {with([](auto& w) { w.parameter("GUI TEXT A P", "$[B"); }), {"unclosed-reference "}},
       {with([](auto& w) { w.parameter("GUI TEXT A P", "a\nb"); }), {"line-break "}},
+      {with([](auto& w) { w.parameter("GUI TEXT A P", "a\\"); }), {"unwritable-value "}},
+      {with([](auto& w) { w.parameter("GUI TEXT \"A B\" P", "a"); }), {"unwritable-value "}},
+      {with([](auto& w) { w.parameter("GUI TEXT A<u000a>B P", "a"); }), {"unwritable-value "}},
       {with([](auto& w) { w.reader(9, "$[B]$[").link(9, "fo 0", 3, "fi 0 INPUT"); }),
        {"unclosed-reference $[B]$["}},
       {with([](auto& w) {
