@@ -3,9 +3,12 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <platform/session/session.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerCfg.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/files/FolderListing.h>
 #include <transform/registry/ChangeLogPage.h>
 #include <transform/registry/CompanionFileParser.h>
+#include <transform/registry/CustomTransformerFiles.h>
 #include <transform/registry/DefinitionFileParser.h>
 #include <transform/registry/ExceptionList.h>
 #include <transform/registry/NamedConnections.h>
@@ -28,7 +31,6 @@ const QString kResourceKind = QStringLiteral("transformer");
 constexpr long kNoChanges = 370642;
 constexpr long kChanges = 370643;
 constexpr long kVersionHeading = 370644;
-constexpr long kCustomTransformer = 370741;
 constexpr long kNamelessDefinition = 370742;
 constexpr long kNamedVersion = 370743;
 constexpr long kAllChanges = 370744;
@@ -51,13 +53,16 @@ TransformerMgr& TransformerMgr::getTransformerMgr() {
 }
 
 TransformerMgr::TransformerMgr()
-    : m_exceptions(std::make_unique<ExceptionList>()), m_connections(std::make_unique<NamedConnections>()) {}
+    : m_customFiles(std::make_unique<CustomTransformerFiles>()),
+      m_exceptions(std::make_unique<ExceptionList>()),
+      m_connections(std::make_unique<NamedConnections>()) {}
 
 TransformerMgr::~TransformerMgr() = default;
 
 void TransformerMgr::reset() {
   m_loaded = false;
   m_prototypes = PrototypeTable();
+  m_customFiles->reset();
   m_iteration = 0;
   m_aliases.clear();
   m_categoryDescriptions.clear();
@@ -163,8 +168,48 @@ void TransformerMgr::loadDefinitionFile(const QString& path, bool onlyCustomTran
   }
 }
 
-void TransformerMgr::loadCustomTransformer(const QString& path, int /*version*/, bool /*replaces*/) {
-  m_lastError = TransformResString(kCustomTransformer, path);
+void TransformerMgr::loadCustomTransformer(const QString& path, int version, bool replaces) {
+  CustomTransformerFiles::Opened opened = CustomTransformerFiles::open(path, version, this);
+  if (opened.needsNewerBuild)
+    m_ignored.push_back({path, opened.name, opened.version, QString(), false});
+  if (!opened.network)
+    return;
+  const TransformerCfg* kept = m_prototypes.find(opened.name, opened.version);
+  if (kept && !replaces) {
+    if (kept->getFileName() != path)
+      m_ignored.push_back({path, opened.name, opened.version, kept->getFileName(), true});
+    return;
+  }
+  auto prototype = std::make_unique<CompoundTransformerCfg>(m_customFiles->keep(std::move(opened.network)),
+                                                            CompoundTransformerCfg::Body::Deferred);
+  prototype->setDefinitionDirectory(this);
+  if (QORXPrettyUpFileName(path).startsWith(QORXOrxHome() + QLatin1Char('/')))
+    prototype->setTransformerType(TransformerCfg::kBuiltIn);
+  const bool isNewest = m_prototypes.add(std::move(prototype));
+  if (isNewest || m_customFiles->fileOf(opened.name).isEmpty())
+    m_customFiles->noteFile(opened.name, path);
+}
+
+void TransformerMgr::loadOnDemand(const QString& name, int version) {
+  const QString path = m_customFiles->fileOf(name);
+  if (path.isEmpty() || version == NEWEST_VERSION)
+    return;
+  if (version != OLDEST_VERSION) {
+    loadCustomTransformer(path, version, false);
+    if (version == 0 && !m_prototypes.find(name, 0))
+      loadCustomTransformer(path, 1, false);
+    return;
+  }
+  const TransformerCfg* oldest = m_prototypes.oldest(name);
+  for (const int older : CustomTransformerFiles::versions(path)) {
+    if (older < 0)
+      continue;
+    if (oldest && older >= oldest->getVersion())
+      return;
+    loadCustomTransformer(path, older, false);
+    if (m_prototypes.find(name, older))
+      return;
+  }
 }
 
 void TransformerMgr::loadCompanionFile(const QString& path) {
@@ -265,6 +310,8 @@ const TransformerCfg* TransformerMgr::findPrototype(const QString& name, int ver
 
 std::unique_ptr<TransformerCfg> TransformerMgr::copyOf(const QString& name, int version) const {
   const TransformerCfg* prototype = findPrototype(name, version);
+  if (!prototype && version == 0 && !m_customFiles->fileOf(name).isEmpty())
+    prototype = m_prototypes.find(name, 1);  // the first version of a custom transformer is called either way
   if (!prototype)
     return nullptr;
   std::unique_ptr<TransformerCfg> copy(prototype->getCopy());
@@ -273,12 +320,16 @@ std::unique_ptr<TransformerCfg> TransformerMgr::copyOf(const QString& name, int 
 }
 
 std::unique_ptr<TransformerCfg> TransformerMgr::makeTransformer(const QString& name, int version) {
+  if (version == OLDEST_VERSION || !findPrototype(name, version))
+    loadOnDemand(name, version);
   std::unique_ptr<TransformerCfg> copy = copyOf(name, version);
   // An alias may lead to another alias; a circle of them leads nowhere.
   QSet<QString> followed;
   for (QString alias = name; !copy && m_aliases.contains(alias) && !followed.contains(alias);) {
     followed.insert(alias);
     alias = m_aliases.value(alias);
+    if (version == OLDEST_VERSION || !findPrototype(alias, version))
+      loadOnDemand(alias, version);
     copy = copyOf(alias, version);
     if (copy)
       copy->setRequestedAlias(name);

@@ -23,6 +23,7 @@
 #include <vector>
 
 class ChangeLogPage;
+class CustomTransformerFiles;
 class ExceptionList;
 class IORXStringArray;
 class NamedConnections;
@@ -114,7 +115,10 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   void reset();
   void loadFolder(const QString& folder, bool onlyCustomTransformers);
   void loadDefinitionFile(const QString& path, bool onlyCustomTransformers);
+  // `replaces` lets it take the place of a definition of the same name and version.
   void loadCustomTransformer(const QString& path, int version, bool replaces);
+  // Reads a further version of a custom transformer whose file is known.
+  void loadOnDemand(const QString& name, int version);
   void loadCompanionFile(const QString& path);
   void define(const TransformerDefinition& definition);
   void localize(const CompanionEntry& entry);
@@ -125,6 +129,7 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   std::unique_ptr<TransformerCfg> copyOf(const QString& name, int version) const;
   void addChanges(ChangeLogPage& page, const QString& name, int first, int last, bool withName) const;
 
+  std::unique_ptr<CustomTransformerFiles> m_customFiles;  // outlives the prototypes, which listen to networks
   PrototypeTable m_prototypes;
   int m_iteration = 0;
   QHash<QString, QString> m_aliases;

@@ -1,0 +1,147 @@
+#include <platform/session/ORXString.h>
+#include <tests/registry/RegistryFolders.h>
+#include <tests/support/QtPrinters.h>
+#include <transform/custom/CompoundTransformerCfg.h>
+#include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/workspace/VersionStore.h>
+
+#include <gtest/gtest.h>
+
+#include <memory>
+
+namespace {
+
+using Copy = std::unique_ptr<TransformerCfg>;
+
+// A document with the custom transformer "Cleaner": input IN, output `output`, parameter LIMIT.
+QByteArray document(const QString& output, int build) {
+  return QString(
+             "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n"
+             "<TRANSFORMER>\n<SUBDOCUMENTS>\n<SUBDOCUMENT NAME=\"Cleaner\" LAST_SAVE_BUILD=\"%2\">\n"
+             "<GLOBAL_PARAMETERS>\n<GLOBAL_PARAMETER GUI_LINE=\"GUI TEXT LIMIT Limit\" "
+             "DEFAULT_VALUE=\"5\"/>\n"
+             "</GLOBAL_PARAMETERS>\n<SUBDOCUMENT_IOS>\n"
+             "<SUBDOCUMENT_IO IDENTIFIER=\"1\" NAME=\"IN\" IS_SOURCE=\"true\"/>\n"
+             "<SUBDOCUMENT_IO IDENTIFIER=\"2\" NAME=\"%1\" IS_SOURCE=\"false\"/>\n</SUBDOCUMENT_IOS>\n"
+             "<FEAT_LINKS>\n<FEAT_LINK IDENTIFIER=\"1\" SOURCE_NODE=\"1\" TARGET_NODE=\"2\" "
+             "SOURCE_PORT_DESC=\"fo 0\" TARGET_PORT_DESC=\"fi 0\"/>\n</FEAT_LINKS>\n"
+             "</SUBDOCUMENT>\n</SUBDOCUMENTS>\n</TRANSFORMER>\n")
+      .arg(output)
+      .arg(build)
+      .toUtf8();
+}
+
+// Puts versions in front of each other, the last one given first in the file: version, build.
+void writeVersions(const QString& path, const std::vector<std::pair<int, int>>& versions) {
+  for (const auto& [version, build] : versions) {
+    QString error;
+    ASSERT_TRUE(VersionStore(path).insert(
+        {"Cleaner", QString::number(version), "Mine", QString("{GUID%1}").arg(version)}, {},
+        document(QString("OUT%1").arg(version), build), error))
+        << error.toStdString();
+  }
+}
+
+QString customFile(RegistryFolders& folders, const QString& name,
+                   const std::vector<std::pair<int, int>>& versions) {
+  folders.define("Other.ort", definitionText("Other", 1));
+  const QString path = folders.path("home/transformers/" + name);
+  writeVersions(path, versions);
+  return path;
+}
+
+int versionOf(TransformerMgr& registry, int asked) {
+  const Copy copy(registry.getTransformer("Cleaner", asked));
+  return copy ? copy->getVersion() : -1;
+}
+
+TEST(CustomTransformerFiles, AreTransformersLikeOthers) {
+  RegistryFolders folders;
+  const QString path = customFile(folders, "Cleaner.ort", {{1, 18286}, {3, 18286}});
+  TransformerMgr& registry = folders.load();
+  EXPECT_EQ(registry.lastError(), QString());
+  EXPECT_EQ(registry.getCategoryTransformers("Mine"), QStringList{"Cleaner"});
+  const Copy copy(registry.getTransformer("Cleaner", ITransformerMgr::NEWEST_VERSION));
+  ASSERT_TRUE(copy);
+  QStringList outputs;
+  copy->getOutputTags(outputs);
+  EXPECT_EQ(outputs, QStringList{"OUT3"});
+  EXPECT_EQ(copy->getParameterValue("LIMIT"), QString("5"));
+  EXPECT_EQ(copy->getFileName(), path);
+  const Copy byGuid(registry.getTransformerWithGUID("GUID3"));
+  EXPECT_TRUE(byGuid);
+}
+
+TEST(CustomTransformerFiles, VersionsAreFoundOnDemand) {
+  const struct {
+    std::vector<std::pair<int, int>> versions;  // the first of the file is the last given
+    int asked;
+    int found;
+  } cases[] = {
+      {{{1, 1}, {3, 1}}, ITransformerMgr::NEWEST_VERSION, 3},
+      {{{1, 1}, {3, 1}}, 1, 1},
+      {{{1, 1}, {3, 1}}, 2, -1},
+      {{{1, 1}, {3, 1}}, 0, 1},
+      {{{1, 1}, {3, 1}}, ITransformerMgr::OLDEST_VERSION, 1},
+      // A build newer than this one: the next lower version serves.
+      {{{1, 18286}, {3, 18287}}, ITransformerMgr::NEWEST_VERSION, 1},
+      {{{1, 18286}, {3, 18287}}, 3, -1},
+  };
+  for (const auto& test : cases) {
+    RegistryFolders folders;
+    customFile(folders, "Cleaner.ort", test.versions);
+    EXPECT_EQ(versionOf(folders.load(), test.asked), test.found) << test.asked;
+  }
+}
+
+TEST(CustomTransformerFiles, RefusedOnesAreListed) {
+  RegistryFolders folders;
+  const QString first = customFile(folders, "A.ort", {{2, 1}});
+  const QString second = customFile(folders, "B.ort", {{2, 1}});
+  const QString newer = customFile(folders, "C.ort", {{9, 99999}});
+  TransformerMgr& registry = folders.load();
+  ASSERT_EQ(registry.ignoredTransformers().size(), 2u);
+  const TransformerMgr::IgnoredTransformer& duplicate = registry.ignoredTransformers().front();
+  EXPECT_EQ(duplicate.path, second);
+  EXPECT_EQ(duplicate.keptPath, first);
+  EXPECT_TRUE(duplicate.isDuplicate);
+  const TransformerMgr::IgnoredTransformer& refused = registry.ignoredTransformers().back();
+  EXPECT_EQ(refused.path, newer);
+  EXPECT_EQ(refused.version, 9);
+  EXPECT_FALSE(refused.isDuplicate);
+  const struct {
+    int version;
+    bool ignored;
+  } cases[] = {{2, true}, {9, true}, {3, false}, {-1, true}, {-2, true}};
+  for (const auto& test : cases)
+    EXPECT_EQ(registry.isTransformerIgnored(ORXString("Cleaner"), test.version), test.ignored)
+        << test.version;
+}
+
+TEST(CustomTransformerFiles, ARemoteFileTakesThePlaceOfTheDefinition) {
+  RegistryFolders folders;
+  const QString first = customFile(folders, "A.ort", {{2, 1}});
+  TransformerMgr& registry = folders.load();
+  const Copy before(registry.getTransformer("Cleaner", 2));
+  const QString remote = folders.path("remote.ort");
+  writeVersions(remote, {{2, 1}});
+  registry.loadRemoteTransformer(remote, 2);
+  const Copy after(registry.getTransformer("Cleaner", 2));
+  ASSERT_TRUE(before && after);
+  EXPECT_EQ(before->getFileName(), first);
+  EXPECT_EQ(after->getFileName(), remote);
+}
+
+TEST(CustomTransformerFiles, InstancesOutliveAReload) {
+  RegistryFolders folders;
+  customFile(folders, "A.ort", {{2, 1}});
+  TransformerMgr& registry = folders.load();
+  const Copy copy(registry.getTransformer("Cleaner", 2));
+  ASSERT_TRUE(copy);
+  folders.load();
+  folders.load();
+  copy->setInputAttributes("IN", QStringList{"a"});
+  EXPECT_EQ(copy->getOutputAttributes("OUT2"), QStringList{"a"});
+}
+
+}  // namespace

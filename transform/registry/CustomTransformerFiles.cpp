@@ -1,0 +1,90 @@
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/registry/CustomTransformerFiles.h>
+#include <transform/registry/ITransformerMgr.h>
+#include <transform/workspace/VersionStore.h>
+
+#include <QFile>
+
+#include <algorithm>
+
+namespace {
+
+// The build that saved a version last, told by its document without parsing it; 0 when it does not say.
+int lastSaveBuild(const QString& path, const VersionInfo& version) {
+  QFile file(path);
+  if (!file.open(QIODevice::ReadOnly) || !file.seek(version.byteOffset))
+    return 0;
+  const QByteArray text = file.read(version.byteLength);
+  static const QByteArray mark("LAST_SAVE_BUILD=\"");
+  const int place = text.lastIndexOf(mark);
+  if (place < 0)
+    return 0;
+  const int begin = place + mark.size();
+  return text.mid(begin, text.indexOf('"', begin) - begin).toInt();
+}
+
+}  // namespace
+
+CustomTransformerFiles::CustomTransformerFiles() = default;
+CustomTransformerFiles::~CustomTransformerFiles() = default;
+
+QList<int> CustomTransformerFiles::versions(const QString& path) {
+  QString error;
+  QList<int> result;
+  for (const VersionInfo& version : VersionStore(path).versions(error))
+    result.append(version.version);
+  std::sort(result.begin(), result.end());
+  return result;
+}
+
+CustomTransformerFiles::Opened CustomTransformerFiles::open(const QString& path, int version,
+                                                            TransformerSource* source) {
+  Opened opened;
+  auto network = std::make_unique<ExternalTransformerNetwork>(path, version, source);
+  if (!network->isLoaded())
+    return opened;
+  opened.name = network->getName();
+  opened.version = network->getVersion();
+
+  QString error;
+  QList<VersionInfo> all = VersionStore(path).versions(error);
+  const auto fits = [&](int wanted) {
+    const auto found = std::find_if(all.cbegin(), all.cend(),
+                                    [&](const VersionInfo& info) { return info.version == wanted; });
+    return found != all.cend() && lastSaveBuild(path, *found) <= TransformerCfg::kThisBuild;
+  };
+  if (fits(opened.version)) {
+    opened.network = std::move(network);
+    return opened;
+  }
+  if (version == ITransformerMgr::NEWEST_VERSION) {
+    std::sort(all.begin(), all.end(),
+              [](const VersionInfo& left, const VersionInfo& right) { return left.version > right.version; });
+    for (const VersionInfo& older : all) {
+      if (older.version >= opened.version || older.name != opened.name || !fits(older.version))
+        continue;
+      network = std::make_unique<ExternalTransformerNetwork>(path, older.version, source);
+      if (!network->isLoaded())
+        continue;
+      opened.version = older.version;
+      opened.network = std::move(network);
+      return opened;
+    }
+  }
+  opened.needsNewerBuild = true;
+  return opened;
+}
+
+ExternalTransformerNetwork* CustomTransformerFiles::keep(
+    std::unique_ptr<ExternalTransformerNetwork> network) {
+  m_networks.push_back(std::move(network));
+  return m_networks.back().get();
+}
+
+void CustomTransformerFiles::reset() {
+  m_files.clear();
+  m_networks.erase(std::remove_if(m_networks.begin(), m_networks.end(),
+                                  [](const auto& network) { return !network->getIsInUse(); }),
+                   m_networks.end());
+}
