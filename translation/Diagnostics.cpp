@@ -6,8 +6,13 @@ void Diagnostics::report(Rule rule, int line, const QString& node, const QString
 }
 
 void Diagnostics::reportText(Rule rule, int line, const QString& node, const QString& text) {
+  reportIn(m_file, rule, line, node, text);
+}
+
+void Diagnostics::reportIn(const QString& file, Rule rule, int line, const QString& node,
+                           const QString& text) {
   const Severity severity = diagnosticRule(rule).severity;
-  m_all.push_back({rule, severity, m_file, line, node, text});
+  m_all.push_back({rule, severity, file, line, node, text});
   if (severity == Severity::Error)
     ++m_errors;
 }

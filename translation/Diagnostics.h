@@ -28,6 +28,8 @@ class ORX_EXPORT Diagnostics {
 
   // With a text that another part of the system has put together.
   void reportText(Rule rule, int line, const QString& node, const QString& text);
+  // About another file than the document itself.
+  void reportIn(const QString& file, Rule rule, int line, const QString& node, const QString& text);
 
   bool hasErrors() const { return m_errors > 0; }
   const std::vector<Diagnostic>& all() const { return m_all; }

@@ -2,7 +2,8 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerSource.h>
-#include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
@@ -159,15 +160,25 @@ std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const Transfor
 }
 
 void WorkspaceBuilder::reportCustomTransformers() {
-  for (const ExternalDocNetwork* network : m_workspace->customTransformers()) {
-    for (const NetworkProblem& problem : network->problems()) {
+  const auto report = [this](const ExternalDocNetwork& network, const QString& file) {
+    for (const NetworkProblem& problem : network.problems()) {
       const Rule rule = problem.kind == NetworkProblem::Kind::Upgraded ? Rule::Upgraded
                         : problem.kind == NetworkProblem::Kind::UnmetDependency
                             ? Rule::UnmetDependency
                             : Rule::CustomTransformerFault;
       const QString node =
-          problem.node.isEmpty() ? network->getName() : network->getName() + QLatin1Char('/') + problem.node;
-      m_diagnostics.reportText(rule, problem.line, node, problem.text);
+          problem.node.isEmpty() ? network.getName() : network.getName() + QLatin1Char('/') + problem.node;
+      m_diagnostics.reportIn(file, rule, problem.line, node, problem.text);
+    }
+  };
+  for (const ExternalDocNetwork* network : m_workspace->customTransformers())
+    report(*network, m_workspace->fileName);
+  QSet<const CompoundTransformerNetwork*> seen;
+  for (const WorkspaceNode& node : m_workspace->nodes) {
+    const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(node.cfg.get()));
+    if (linked && !seen.contains(linked)) {
+      seen.insert(linked);
+      report(*linked, linked->getFileName());
     }
   }
 }

@@ -1,5 +1,6 @@
 #include <transform/core/TransformerSource.h>
 #include <transform/files/AtomicFile.h>
+#include <transform/files/InputFile.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 #include <translation/MFDeviceBuffer.h>
@@ -7,22 +8,19 @@
 #include <translation/WorkspaceBuilder.h>
 #include <translation/WorkspaceTranslation.h>
 
-#include <QFile>
-
 std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, TransformerSource& source,
                                          Diagnostics& diagnostics, QString& error) {
   // Asked before the reader is, because its exceptions do not tell a missing file from a malformed one.
-  QFile file(request.workspaceFile);
-  if (!file.open(QIODevice::ReadOnly)) {
+  InputFile file(request.workspaceFile);
+  if (!file.open()) {
     error = file.errorString();
     return nullptr;
   }
-  file.close();
 
   QStringList headerLines;
   const std::unique_ptr<IXMLComponentReader> reader = IXMLComponentReader::create();
   try {
-    reader->ReadInput(request.workspaceFile, headerLines);
+    reader->ReadInput(file.path(), headerLines);
   } catch (const WorkspaceLoaderException& exception) {
     diagnostics.reportText(Rule::MalformedDocument, exception.line(), QString(), exception.getMessage());
     return nullptr;

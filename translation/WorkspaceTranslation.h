@@ -21,7 +21,7 @@ enum class TranslationResult {
 };
 
 struct TranslationRequest {
-  QString workspaceFile;
+  QString workspaceFile;                    // "-" is standard input
   QString outputFile;                       // "-" is standard output
   QHash<QString, QString> parameterValues;  // other values for global parameters, by name
 };

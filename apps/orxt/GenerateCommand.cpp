@@ -1,6 +1,7 @@
 #include <apps/orxt/Console.h>
 #include <apps/orxt/GenerateCommand.h>
 #include <apps/orxt/ProcessPool.h>
+#include <transform/files/InputFile.h>
 #include <transform/registry/TransformerMgr.h>
 #include <translation/WorkspaceTranslation.h>
 
@@ -12,7 +13,7 @@ namespace {
 
 constexpr CommandFacts kFacts = {"generate", "Write the mapping file of a workspace",
                                  "orxt generate parcels.orw -o parcels.mf\n"
-                                 "orxt generate roads.orw --param MAX_SPEED=80 -o -\n"
+                                 "orxt generate - --param MAX_SPEED=80 <roads.orw >roads.mf\n"
                                  "orxt generate nightly/*.orw -d out --jobs 4"};
 
 ExitStatus exitStatus(TranslationResult result) {
@@ -113,13 +114,14 @@ ExitStatus GenerateCommand::run(Console& console) {
 
 ExitStatus GenerateCommand::runJob(const Job& job, const QHash<QString, QString>& values,
                                    TransformerSource& source, Console& console) const {
-  Diagnostics diagnostics(job.workspace);
+  const QString shownName = InputFile::shownName(job.workspace);
+  Diagnostics diagnostics(shownName);
   QString error;
   const TranslationResult result =
       translateWorkspace({job.workspace, job.output, values}, source, diagnostics, error);
   console.show(diagnostics);
   if (result == TranslationResult::Unreadable)
-    console.failFile(job.workspace, error);
+    console.failFile(shownName, error);
   else if (result == TranslationResult::Unwritable)
     console.fail(error);
   return exitStatus(result);
