@@ -338,31 +338,34 @@ TEST(Instance, GivesParameterValuesInAttributeNames) {
   EXPECT_EQ(instance.getOutputAttributes(QStringLiteral("O")), QStringList());
 }
 
-// A definition that is placed twice on each of 60 levels.
-TEST(Instance, NestingCostsItsDefinitionsOnly) {
-  constexpr int kLevels = 60;
+// Two instances of the level below in a row on each level; in the lowest, two transformers of `definition`.
+std::vector<std::unique_ptr<OpenNetwork>> doubledLevels(int count, const TransformerDefinition& definition) {
   std::vector<std::unique_ptr<OpenNetwork>> levels;
-  for (int level = 0; level < kLevels; ++level) {
+  for (int level = 0; level < count; ++level) {
+    const bool isLowest = level == 0;
+    const QString in = isLowest ? QStringLiteral("IN") : QStringLiteral("A");
+    const QString out = isLowest ? QStringLiteral("OUT") : QStringLiteral("O");
     auto network = std::make_unique<OpenNetwork>(QStringLiteral("Level%1").arg(level));
     network->addInput(QStringLiteral("A"), 0, 0);
     network->addOutput(QStringLiteral("O"), 1, kOutgoingArriving, {}, 0);
-    QString port = QStringLiteral("A");
-    int last = 0;
-    for (int node = 2; node < 4; ++node) {
-      const QString in = level == 0 ? QStringLiteral("IN") : QStringLiteral("A");
-      network->addTransformer(level == 0 ? configured(passing(QStringLiteral("Adder"), QStringLiteral("OUT"),
-                                                              QStringLiteral("x")))
-                                               .release()
-                                         : new CompoundTransformerCfg(levels.back().get()),
-                              {}, node);
-      network->addLink(last, port, node, in);
-      port = level == 0 ? QStringLiteral("OUT") : QStringLiteral("O");
-      last = node;
+    for (const int node : {2, 3}) {
+      network->addTransformer(
+          isLowest ? configured(definition).release() : new CompoundTransformerCfg(levels.back().get()), {},
+          node);
     }
-    network->addLink(last, port, 1, QStringLiteral("O"));
+    network->addLink(0, QStringLiteral("A"), 2, in);
+    network->addLink(2, out, 3, in);
+    network->addLink(3, out, 1, QStringLiteral("O"));
     network->doneAdding(true);
     levels.push_back(std::move(network));
   }
+  return levels;
+}
+
+TEST(Instance, NestingCostsItsDefinitionsOnly) {
+  constexpr int kLevels = 60;
+  const auto levels =
+      doubledLevels(kLevels, passing(QStringLiteral("Adder"), QStringLiteral("OUT"), QStringLiteral("x")));
   CompoundTransformerCfg instance(levels.back().get());
   instance.setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
   EXPECT_EQ(instance.getOutputAttributes(QStringLiteral("O")), names(QStringLiteral("a,x")));
@@ -375,6 +378,48 @@ TEST(Instance, NestingCostsItsDefinitionsOnly) {
   instance.getUsedComponents(readers, writers, transformers, true);
   EXPECT_EQ(transformers.size(), kLevels + 1);
   EXPECT_TRUE(instance.instantiationFault().isEmpty());
+}
+
+// Every transformer on the way makes another name of the attribute, so that no two instances are asked alike.
+TEST(Instance, NestingIsBoundedWhenEveryInstanceDiffers) {
+  TransformerDefinition collector = passing(QStringLiteral("Collector"));
+  collector.listActions = QStringList{QStringLiteral("OUT COLLECT IN L")};
+  const auto few = doubledLevels(3, collector);
+  CompoundTransformerCfg exact(few.back().get());
+  exact.setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
+  EXPECT_EQ(exact.getOutputAttributes(QStringLiteral("O")).last().count(QStringLiteral("L{}.")), 8);
+  const auto many = doubledLevels(40, collector);
+  CompoundTransformerCfg bounded(many.back().get());
+  bounded.setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
+  EXPECT_FALSE(bounded.getOutputAttributes(QStringLiteral("O")).isEmpty());
+}
+
+// Values that refer to the values of the level around them, twice each.
+TEST(Instance, ValuesMayNotGrowWithoutBound) {
+  TransformerDefinition namer =
+      passing(QStringLiteral("Namer"), QStringLiteral("OUT"), QStringLiteral("$(P)"));
+  namer.parameterNames = names(QStringLiteral("P"));
+  namer.parameterTypes = names(QStringLiteral("NEW_ATTR"));
+  namer.parameterPrompts = namer.parameterDefaults = QStringList{QString()};
+  const QString twice = QStringLiteral("$(P)$(P)");
+  std::vector<std::unique_ptr<OpenNetwork>> levels;
+  for (int level = 0; level < 60; ++level) {
+    auto network = std::make_unique<OpenNetwork>(QStringLiteral("Level%1").arg(level));
+    network->addOutput(QStringLiteral("O"), 1, kOutgoingArriving, {}, 0);
+    std::unique_ptr<TransformerCfg> inner =
+        level == 0 ? configured(namer) : std::make_unique<CompoundTransformerCfg>(levels.back().get());
+    inner->setParameterValue(QStringLiteral("P"), twice, false);
+    network->addTransformer(inner.release(), {}, 2);
+    network->addLink(2, level == 0 ? QStringLiteral("OUT") : QStringLiteral("O"), 1, QStringLiteral("O"));
+    network->publish(QStringLiteral("GUI TEXT P P"), QStringLiteral("ab"));
+    network->doneAdding(true);
+    levels.push_back(std::move(network));
+  }
+  EXPECT_EQ(CompoundTransformerCfg(levels[2].get()).getOutputAttributes(QStringLiteral("O")),
+            QStringList{QStringLiteral("ab").repeated(8)});
+  for (const QString& name :
+       CompoundTransformerCfg(levels.back().get()).getOutputAttributes(QStringLiteral("O")))
+    EXPECT_LT(name.size(), 1 << 20);
 }
 
 TEST(Instance, FindsNestingFaults) {

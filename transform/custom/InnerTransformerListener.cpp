@@ -10,8 +10,8 @@ namespace {
 // Values refer to the parameters of the custom transformer around, whose values refer to the next one: what
 // one question may cost, and how long a value may become on the way, is bounded. What is left over stays a
 // reference.
-constexpr int kMostReplacements = 10000;
-constexpr int kLongestValue = 1 << 20;
+constexpr int kMostReplacements = 1000;
+constexpr int kLongestValue = 1 << 18;
 
 struct Budget {
   int depth = 0;
@@ -37,15 +37,17 @@ QString InnerTransformerListener::resolve(const QString& value) const {
   Budget& left = budget();
   if (left.depth++ == 0)
     left.replacements = 0;
+  int length = value.size();
   const QString resolved = replaceParameterReferences(value, [&](const QString& name, QString& replacement) {
     if (!m_network.hasParameter(name) || left.depth > CompoundTransformerNetwork::kDeepestNesting ||
         ++left.replacements > kMostReplacements)
       return false;
     replacement = valueOf(name);
-    return true;
+    length += replacement.size();
+    return length <= kLongestValue;
   });
   --left.depth;
-  return resolved.size() > kLongestValue ? value : resolved;
+  return resolved;
 }
 
 QString InnerTransformerListener::unpackValue(const TransformerCfg&, const QString& value, bool isEncoded,

@@ -10,13 +10,16 @@ namespace {
 // Rounds through a cycle until nothing changes any more; attributes that still change then (a list that
 // grows with every round) are taken as they are.
 constexpr int kMostRounds = 8;
-// Different sets of arriving attributes for which one output is worked out within an outermost query. A
-// definition placed more often than that gives what reaches it.
-constexpr int kMostAnswers = 4096;
+// What the custom transformers inside may cost within one outermost query, in characters of the attributes
+// that reach them. Definitions that are placed in each other again and again, each time with other
+// attributes, could ask for more than any machine has: what exceeds this gives what reaches it.
+constexpr qint64 kMostCost = 32 * 1024 * 1024;
+constexpr qint64 kCostOfQuestion = 512;
 
 struct QueryState {
   int depth = 0;
   quint64 number = 0;
+  qint64 cost = 0;
 };
 
 QueryState& queryState() {
@@ -30,8 +33,10 @@ QueryState& queryState() {
 struct CompoundTransformerNetwork::AttributeQuery {
   explicit AttributeQuery(bool& isEvaluating) : m_isEvaluating(isEvaluating) {
     m_isEvaluating = true;
-    if (queryState().depth++ == 0)
+    if (queryState().depth++ == 0) {
       ++queryState().number;
+      queryState().cost = 0;
+    }
   }
   ~AttributeQuery() {
     m_isEvaluating = false;
@@ -101,6 +106,13 @@ QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& outpu
     m_memo->query = queryState().number;
     m_memo->answers.clear();
   }
+  queryState().cost += kCostOfQuestion;
+  for (const QString& input : m_inputs) {
+    for (const QString& attribute : m_inputNodes.at(input)->setAttributes())
+      queryState().cost += attribute.size();
+  }
+  if (queryState().cost > kMostCost)
+    return arrivingAttributes();
   AttributeMemo::Key key;
   key.output = output;
   for (const QString& input : m_inputs)
@@ -111,8 +123,6 @@ QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& outpu
   const auto known = m_memo->answers.constFind(key);
   if (known != m_memo->answers.constEnd())
     return *known;
-  if (m_memo->answers.size() >= kMostAnswers)
-    return arrivingAttributes();
   const QStringList answer = evaluate(*node->second, order, origins);
   m_memo->answers.insert(key, answer);
   return answer;
