@@ -15,7 +15,6 @@
 
 namespace {
 
-const QLatin1String kDescriptionProperty("DESCRIPTION");
 const QLatin1String kHistoryProperty("HISTORY");
 
 template <class Value>

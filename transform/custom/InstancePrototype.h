@@ -10,11 +10,11 @@ class CompoundTransformerNetwork;
 class TransformerCfg;
 
 // Added to instances of a custom transformer that loops while others wait.
-constexpr QLatin1String kMaxLoopIterationsParameter("MAX_LOOP_ITERATIONS");
-constexpr QLatin1String kIterationCountParameter("ITERATION_COUNT_ATTR");
+inline const QLatin1String kMaxLoopIterationsParameter("MAX_LOOP_ITERATIONS");
+inline const QLatin1String kIterationCountParameter("ITERATION_COUNT_ATTR");
 // Added to instances of a custom transformer that may run in several processes, unless its group-by is a
 // reference to a parameter.
-constexpr QLatin1String kProcessGroupByParameter("ORX_PROCESS_GROUP_BY");
+inline const QLatin1String kProcessGroupByParameter("ORX_PROCESS_GROUP_BY");
 
 std::shared_ptr<const TransformerCfg> makeInstancePrototype(const CompoundTransformerNetwork& network);
 

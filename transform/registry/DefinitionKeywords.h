@@ -46,32 +46,32 @@ ORX_EXPORT QString keywordValue(const DefinitionKeyword& keyword, const QString&
 
 // Words that stand alone on a line and enclose a block; kCategoryDescriptionStart is followed by the
 // category's name.
-inline constexpr QLatin1String kTemplateStart("TEMPLATE_START");
-inline constexpr QLatin1String kTemplateEnd("TEMPLATE_END");
-inline constexpr QLatin1String kDescriptionStart("DESCRIPTION_START");
-inline constexpr QLatin1String kDescriptionEnd("DESCRIPTION_END");
-inline constexpr QLatin1String kTooltipStart("TOOLTIP_START");
-inline constexpr QLatin1String kTooltipEnd("TOOLTIP_END");
-inline constexpr QLatin1String kChangeLogStart("CHANGE_LOG_START");
-inline constexpr QLatin1String kChangeLogEnd("CHANGE_LOG_END");
-inline constexpr QLatin1String kCategoryDescriptionStart("CATEGORY_DESCRIPTION_START");
-inline constexpr QLatin1String kCategoryDescriptionEnd("CATEGORY_DESCRIPTION_END");
+inline const QLatin1String kTemplateStart("TEMPLATE_START");
+inline const QLatin1String kTemplateEnd("TEMPLATE_END");
+inline const QLatin1String kDescriptionStart("DESCRIPTION_START");
+inline const QLatin1String kDescriptionEnd("DESCRIPTION_END");
+inline const QLatin1String kTooltipStart("TOOLTIP_START");
+inline const QLatin1String kTooltipEnd("TOOLTIP_END");
+inline const QLatin1String kChangeLogStart("CHANGE_LOG_START");
+inline const QLatin1String kChangeLogEnd("CHANGE_LOG_END");
+inline const QLatin1String kCategoryDescriptionStart("CATEGORY_DESCRIPTION_START");
+inline const QLatin1String kCategoryDescriptionEnd("CATEGORY_DESCRIPTION_END");
 
 // Keywords that the code names.
-inline constexpr QLatin1String kTransformerName("TRANSFORMER_NAME:");
-inline constexpr QLatin1String kVersion("VERSION:");
-inline constexpr QLatin1String kParameterName("PARAMETER_NAME:");
-inline constexpr QLatin1String kParameterType("PARAMETER_TYPE:");
-inline constexpr QLatin1String kParameterPrompt("PARAMETER_PROMPT:");
-inline constexpr QLatin1String kParameterDefault("PARAMETER_DEFAULT:");
-inline constexpr QLatin1String kParameterLookup("PARAMETER_LOOKUP:");
-inline constexpr QLatin1String kLocalizedName("LOCALIZED_NAME:");
-inline constexpr QLatin1String kCategoryName("CATEGORY_NAME:");
-inline constexpr QLatin1String kTagDescription("TAG_DESCRIPTION");
+inline const QLatin1String kTransformerName("TRANSFORMER_NAME:");
+inline const QLatin1String kVersion("VERSION:");
+inline const QLatin1String kParameterName("PARAMETER_NAME:");
+inline const QLatin1String kParameterType("PARAMETER_TYPE:");
+inline const QLatin1String kParameterPrompt("PARAMETER_PROMPT:");
+inline const QLatin1String kParameterDefault("PARAMETER_DEFAULT:");
+inline const QLatin1String kParameterLookup("PARAMETER_LOOKUP:");
+inline const QLatin1String kLocalizedName("LOCALIZED_NAME:");
+inline const QLatin1String kCategoryName("CATEGORY_NAME:");
+inline const QLatin1String kTagDescription("TAG_DESCRIPTION");
 
 // Words inside values.
-inline constexpr QLatin1String kBlankEntry("<BLANK>");
-inline constexpr QLatin1String kNoInput("<NO_INPUT>");
+inline const QLatin1String kBlankEntry("<BLANK>");
+inline const QLatin1String kNoInput("<NO_INPUT>");
 
 // The feature-holding bit of a mode; 0 for a word that is none.
 ORX_EXPORT int featureHoldingBit(const QString& mode);

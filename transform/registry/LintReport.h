@@ -27,42 +27,42 @@ constexpr bool kError = true;
 constexpr bool kWarning = false;
 
 // The file.
-inline constexpr LintRule kUnreadable{QLatin1String("unreadable-file"), kError};
-inline constexpr LintRule kNotUtf8{QLatin1String("not-utf8"), kError};
-inline constexpr LintRule kWorkspaceMark{QLatin1String("workspace-mark"), kError};
-inline constexpr LintRule kOpenBlock{QLatin1String("open-block"), kError};
-inline constexpr LintRule kUnfinished{QLatin1String("unfinished-definition"), kError};
+inline const LintRule kUnreadable{QLatin1String("unreadable-file"), kError};
+inline const LintRule kNotUtf8{QLatin1String("not-utf8"), kError};
+inline const LintRule kWorkspaceMark{QLatin1String("workspace-mark"), kError};
+inline const LintRule kOpenBlock{QLatin1String("open-block"), kError};
+inline const LintRule kUnfinished{QLatin1String("unfinished-definition"), kError};
 // The header.
-inline constexpr LintRule kUnknownKeyword{QLatin1String("unknown-keyword"), kError};
-inline constexpr LintRule kRepeatedKeyword{QLatin1String("repeated-keyword"), kWarning};
-inline constexpr LintRule kBadValue{QLatin1String("bad-value"), kError};
-inline constexpr LintRule kDuplicateDefinition{QLatin1String("duplicate-definition"), kError};
-inline constexpr LintRule kMissingText{QLatin1String("missing-text"), kWarning};
+inline const LintRule kUnknownKeyword{QLatin1String("unknown-keyword"), kError};
+inline const LintRule kRepeatedKeyword{QLatin1String("repeated-keyword"), kWarning};
+inline const LintRule kBadValue{QLatin1String("bad-value"), kError};
+inline const LintRule kDuplicateDefinition{QLatin1String("duplicate-definition"), kError};
+inline const LintRule kMissingText{QLatin1String("missing-text"), kWarning};
 // Ports and attributes.
-inline constexpr LintRule kUnknownPort{QLatin1String("unknown-port"), kError};
-inline constexpr LintRule kBadListAction{QLatin1String("bad-list-action"), kError};
-inline constexpr LintRule kBadMapping{QLatin1String("bad-mapping"), kError};
+inline const LintRule kUnknownPort{QLatin1String("unknown-port"), kError};
+inline const LintRule kBadListAction{QLatin1String("bad-list-action"), kError};
+inline const LintRule kBadMapping{QLatin1String("bad-mapping"), kError};
 // Parameters.
-inline constexpr LintRule kParameterLines{QLatin1String("parameter-lines"), kError};
-inline constexpr LintRule kDuplicateParameter{QLatin1String("duplicate-parameter"), kError};
-inline constexpr LintRule kUnknownParameter{QLatin1String("unknown-parameter"), kError};
-inline constexpr LintRule kUnknownType{QLatin1String("unknown-type"), kError};
-inline constexpr LintRule kPlainText{QLatin1String("plain-text-type"), kError};
-inline constexpr LintRule kBadDefault{QLatin1String("bad-default"), kError};
+inline const LintRule kParameterLines{QLatin1String("parameter-lines"), kError};
+inline const LintRule kDuplicateParameter{QLatin1String("duplicate-parameter"), kError};
+inline const LintRule kUnknownParameter{QLatin1String("unknown-parameter"), kError};
+inline const LintRule kUnknownType{QLatin1String("unknown-type"), kError};
+inline const LintRule kPlainText{QLatin1String("plain-text-type"), kError};
+inline const LintRule kBadDefault{QLatin1String("bad-default"), kError};
 // The template.
-inline constexpr LintRule kBadStatement{QLatin1String("bad-statement"), kError};
-inline constexpr LintRule kUnknownToken{QLatin1String("unknown-token"), kError};
-inline constexpr LintRule kOutputRoute{QLatin1String("output-route"), kError};
-inline constexpr LintRule kOmittableLine{QLatin1String("omittable-line"), kError};
-inline constexpr LintRule kUnusedPort{QLatin1String("unused-port"), kWarning};
-inline constexpr LintRule kUnusedParameter{QLatin1String("unused-parameter"), kWarning};
+inline const LintRule kBadStatement{QLatin1String("bad-statement"), kError};
+inline const LintRule kUnknownToken{QLatin1String("unknown-token"), kError};
+inline const LintRule kOutputRoute{QLatin1String("output-route"), kError};
+inline const LintRule kOmittableLine{QLatin1String("omittable-line"), kError};
+inline const LintRule kUnusedPort{QLatin1String("unused-port"), kWarning};
+inline const LintRule kUnusedParameter{QLatin1String("unused-parameter"), kWarning};
 // Companions.
-inline constexpr LintRule kUnknownInCompanion{QLatin1String("unknown-in-companion"), kError};
-inline constexpr LintRule kMissingTranslation{QLatin1String("missing-translation"), kWarning};
+inline const LintRule kUnknownInCompanion{QLatin1String("unknown-in-companion"), kError};
+inline const LintRule kMissingTranslation{QLatin1String("missing-translation"), kWarning};
 // Scripts.
-inline constexpr LintRule kTclSyntax{QLatin1String("tcl-syntax"), kError};
-inline constexpr LintRule kPythonSyntax{QLatin1String("python-syntax"), kError};
-inline constexpr LintRule kUncheckedPython{QLatin1String("unchecked-python"), kWarning};
+inline const LintRule kTclSyntax{QLatin1String("tcl-syntax"), kError};
+inline const LintRule kPythonSyntax{QLatin1String("python-syntax"), kError};
+inline const LintRule kUncheckedPython{QLatin1String("unchecked-python"), kWarning};
 
 }  // namespace lint_rules
 
