@@ -20,8 +20,8 @@
 // Inside a definition the published parameters are macros whose values only the instance knows.
 class CustomDefinition::Listener : public TransformerCfgListener {
  public:
-  explicit Listener(const QString& prefixReference)
-      : m_start(QLatin1String("$(") + prefixReference + QLatin1Char('_')) {}
+  Listener(const QString& prefixReference, const TransformerCfgListener& surroundings)
+      : m_start(QLatin1String("$(") + prefixReference + QLatin1Char('_')), m_surroundings(surroundings) {}
 
   QString unpackValue(const TransformerCfg&, const QString& value, bool isEncoded,
                       UnpackLevel level) const override {
@@ -42,15 +42,22 @@ class CustomDefinition::Listener : public TransformerCfgListener {
     return isRunTimeValue(cfg, value);
   }
 
+  // Macros of the workspace are no parameters here, but the engine knows them all the same.
+  bool expandMacros(const TransformerCfg& cfg, QString& text) const override {
+    return m_surroundings.expandMacros(cfg, text);
+  }
+
  private:
   const QString m_start;
+  const TransformerCfgListener& m_surroundings;
 };
 
-CustomDefinition::CustomDefinition(const ExternalDocNetwork& network)
+CustomDefinition::CustomDefinition(const ExternalDocNetwork& network,
+                                   const TransformerCfgListener& surroundings)
     : m_network(network),
       m_prefix(makePrefixMacro(network.getName())),
       m_reference(QLatin1String("$(") + m_prefix + QLatin1Char(')')),
-      m_listener(std::make_unique<Listener>(m_reference)) {}
+      m_listener(std::make_unique<Listener>(m_reference, surroundings)) {}
 
 CustomDefinition::~CustomDefinition() = default;
 

@@ -25,8 +25,9 @@ class TransformerCfg;
 
 class ORX_EXPORT CustomDefinition {
  public:
-  // `network` is not owned and is not changed: what is written are copies of its transformers.
-  explicit CustomDefinition(const ExternalDocNetwork& network);
+  // `network` is not changed: what is written are copies of its transformers. `surroundings` is the listener
+  // of the workspace. Neither is owned.
+  CustomDefinition(const ExternalDocNetwork& network, const TransformerCfgListener& surroundings);
   ~CustomDefinition();
 
   // Orders and connects the copies, checks what will be written, makes the text. False when anything was

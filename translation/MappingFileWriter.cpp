@@ -1,5 +1,6 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/LookupChecks.h>
+#include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/text/MFBuffer.h>
@@ -13,7 +14,6 @@
 
 #include <QSet>
 
-#include <algorithm>
 #include <limits>
 
 namespace {
@@ -25,13 +25,6 @@ std::size_t at(int number) {
 void writeStatement(MFBuffer& buffer, const QString& line) {
   buffer.add(line);
   buffer.flush();
-}
-
-// One word of a macro statement and of a reference.
-bool isMacroName(const QString& name) {
-  return !name.isEmpty() && std::none_of(name.begin(), name.end(), [](QChar c) {
-    return c.isSpace() || QStringLiteral("$()").contains(c);
-  });
 }
 
 }  // namespace
@@ -57,7 +50,7 @@ bool MappingFileWriter::prepare() {
 
 bool MappingFileWriter::prepareDefinitions() {
   for (const ExternalDocNetwork* network : m_workspace.customTransformers()) {
-    m_definitions.emplace_back(*network);
+    m_definitions.emplace_back(*network, m_workspace.listener);
     m_definitions.back().prepare(m_diagnostics);
   }
   return !m_diagnostics.hasErrors();

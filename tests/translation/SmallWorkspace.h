@@ -134,7 +134,7 @@ class SmallWorkspace {
 };
 
 // Makes the transformers "Copy" (INPUT to OUTPUT, REST), "Join" (LEFT, RIGHT to OUTPUT) and "Pick" (a lookup
-// choice).
+// choice) and "Map" (a choice with a lookup table).
 class SmallSource : public TransformerSource {
  public:
   std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override {
@@ -154,6 +154,10 @@ class SmallSource : public TransformerSource {
     } else if (name == "Pick") {
       parameter = "MODE";
       type = "LOOKUP_CHOICE Fast,fast%Slow<space>one,slow";
+    } else if (name == "Map") {
+      parameter = "MODE";
+      type = "CHOICE Fast%Slow";
+      definition.parameterLookups.insert(parameter, QStringList{"Fast,fast"});
     } else if (name != "Copy") {
       return nullptr;
     }

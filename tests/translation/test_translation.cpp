@@ -339,6 +339,37 @@ TEST(Translation, MacrosInLookupsAreJudgedByTheirValues) {
   EXPECT_EQ(translate(workspace, {{"A", "Fast"}}).diagnostics, QStringList());
 }
 
+TEST(Translation, LookupsInsideCustomTransformersAreJudgedByTheInstances) {
+  const struct {
+    const char* type;        // inside
+    const char* inner;       // its choice
+    const char* value;       // of the instance's parameter
+    const char* identifier;  // of the instance
+    QStringList diagnostics;
+  } cases[] = {
+      {"Pick", "$(LIMIT)", "Slow one", "First", {}},
+      {"Pick", "$(LIMIT)", "}", "First", {"unwritable-value First"}},
+      {"Pick", "x$[LIMIT]", "}", "First", {"unwritable-value First"}},
+      {"Pick", "$(LIMIT)", "$(A)", "First", {"unwritable-value First"}},
+      {"Pick", "Fast", "}", "First", {}},
+      {"Map", "$(A)", "Fast", "First", {"unwritable-value Cleaner/P"}},
+      {"Pick", "$(LIMIT)", "Fast", "[exit]", {"unwritable-value [exit]"}},
+      {"Pick", "Fast", "Fast", "[exit]", {}},
+      {"Pick", "Fast", "a\\", "First", {"unwritable-value First"}},
+      {"Pick", "Fast", "Fast", "a\"b", {"unwritable-value a\"b"}},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.parameter("GUI TEXT A Prompt", "{");
+    workspace.transformer(
+        3, "SubDocumentTransformer",
+        {"Pick", "SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", test.identifier, "LIMIT", test.value});
+    workspace.beginCustom("Cleaner", {"CATEGORY", "Mine"}).parameter("GUI TEXT LIMIT Limit", "Fast");
+    workspace.transformer(3, test.type, {"XFORMER_NAME", "P", "MODE", test.inner}).endCustom();
+    EXPECT_EQ(translate(workspace).diagnostics, test.diagnostics) << test.inner << ' ' << test.value;
+  }
+}
+
 TEST(Translation, RefusesWhatItCannotTranslate) {
   const auto with = [](const std::function<void(SmallWorkspace&)>& change) {
     SmallWorkspace workspace = copyBetween();

@@ -1,6 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/MacroText.h>
 
+#include <algorithm>
 #include <cstring>
 
 namespace {
@@ -84,4 +85,10 @@ QString withoutReferences(const QString& text) {
     done = end;
   }
   return references.empty() ? text : result + text.midRef(done);
+}
+
+bool isMacroName(const QString& name) {
+  return !name.isEmpty() && std::none_of(name.begin(), name.end(), [](QChar c) {
+    return c.isSpace() || c == QLatin1Char('$') || c == QLatin1Char('(') || c == QLatin1Char(')');
+  });
 }

@@ -19,5 +19,8 @@ ORX_EXPORT QString encodeAroundReferences(const QString& text);
 // The same for a text that is word-encoded already, or should be: what is not gets encoded.
 ORX_EXPORT QString reencodeAroundReferences(const QString& encoded);
 
+// Whether a macro may bear the name: it is one word of a macro statement and of a reference.
+ORX_EXPORT bool isMacroName(const QString& name);
+
 // A text with a harmless word in place of every reference.
 ORX_EXPORT QString withoutReferences(const QString& text);

@@ -1,7 +1,10 @@
 // What an instance of a custom transformer writes into the mapping file.
+#include <transform/core/LookupChecks.h>
+#include <transform/core/TransformerCfgListener.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CustomMessages.h>
+#include <transform/custom/LookedUpParameters.h>
 #include <transform/custom/ParameterReferences.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/GlobalMacros.h>
@@ -193,6 +196,7 @@ QString CompoundTransformerCfg::macroValue(const QString& parameter, const GUITy
 
 QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const {
   const QString prefix = makePrefixMacro(getVisualName());
+  std::optional<LookedUpParameters> lookedUp;  // found when the first value asks for them
   QHash<QString, QString> messages;
   for (const QString& parameter : getParameters()) {
     const GUIType& type = getParameterGUIType(parameter);
@@ -216,8 +220,32 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
     }
     if (message.isEmpty() && !areClosed({lines}))
       message = TransformResString(custom_messages::kUnclosedReference, parameter);
+    if (message.isEmpty() && language == ScriptLanguage::None) {
+      if (const long number = refuseMacroValue(parameter, lines.first(), lookedUp))
+        message = TransformResString(number);
+    }
     if (!message.isEmpty())
       messages.insert(parameter, message);
   }
   return messages;
+}
+
+// The inside is written once for all instances, so what its fragments cannot carry is found here.
+long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QString& value,
+                                              std::optional<LookedUpParameters>& lookedUp) const {
+  const bool isName = parameter == kIdentifierParameter;
+  if (value.endsWith(QLatin1Char('\\')))
+    return lookup_checks::kEndsInBackslash;
+  QString expanded = MFBuffer::withOrdinaryMacros(value);
+  const bool ends = !listener() || listener()->expandMacros(*this, expanded);
+  // The name stands in quotes as it is.
+  if (isName && expanded.contains(QLatin1Char('"')))
+    return lookup_checks::kIdentifierInScript;
+  if ((ends && lookup_checks::fitsFragment(expanded)) || !m_network)
+    return 0;
+  if (!lookedUp)
+    lookedUp.emplace(*m_network);
+  if (isName)
+    return lookedUp->hasFragment() ? lookup_checks::kIdentifierInScript : 0;
+  return lookedUp->contains(parameter) ? lookup_checks::kValueInScript : 0;
 }

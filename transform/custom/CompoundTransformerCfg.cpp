@@ -1,5 +1,6 @@
 // Everything but the mapping file, which is written in CompoundMappingFile.cpp.
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/MacroText.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CustomMessages.h>
@@ -8,6 +9,7 @@
 #include <transform/custom/ParameterReferences.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
 
 #include <QSet>
 
@@ -337,8 +339,11 @@ void CompoundTransformerCfg::turnOffMultiProcessing() {
 }
 
 QString CompoundTransformerCfg::instantiationFault() const {
-  return m_network ? findNestingFault(*m_network)
-                   : TransformResString(custom_messages::kNoInstance, getName());
+  if (!m_network)
+    return TransformResString(custom_messages::kNoInstance, getName());
+  return isMacroName(makePrefixMacro(getVisualName()))
+             ? findNestingFault(*m_network)
+             : TransformResString(custom_messages::kNoMacroName, getVisualName());
 }
 
 // --- listening ---------------------------------------------------------------------------------------------

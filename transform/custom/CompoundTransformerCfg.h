@@ -9,7 +9,10 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetworkListener.h>
 
+#include <optional>
+
 class CompoundTransformerNetwork;
+class LookedUpParameters;
 
 class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public CompoundTransformerNetworkListener {
  public:
@@ -69,7 +72,8 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   // The first version that the network or a transformer inside names.
   QString pythonVersion() const;
   // What would make the parameter macros wrong if they were written: scripts that their block would change,
-  // line breaks, deferred references that never close. One message per parameter.
+  // line breaks, deferred references that never close, values that a fragment inside cannot carry. One
+  // message per parameter.
   QHash<QString, QString> findUnwritableParameters() const;
   // A message for the user; empty when instances can be written.
   QString instantiationFault() const;
@@ -97,6 +101,9 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   Statements outputRenamers() const;
   // One line each.
   QStringList parameterStatements(const QString& prefixMacro, bool defaultsOnly) const;
+  // The number of the message that says why, or 0.
+  long refuseMacroValue(const QString& parameter, const QString& value,
+                        std::optional<LookedUpParameters>& lookedUp) const;
   QString macroValue(const QString& parameter, const GUIType& type, const QString& prefixMacro) const;
   // What the AttributeSetters inside, at any depth, have as their "DEST_ATTR".
   QSet<QString> attributeSetterDestinations() const;

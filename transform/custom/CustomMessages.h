@@ -31,5 +31,6 @@ constexpr long kPromptMaxIterations = 370848;
 constexpr long kPromptIterationCount = 370849;
 constexpr long kPromptGroupBy = 370850;
 constexpr long kNoInstance = 370851;
+constexpr long kNoMacroName = 370852;
 
 }  // namespace custom_messages
