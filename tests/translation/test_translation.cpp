@@ -361,9 +361,8 @@ TEST(Translation, LookupsInsideCustomTransformersAreJudgedByTheInstances) {
   for (const auto& test : cases) {
     SmallWorkspace workspace;
     workspace.parameter("GUI TEXT A Prompt", "{");
-    workspace.transformer(
-        3, "SubDocumentTransformer",
-        {"Pick", "SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", test.identifier, "LIMIT", test.value});
+    workspace.transformer(3, "SubDocumentTransformer",
+                          {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", test.identifier, "LIMIT", test.value});
     workspace.beginCustom("Cleaner", {"CATEGORY", "Mine"}).parameter("GUI TEXT LIMIT Limit", "Fast");
     workspace.transformer(3, test.type, {"XFORMER_NAME", "P", "MODE", test.inner}).endCustom();
     EXPECT_EQ(translate(workspace).diagnostics, test.diagnostics) << test.inner << ' ' << test.value;
