@@ -2,6 +2,8 @@
 #include <translation/GlobalParameters.h>
 #include <translation/MacroReferences.h>
 
+#include <algorithm>
+
 namespace {
 
 // Values that refer to values that refer to values can grow without end; what goes beyond these stays as it
@@ -16,26 +18,32 @@ QString referencedName(const QString& reference) {
   return reference.mid(2, reference.size() - 3);
 }
 
+// The first word of a trimmed text, which loses it and the blanks behind it.
+QString takeWord(QString& text) {
+  const auto end = std::find_if(text.cbegin(), text.cend(), [](QChar c) { return c.isSpace(); });
+  const QString word = text.left(static_cast<int>(end - text.cbegin()));
+  text = text.mid(word.size()).trimmed();
+  return word;
+}
+
 }  // namespace
 
 void GlobalParameters::readHeaderLine(const QString& line, int lineNumber) {
-  for (const QLatin1String keyword : {QLatin1String("DEFAULT_MACRO "), QLatin1String("MACRO ")}) {
-    if (!line.startsWith(keyword))
-      continue;
-    const QString rest = line.mid(keyword.size()).trimmed();
-    const int blank = rest.indexOf(QLatin1Char(' '));
-    const QString name = blank < 0 ? rest : rest.left(blank);
-    if (name.isEmpty())
-      return;
-    const bool isNew = !m_index.contains(name);
-    Parameter& parameter = entry(name);
-    // An earlier setting stands against a default.
-    if (isNew || keyword == QLatin1String("MACRO "))
-      parameter.value = blank < 0 ? QString() : rest.mid(blank + 1).trimmed();
-    parameter.setInHeader = true;
-    parameter.line = lineNumber;
+  QString rest = line.trimmed();
+  const QString keyword = takeWord(rest);
+  const bool isSetting = keyword == QLatin1String("MACRO");
+  if (!isSetting && keyword != QLatin1String("DEFAULT_MACRO"))
     return;
-  }
+  const QString name = takeWord(rest);
+  if (name.isEmpty())
+    return;
+  const bool isNew = !m_index.contains(name);
+  Parameter& parameter = entry(name);
+  // An earlier setting stands against a default.
+  if (isNew || isSetting)
+    parameter.value = rest;
+  parameter.setInHeader = true;
+  parameter.line = lineNumber;
 }
 
 void GlobalParameters::declare(const QString& name, const QString& value, int lineNumber) {

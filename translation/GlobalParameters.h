@@ -25,7 +25,7 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
     const QString& currentValue() const { return isOverridden ? overridingValue : value; }
   };
 
-  // Takes "MACRO NAME VALUE" and "DEFAULT_MACRO NAME VALUE" lines; every other line is passed over.
+  // Takes "MACRO NAME VALUE" and "DEFAULT_MACRO NAME VALUE" statements; every other one is passed over.
   void readHeaderLine(const QString& line, int lineNumber);
   // A value that the header sets is kept.
   void declare(const QString& name, const QString& value, int lineNumber);

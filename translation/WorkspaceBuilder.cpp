@@ -70,8 +70,18 @@ std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& re
 void WorkspaceBuilder::addGlobalParameters(const IXMLComponentReader& reader) {
   GlobalParameters& parameters = m_workspace->parameters;
   int lineNumber = m_workspace->firstHeaderLine;
-  for (const QString& line : m_workspace->headerLines)
-    parameters.readHeaderLine(line, lineNumber++);
+  QString statement;
+  for (const QString& line : m_workspace->headerLines) {
+    statement += line;
+    ++lineNumber;
+    if (statement.endsWith(QLatin1Char('\\'))) {
+      statement.chop(1);
+      continue;
+    }
+    parameters.readHeaderLine(statement, lineNumber - 1);
+    statement.clear();
+  }
+  parameters.readHeaderLine(statement, lineNumber - 1);
   for (const GlobalParameterStruct& record : reader.GetGlobalParameterList(QString())) {
     const QString name = GUIType::fromGuiLine(record.guiLine).getName();
     if (name.isEmpty())
@@ -108,25 +118,30 @@ void WorkspaceBuilder::addTransformer(const TransformerStruct& record) {
     placeNode(record.identifier, record.line, title, -1);
     return;
   }
-  const auto sameName = m_linesByName.constFind(title);
-  if (sameName != m_linesByName.constEnd()) {
-    m_diagnostics.report(Rule::DuplicateName, record.line, title, {title, QString::number(sameName.value())});
-  } else {
-    m_linesByName.insert(title, record.line);
-  }
-
   WorkspaceNode node;
   node.identifier = record.identifier;
   node.line = record.line;
   node.name = title;
   node.cfg = makeTransformer(record, title);
   if (!node.cfg) {
+    takeName(title, record.line);
     placeNode(record.identifier, record.line, title, -1);
     return;
   }
   applyRecord(record, node);
-  if (placeNode(record.identifier, record.line, title, static_cast<int>(m_workspace->nodes.size())))
+  // The identifier may have come out shorter than the record's name; it is what the statements hold.
+  node.name = node.cfg->getIdentifier();
+  takeName(node.name, record.line);
+  if (placeNode(record.identifier, record.line, node.name, static_cast<int>(m_workspace->nodes.size())))
     m_workspace->nodes.push_back(std::move(node));
+}
+
+void WorkspaceBuilder::takeName(const QString& name, int line) {
+  const auto earlier = m_linesByName.constFind(name);
+  if (earlier != m_linesByName.constEnd())
+    m_diagnostics.report(Rule::DuplicateName, line, name, {name, QString::number(earlier.value())});
+  else
+    m_linesByName.insert(name, line);
 }
 
 std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const TransformerStruct& record,

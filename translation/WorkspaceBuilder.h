@@ -39,6 +39,7 @@ class ORX_EXPORT WorkspaceBuilder {
   std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& nodeName);
   void reportCustomTransformers();
   void applyRecord(const TransformerStruct& record, WorkspaceNode& node);
+  void takeName(const QString& name, int line);
   bool placeNode(int identifier, int line, const QString& name, int node);
   // False when the link cannot be placed; `source` and `target` are -1 when it leads to a node that is left
   // out.

@@ -167,6 +167,18 @@ TEST(ConfigDefinition, CopiesHoldTheirOwnValuesPortsAndIdentity) {
   EXPECT_EQ(prototype.getParameterValue(qs("A")), qs("2"));
   EXPECT_EQ(prototype.getInputAttributeUnion(), words("y"));
   EXPECT_FALSE(prototype.hasParameter(qs("B")));
+
+  TransformerDefinition inputs = makeDefinition({});
+  inputs.inputTags = words("IN SECOND");
+  TransformerCfg earlier;
+  earlier.configure(inputs);
+  earlier.setInputAttributes({{qs("IN"), words("first")}, {qs("SECOND"), words("second")}});
+  EXPECT_EQ(earlier.getInputAttributeUnion(), words("first second"));
+  inputs.inputTags = words("SECOND IN");
+  TransformerCfg later;
+  later.configure(inputs);
+  later.copyValues(&earlier);
+  EXPECT_EQ(later.getInputAttributeUnion(), words("second first"));
 }
 
 TEST(ConfigDefinition, ClosedStringsReachTheSameOperations) {

@@ -221,6 +221,10 @@ TEST(ConfigValues, RecordsStayPutWhileValuesChange) {
   EXPECT_EQ(record->getName(), qs("B"));
   EXPECT_TRUE(record->choices().contains(qs("b")));
   EXPECT_EQ(record->getTypeWithConfig(), qs("CHOICE a%b"));
+  record->setTypeFromGUILine(qs("GUI OPTIONAL LISTBOX OTHER c%d Other prompt"));
+  EXPECT_EQ(record->getName(), qs("B"));
+  EXPECT_EQ(record->getTypeWithConfig(), qs("LISTBOX c%d"));
+  EXPECT_TRUE(record->getFlag(kGUITypeOptional));
   record->setTypeFromGUILine(qs("CHOICE \"\""));
   EXPECT_EQ(record->getTypeWithConfig(), qs("CHOICE"));
 }

@@ -160,6 +160,9 @@ TEST(Values, SeveralProcesses) {
       {"No Parallelism", "a", false},  {"NO_PARALLELISM", "a", false}, {"NO", "a", false},
       {"Moderate", "<UNUSED>", false}, {"MODERATE", "a b", true},      {"Extreme", "<Unused>", true},
   };
+  // The group-by value stands in no line of the template, yet it is written.
+  const auto faulty = makeCfg({{}, {}, {{"GROUP", "ATTR_LIST", "a\nb"}}, {"F"}, false, "GROUP"});
+  EXPECT_EQ(faulty->findUnwritableValues().keys(), QStringList("GROUP"));
   for (const Case& c : cases) {
     const auto cfg = makeCfg({{"IN"},
                               {"OUT", "FREE"},

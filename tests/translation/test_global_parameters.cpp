@@ -18,7 +18,8 @@ TEST(GlobalParameters, HeaderLinesSetValues) {
       {"the last setting stands", {"MACRO A x", "MACRO A y"}, "y", true},
       {"a default does not undo a setting", {"MACRO A x", "DEFAULT_MACRO A y"}, "x", true},
       {"a setting without value", {"MACRO A"}, "", true},
-      {"another keyword", {"MACROS A x", " MACRO A x", "INCLUDE A x"}, "", false},
+      {"any blanks", {" MACRO\tA \t x y "}, "x y", true},
+      {"another keyword", {"MACROS A x", "# MACRO A x", "INCLUDE A x"}, "", false},
   };
   for (const auto& test : cases) {
     GlobalParameters parameters;

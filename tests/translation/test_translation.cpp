@@ -337,6 +337,9 @@ TEST(Translation, MacrosInLookupsAreJudgedByTheirValues) {
   workspace.header("MACRO A {").transformer(7, "Pick", {"XFORMER_NAME", "P", "MODE", "$(A)"});
   EXPECT_EQ(translate(workspace).diagnostics, QStringList("unwritable-value P"));
   EXPECT_EQ(translate(workspace, {{"A", "Fast"}}).diagnostics, QStringList());
+  SmallWorkspace continued = copyBetween();
+  continued.header("MACRO A x\\").header("{").transformer(7, "Pick", {"XFORMER_NAME", "P", "MODE", "$(A)"});
+  EXPECT_EQ(translate(continued).diagnostics, QStringList("unwritable-value P"));
 }
 
 TEST(Translation, LookupsInsideCustomTransformersAreJudgedByTheInstances) {
@@ -399,6 +402,11 @@ TEST(Translation, RefusesWhatItCannotTranslate) {
          w.transformer(7, "Copy", {"XFORMER_NAME", "C"});
        }),
        {"duplicate-name C"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", QString("x").repeated(1030)})
+             .transformer(8, "Copy", {"XFORMER_NAME", QString("x").repeated(1031)});
+       }),
+       {"duplicate-name " + QString("x").repeated(1023)}},
       {with([](auto& w) {
          w.transformer(1, "Copy", {"XFORMER_NAME", "N"});
        }),

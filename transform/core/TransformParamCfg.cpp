@@ -23,7 +23,9 @@ QString TransformParamCfg::getTypeWithConfig() const {
 }
 
 void TransformParamCfg::setTypeFromGUILine(const QString& line) {
-  GUIType::operator=(GUIType::fromTransformerTypeString(line, getName(), getDescription()));
+  const GUIType promptLine = GUIType::fromGuiLine(line);
+  const QString typeText = promptLine.isNull() ? line : promptLine.getTypeText();
+  GUIType::operator=(GUIType::fromTransformerTypeString(typeText, getName(), getDescription()));
   rebuildLookupData();
 }
 

@@ -26,7 +26,8 @@ class ORX_EXPORT TransformParamCfg : public GUIType {
 
   // The type and, unless empty or `""`, a blank and the configuration.
   QString getTypeWithConfig() const;
-  // Takes the type from the type text of a definition; name and prompt stay, the lookup data is rebuilt.
+  // Takes the type from a prompt line, or from the type text of a definition; name and prompt stay, the
+  // lookup data is rebuilt.
   void setTypeFromGUILine(const QString& line);
 
   // The entries of a choice or list box type; empty for any other. Shared by all copies.

@@ -75,6 +75,8 @@ void TransformerCfg::copyValues(const TransformerCfg* other) {
     }
   }
   deepCopyAttributeInfo(other);
+  // Its order is that of the inputs, which may be others here.
+  m_attributeUnion.reset();
 }
 
 void TransformerCfg::deepCopyParameterInfo(const TransformerCfg* other) {
