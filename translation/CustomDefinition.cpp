@@ -91,17 +91,19 @@ bool CustomDefinition::prepare(Diagnostics& diagnostics) {
   if (diagnostics.hasErrors())
     return false;
 
-  QStringList fields = {m_network.getName(), QString::number(m_network.getVersion()), m_network.getCategory(),
-                        m_network.getGUID()};
+  // Commas separate the fields; a category may list several.
+  const QString category = m_network.getCategory().replace(QLatin1Char(','), QLatin1Char(' ')).simplified();
+  const QString guid = m_network.getGUID().replace(QLatin1Char(','), QLatin1Char(' ')).simplified();
+  const QStringList fields = {m_network.getName(), QString::number(m_network.getVersion()), category, guid};
   m_block = QORXToLocal8Bit(CustomTransformerHeader::openingLine(fields)) + '\n';
-  for (const QByteArray& line : body().split('\n')) {
+  for (const QByteArray& line : body(diagnostics).split('\n')) {
     if (!line.isEmpty())
       m_block += "# " + line + '\n';
     else
       m_block += "#\n";
   }
   m_block += "# TRANSFORMER_END\n\n";
-  return true;
+  return !diagnostics.hasErrors();
 }
 
 void CustomDefinition::write(MFBuffer& buffer) const {
@@ -182,26 +184,31 @@ void CustomDefinition::connect(Part& part) const {
   }
 }
 
+QString CustomDefinition::title(const Part& part) const {
+  return m_network.getName() + QLatin1Char('/') + part.node->name();
+}
+
 void CustomDefinition::check(const Part& part, Diagnostics& diagnostics) const {
-  const QString title = m_network.getName() + QLatin1Char('/') + part.node->name();
   const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(part.cfg.get());
   const QHash<QString, QString> faults =
       custom ? custom->findUnwritableParameters() : part.cfg->findUnwritableValues();
   for (const QString& parameter : part.cfg->getParameters()) {
     const auto fault = faults.constFind(parameter);
     if (fault != faults.constEnd())
-      diagnostics.report(Rule::UnwritableValue, 0, title, {parameter, fault.value()});
+      diagnostics.report(Rule::UnwritableValue, 0, title(part), {parameter, fault.value()});
   }
 }
 
-QByteArray CustomDefinition::body() {
+QByteArray CustomDefinition::body(Diagnostics& diagnostics) {
   QByteArray text;
   QBuffer device(&text);
   device.open(QIODevice::WriteOnly);
   {
     MFDeviceBuffer buffer(device);
-    for (Part& part : m_parts)
-      part.cfg->instantiate(buffer, m_network.getName());
+    for (Part& part : m_parts) {
+      if (!part.cfg->instantiate(buffer, m_network.getName()))
+        diagnostics.report(Rule::NotWritten, 0, title(part), {part.cfg->getName()});
+    }
     // What reaches an output leaves under the port's inner name; what reaches a loop point leaves by the
     // loop's output.
     for (const SubDocNetworkObj* node : m_network.nodes()) {

@@ -52,7 +52,8 @@ class ORX_EXPORT CustomDefinition {
   QString innerName(const QString& name) const;
   // The flow that a link's end brings, or takes, at that node and port.
   QString flowFrom(const SubDocNetworkObj& node, const QString& port) const;
-  QByteArray body();
+  QString title(const Part& part) const;
+  QByteArray body(Diagnostics& diagnostics);
   QString redirect(const QString& value) const;
 
   const ExternalDocNetwork& m_network;

@@ -27,6 +27,7 @@ const std::vector<DiagnosticRule>& diagnosticRules() {
       // The texts of these come from the custom transformer.
       {Rule::Nesting, QLatin1String("nesting"), Severity::Error, 0},
       {Rule::CustomTransformerFault, QLatin1String("custom-transformer-fault"), Severity::Error, 0},
+      {Rule::NotWritten, QLatin1String("not-written"), Severity::Error, 370853},
   };
   return rules;
 }

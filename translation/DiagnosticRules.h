@@ -34,6 +34,7 @@ enum class Rule {
   TakenName,
   Nesting,
   CustomTransformerFault,
+  NotWritten,
 };
 
 struct DiagnosticRule {

@@ -256,7 +256,7 @@ void MappingFileWriter::check() {
   }
 }
 
-void MappingFileWriter::write(MFBuffer& buffer) {
+bool MappingFileWriter::write(MFBuffer& buffer) {
   writeStatement(buffer, QLatin1String("# Written by ") + programVersion());
   if (!m_workspace.headerLines.isEmpty()) {
     for (const QString& line : m_workspace.headerLines)
@@ -267,9 +267,13 @@ void MappingFileWriter::write(MFBuffer& buffer) {
   writeFeatureTypes(buffer);
   for (const CustomDefinition& definition : m_definitions)
     definition.write(buffer);
-  for (const int node : m_order)
-    m_workspace.nodes[at(node)].cfg->instantiate(buffer, m_workspace.fileName);
+  for (const int number : m_order) {
+    const WorkspaceNode& node = m_workspace.nodes[at(number)];
+    if (!node.cfg->instantiate(buffer, m_workspace.fileName))
+      m_diagnostics.report(Rule::NotWritten, node.line, node.name, {node.name});
+  }
   writeWriterRoutes(buffer);
+  return !m_diagnostics.hasErrors();
 }
 
 void MappingFileWriter::writeParameters(MFBuffer& buffer) const {

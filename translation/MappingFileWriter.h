@@ -23,8 +23,9 @@ class ORX_EXPORT MappingFileWriter {
   // Orders and connects the transformers and pushes attributes through; checks everything that will be
   // written. False when there are errors, those found before included; nothing may be written then.
   bool prepare();
-  // The whole mapping file. Call after prepare() answered true.
-  void write(MFBuffer& buffer);
+  // The whole mapping file. Call after prepare() answered true. False when a transformer did not write its
+  // statements after all, which diagnostics tell.
+  bool write(MFBuffer& buffer);
 
  private:
   bool order();

@@ -38,8 +38,7 @@ bool writeMappingFile(Workspace& workspace, QIODevice& device, Diagnostics& diag
   if (!writer.prepare())
     return false;
   MFDeviceBuffer buffer(device);
-  writer.write(buffer);
-  return true;
+  return writer.write(buffer);
 }
 
 TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,
@@ -58,7 +57,8 @@ TranslationResult translateWorkspace(const TranslationRequest& request, Transfor
   }
   {
     MFDeviceBuffer buffer(output.device());
-    writer.write(buffer);
+    if (!writer.write(buffer))
+      return TranslationResult::Refused;
   }
   if (!output.commit()) {
     error = output.errorString();

@@ -5,6 +5,8 @@
 #include <QFile>
 #include <QTextStream>
 
+#include <utility>
+
 namespace {
 
 QString unescaped(const QString& text) {
@@ -44,9 +46,10 @@ bool ORXLocalizedMessageDatabase::getMessage(long number, QORXString& text) cons
 }
 
 const ORXLocalizedMessageDatabase::Table& ORXLocalizedMessageDatabase::table(const QString& language) const {
-  const auto known = m_tables.constFind(language);
-  if (known != m_tables.constEnd()) {
-    return known.value();
+  const std::lock_guard<std::mutex> lock(m_mutex);
+  const auto known = m_tables.find(language);
+  if (known != m_tables.end()) {
+    return known->second;
   }
   Table texts;
   const QString folder = m_folder.isEmpty() ? QORXOrxHome() + QLatin1String("/messages") : m_folder;
@@ -65,5 +68,5 @@ const ORXLocalizedMessageDatabase::Table& ORXLocalizedMessageDatabase::table(con
       }
     }
   }
-  return m_tables.insert(language, texts).value();
+  return m_tables.emplace(language, std::move(texts)).first->second;
 }

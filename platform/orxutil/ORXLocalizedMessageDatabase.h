@@ -12,6 +12,9 @@
 #include <QHash>
 #include <QString>
 
+#include <map>
+#include <mutex>
+
 class ORX_EXPORT ORXLocalizedMessageDatabase {
  public:
   ORXLocalizedMessageDatabase() = default;
@@ -19,7 +22,8 @@ class ORX_EXPORT ORXLocalizedMessageDatabase {
   explicit ORXLocalizedMessageDatabase(const QString& folder) : m_folder(folder) {}
 
   // Fills `text` with the message of the current language, else the English one, else with nothing; answers
-  // whether there was one. Follows a change of language; a language's file is read once.
+  // whether there was one. Follows a change of language; a language's file is read once. May
+  // be asked by several threads at once.
   bool getMessage(long number, QORXString& text) const;
 
  private:
@@ -27,5 +31,7 @@ class ORX_EXPORT ORXLocalizedMessageDatabase {
   const Table& table(const QString& language) const;
 
   QString m_folder;
-  mutable QHash<QString, Table> m_tables;
+  mutable std::mutex m_mutex;
+  // Tables stay where they are once read.
+  mutable std::map<QString, Table> m_tables;
 };

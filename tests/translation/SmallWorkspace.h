@@ -133,8 +133,8 @@ class SmallWorkspace {
   int m_linkCount = 0;
 };
 
-// Makes the transformers "Copy" (INPUT to OUTPUT, REST), "Join" (LEFT, RIGHT to OUTPUT) and "Pick" (a lookup
-// choice) and "Map" (a choice with a lookup table).
+// Makes the transformers "Copy" (INPUT to OUTPUT, REST), "Join" (LEFT, RIGHT to OUTPUT), "Pick" (a lookup
+// choice), "Map" (a choice with a lookup table) and "Broken" (a template that cannot be written).
 class SmallSource : public TransformerSource {
  public:
   std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override {
@@ -158,7 +158,7 @@ class SmallSource : public TransformerSource {
       parameter = "MODE";
       type = "CHOICE Fast%Slow";
       definition.parameterLookups.insert(parameter, QStringList{"Fast,fast"});
-    } else if (name != "Copy") {
+    } else if (name != "Copy" && name != "Broken") {
       return nullptr;
     }
     definition.parameterNames = QStringList{parameter};
@@ -173,6 +173,8 @@ class SmallSource : public TransformerSource {
                                       tag + " OUTPUT FEATURE_TYPE $(OUTPUT_" + tag + "_FTYPE) $(OUTPUT_" +
                                       tag + "_FUNCS)";
     }
+    if (name == "Broken")
+      definition.templateLines << "# $[";
     auto cfg = std::make_unique<TransformerCfg>();
     cfg->configure(definition);
     return cfg;

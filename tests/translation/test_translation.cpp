@@ -291,6 +291,10 @@ TEST(Translation, RefusesFaultyCustomTransformers) {
          w.transformer(9, "Copy", {"XFORMER_NAME", "N", "VALUE", "$[x"});
        }),
        {"unwritable-value Cleaner/N"}},
+      {withCustom([](auto& w) {
+         w.transformer(9, "Broken", {"XFORMER_NAME", "N"});
+       }),
+       {"not-written Cleaner/N"}},
       {withCustom([](auto& w) { w.port(9, "IN", "false"); }), {"custom-transformer-fault Cleaner/IN"}},
   };
   for (const auto& test : cases) {
@@ -298,6 +302,12 @@ TEST(Translation, RefusesFaultyCustomTransformers) {
     EXPECT_EQ(outcome.diagnostics.mid(0, 1), test.diagnostics);
     EXPECT_EQ(outcome.result, TranslationResult::Refused);
     EXPECT_EQ(outcome.text, QString());
+  }
+  for (const char* name : {"Cleaner (2)", "A,B", "A$B"}) {
+    SmallWorkspace workspace;
+    workspace.transformer(3, "SubDocumentTransformer", {"SUB_DOC_NAME", name, "XFORMER_NAME", "First"});
+    workspace.beginCustom(name, {}).endCustom();
+    EXPECT_EQ(translate(workspace).diagnostics.mid(0, 1), QStringList("nesting First")) << name;
   }
 }
 

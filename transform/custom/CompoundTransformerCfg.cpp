@@ -341,9 +341,11 @@ void CompoundTransformerCfg::turnOffMultiProcessing() {
 QString CompoundTransformerCfg::instantiationFault() const {
   if (!m_network)
     return TransformResString(custom_messages::kNoInstance, getName());
-  return isMacroName(makePrefixMacro(getVisualName()))
-             ? findNestingFault(*m_network)
-             : TransformResString(custom_messages::kNoMacroName, getVisualName());
+  // The name is a field of the definition's opening line, and part of the prefix macro.
+  const bool isWritable =
+      isMacroName(makePrefixMacro(getVisualName())) && !getName().contains(QLatin1Char(','));
+  return isWritable ? findNestingFault(*m_network)
+                    : TransformResString(custom_messages::kNoMacroName, getVisualName());
 }
 
 // --- listening ---------------------------------------------------------------------------------------------
