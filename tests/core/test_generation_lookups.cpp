@@ -442,6 +442,9 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
     QString line;
     long number;  // 0: fine
   };
+  const QString members =
+      "MULTIPARAMETER " + MemberList::configToken(',', {GUIType::fromGuiLine("GUI TEXT A a"),
+                                                        GUIType::fromGuiLine("GUI TEXT B b")});
   const Case cases[] = {
       {{"P", "TEXT", "a\nb"}, "K $(P)", kBreaksLine},
       {{"P", "TEXT", "a\nb"}, "K $(Q)", 0},
@@ -452,6 +455,10 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", "TEXT", "a\\"}, "K $(P) x", 0},
       {{"P", "TEXT", "$[x"}, "K $(P)", kUnclosedReference},
       {{"P", "TEXT", "$[x] {\"[;"}, "K $(P)", 0},
+      {{"P", members, "A,x\\,B,y"}, "K $(A)", kEndsInBackslash},
+      {{"P", members, "A,$[x,B,]"}, "K $(A)", kUnclosedReference},
+      {{"P", members, "A,\"x\ny\",B,]"}, "K $(A)", kBreaksLine},
+      {{"P", members, "A,x,B,y"}, "K $(A)", 0},
       {{"P", "TEXT_OR_ATTR", "@Value(a)$[x\n"}, "K $(P)", 0},  // the wrapped text is one word
       {{"P", "LOOKUP_CHOICE A,a", "$(G) $["}, "K $(P)", kUnclosedReference},
       {{"P", "LOOKUP_CHOICE A,a", "$(G)\""}, "K", kValueInScript},

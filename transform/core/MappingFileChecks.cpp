@@ -1,3 +1,4 @@
+#include <platform/qorxcore/Lists.h>
 #include <transform/core/CompiledTemplate.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/ExpressionWriter.h>
@@ -116,16 +117,21 @@ long MappingFileChecks::refuse(const TransformParamCfg& record, const CompiledTe
   }
   NullBuffer buffer;
   const QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
-  if (!isOneLine(value)) {
+  // Each member stands in a place of its own.
+  const QStringList parts = record.isMultiParameter()
+                                ? QORXSdfStringToList(value, record.members().separator())
+                                : QStringList(value);
+  if (!std::all_of(parts.cbegin(), parts.cend(), isOneLine)) {
     return kBreaksLine;
   }
-  if (!isSelfClosed(value)) {
+  if (!std::all_of(parts.cbegin(), parts.cend(), isSelfClosed)) {
     return kUnclosedReference;
   }
   const int slot = compiled ? compiled->slotOf(name) : CompiledTemplate::kNoSlot;
   const bool endsLine = !compiled || m_bringsTokens || record.isMultiParameter() ||
                         (slot != CompiledTemplate::kNoSlot && compiled->endsLine(slot));
-  if (endsLine && value.endsWith(QLatin1Char('\\'))) {
+  const auto endsInBackslash = [](const QString& part) { return part.endsWith(QLatin1Char('\\')); };
+  if (endsLine && std::any_of(parts.cbegin(), parts.cend(), endsInBackslash)) {
     return kEndsInBackslash;
   }
   return name == kIdentifierParameter ? refuseIdentifier(stored) : 0;
