@@ -1,4 +1,5 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/core/LookupChecks.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CustomTransformerHeader.h>
@@ -87,6 +88,10 @@ bool CustomDefinition::prepare(Diagnostics& diagnostics) {
   for (Part& part : m_parts) {
     connect(part);
     check(part, diagnostics);
+  }
+  for (const SubDocNetworkObj* node : m_network.nodes()) {
+    if (!lookup_checks::isOneLine(node->name()))
+      diagnostics.report(Rule::LineBreak, 0, m_network.getName(), {node->name().simplified()});
   }
   if (diagnostics.hasErrors())
     return false;

@@ -295,6 +295,8 @@ TEST(Translation, RefusesFaultyCustomTransformers) {
          w.transformer(9, "Broken", {"XFORMER_NAME", "N"});
        }),
        {"not-written Cleaner/N"}},
+      {withCustom([](auto& w) { w.port(9, "A\nB", "false").link(3, "fo 0", 9, "fi 0"); }),
+       {"line-break Cleaner"}},
       {withCustom([](auto& w) { w.port(9, "IN", "false"); }), {"custom-transformer-fault Cleaner/IN"}},
   };
   for (const auto& test : cases) {
