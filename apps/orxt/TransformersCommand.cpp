@@ -1,5 +1,8 @@
+#include <apps/orxt/TransformersCategoriesCommand.h>
+#include <apps/orxt/TransformersChangeLogCommand.h>
 #include <apps/orxt/TransformersCommand.h>
 #include <apps/orxt/TransformersListCommand.h>
+#include <apps/orxt/TransformersSearchCommand.h>
 #include <apps/orxt/TransformersShowCommand.h>
 
 #include <CLI/CLI.hpp>
@@ -8,6 +11,7 @@ namespace {
 
 constexpr CommandFacts kFacts = {"transformers", "Look things up in the catalogue of transformers",
                                  "orxt transformers list --category Geometry\n"
+                                 "orxt transformers search clip area\n"
                                  "orxt transformers show GeometryBufferer"};
 
 }  // namespace
@@ -15,6 +19,9 @@ constexpr CommandFacts kFacts = {"transformers", "Look things up in the catalogu
 TransformersCommand::TransformersCommand() : Command(kFacts) {
   m_commands.push_back(std::make_unique<TransformersListCommand>());
   m_commands.push_back(std::make_unique<TransformersShowCommand>());
+  m_commands.push_back(std::make_unique<TransformersSearchCommand>());
+  m_commands.push_back(std::make_unique<TransformersCategoriesCommand>());
+  m_commands.push_back(std::make_unique<TransformersChangeLogCommand>());
 }
 
 void TransformersCommand::declare(CLI::App& app) {

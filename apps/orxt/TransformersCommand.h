@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-// The catalogue: `list` and `show`, each a small command of its own.
+// The catalogue; each way to ask it is a small command of its own.
 class TransformersCommand : public Command {
  public:
   TransformersCommand();

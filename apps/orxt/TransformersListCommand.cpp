@@ -1,13 +1,12 @@
+#include <apps/orxt/CatalogueText.h>
 #include <apps/orxt/Console.h>
 #include <apps/orxt/TransformersListCommand.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
-#include <transform/text/TextHelpers.h>
 
 #include <CLI/CLI.hpp>
 #include <QJsonArray>
 #include <QJsonDocument>
-#include <QJsonObject>
 
 #include <algorithm>
 
@@ -15,12 +14,6 @@ namespace {
 
 constexpr CommandFacts kFacts = {"list", "List the transformers by name",
                                  "orxt transformers list --category Geometry --lang de"};
-
-QString firstSentence(const QStringList& lines) {
-  const QString text = lines.join(QLatin1Char(' ')).simplified();
-  const int end = text.indexOf(QLatin1String(". "));
-  return end < 0 ? text : text.left(end + 1);
-}
 
 }  // namespace
 
@@ -58,24 +51,14 @@ ExitStatus TransformersListCommand::run(Console& console) {
 
   if (m_json) {
     QJsonArray list;
-    for (const auto& cfg : found) {
-      list.append(QJsonObject{{QStringLiteral("name"), cfg->getName()},
-                              {QStringLiteral("version"), cfg->getVersion()},
-                              {QStringLiteral("localizedName"), cfg->getLocalizedName()},
-                              {QStringLiteral("categories"), QJsonArray::fromStringList(cfg->tags())},
-                              {QStringLiteral("visible"), cfg->isVisible()},
-                              {QStringLiteral("file"), cfg->getFileName()},
-                              {QStringLiteral("summary"), firstSentence(cfg->getDescriptionLines())}});
-    }
+    for (const auto& cfg : found)
+      list.append(summaryAsJson(*cfg));
     console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
     return kExitDone;
   }
-  int width = 0;
+  std::vector<const TransformerCfg*> transformers;
   for (const auto& cfg : found)
-    width = std::max(width, cfg->getLocalizedName().size());
-  for (const auto& cfg : found)
-    console.print(
-        makeColumnString(cfg->getLocalizedName(), firstSentence(cfg->getDescriptionLines()), width + 1) +
-        QLatin1Char('\n'));
+    transformers.push_back(cfg.get());
+  printSummaries(transformers, console);
   return kExitDone;
 }

@@ -1,4 +1,5 @@
 #include <apps/orxt/Console.h>
+#include <apps/orxt/ParameterSchema.h>
 #include <apps/orxt/TransformersShowCommand.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
@@ -14,7 +15,8 @@
 namespace {
 
 constexpr CommandFacts kFacts = {"show", "Show one transformer: its ports, parameters and texts",
-                                 "orxt transformers show GeometryBufferer --version 1"};
+                                 "orxt transformers show GeometryBufferer --version 1\n"
+                                 "orxt transformers show GeometryBufferer --schema >buffer.schema.json"};
 
 constexpr int kTagColumn = 24;
 constexpr int kParameterColumn = 28;
@@ -38,7 +40,8 @@ void TransformersShowCommand::declare(CLI::App& app) {
       ->type_name("VERSION")
       ->check(CLI::IsMember({"newest", "oldest"}) | CLI::NonNegativeNumber)
       ->capture_default_str();
-  app.add_flag("--json", m_json, "As JSON");
+  CLI::Option* json = app.add_flag("--json", m_json, "As JSON");
+  app.add_flag("--schema", m_schema, "A JSON Schema of the parameters instead")->excludes(json);
   m_definitions.declare(app);
 }
 
@@ -59,7 +62,9 @@ ExitStatus TransformersShowCommand::run(Console& console) {
             : QStringLiteral("'%1' has no version %2; the newest is %3").arg(name, version).arg(newest));
     return kExitRefused;
   }
-  if (m_json)
+  if (m_schema)
+    console.print(QString::fromUtf8(QJsonDocument(ParameterSchema(*cfg).schema()).toJson()));
+  else if (m_json)
     showJson(*cfg, console);
   else
     showText(*cfg, console);

@@ -20,5 +20,6 @@ class TransformersShowCommand : public Command {
   std::string m_name;
   std::string m_version = "newest";
   bool m_json = false;
+  bool m_schema = false;
   DefinitionOptions m_definitions;
 };

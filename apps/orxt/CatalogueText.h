@@ -1,0 +1,17 @@
+// How the commands of the catalogue show transformers in lists.
+#pragma once
+
+#include <QJsonObject>
+#include <QString>
+#include <QStringList>
+
+#include <vector>
+
+class Console;
+class TransformerCfg;
+
+// Up to and with the first full stop that ends a word; all of it when there is none.
+QString firstSentence(const QStringList& lines);
+QJsonObject summaryAsJson(const TransformerCfg& transformer);
+// Shown name and first sentence of each, aligned.
+void printSummaries(const std::vector<const TransformerCfg*>& transformers, Console& console);

@@ -1,0 +1,58 @@
+#include <apps/orxt/Console.h>
+#include <apps/orxt/TransformersCategoriesCommand.h>
+#include <transform/registry/TransformerMgr.h>
+#include <transform/text/TextHelpers.h>
+
+#include <CLI/CLI.hpp>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+
+#include <algorithm>
+
+namespace {
+
+constexpr CommandFacts kFacts = {"categories", "List the categories of the catalogue with their descriptions",
+                                 "orxt transformers categories --lang de"};
+
+}  // namespace
+
+TransformersCategoriesCommand::TransformersCategoriesCommand() : Command(kFacts) {}
+
+void TransformersCategoriesCommand::declare(CLI::App& app) {
+  app.add_flag("--json", m_json, "As JSON");
+  m_definitions.declare(app);
+}
+
+ExitStatus TransformersCategoriesCommand::run(Console& console) {
+  const TransformerMgr& registry = m_definitions.load(console);
+  QStringList categories = registry.getCategories();
+  categories.sort();
+  const auto descriptionOf = [&](const QString& category) {
+    QStringList lines;
+    registry.getCategoryDesc(category, lines);
+    return lines.join(QLatin1Char(' ')).simplified();
+  };
+  if (m_json) {
+    QJsonArray list;
+    for (const QString& category : std::as_const(categories)) {
+      QStringList names = registry.getCategoryTransformers(category);
+      names.sort();
+      list.append(QJsonObject{{QStringLiteral("name"), category},
+                              {QStringLiteral("localizedName"), registry.getLocalizedCategoryName(category)},
+                              {QStringLiteral("description"), descriptionOf(category)},
+                              {QStringLiteral("transformers"), QJsonArray::fromStringList(names)}});
+    }
+    console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
+    return kExitDone;
+  }
+  int width = 0;
+  for (const QString& category : std::as_const(categories))
+    width = std::max(width, registry.getLocalizedCategoryName(category).size());
+  for (const QString& category : std::as_const(categories)) {
+    console.print(
+        makeColumnString(registry.getLocalizedCategoryName(category), descriptionOf(category), width + 1) +
+        QLatin1Char('\n'));
+  }
+  return kExitDone;
+}

@@ -1,0 +1,19 @@
+#pragma once
+
+#include <apps/orxt/Command.h>
+#include <apps/orxt/DefinitionOptions.h>
+
+#include <string>
+
+class TransformersChangeLogCommand : public Command {
+ public:
+  TransformersChangeLogCommand();
+  void declare(CLI::App& app) override;
+  ExitStatus run(Console& console) override;
+
+ private:
+  std::string m_name;
+  int m_fromVersion = -1;
+  std::string m_output = "-";
+  DefinitionOptions m_definitions;
+};

@@ -1,0 +1,77 @@
+#include <apps/orxt/CatalogueSearch.h>
+#include <apps/orxt/CatalogueText.h>
+#include <apps/orxt/Console.h>
+#include <apps/orxt/TransformersSearchCommand.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/registry/TransformerMgr.h>
+
+#include <CLI/CLI.hpp>
+#include <QJsonArray>
+#include <QJsonDocument>
+
+namespace {
+
+constexpr CommandFacts kFacts = {
+    "search", "Find transformers by words in names, aliases, categories and descriptions, best first",
+    "orxt transformers search clip area\n"
+    "orxt transformers search --lang de Geometrie"};
+
+const char* placeName(CatalogueSearch::Place place) {
+  switch (place) {
+    case CatalogueSearch::Place::ExactName:
+      return "exactName";
+    case CatalogueSearch::Place::Name:
+      return "name";
+    case CatalogueSearch::Place::Alias:
+      return "alias";
+    case CatalogueSearch::Place::Category:
+      return "category";
+    case CatalogueSearch::Place::Description:
+      break;
+  }
+  return "description";
+}
+
+}  // namespace
+
+TransformersSearchCommand::TransformersSearchCommand() : Command(kFacts) {}
+
+void TransformersSearchCommand::declare(CLI::App& app) {
+  app.add_option("word", m_words, "Words that must all be found; case does not count")
+      ->type_name("WORD")
+      ->required();
+  app.add_flag("--all", m_all, "Also those that are no longer offered");
+  app.add_flag("--json", m_json, "As JSON");
+  m_definitions.declare(app);
+}
+
+ExitStatus TransformersSearchCommand::run(Console& console) {
+  QStringList words;
+  for (const std::string& word : m_words)
+    words << QString::fromStdString(word);
+  const CatalogueSearch search(words);
+  if (search.isEmpty()) {
+    console.fail(QStringLiteral("give at least one word to search for"));
+    return kExitUsage;
+  }
+  const std::vector<CatalogueSearch::Hit> hits = search.find(m_definitions.load(console), m_all);
+  if (m_json) {
+    QJsonArray list;
+    for (const CatalogueSearch::Hit& hit : hits) {
+      QJsonObject entry = summaryAsJson(*hit.transformer);
+      entry.insert(QStringLiteral("foundIn"), QLatin1String(placeName(hit.place)));
+      list.append(entry);
+    }
+    console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
+  } else {
+    std::vector<const TransformerCfg*> transformers;
+    for (const CatalogueSearch::Hit& hit : hits)
+      transformers.push_back(hit.transformer.get());
+    printSummaries(transformers, console);
+  }
+  if (!hits.empty())
+    return kExitDone;
+  console.fail(QStringLiteral("no transformer has '%1'; `orxt transformers categories` shows where to look")
+                   .arg(words.join(QLatin1String("' and '"))));
+  return kExitRefused;
+}

@@ -1,0 +1,20 @@
+#pragma once
+
+#include <apps/orxt/Command.h>
+#include <apps/orxt/DefinitionOptions.h>
+
+#include <string>
+#include <vector>
+
+class TransformersSearchCommand : public Command {
+ public:
+  TransformersSearchCommand();
+  void declare(CLI::App& app) override;
+  ExitStatus run(Console& console) override;
+
+ private:
+  std::vector<std::string> m_words;
+  bool m_all = false;
+  bool m_json = false;
+  DefinitionOptions m_definitions;
+};
