@@ -391,7 +391,7 @@ QString TransformerCfg::getDefaultMacroLine(const QString& parameter) const {
 }
 
 QString TransformerCfg::getDefaultMacroValue(const QString& name, UnpackLevel level) const {
-  const QString value = getParameterValue(name, level);
+  QString value = getParameterValue(name, level);
   if (value != kUnusedValue) {
     return value;
   }
