@@ -1,5 +1,7 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/LookupChecks.h>
+#include <transform/core/ParameterReferences.h>
+#include <transform/core/ParameterScopeListener.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CustomTransformerHeader.h>
@@ -8,48 +10,37 @@
 #include <transform/custom/SubDocNetworkObjLoop.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
+#include <transform/text/MFBuffer.h>
 #include <transform/text/TextHelpers.h>
 #include <translation/CustomDefinition.h>
 #include <translation/FlowOrder.h>
 #include <translation/InstanceIdentity.h>
 #include <translation/MFDeviceBuffer.h>
-#include <translation/MacroReferences.h>
 #include <translation/RouteStatement.h>
 
 #include <QBuffer>
 
-// Inside a definition the published parameters are macros whose values only the instance knows.
-class CustomDefinition::Listener : public TransformerCfgListener {
+// Inside a definition the published parameters are macros whose values only the instance knows: whatever
+// refers to them also refers to the prefix macro.
+class CustomDefinition::Listener : public ParameterScopeListener {
  public:
-  Listener(const QString& prefixReference, const TransformerCfgListener& surroundings)
-      : m_start(QLatin1String("$(") + prefixReference + QLatin1Char('_')), m_surroundings(surroundings) {}
-
-  QString unpackValue(const TransformerCfg&, const QString& value, bool isEncoded,
-                      UnpackLevel level) const override {
-    return level == UnpackLevel::Decoded && isEncoded ? QORXWwjdDecode(value) : value;
-  }
-  bool isRunTimeValue(const TransformerCfg&, const QString& value) const override {
-    return value.contains(m_start);
-  }
-  bool isDeferredValue(const TransformerCfg& cfg, const QString& value) const override {
-    MacroReferences references(value);
-    while (references.next()) {
-      if (cfg.getParameterByMacroName(references.name()))
-        return true;
-    }
-    return false;
-  }
-  bool acceptsValue(const TransformerCfg& cfg, const QString&, const QString& value) const override {
-    return isRunTimeValue(cfg, value);
-  }
+  Listener(const QString& prefix, const TransformerCfgListener& surroundings)
+      : m_prefix(prefix), m_surroundings(surroundings) {}
 
   // Macros of the workspace are no parameters here, but the engine knows them all the same.
+  bool isRunTimeValue(const TransformerCfg& cfg, const QString& value) const override {
+    return ParameterScopeListener::isRunTimeValue(cfg, value) || m_surroundings.isRunTimeValue(cfg, value);
+  }
   bool expandMacros(const TransformerCfg& cfg, QString& text) const override {
     return m_surroundings.expandMacros(cfg, text);
   }
 
+ protected:
+  bool isScopeParameter(const QString& name) const override { return name == m_prefix; }
+  QString resolve(const QString& value) const override { return value; }
+
  private:
-  const QString m_start;
+  const QString m_prefix;
   const TransformerCfgListener& m_surroundings;
 };
 
@@ -58,7 +49,7 @@ CustomDefinition::CustomDefinition(const ExternalDocNetwork& network,
     : m_network(network),
       m_prefix(makePrefixMacro(network.getName())),
       m_reference(QLatin1String("$(") + m_prefix + QLatin1Char(')')),
-      m_listener(std::make_unique<Listener>(m_reference, surroundings)) {}
+      m_listener(std::make_unique<Listener>(m_prefix, surroundings)) {}
 
 CustomDefinition::~CustomDefinition() = default;
 
@@ -67,17 +58,13 @@ QString CustomDefinition::innerName(const QString& name) const {
 }
 
 QString CustomDefinition::redirect(const QString& value) const {
-  MacroReferences references(value);
-  QString result;
-  int copied = 0;
-  while (references.next()) {
-    if (!m_network.hasParameter(references.name()))
-      continue;
-    result += value.midRef(copied, references.start() - copied);
-    result += QLatin1String("$(") + innerName(references.name()) + QLatin1Char(')');
-    copied = references.end();
-  }
-  return copied == 0 ? value : result + value.midRef(copied);
+  // Deferred references become ordinary ones as soon as they are written.
+  const bool isDeferred = value.contains(QLatin1String("$[")) && MFBuffer::closesDeferredMacros(value);
+  return replaceParameterReferences(isDeferred ? MFBuffer::withOrdinaryMacros(value) : value,
+                                    [this](const QString& name, QString& replacement) {
+                                      replacement = QLatin1String("$(") + innerName(name) + QLatin1Char(')');
+                                      return m_network.hasParameter(name);
+                                    });
 }
 
 bool CustomDefinition::prepare(Diagnostics& diagnostics) {

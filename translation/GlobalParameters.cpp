@@ -1,6 +1,6 @@
+#include <transform/core/ParameterReferences.h>
 #include <transform/text/GlobalMacros.h>
 #include <translation/GlobalParameters.h>
-#include <translation/MacroReferences.h>
 
 #include <algorithm>
 
@@ -97,15 +97,6 @@ bool GlobalParameters::isBuiltInParameter(const QString& reference) const {
   return isGlobalMacro(referencedName(reference));
 }
 
-bool GlobalParameters::holdsReference(const QString& text) const {
-  MacroReferences references(text);
-  while (references.next()) {
-    if (m_index.contains(references.name()))
-      return true;
-  }
-  return false;
-}
-
 QString GlobalParameters::resolve(const QString& text) const {
   QStringList open;
   int budget = kMaximumReplacements;
@@ -113,24 +104,18 @@ QString GlobalParameters::resolve(const QString& text) const {
 }
 
 QString GlobalParameters::resolve(const QString& text, QStringList& open, int& budget) const {
-  MacroReferences references(text);
-  QString result;
-  int copied = 0;
-  while (references.next()) {
-    const Parameter* parameter = find(references.name());
+  int length = text.size();
+  QString resolved = replaceParameterReferences(text, [&](const QString& name, QString& replacement) {
+    const Parameter* parameter = find(name);
     if (!parameter || open.contains(parameter->name) || open.size() >= kMaximumNesting || --budget < 0)
-      continue;
-    result += text.midRef(copied, references.start() - copied);
+      return false;
     open.append(parameter->name);
-    result += resolve(parameter->currentValue(), open, budget);
+    replacement = resolve(parameter->currentValue(), open, budget);
     open.removeLast();
-    copied = references.end();
-    if (result.size() > kMaximumLength) {
+    length += replacement.size();
+    if (length > kMaximumLength)
       budget = 0;
-      return text;
-    }
-  }
-  if (copied == 0)
-    return text;
-  return result + text.midRef(copied);
+    return length <= kMaximumLength;
+  });
+  return resolved;
 }

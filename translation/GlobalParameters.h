@@ -41,8 +41,6 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
   bool isPrivateParameter(const QString& reference) const override;
   bool isBuiltInParameter(const QString& reference) const override;
 
-  // Whether the text holds a reference "$(NAME)" to one of these parameters.
-  bool holdsReference(const QString& text) const;
   // Every reference to one of these parameters replaced by its value, references inside values too. A
   // parameter that refers to itself keeps its reference as it stands.
   QString resolve(const QString& text) const;

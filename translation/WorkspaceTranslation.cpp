@@ -33,14 +33,6 @@ std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, Tran
   return builder.build(*reader, request.workspaceFile, headerLines);
 }
 
-bool writeMappingFile(Workspace& workspace, QIODevice& device, Diagnostics& diagnostics) {
-  MappingFileWriter writer(workspace, diagnostics);
-  if (!writer.prepare())
-    return false;
-  MFDeviceBuffer buffer(device);
-  return writer.write(buffer);
-}
-
 TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,
                                      Diagnostics& diagnostics, QString& error) {
   const std::unique_ptr<Workspace> workspace = readWorkspace(request, source, diagnostics, error);

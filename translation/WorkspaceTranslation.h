@@ -9,7 +9,6 @@
 
 #include <memory>
 
-class QIODevice;
 class TransformerSource;
 class Workspace;
 
@@ -31,10 +30,6 @@ struct TranslationRequest {
 ORX_EXPORT std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request,
                                                     TransformerSource& source, Diagnostics& diagnostics,
                                                     QString& error);
-
-// Writes the mapping file to a device that is open for writing. False when the workspace was refused; nothing
-// has been written then. Failures of the device show in the device.
-ORX_EXPORT bool writeMappingFile(Workspace& workspace, QIODevice& device, Diagnostics& diagnostics);
 
 // The whole job. Output appears whole or not at all. `error` receives why a file could not be read or
 // written.

@@ -248,6 +248,37 @@ TEST(Translation, NestedCustomTransformersAreDefinedInnermostFirst) {
     EXPECT_TRUE(outcome.text.contains(statement)) << statement << "\n" << outcome.text.toStdString();
 }
 
+TEST(Translation, ReferencesInsideACustomTransformerReachTheParameterThatTheyMean) {
+  const struct {
+    const char* value;
+    const char* written;
+  } cases[] = {
+      {"$(LIMIT)", "P $($(Cleaner_WORKSPACE_NAME)_LIMIT)\n"},
+      {"$[LIMIT]", "P $($(Cleaner_WORKSPACE_NAME)_LIMIT)\n"},
+      {"x$(LIMIT)y$(GLOBAL)", "P x$($(Cleaner_WORKSPACE_NAME)_LIMIT)y$(GLOBAL)\n"},
+      {"$(ORX_HOME)", "P $(ORX_HOME)\n"},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace = withCustom([&](SmallWorkspace& inner) {
+      inner.transformer(5, "Copy", {"XFORMER_NAME", "Other", "VALUE", test.value});
+    });
+    workspace.parameter("GUI TEXT GLOBAL Prompt", "1");
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.diagnostics, QStringList()) << test.value;
+    EXPECT_TRUE(outcome.text.contains(test.written)) << test.written << "\n" << outcome.text.toStdString();
+  }
+}
+
+TEST(Translation, ALookupInsideACustomTransformerMayTakeAGlobalParameter) {
+  SmallWorkspace workspace = withCustom([&](SmallWorkspace& inner) {
+    inner.transformer(5, "Pick", {"XFORMER_NAME", "Picked", "MODE", "$(SPEED)"});
+  });
+  workspace.parameter("GUI TEXT SPEED Prompt", "Fast");
+  const Outcome outcome = translate(workspace);
+  EXPECT_EQ(outcome.diagnostics, QStringList());
+  EXPECT_TRUE(outcome.text.contains("# INCLUDE [ switch {$(SPEED)} {")) << outcome.text.toStdString();
+}
+
 TEST(Translation, ALoopingCustomTransformerIsWrittenAsALoop) {
   SmallWorkspace workspace;
   workspace.reader(1, "Parcels")

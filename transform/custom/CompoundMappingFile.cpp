@@ -5,7 +5,7 @@
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CustomMessages.h>
 #include <transform/custom/LookedUpParameters.h>
-#include <transform/custom/ParameterReferences.h>
+#include <transform/core/ParameterReferences.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>

@@ -6,7 +6,7 @@
 #include <transform/custom/CustomMessages.h>
 #include <transform/custom/InstancePrototype.h>
 #include <transform/custom/NestedNetworks.h>
-#include <transform/custom/ParameterReferences.h>
+#include <transform/core/ParameterReferences.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>

@@ -1,9 +1,9 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/InnerTransformerListener.h>
-#include <transform/custom/ParameterReferences.h>
 
 namespace {
 
@@ -50,37 +50,6 @@ QString InnerTransformerListener::resolve(const QString& value) const {
   return resolved;
 }
 
-QString InnerTransformerListener::unpackValue(const TransformerCfg&, const QString& value, bool isEncoded,
-                                              UnpackLevel level) const {
-  if (level == UnpackLevel::Stored)
-    return value;
-  const QString resolved = resolve(value);
-  return level == UnpackLevel::Decoded && isEncoded ? QORXWwjdDecode(resolved) : resolved;
-}
-
-bool InnerTransformerListener::isRunTimeValue(const TransformerCfg&, const QString& value) const {
-  return anyParameterReference(value, [this](const QString& name) { return m_network.hasParameter(name); });
-}
-
-bool InnerTransformerListener::isDeferredValue(const TransformerCfg& cfg, const QString& value) const {
-  return anyParameterReference(
-      value, [&cfg](const QString& name) { return cfg.getParameterByMacroName(name) != nullptr; });
-}
-
-bool InnerTransformerListener::acceptsValue(const TransformerCfg& cfg, const QString&,
-                                            const QString& value) const {
-  return isRunTimeValue(cfg, value);
-}
-
-QString InnerTransformerListener::resolveUserTypedMacro(const TransformerCfg&, const QString& value,
-                                                        UnpackLevel) const {
-  return resolve(value);
-}
-
-QString InnerTransformerListener::resolveDefaultValue(const TransformerCfg&, const QString& value) const {
-  return resolve(value);
-}
-
-bool InnerTransformerListener::expandMacros(const TransformerCfg& cfg, QString& text) const {
-  return expandByUnpacking(cfg, text);
+bool InnerTransformerListener::isScopeParameter(const QString& name) const {
+  return m_network.hasParameter(name);
 }

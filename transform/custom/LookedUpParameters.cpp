@@ -2,7 +2,7 @@
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/LookedUpParameters.h>
 #include <transform/custom/NestedNetworks.h>
-#include <transform/custom/ParameterReferences.h>
+#include <transform/core/ParameterReferences.h>
 #include <transform/text/MFBuffer.h>
 
 #include <QHash>
