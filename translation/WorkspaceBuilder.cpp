@@ -7,36 +7,9 @@
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
+#include <transform/workspace/TransformerRecords.h>
 #include <translation/InstanceIdentity.h>
 #include <translation/WorkspaceBuilder.h>
-
-namespace {
-
-// The parameter of an instance that names its custom transformer.
-const QLatin1String kSubDocumentName("SUB_DOC_NAME");
-
-QString subDocumentName(const TransformerStruct& record) {
-  for (const XformParmStruct& parameter : record.parameters) {
-    if (parameter.parmName == kSubDocumentName)
-      return parameter.parmValue;
-  }
-  return QString();
-}
-
-QString nodeTitle(const TransformerStruct& record) {
-  return record.name.isEmpty() ? record.type + QLatin1Char('_') + QString::number(record.identifier)
-                               : record.name;
-}
-
-// Port orders are lists in a list: per port its tag, behind it the sources in their order.
-std::vector<QStringList> readPortOrder(const QString& text) {
-  std::vector<QStringList> ports;
-  for (const QString& port : QORXSdfStringToList(text, QLatin1Char(',')))
-    ports.push_back(QORXSdfStringToList(port, QLatin1Char(' ')));
-  return ports;
-}
-
-}  // namespace
 
 WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
                                    const QHash<QString, QString>& parameterValues)
@@ -113,7 +86,7 @@ void WorkspaceBuilder::addFeatureType(const FeatureTypeStruct& record) {
 }
 
 void WorkspaceBuilder::addTransformer(const TransformerStruct& record) {
-  const QString title = nodeTitle(record);
+  const QString title = transformerTitle(record);
   if (!record.enabled) {
     placeNode(record.identifier, record.line, title, -1);
     return;
@@ -206,7 +179,7 @@ void WorkspaceBuilder::applyRecord(const TransformerStruct& record, WorkspaceNod
   cfg.setBaseGuid(instanceStem(QStringList(), record.identifier, node.name));
   cfg.setParameterDirectory(&m_workspace->parameters);
   for (const XformParmStruct& parameter : record.parameters) {
-    if (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentName)
+    if (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentNameParameter)
       continue;
     if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
       m_diagnostics.report(Rule::UnknownParameter, parameter.line, node.name,

@@ -1,24 +1,14 @@
 #include <apps/orxt/DocumentFacts.h>
 #include <platform/orxparameter/orxparameter.h>
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/workspace/TransformerRecords.h>
 
 #include <map>
 
 namespace {
 
-const QLatin1String kSubDocumentParameter("SUB_DOC_NAME");
 const QLatin1String kPasswordType("PASSWORD");
 const QLatin1String kHiddenValue("********");
-
-QString subDocumentOf(const TransformerStruct& record) {
-  if (record.kind != TransformerKind::SubDocument)
-    return QString();
-  for (const XformParmStruct& parameter : record.parameters) {
-    if (parameter.parmName == kSubDocumentParameter)
-      return parameter.parmValue;
-  }
-  return QString();
-}
 
 }  // namespace
 
@@ -32,7 +22,7 @@ QStringList subDocuments(const IXMLComponentReader& reader) {
 std::vector<TransformerCount> countTransformers(const IXMLComponentReader& reader, const QString& document) {
   std::map<std::pair<QString, QString>, TransformerCount> counts;
   for (const TransformerStruct& record : reader.GetTransformerList(document)) {
-    const QString subDocument = subDocumentOf(record);
+    const QString subDocument = subDocumentName(record);
     TransformerCount& entry = counts[{record.type, subDocument}];
     entry.type = record.type;
     entry.subDocument = subDocument;

@@ -7,33 +7,11 @@
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
+#include <transform/workspace/TransformerRecords.h>
 
 #include <algorithm>
 
 namespace {
-
-const QLatin1String kSubDocumentName("SUB_DOC_NAME");
-
-QString nodeTitle(const TransformerStruct& record) {
-  return record.name.isEmpty() ? record.type + QLatin1Char('_') + QString::number(record.identifier)
-                               : record.name;
-}
-
-QString subDocumentName(const TransformerStruct& record) {
-  for (const XformParmStruct& parameter : record.parameters) {
-    if (parameter.parmName == kSubDocumentName)
-      return parameter.parmValue;
-  }
-  return QString();
-}
-
-// The ports of an input order: lists in a list, each beginning with the port's tag.
-QStringList portsOfOrder(const QString& text) {
-  QStringList ports;
-  for (const QString& port : QORXSdfStringToList(text, QLatin1Char(',')))
-    ports.append(QORXSdfStringToList(port, QLatin1Char(' ')).value(0));
-  return ports;
-}
 
 // Every name under which a transformer's tags are known; a tag itself goes before an older or a second name.
 QHash<QString, QString> namesOfTags(const QStringList& tags, const QHash<QString, QString>& aliases,
@@ -147,7 +125,7 @@ void ExternalDocNetwork::Builder::addPorts() {
 void ExternalDocNetwork::Builder::addTransformer(const TransformerStruct& record) {
   Place place;
   place.line = record.line;
-  place.title = nodeTitle(record);
+  place.title = transformerTitle(record);
   place.isLeftOut = !record.enabled;
   std::unique_ptr<TransformerCfg> cfg;
   if (record.enabled) {
@@ -206,7 +184,7 @@ void ExternalDocNetwork::Builder::configure(const TransformerStruct& record, Pla
     cfg.setLastParmEditBuild(record.lastParmEdit);
   cfg.setIdentifier(place.title);
   for (const XformParmStruct& parameter : record.parameters) {
-    if (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentName)
+    if (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentNameParameter)
       continue;
     if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
       report(NetworkProblem::Kind::UnknownParameter, parameter.line, place.title,
@@ -225,7 +203,8 @@ void ExternalDocNetwork::Builder::configure(const TransformerStruct& record, Pla
 
   for (const OutputFeatStruct& output : record.outputFeats)
     place.recordOutputs.append(output.name);
-  place.recordInputs = portsOfOrder(record.inputFtOrder);
+  for (const QStringList& port : readPortOrder(record.inputFtOrder))
+    place.recordInputs.append(port.value(0));
   QStringList tags;
   cfg.getInputTags(tags);
   tags += cfg.getDynamicInputTags();

@@ -6,6 +6,7 @@
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/PlainFile.h>
+#include <transform/workspace/TransformerRecords.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 #include <transform/workspace/XMLComponentReader.h>
 
@@ -37,12 +38,9 @@ QString bodyName(const IXMLComponentReader& reader, const QString& name) {
   const QStringList documents = reader.GetSubDocList();
   QStringList placed;
   for (const TransformerStruct& record : reader.GetTransformerList(QString())) {
-    if (record.kind != TransformerKind::SubDocument)
-      continue;
-    for (const XformParmStruct& parameter : record.parameters) {
-      if (parameter.parmName == QLatin1String("SUB_DOC_NAME") && documents.contains(parameter.parmValue))
-        placed.append(parameter.parmValue);
-    }
+    const QString named = subDocumentName(record);
+    if (documents.contains(named))
+      placed.append(named);
   }
   if (placed.contains(name) || (placed.isEmpty() && documents.contains(name)))
     return name;

@@ -237,7 +237,7 @@ struct TransformerStruct {
   bool parmsEdited = false;
   bool enabled = true;
   int lastParmEdit = 0;
-  QString inputFtOrder;
+  QString inputFtOrder;  // readPortOrder() reads it
   QString outputFtOrder;
   RecordList<OutputFeatStruct> outputFeats;
   RecordList<FeatCollapsedStruct> featCollapsed;
