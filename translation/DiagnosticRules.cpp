@@ -28,10 +28,33 @@ const std::vector<DiagnosticRule>& diagnosticRules() {
       {Rule::Nesting, QLatin1String("nesting"), Severity::Error, 0},
       {Rule::CustomTransformerFault, QLatin1String("custom-transformer-fault"), Severity::Error, 0},
       {Rule::NotWritten, QLatin1String("not-written"), Severity::Error, 370853},
+      {Rule::MissingAttribute, QLatin1String("missing-attribute"), Severity::Error, 370607},
+      {Rule::MissingValue, QLatin1String("missing-value"), Severity::Error, 370608},
+      {Rule::MissingFile, QLatin1String("missing-file"), Severity::Error, 370612},
+      {Rule::UnknownConnection, QLatin1String("unknown-connection"), Severity::Error, 370636},
+      // The text comes from the transformer, when it has one.
+      {Rule::InvalidValue, QLatin1String("invalid-value"), Severity::Error, 370855},
+      {Rule::UnfedInput, QLatin1String("unfed-input"), Severity::Warning, 370856},
+      {Rule::UnfedWriter, QLatin1String("unfed-writer"), Severity::Warning, 370857},
+      {Rule::DroppedOutput, QLatin1String("dropped-output"), Severity::Hint, 370858},
+      {Rule::UnusedReader, QLatin1String("unused-reader"), Severity::Hint, 370859},
+      {Rule::Deprecated, QLatin1String("deprecated"), Severity::Warning, 370860},
+      {Rule::NewerVersion, QLatin1String("newer-version"), Severity::Hint, 370862},
+      {Rule::NewerBuild, QLatin1String("newer-build"), Severity::Warning, 370863},
+      {Rule::UnusedParameter, QLatin1String("unused-parameter"), Severity::Hint, 370864},
+      {Rule::UnknownReference, QLatin1String("unknown-reference"), Severity::Warning, 370865},
   };
   return rules;
 }
 
 const DiagnosticRule& diagnosticRule(Rule rule) {
   return diagnosticRules()[static_cast<std::size_t>(rule)];
+}
+
+const DiagnosticRule* findDiagnosticRule(const QString& name) {
+  for (const DiagnosticRule& rule : diagnosticRules()) {
+    if (rule.name == name)
+      return &rule;
+  }
+  return nullptr;
 }

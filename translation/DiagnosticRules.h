@@ -35,6 +35,20 @@ enum class Rule {
   Nesting,
   CustomTransformerFault,
   NotWritten,
+  MissingAttribute,
+  MissingValue,
+  MissingFile,
+  UnknownConnection,
+  InvalidValue,
+  UnfedInput,
+  UnfedWriter,
+  DroppedOutput,
+  UnusedReader,
+  Deprecated,
+  NewerVersion,
+  NewerBuild,
+  UnusedParameter,
+  UnknownReference,
 };
 
 struct DiagnosticRule {
@@ -47,3 +61,5 @@ struct DiagnosticRule {
 // In the order of the enumeration.
 ORX_EXPORT const std::vector<DiagnosticRule>& diagnosticRules();
 ORX_EXPORT const DiagnosticRule& diagnosticRule(Rule rule);
+// By name; null when there is none.
+ORX_EXPORT const DiagnosticRule* findDiagnosticRule(const QString& name);

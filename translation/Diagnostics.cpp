@@ -9,10 +9,16 @@ void Diagnostics::reportText(Rule rule, int line, const QString& node, const QSt
   reportIn(m_file, rule, line, node, text);
 }
 
+void Diagnostics::reportParameter(Rule rule, int line, const QString& node, const QString& parameter,
+                                  const QString& text) {
+  reportIn(m_file, rule, line, node, text);
+  m_all.back().parameter = parameter;
+}
+
 void Diagnostics::reportIn(const QString& file, Rule rule, int line, const QString& node,
                            const QString& text) {
   const Severity severity = diagnosticRule(rule).severity;
-  m_all.push_back({rule, severity, file, line, node, text});
+  m_all.push_back({rule, severity, file, line, node, text, QString()});
   if (severity == Severity::Error)
     ++m_errors;
 }

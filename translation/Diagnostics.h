@@ -16,6 +16,7 @@ struct Diagnostic {
   int line = 0;  // of the element in the file, from 1; 0 when the whole file is meant
   QString node;  // empty when no node is meant
   QString text;
+  QString parameter;  // name of the parameter that is meant; empty when none is
 };
 
 class ORX_EXPORT Diagnostics {
@@ -28,6 +29,9 @@ class ORX_EXPORT Diagnostics {
 
   // With a text that another part of the system has put together.
   void reportText(Rule rule, int line, const QString& node, const QString& text);
+  // About one parameter of the node.
+  void reportParameter(Rule rule, int line, const QString& node, const QString& parameter,
+                       const QString& text);
   // About another file than the document itself.
   void reportIn(const QString& file, Rule rule, int line, const QString& node, const QString& text);
 

@@ -39,13 +39,14 @@ bool MappingFileWriter::prepare() {
   m_copies.assign(count, {});
   m_copiedFlows.assign(count, QString());
   m_incoming.assign(count, {});
-  if (order()) {
+  m_isConnected = order();
+  if (m_isConnected) {
     nameFlows();
     connect();
     pushAttributes();
   }
   check();
-  return !m_diagnostics.hasErrors() && prepareDefinitions();
+  return prepareDefinitions();
 }
 
 bool MappingFileWriter::prepareDefinitions() {

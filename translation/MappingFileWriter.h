@@ -23,6 +23,8 @@ class ORX_EXPORT MappingFileWriter {
   // Orders and connects the transformers and pushes attributes through; checks everything that will be
   // written. False when there are errors, those found before included; nothing may be written then.
   bool prepare();
+  // Whether prepare() could connect the transformers and tell them which attributes arrive.
+  bool isConnected() const { return m_isConnected; }
   // The whole mapping file. Call after prepare() answered true. False when a transformer did not write its
   // statements after all, which diagnostics tell.
   bool write(MFBuffer& buffer);
@@ -47,6 +49,7 @@ class ORX_EXPORT MappingFileWriter {
 
   Workspace& m_workspace;
   Diagnostics& m_diagnostics;
+  bool m_isConnected = false;
   std::vector<int> m_order;                              // transformers, each behind what feeds it
   std::vector<QHash<QString, QString>> m_flows;          // per node: output tag to flow; "" for feature types
   std::vector<QHash<QString, QStringList>> m_functions;  // per node: output tag to output functions

@@ -37,6 +37,10 @@ struct WorkspaceNode {
   std::vector<QStringList> inputOrder;  // per input port of the record: tag, then its sources in order
   QHash<QString, QStringList> exposed;  // output tag to the attributes that a user added there
 
+  // Whether a link at this end was left out: it, or the node at its other end, is disabled or at fault.
+  bool lacksInputLink = false;
+  bool lacksOutputLink = false;
+
   bool isTransformer() const { return kind == Kind::Transformer; }
 };
 

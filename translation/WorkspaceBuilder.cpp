@@ -31,8 +31,10 @@ std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& re
     addFeatureType(record);
   for (const TransformerStruct& record : reader.GetTransformerList(mainDocument))
     addTransformer(record);
-  for (const LinkStruct& record : reader.GetFeatureTypeLinkList(mainDocument))
-    addLink(record);
+  for (const LinkStruct& record : reader.GetFeatureTypeLinkList(mainDocument)) {
+    if (!addLink(record))
+      noteLeftOut(record);
+  }
   for (const LinkStruct& record : reader.GetAttributeLinkList(mainDocument))
     addAttributeLink(record);
   reportCustomTransformers();
@@ -238,10 +240,10 @@ bool WorkspaceBuilder::findEnds(const LinkStruct& record, int& source, int& targ
   return true;
 }
 
-void WorkspaceBuilder::addLink(const LinkStruct& record) {
+bool WorkspaceBuilder::addLink(const LinkStruct& record) {
   WorkspaceLink link;
   if (!record.enabled || !findEnds(record, link.source, link.target) || link.source < 0 || link.target < 0)
-    return;
+    return false;
   const WorkspaceNode& source = m_workspace->nodes[static_cast<std::size_t>(link.source)];
   const WorkspaceNode& target = m_workspace->nodes[static_cast<std::size_t>(link.target)];
   if (source.kind == WorkspaceNode::Kind::Writer || target.kind == WorkspaceNode::Kind::Reader) {
@@ -249,7 +251,7 @@ void WorkspaceBuilder::addLink(const LinkStruct& record) {
     m_diagnostics.report(
         Rule::BadPort, record.line, isSource ? source.name : target.name,
         {QString::number(record.identifier), isSource ? record.sourcePortDesc : record.targetPortDesc});
-    return;
+    return false;
   }
 
   const auto readPort = [&](const QString& description, bool wantsOutput, unsigned& number, QString& name) {
@@ -267,15 +269,25 @@ void WorkspaceBuilder::addLink(const LinkStruct& record) {
   QString name;
   if (!readPort(record.sourcePortDesc, true, number, name) ||
       (source.isTransformer() && !findOutput(source, record, number, name, link.output)))
-    return;
+    return false;
   number = 0;
   name.clear();
   if (!readPort(record.targetPortDesc, false, number, name) ||
       (target.isTransformer() && !findInput(target, record, number, name, link.input)))
-    return;
+    return false;
   link.executionIndex = record.executionIdx;
   link.line = record.line;
   m_workspace->links.push_back(link);
+  return true;
+}
+
+void WorkspaceBuilder::noteLeftOut(const LinkStruct& record) {
+  const int source = m_places.value(record.sourceNode).node;
+  const int target = m_places.value(record.targetNode).node;
+  if (source >= 0)
+    m_workspace->nodes[static_cast<std::size_t>(source)].lacksOutputLink = true;
+  if (target >= 0)
+    m_workspace->nodes[static_cast<std::size_t>(target)].lacksInputLink = true;
 }
 
 bool WorkspaceBuilder::findOutput(const WorkspaceNode& node, const LinkStruct& record, unsigned number,

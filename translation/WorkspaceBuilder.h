@@ -44,7 +44,9 @@ class ORX_EXPORT WorkspaceBuilder {
   // False when the link cannot be placed; `source` and `target` are -1 when it leads to a node that is left
   // out.
   bool findEnds(const LinkStruct& record, int& source, int& target);
-  void addLink(const LinkStruct& record);
+  // False when the link is left out.
+  bool addLink(const LinkStruct& record);
+  void noteLeftOut(const LinkStruct& record);
   void addAttributeLink(const LinkStruct& record);
   bool findOutput(const WorkspaceNode& node, const LinkStruct& record, unsigned number, const QString& name,
                   QString& tag);

@@ -12,6 +12,7 @@ void DefinitionOptions::declare(CLI::App& app) {
                  "Folder with further definitions, behind all others (repeatable)")
       ->type_name("DIR")
       ->expected(1)
+      ->allow_extra_args(false)
       ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
   app.add_option("--lang", m_language, "Language of texts: en, de or fr")->type_name("LANG");
 }

@@ -45,6 +45,7 @@ void GenerateCommand::declare(CLI::App& app) {
   app.add_option("--param", m_parameters, "Gives a global parameter another value (repeatable)")
       ->type_name("NAME=VALUE")
       ->expected(1)
+      ->allow_extra_args(false)
       ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
   app.add_option("-j,--jobs", m_jobs, "How many workspaces to work on at once")
       ->type_name("N")

@@ -5,6 +5,7 @@
 #include <apps/orxt/InfoCommand.h>
 #include <apps/orxt/LintCommand.h>
 #include <apps/orxt/TransformersCommand.h>
+#include <apps/orxt/ValidateCommand.h>
 #include <translation/ProgramVersion.h>
 
 #include <CLI/CLI.hpp>
@@ -20,6 +21,7 @@ namespace {
 std::vector<std::unique_ptr<Command>> makeCommands() {
   std::vector<std::unique_ptr<Command>> commands;
   commands.push_back(std::make_unique<GenerateCommand>());
+  commands.push_back(std::make_unique<ValidateCommand>());
   commands.push_back(std::make_unique<InfoCommand>());
   commands.push_back(std::make_unique<FormatCommand>());
   commands.push_back(std::make_unique<LintCommand>());

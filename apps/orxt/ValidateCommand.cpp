@@ -1,0 +1,137 @@
+#include <apps/orxt/Console.h>
+#include <apps/orxt/SarifLog.h>
+#include <apps/orxt/ValidateCommand.h>
+#include <transform/registry/TransformerMgr.h>
+
+#include <CLI/CLI.hpp>
+#include <QJsonArray>
+#include <QJsonDocument>
+
+#include <algorithm>
+
+namespace {
+
+constexpr CommandFacts kFacts = {"validate", "Find everything that is wrong with workspaces",
+                                 "orxt validate parcels.orw roads.orw\n"
+                                 "orxt validate --quiet --rule missing-file=warning nightly/*.orw\n"
+                                 "orxt validate --sarif parcels.orw >parcels.sarif"};
+
+QJsonObject toJson(const ValidationReport& report) {
+  QJsonArray findings;
+  for (const Diagnostic& finding : report.findings) {
+    findings.append(QJsonObject{{QStringLiteral("file"), finding.file},
+                                {QStringLiteral("line"), finding.line},
+                                {QStringLiteral("severity"), severityName(finding.severity)},
+                                {QStringLiteral("rule"), QString(diagnosticRule(finding.rule).name)},
+                                {QStringLiteral("node"), finding.node},
+                                {QStringLiteral("parameter"), finding.parameter},
+                                {QStringLiteral("text"), finding.text}});
+  }
+  return {{QStringLiteral("file"), report.file},
+          {QStringLiteral("unreadable"), report.readError},
+          {QStringLiteral("errors"), report.count(Severity::Error)},
+          {QStringLiteral("warnings"), report.count(Severity::Warning)},
+          {QStringLiteral("hints"), report.count(Severity::Hint)},
+          {QStringLiteral("findings"), findings}};
+}
+
+QString counted(int count, const QString& noun) {
+  return QString::number(count) + QLatin1Char(' ') + noun + (count == 1 ? QString() : QStringLiteral("s"));
+}
+
+ExitStatus exitStatus(const std::vector<ValidationReport>& reports) {
+  ExitStatus status = kExitDone;
+  for (const ValidationReport& report : reports) {
+    if (!report.isReadable())
+      return kExitFile;
+    if (report.count(Severity::Error) > 0)
+      status = kExitRefused;
+  }
+  return status;
+}
+
+}  // namespace
+
+ValidateCommand::ValidateCommand() : Command(kFacts) {}
+
+void ValidateCommand::declare(CLI::App& app) {
+  app.add_option("workspace", m_workspaces, "Workspace files; - is standard input")
+      ->type_name("WORKSPACE")
+      ->required();
+  CLI::Option* json = app.add_flag("--json", m_json, "As JSON: a list with one object per workspace");
+  app.add_flag("--sarif", m_sarif, "As a SARIF 2.1.0 log")->excludes(json);
+  app.add_flag("-q,--quiet", m_quiet, "Errors only, and no summary");
+  app.add_option("--rule", m_rules, "Turns a rule off, or gives it another severity (repeatable)")
+      ->type_name("NAME=off|warning|error|hint")
+      ->expected(1)
+      ->allow_extra_args(false)
+      ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+  m_definitions.declare(app);
+}
+
+ExitStatus ValidateCommand::run(Console& console) {
+  RuleSettings settings;
+  for (const std::string& rule : m_rules) {
+    QString reason;
+    if (!settings.set(QString::fromStdString(rule), reason)) {
+      console.fail(QLatin1String("--rule: ") + reason);
+      return kExitUsage;
+    }
+  }
+  TransformerMgr& registry = m_definitions.load(console);
+  std::vector<ValidationReport> reports;
+  for (const std::string& workspace : m_workspaces) {
+    reports.push_back(validateWorkspace(QString::fromStdString(workspace), registry, settings));
+    std::vector<Diagnostic>& findings = reports.back().findings;
+    if (m_quiet) {
+      findings.erase(
+          std::remove_if(findings.begin(), findings.end(),
+                         [](const Diagnostic& finding) { return finding.severity != Severity::Error; }),
+          findings.end());
+    }
+    show(reports.back(), console);
+  }
+  summarize(reports, console);
+  return exitStatus(reports);
+}
+
+void ValidateCommand::show(const ValidationReport& report, Console& console) const {
+  if (!m_json && !m_sarif) {
+    for (const Diagnostic& finding : report.findings)
+      console.showFinding(
+          finding.file, finding.line, finding.severity,
+          textWithNode(finding) + QLatin1String(" [") + diagnosticRule(finding.rule).name + QLatin1Char(']'));
+  }
+  if (!report.isReadable())
+    console.failFile(report.file, report.readError);
+}
+
+void ValidateCommand::summarize(const std::vector<ValidationReport>& reports, Console& console) const {
+  if (m_sarif) {
+    console.print(QString::fromUtf8(QJsonDocument(sarifLog(reports)).toJson()));
+    return;
+  }
+  if (m_json) {
+    QJsonArray list;
+    for (const ValidationReport& report : reports)
+      list.append(toJson(report));
+    console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
+    return;
+  }
+  if (m_quiet)
+    return;
+  int counts[3] = {};
+  int unreadable = 0;
+  for (const ValidationReport& report : reports) {
+    for (const Severity severity : {Severity::Error, Severity::Warning, Severity::Hint})
+      counts[static_cast<int>(severity)] += report.count(severity);
+    unreadable += report.isReadable() ? 0 : 1;
+  }
+  QString line = counted(static_cast<int>(reports.size()), QStringLiteral("workspace")) +
+                 QLatin1String(": ") + counted(counts[0], QStringLiteral("error")) + QLatin1String(", ") +
+                 counted(counts[1], QStringLiteral("warning")) + QLatin1String(", ") +
+                 counted(counts[2], QStringLiteral("hint"));
+  if (unreadable > 0)
+    line += QLatin1String(", ") + QString::number(unreadable) + QLatin1String(" unreadable");
+  console.print(line + QLatin1Char('\n'));
+}

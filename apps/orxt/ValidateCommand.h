@@ -1,0 +1,26 @@
+#pragma once
+
+#include <apps/orxt/Command.h>
+#include <apps/orxt/DefinitionOptions.h>
+#include <translation/WorkspaceValidation.h>
+
+#include <string>
+#include <vector>
+
+class ValidateCommand : public Command {
+ public:
+  ValidateCommand();
+  void declare(CLI::App& app) override;
+  ExitStatus run(Console& console) override;
+
+ private:
+  void show(const ValidationReport& report, Console& console) const;
+  void summarize(const std::vector<ValidationReport>& reports, Console& console) const;
+
+  std::vector<std::string> m_workspaces;
+  std::vector<std::string> m_rules;
+  bool m_json = false;
+  bool m_sarif = false;
+  bool m_quiet = false;
+  DefinitionOptions m_definitions;
+};

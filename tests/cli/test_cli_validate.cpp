@@ -1,0 +1,126 @@
+// Validation as a person runs it: broken workspaces against what is to be said about them, sound ones
+// against silence, and the forms for programs.
+#include <tests/cli/OrxtProcess.h>
+#include <tests/support/QtPrinters.h>
+
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QTemporaryDir>
+#include <gtest/gtest.h>
+
+namespace {
+
+QString brokenFolder() {
+  return QStringLiteral(ORX_SOURCE_DIR) + "/tests/data/broken";
+}
+
+Outcome validateBroken(const QStringList& arguments) {
+  return orxt(QStringList{"validate", "--resources", "definitions"} + arguments, brokenFolder());
+}
+
+// scripts/renew-expectations writes the expectations.
+TEST(Validate, SaysWhatIsWrongWithBrokenWorkspaces) {
+  const QStringList names = QDir(brokenFolder()).entryList({"*.orw"});
+  ASSERT_GE(names.size(), 12);
+  for (const QString& name : names) {
+    const QByteArray before = readAll(brokenFolder() + "/" + name);
+    const Outcome run = validateBroken({"--lang", "en", name});
+    EXPECT_EQ(run.err + run.out + QString("exit status %1\n").arg(run.status),
+              QString::fromUtf8(readAll(brokenFolder() + "/" + name.chopped(4) + ".expected")))
+        << name.toStdString();
+    EXPECT_EQ(readAll(brokenFolder() + "/" + name), before) << name.toStdString();
+  }
+}
+
+TEST(Validate, FindsNothingWrongWithTheSamples) {
+  // One sample keeps a deprecated transformer on purpose.
+  const Outcome run = orxt(QStringList{"validate", "--json", "--rule", "deprecated=off"} + samples());
+  EXPECT_EQ(run.status, 0);
+  const QJsonArray reports = QJsonDocument::fromJson(run.out.toUtf8()).array();
+  ASSERT_EQ(reports.size(), samples().size());
+  for (const QJsonValue& report : reports) {
+    EXPECT_EQ(report["errors"].toInt(-1), 0) << run.out.toStdString();
+    EXPECT_EQ(report["warnings"].toInt(-1), 0) << run.out.toStdString();
+    EXPECT_LE(report["hints"].toInt(99), 5) << run.out.toStdString();
+  }
+}
+
+TEST(Validate, EndsWithTheStatusThatFits) {
+  const struct {
+    QStringList arguments;
+    int status;
+    int errors;  // lines on standard error
+    const char* out;
+  } cases[] = {
+      {{"loose-ends.orw"}, 0, 6, "1 workspace: 0 errors, 3 warnings, 3 hints\n"},
+      {{"loose-ends.orw", "--quiet"}, 0, 0, ""},
+      {{"refused-values.orw", "--quiet"}, 1, 5, ""},
+      {{"refused-values.orw", "loose-ends.orw"}, 1, 11, "2 workspaces: 5 errors, 3 warnings, 3 hints\n"},
+      {{"missing.orw", "refused-values.orw", "-q"}, 3, 6, ""},
+      {{"loose-ends.orw", "--rule", "unfed-input=error", "-q"}, 1, 2, ""},
+      {{"loose-ends.orw", "--rule", "unfed-input=off", "--rule", "dropped-output=off"},
+       0,
+       2,
+       "1 workspace: 0 errors, 1 warning, 1 hint\n"},
+      {{"cycle.orw", "--rule", "cycle=warning"}, 0, 1, "1 workspace: 0 errors, 1 warning, 0 hints\n"},
+      {{"cycle.orw", "--rule", "cycle=hint", "--rule", "cycle=error", "-q"}, 1, 1, ""},
+      {{"cycle.orw", "--rule", "cycle=loud"}, 2, 1, ""},
+      {{"cycle.orw", "--rule", "circle=off"}, 2, 1, ""},
+      {{"cycle.orw", "--rule", "cycle"}, 2, 1, ""},
+  };
+  for (const auto& test : cases) {
+    const Outcome run = validateBroken(test.arguments);
+    const std::string line = test.arguments.join(' ').toStdString() + "\n" + run.err.toStdString();
+    EXPECT_EQ(run.status, test.status) << line;
+    EXPECT_EQ(run.err.count('\n'), test.errors) << line;
+    EXPECT_EQ(run.out, QString(test.out)) << line;
+  }
+}
+
+TEST(Validate, GivesRefusalsInEveryLanguage) {
+  QSet<QString> texts;
+  for (const char* language : {"en", "de", "fr"}) {
+    const Outcome run = validateBroken({"--json", "refused-values.orw", "--lang", language});
+    QStringList rules;
+    const QJsonArray findings = QJsonDocument::fromJson(run.out.toUtf8()).array().at(0)["findings"].toArray();
+    for (const QJsonValue& finding : findings) {
+      rules << finding["rule"].toString() + " " + finding["parameter"].toString();
+      texts.insert(finding["text"].toString());
+      EXPECT_EQ(finding["node"].toString(), QString("Refused"));
+    }
+    EXPECT_EQ(rules,
+              (QStringList{"missing-value NEEDED", "missing-file FILE", "unknown-connection CONNECTION",
+                           "missing-attribute ATTRIBUTE", "invalid-value LONG_TEXT"}))
+        << language;
+  }
+  EXPECT_EQ(texts.size(), 15);
+}
+
+TEST(Validate, WritesSarif) {
+  QTemporaryDir folder;
+  const QString spaced = folder.filePath("a b#.orw");
+  ASSERT_TRUE(QFile::copy(brokenFolder() + "/cycle.orw", spaced));
+  const Outcome run = validateBroken({"--sarif", "refused-values.orw", spaced, "missing.orw"});
+  EXPECT_EQ(run.status, 3);
+  const QJsonObject log = QJsonDocument::fromJson(run.out.toUtf8()).object();
+  EXPECT_EQ(log["version"].toString(), QString("2.1.0"));
+  const QJsonObject sarifRun = log["runs"].toArray().at(0).toObject();
+  const QJsonArray rules = sarifRun["tool"]["driver"]["rules"].toArray();
+  const QJsonArray results = sarifRun["results"].toArray();
+  ASSERT_EQ(results.size(), 6);
+  for (const QJsonValue& result : results)
+    EXPECT_EQ(rules.at(result["ruleIndex"].toInt(-1))["id"], result["ruleId"]);
+  const QJsonValue first = results.at(0);
+  EXPECT_EQ(first["ruleId"].toString(), QString("missing-value"));
+  EXPECT_EQ(first["level"].toString(), QString("error"));
+  const QJsonValue place = first["locations"].toArray().at(0)["physicalLocation"];
+  EXPECT_EQ(place["artifactLocation"]["uri"].toString(), QString("refused-values.orw"));
+  EXPECT_EQ(place["region"]["startLine"].toInt(), 13);
+  const QString uri =
+      results.at(5)["locations"].toArray().at(0)["physicalLocation"]["artifactLocation"]["uri"].toString();
+  EXPECT_TRUE(uri.startsWith("file:///") && uri.endsWith("/a%20b%23.orw")) << uri.toStdString();
+  EXPECT_FALSE(sarifRun["invocations"].toArray().at(0)["executionSuccessful"].toBool(true));
+}
+
+}  // namespace

@@ -1,0 +1,33 @@
+// What is wrong with the way features take through a workspace: inputs that nothing feeds, features that
+// nothing takes, and where, in consequence, nobody can tell which attributes arrive.
+#pragma once
+
+#include <translation/Diagnostics.h>
+#include <translation/Workspace.h>
+
+#include <QSet>
+#include <QString>
+
+#include <vector>
+
+class FlowChecks {
+ public:
+  // Not owned. Looks at the links once.
+  explicit FlowChecks(const Workspace& workspace);
+
+  // Ends that a link leads to which had to be left out are passed over: the link's own finding is enough.
+  void report(Diagnostics& diagnostics) const;
+  // Whether everything that flows into the node is known; where it is not, attributes may only seem to be
+  // missing.
+  bool knowsWhatArrives(int node) const { return m_isKnown[static_cast<std::size_t>(node)]; }
+
+ private:
+  void findUnknownFlows();
+  void reportInputs(const WorkspaceNode& node, const QSet<QString>& fed, Diagnostics& diagnostics) const;
+  void reportOutputs(const WorkspaceNode& node, const QSet<QString>& taken, Diagnostics& diagnostics) const;
+
+  const Workspace& m_workspace;
+  std::vector<QSet<QString>> m_fed;    // per node: inputs that a link leads to
+  std::vector<QSet<QString>> m_taken;  // per node: outputs that a link leaves by
+  std::vector<bool> m_isKnown;
+};

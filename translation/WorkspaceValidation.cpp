@@ -1,0 +1,243 @@
+#include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerSource.h>
+#include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/custom/NestedNetworks.h>
+#include <transform/custom/SubDocNetworkObjXformer.h>
+#include <transform/text/GlobalMacros.h>
+#include <transform/text/MessageStrings.h>
+#include <translation/FlowChecks.h>
+#include <translation/MappingFileWriter.h>
+#include <translation/ReferencedNames.h>
+#include <translation/ValueChecks.h>
+#include <translation/WorkspaceBuilder.h>
+#include <translation/WorkspaceDocument.h>
+#include <translation/WorkspaceValidation.h>
+
+#include <algorithm>
+
+namespace {
+
+constexpr long kDeprecatedOnly = 370861;
+constexpr long kOnlyCustomTransformers = 370867;
+
+class Validation {
+ public:
+  Validation(const WorkspaceDocument& document, TransformerSource& source, Diagnostics& diagnostics)
+      : m_reader(document.reader()),
+        m_headerLines(document.headerLines()),
+        m_source(source),
+        m_diagnostics(diagnostics),
+        m_values(diagnostics) {}
+
+  void run();
+
+ private:
+  using Records = QHash<int, const TransformerStruct*>;  // by identifier, the first of each
+
+  static Records byIdentifier(const ORXTValSlist<TransformerStruct>& list);
+  void checkBuild();
+  void checkTransformers(const Workspace& workspace, bool isConnected);
+  void checkInside(const ExternalDocNetwork& network, const Workspace& workspace);
+  void checkAge(const TransformerCfg& cfg, int line, const QString& title);
+  void checkParameterUse(const Workspace& workspace);
+  void collectReferences(ReferencedNames& names) const;
+  bool isKnown(const GlobalParameters& parameters, const QString& name) const;
+
+  const IXMLComponentReader& m_reader;
+  const QStringList& m_headerLines;
+  TransformerSource& m_source;
+  Diagnostics& m_diagnostics;
+  ValueChecks m_values;
+  QStringList m_parameterNames;
+  bool m_includesOthers = false;       // the header takes in files that may set further parameters
+  QHash<QString, int> m_newestByName;  // -1: not known outside the document
+};
+
+void Validation::run() {
+  checkBuild();
+  const std::unique_ptr<Workspace> workspace =
+      WorkspaceBuilder(m_source, m_diagnostics).build(m_reader, m_diagnostics.file(), m_headerLines);
+  MappingFileWriter writer(*workspace, m_diagnostics);
+  writer.prepare();
+
+  for (const GlobalParameters::Parameter& parameter : workspace->parameters.all())
+    m_parameterNames.append(parameter.name);
+  m_includesOthers = std::any_of(m_headerLines.begin(), m_headerLines.end(), [](const QString& line) {
+    return line.startsWith(QLatin1String("INCLUDE "));
+  });
+  checkTransformers(*workspace, writer.isConnected());
+  for (const ExternalDocNetwork* network : workspace->customTransformers())
+    checkInside(*network, *workspace);
+  checkParameterUse(*workspace);
+}
+
+Validation::Records Validation::byIdentifier(const ORXTValSlist<TransformerStruct>& list) {
+  Records records;
+  for (const TransformerStruct& record : list) {
+    if (!records.contains(record.identifier))
+      records.insert(record.identifier, &record);
+  }
+  return records;
+}
+
+void Validation::checkBuild() {
+  const QString build = m_reader.GetMiscParm(QStringLiteral("LAST_SAVE_BUILD"));
+  if (build.toInt() > TransformerCfg::kThisBuild)
+    m_diagnostics.report(Rule::NewerBuild, m_reader.GetDocumentLine(QString()), QString(),
+                         {build, QString::number(TransformerCfg::kThisBuild)});
+}
+
+bool Validation::isKnown(const GlobalParameters& parameters, const QString& name) const {
+  return m_includesOthers || parameters.find(name) || isGlobalMacro(name);
+}
+
+void Validation::checkTransformers(const Workspace& workspace, bool isConnected) {
+  const FlowChecks flow(workspace);
+  flow.report(m_diagnostics);
+  const ORXTValSlist<TransformerStruct> list = m_reader.GetTransformerList(QString());
+  const Records records = byIdentifier(list);
+  const auto knows = [&](const QString& name) { return isKnown(workspace.parameters, name); };
+  for (std::size_t number = 0; number < workspace.nodes.size(); ++number) {
+    const WorkspaceNode& node = workspace.nodes[number];
+    const TransformerStruct* record = node.isTransformer() ? records.value(node.identifier) : nullptr;
+    if (!record)
+      continue;
+    m_values.checkValues(*node.cfg, *record, node.name,
+                         isConnected && flow.knowsWhatArrives(static_cast<int>(number)));
+    m_values.checkReferences(*node.cfg, *record, node.name, knows, m_parameterNames);
+    checkAge(*node.cfg, node.line, node.name);
+  }
+}
+
+void Validation::checkInside(const ExternalDocNetwork& network, const Workspace& workspace) {
+  const ORXTValSlist<TransformerStruct> list = m_reader.GetTransformerList(network.getName());
+  const Records records = byIdentifier(list);
+  const QStringList names = network.getParameters();
+  const auto knows = [&](const QString& name) {
+    return network.hasParameter(name) || isKnown(workspace.parameters, name);
+  };
+  for (const SubDocNetworkObj* object : network.nodes()) {
+    const auto* node = dynamic_cast<const SubDocNetworkObjXformer*>(object);
+    const TransformerStruct* record = node ? records.value(node->number()) : nullptr;
+    if (!record)
+      continue;
+    const TransformerCfg& cfg = *node->getTransformer();
+    const QString title = network.getName() + QLatin1Char('/') + node->name();
+    m_values.checkValues(cfg, *record, title, /*knowsWhatArrives=*/false);
+    m_values.checkReferences(cfg, *record, title, knows, names);
+    checkAge(cfg, record->line, title);
+  }
+}
+
+void Validation::checkAge(const TransformerCfg& cfg, int line, const QString& title) {
+  const QString name = cfg.getName();
+  const CompoundTransformerNetwork* network = networkOf(&cfg);
+  if (cfg.isDeprecated() || (network && network->isDeprecated())) {
+    if (cfg.replacedBy().isEmpty())
+      m_diagnostics.reportText(Rule::Deprecated, line, title, TransformResString(kDeprecatedOnly, name));
+    else
+      m_diagnostics.report(Rule::Deprecated, line, title, {name, cfg.replacedBy()});
+    return;
+  }
+  if (network && !dynamic_cast<const ExternalTransformerNetwork*>(network))
+    return;
+  auto newest = m_newestByName.constFind(name);
+  if (newest == m_newestByName.constEnd()) {
+    const std::unique_ptr<TransformerCfg> made =
+        m_source.makeTransformer(name, TransformerSource::kNewestVersion);
+    newest = m_newestByName.insert(name, made ? made->getVersion() : -1);
+  }
+  if (newest.value() > cfg.getVersion())
+    m_diagnostics.report(Rule::NewerVersion, line, title,
+                         {name, QString::number(cfg.getVersion()), QString::number(newest.value())});
+}
+
+void Validation::collectReferences(ReferencedNames& names) const {
+  for (const QString& line : m_headerLines)
+    names.add(line);
+  for (const DatasetStruct& dataset : m_reader.GetDatasetList()) {
+    names.add(dataset.dataset);
+    for (const MetafileParameterStruct& parameter : dataset.metafileParameters)
+      names.add(parameter.value);
+  }
+  for (const FeatureTypeStruct& type : m_reader.GetFeatureTypeList()) {
+    for (const QString& text : {type.featureTypeName, type.featureTypeNameQualifier, type.mergeFilter})
+      names.add(text);
+    for (const FeatAttributeStruct& attribute : type.attributes)
+      names.add(attribute.attrValue);
+    for (const DeflineParmStruct& parameter : type.deflineParms)
+      names.add(parameter.parmValue);
+    for (const NonGuiDeflineParmStruct& parameter : type.nonGuiDeflineParms)
+      names.add(parameter.value);
+  }
+  // Also inside custom transformers, whose scripts see the global parameters.
+  for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList()) {
+    for (const GlobalParameterStruct& parameter : m_reader.GetGlobalParameterList(document)) {
+      names.add(parameter.defaultValue);
+      names.add(parameter.guiLine);
+    }
+    for (const TransformerStruct& transformer : m_reader.GetTransformerList(document)) {
+      for (const XformParmStruct& parameter : transformer.parameters)
+        names.add(parameter.parmValue);
+      for (const XformAttrStruct& attribute : transformer.attributes)
+        names.add(attribute.attrValue);
+    }
+    for (const ConstantStruct& constant : m_reader.GetConstantList(document))
+      names.add(constant.constValue);
+  }
+}
+
+void Validation::checkParameterUse(const Workspace& workspace) {
+  ReferencedNames names;
+  collectReferences(names);
+  for (const GlobalParameters::Parameter& parameter : workspace.parameters.all()) {
+    // What the header sets may be read by the engine itself.
+    if (!parameter.setInHeader && !names.contains(parameter.name))
+      m_diagnostics.report(Rule::UnusedParameter, parameter.line, QString(), {parameter.name});
+  }
+}
+
+std::vector<Diagnostic> inDocumentOrder(const Diagnostics& diagnostics) {
+  std::vector<Diagnostic> findings = diagnostics.all();
+  std::stable_sort(findings.begin(), findings.end(), [&](const Diagnostic& left, const Diagnostic& right) {
+    const bool isLeftOther = left.file != diagnostics.file();
+    const bool isRightOther = right.file != diagnostics.file();
+    if (isLeftOther != isRightOther)
+      return isRightOther;
+    if (left.file != right.file)
+      return left.file < right.file;
+    return left.line < right.line;
+  });
+  return findings;
+}
+
+}  // namespace
+
+int ValidationReport::count(Severity severity) const {
+  return static_cast<int>(
+      std::count_if(findings.begin(), findings.end(),
+                    [severity](const Diagnostic& finding) { return finding.severity == severity; }));
+}
+
+ValidationReport validateWorkspace(const QString& fileName, TransformerSource& source,
+                                   const RuleSettings& settings) {
+  ValidationReport report;
+  report.file = InputFile::shownName(fileName);
+  Diagnostics diagnostics(report.file);
+  WorkspaceDocument document(fileName);
+  switch (document.read(diagnostics, report.readError)) {
+    case WorkspaceDocument::Reading::Unreadable:
+      return report;
+    case WorkspaceDocument::Reading::Refused:
+      break;
+    case WorkspaceDocument::Reading::Done:
+      if (document.form() == WorkspaceFile::Form::Versioned)
+        diagnostics.reportText(Rule::NoDocument, 0, QString(), TransformResString(kOnlyCustomTransformers));
+      else
+        Validation(document, source, diagnostics).run();
+      break;
+  }
+  report.findings = settings.apply(inDocumentOrder(diagnostics));
+  return report;
+}

@@ -1,0 +1,32 @@
+// Finds everything that is wrong with a workspace, in one run, and changes nothing.
+//
+// Beside all that stops or disturbs the writing of a mapping file: values that the transformers refuse,
+// attributes that do not arrive, inputs that nothing feeds, features that nothing takes, outdated
+// transformers, parameters and references that do not fit together. The transformers inside embedded custom
+// transformers are judged as well, those inside linked ones where the linked file is loaded. Which attributes
+// reach the inside differs by instance, so no attribute is called missing there. Embedded custom transformers
+// that nothing uses are not looked at.
+#pragma once
+
+#include <platform/Export.h>
+#include <translation/Diagnostics.h>
+#include <translation/RuleSettings.h>
+
+#include <QString>
+
+#include <vector>
+
+class TransformerSource;
+
+struct ORX_EXPORT ValidationReport {
+  QString file;                      // as messages call it
+  QString readError;                 // why the file cannot be read; empty when it can
+  std::vector<Diagnostic> findings;  // by line; behind them those in linked files, by file and line
+
+  bool isReadable() const { return readError.isEmpty(); }
+  int count(Severity severity) const;
+};
+
+// `fileName` may be "-", standard input.
+ORX_EXPORT ValidationReport validateWorkspace(const QString& fileName, TransformerSource& source,
+                                              const RuleSettings& settings = {});
