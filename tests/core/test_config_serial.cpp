@@ -58,6 +58,67 @@ TEST(ConfigSerial, HostileValuesComeBack) {
   }
 }
 
+// What a type makes of a value when it is set has been done when the value is written.
+TEST(ConfigSerial, StoredValuesOfEveryTypeComeBack) {
+  const std::vector<ConfigParameter> parameters = {
+      {"PLAIN", "TEXT"},
+      {"ENCODED", "TEXT_ENCODED"},
+      {"ATTRIBUTE", "ATTR"},
+      {"ATTRIBUTES", "ATTR_LIST_ENCODED"},
+      {"MIXED", "TEXT_OR_ATTR_ENCODED"},
+      {"NUMBER", "OPTIONAL FLOAT_OR_ATTR"},
+      {"CHOSEN", "LOOKUP_CHOICE Shown,STORED%Other,OTHER"},
+      {"PACK",
+       "MULTIPARAMETER <semicolon>,GUI<space>TEXT<space>FIRST<space>F,GUI<space>TEXT<space>SECOND<space>S"},
+      {"ROWS", "GUI_LINE_TABLE <comma>,GUI<space>TEXT<space>KEY<space>K,GUI<space>TEXT<space>WORTH<space>W"}};
+  const QStringList values = {qs(""),
+                              qs("&id"),
+                              qs("&&id"),
+                              qs("& id"),
+                              qs("@Value(id)"),
+                              qs("ORX_CONDITIONAL:DEFAULT_VALUE,\"a,b\""),
+                              qs("$(A) $[B"),
+                              qs("FIRST;1;SECOND;\"a;\"\"b\"\"\""),
+                              qs("k,\"v,\"\"w\"\"\",,"),
+                              qs("Shown"),
+                              qs("\"a\"\n,b"),
+                              qs("PARAMETER_VALUES,\"PLAIN,x\""),
+                              QString(QChar(0)) + QChar(0xdc00) + QChar(0xfeff),
+                              QString(5000, QLatin1Char('"'))};
+  for (const QString& value : values) {
+    TransformerCfg cfg;
+    cfg.configure(makeDefinition(parameters));
+    for (const QString& name : cfg.getParameters()) {
+      cfg.setParameterValue(name, value, true);
+    }
+    TransformerCfg restored;
+    restored.configure(makeDefinition(parameters));
+    QHash<QString, QString> fields = fieldsOf(cfg.serialize());
+    restored.deserialize(fields);
+    for (const QString& name : cfg.getParameters()) {
+      EXPECT_EQ(restored.getParameterValue(name), cfg.getParameterValue(name))
+          << name.toStdString() << ": " << value.left(40).toStdString();
+    }
+    EXPECT_EQ(restored.serialize(), cfg.serialize()) << value.left(40).toStdString();
+  }
+}
+
+TEST(ConfigSerial, ListsAreAppended) {
+  TransformerCfg cfg;
+  cfg.configure(makeDefinition(kParameters));
+  QHash<QString, QString> fields{{qs("INPUT_FILTERS"), qs("IN,\"f,g\"")},
+                                 {qs("INPUT_ATTRS"), qs("IN,\"a,b\"")},
+                                 {qs("OUTPUT_FEATURE_TYPES"), qs("OUT,t")},
+                                 {qs("OUTPUT_FUNCTIONS"), qs("OUT,\"x,y\",REST")}};
+  cfg.deserialize(fields);
+  cfg.deserialize(fields);
+  const QHash<QString, QString> twice = fieldsOf(cfg.serialize());
+  EXPECT_EQ(twice.value(qs("INPUT_FILTERS")), qs("IN,\"f,g,f,g\""));
+  EXPECT_EQ(twice.value(qs("INPUT_ATTRS")), qs("IN,\"a,b\""));
+  EXPECT_EQ(twice.value(qs("OUTPUT_FEATURE_TYPES")), qs("OUT,t"));
+  EXPECT_EQ(twice.value(qs("OUTPUT_FUNCTIONS")), qs("OUT,\"x,y,x,y\""));
+}
+
 TEST(ConfigSerial, KeysStandInTheirOrder) {
   TransformerCfg cfg;
   cfg.configure(makeDefinition(kParameters));

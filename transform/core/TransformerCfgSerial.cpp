@@ -37,6 +37,15 @@ QString valueText(const QStringList& value) {
   return pack(value);
 }
 
+// As it is to be set for the record to hold what it holds now: setting takes one mark away from attribute
+// names.
+QString settableValue(const TransformParamCfg& record) {
+  const QString& value = record.getValue();
+  TransformParamCfg again = record;
+  again.setValue(value);
+  return again.getValue() == value ? value : QLatin1Char('&') + value;
+}
+
 // The table's entries by tag: those of the ports first, in their order, then any others by name.
 template <typename Value>
 QString packTable(const QHash<QString, Value>& table, const QStringList& tagOrder) {
@@ -93,7 +102,7 @@ void appendLists(const QString& text, QHash<QString, QStringList>& table) {
 QString TransformerCfg::serialize() const {
   QStringList values;
   for (const TransformParamCfg& record : m_parameters.records()) {
-    values << record.getName() << record.getValue();
+    values << record.getName() << settableValue(record);
   }
   const QStringList inputs = allInputTags();
   QStringList outputs;
@@ -136,7 +145,5 @@ void TransformerCfg::deserialize(QHash<QString, QString>& fields) {
   for (const auto& [tag, featureType] : unpackTable(fields.value(kOutputFeatureTypesKey))) {
     m_ports.outputFeatureTypes.insert(tag, featureType);
   }
-  for (const auto& [tag, functions] : unpackTable(fields.value(kOutputFunctionsKey))) {
-    m_ports.outputFunctions.insert(tag, unpack(functions));
-  }
+  appendLists(fields.value(kOutputFunctionsKey), m_ports.outputFunctions);
 }

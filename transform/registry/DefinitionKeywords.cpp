@@ -74,8 +74,13 @@ const std::vector<DefinitionKeyword>& definitionKeywords() {
 }
 
 const DefinitionKeyword* findDefinitionKeyword(const QString& line, unsigned place) {
+  if (line.isEmpty()) {
+    return nullptr;
+  }
+  const QChar first = line.at(0);
   for (const DefinitionKeyword& keyword : definitionKeywords()) {
-    if ((keyword.places & place) && line.startsWith(keyword.word)) {
+    if (first == QLatin1Char(*keyword.word.data()) && (keyword.places & place) &&
+        line.startsWith(keyword.word)) {
       return &keyword;
     }
   }

@@ -24,11 +24,14 @@ QString withoutTrailingSpace(const QString& line) {
 }  // namespace
 
 bool DefinitionLines::open(QIODevice& device) {
-  // One byte more than may be there; a pipe gives its content in pieces.
-  constexpr int kPiece = 256 * 1024;
-  for (qint64 size = 0; size <= kLargestFile; size = m_bytes.size()) {
-    m_bytes.resize(static_cast<int>(size) + kPiece);
-    const qint64 got = device.read(m_bytes.data() + size, kPiece);
+  // As much as the device says it has and one byte more, so that one reading tells its end; a pipe says
+  // nothing and gives its content in pieces.
+  constexpr qint64 kPiece = 256 * 1024;
+  const qint64 told = device.isSequential() ? 0 : std::min(device.size() - device.pos(), kLargestFile);
+  qint64 piece = told > 0 ? told + 1 : kPiece;
+  for (qint64 size = 0; size <= kLargestFile; size = m_bytes.size(), piece = kPiece) {
+    m_bytes.resize(static_cast<int>(size + piece));
+    const qint64 got = device.read(m_bytes.data() + size, piece);
     m_bytes.truncate(static_cast<int>(size + std::max<qint64>(got, 0)));
     if (got <= 0) {
       // At its end a sequential device may answer as for an error.
@@ -36,6 +39,9 @@ bool DefinitionLines::open(QIODevice& device) {
         m_error = device.errorString();
         return false;
       }
+      break;
+    }
+    if (m_bytes.size() == told && device.atEnd()) {
       break;
     }
   }
@@ -58,9 +64,15 @@ bool DefinitionLines::next() {
   const int lineFeed = m_bytes.indexOf('\n', m_begin);
   const int size = (lineFeed < 0 ? m_bytes.size() : lineFeed) - m_begin;
   m_end = lineFeed < 0 ? m_bytes.size() : lineFeed + 1;
-  QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
-  m_line = QTextCodec::codecForMib(kMibUtf8)->toUnicode(m_bytes.constData() + m_begin, size, &state);
-  m_isSound = m_isSound && state.invalidChars == 0 && state.remainingChars == 0;
+  const char* bytes = m_bytes.constData() + m_begin;
+  if (std::all_of(bytes, bytes + size, [](char c) { return static_cast<unsigned char>(c) < 0x80; })) {
+    m_line = QString::fromLatin1(bytes, size);  // most lines by far, and sound
+  } else {
+    static const QTextCodec* const utf8 = QTextCodec::codecForMib(kMibUtf8);
+    QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
+    m_line = utf8->toUnicode(bytes, size, &state);
+    m_isSound = m_isSound && state.invalidChars == 0 && state.remainingChars == 0;
+  }
   m_trimmed = m_line.trimmed();
   ++m_number;
   return true;

@@ -143,15 +143,17 @@ void TransformerMgr::noteUnreadable(const QString& path, const QString& reason) 
 }
 
 void TransformerMgr::loadDefinitionFile(const QString& path, bool onlyCustomTransformers) {
-  if (XMLComponentReader::IsFileXMLWorkspace(path)) {
+  QFile file(path);
+  const bool isOpen = file.open(QIODevice::ReadOnly);
+  if (isOpen && XMLComponentReader::isXMLWorkspace(file)) {
+    file.close();
     loadCustomTransformer(path, NEWEST_VERSION, false);
     return;
   }
   if (onlyCustomTransformers) {
     return;
   }
-  QFile file(path);
-  if (!file.open(QIODevice::ReadOnly)) {
+  if (!isOpen) {
     noteUnreadable(path, QString());
     return;
   }

@@ -33,7 +33,11 @@ bool XMLComponentReader::IsFileXMLWorkspace(const QString& fileName) {
   QFile file(fileName);
   if (!file.open(QIODevice::ReadOnly | QIODevice::Unbuffered))
     return false;
-  const QByteArray start = file.read(kRecognisedBytes);
+  return isXMLWorkspace(file);
+}
+
+bool XMLComponentReader::isXMLWorkspace(QIODevice& device) {
+  const QByteArray start = device.peek(kRecognisedBytes);
   for (const char* const tag : {"<WORKSPACE", "<DATASOURCE", "<ETL_TOOL", "<TRANSFORMER", "ORW"}) {
     if (start.contains(tag))
       return true;

@@ -4,6 +4,7 @@
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/XMLComponentParser.h>
 
+class QIODevice;
 struct Word;
 
 class ORX_EXPORT XMLComponentReader : public XMLComponentParser, public IXMLComponentReader {
@@ -14,6 +15,8 @@ class ORX_EXPORT XMLComponentReader : public XMLComponentParser, public IXMLComp
   // Whether the first 100 bytes hold a root tag of a workspace, or "ORW". False for a file that cannot be
   // read.
   static bool IsFileXMLWorkspace(const QString& fileName);
+  // The same of what stands next in an open device, which stays where it is.
+  static bool isXMLWorkspace(QIODevice& device);
   // Splits a workspace file and answers the name of a new temporary file with its XML, which the caller
   // deletes. Header lines are appended; prompt lines (by parameter name) and macros (by name) are collected
   // when wanted.
