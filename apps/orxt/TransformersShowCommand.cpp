@@ -30,6 +30,18 @@ QJsonArray portsAsJson(const TransformerCfg& cfg, const QStringList& tags) {
   return ports;
 }
 
+// The type, and what its configuration says in words a person reads.
+QString typeAsText(const TransformParamCfg& parameter) {
+  QStringList parts;
+  for (const auto& [shown, stored] : parameter.choices().entries())
+    parts.append(shown);
+  for (const GUIType& member : parameter.members().members())
+    parts.append(member.getName());
+  if (parts.isEmpty())
+    return parameter.getTypeWithConfig();
+  return parameter.getType() + QLatin1String(" of ") + parts.join(QLatin1String(" | "));
+}
+
 }  // namespace
 
 TransformersShowCommand::TransformersShowCommand() : Command(kFacts) {}
@@ -104,7 +116,7 @@ void TransformersShowCommand::showText(const TransformerCfg& cfg, Console& conso
   for (const QString& name : cfg.getParameters()) {
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
     line(QLatin1String("  ") + makeColumnString(name, parameter->getDescription(), kParameterColumn));
-    QString facts = parameter->getTypeWithConfig();
+    QString facts = typeAsText(*parameter);
     if (parameter->getFlag(kGUITypeOptional))
       facts += QLatin1String(", optional");
     if (!parameter->getDefaultValue().isEmpty())
