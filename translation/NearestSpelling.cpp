@@ -15,12 +15,17 @@ int editDistance(const QString& from, const QString& to, int limit) {
   Row* beforeLast = &rows[0];
   Row* last = &rows[1];
   Row* row = &rows[2];
-  for (int column = 0; column <= to.size(); ++column)
+  // Only cells within `limit` of the diagonal can be reached by so few edits.
+  for (Row& cells : rows)
+    cells.fill(limit + 1);
+  for (int column = 0; column <= std::min(to.size(), limit); ++column)
     (*last)[static_cast<std::size_t>(column)] = column;
   for (int i = 1; i <= from.size(); ++i) {
-    (*row)[0] = i;
-    int least = i;
-    for (int j = 1; j <= to.size(); ++j) {
+    const int first = std::max(1, i - limit);
+    const int end = std::min(to.size(), i + limit);
+    (*row)[static_cast<std::size_t>(first - 1)] = first == 1 ? std::min(i, limit + 1) : limit + 1;
+    int least = (*row)[static_cast<std::size_t>(first - 1)];
+    for (int j = first; j <= end; ++j) {
       const auto column = static_cast<std::size_t>(j);
       const bool isSame = from.at(i - 1) == to.at(j - 1);
       int edits =
@@ -32,6 +37,8 @@ int editDistance(const QString& from, const QString& to, int limit) {
     }
     if (least > limit)
       return limit + 1;
+    if (end < to.size())
+      (*row)[static_cast<std::size_t>(end) + 1] = limit + 1;
     Row* const free = beforeLast;
     beforeLast = last;
     last = row;

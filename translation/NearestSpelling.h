@@ -14,5 +14,5 @@ class ORX_EXPORT NearestSpelling {
   QString find(const QString& name, const QStringList& candidates);
 
  private:
-  int m_budget = 500000;  // candidates that may still be looked at
+  int m_budget = 200000;  // candidates that may still be looked at
 };
