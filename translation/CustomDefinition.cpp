@@ -19,6 +19,7 @@
 #include <translation/RouteStatement.h>
 
 #include <QBuffer>
+#include <QSet>
 
 // Inside a definition the published parameters are macros whose values only the instance knows: whatever
 // refers to them also refers to the prefix macro.
@@ -82,24 +83,34 @@ bool CustomDefinition::prepare(Diagnostics& diagnostics) {
   }
   if (diagnostics.hasErrors())
     return false;
-
-  // Commas separate the fields; a category may list several.
-  const QString category = m_network.getCategory().replace(QLatin1Char(','), QLatin1Char(' ')).simplified();
-  const QString guid = m_network.getGUID().replace(QLatin1Char(','), QLatin1Char(' ')).simplified();
-  const QStringList fields = {m_network.getName(), QString::number(m_network.getVersion()), category, guid};
-  m_block = QORXToLocal8Bit(CustomTransformerHeader::openingLine(fields)) + '\n';
-  for (const QByteArray& line : body(diagnostics).split('\n')) {
-    if (!line.isEmpty())
-      m_block += "# " + line + '\n';
-    else
-      m_block += "#\n";
-  }
-  m_block += "# TRANSFORMER_END\n\n";
+  m_body = makeBody(diagnostics);
   return !diagnostics.hasErrors();
 }
 
+QStringList CustomDefinition::lines() const {
+  return QORXFromLocal8Bit(m_body).split(QLatin1Char('\n'));
+}
+
+QStringList CustomDefinition::headerFields() const {
+  // Commas separate the fields; a category may list several.
+  const QString category = m_network.getCategory().replace(QLatin1Char(','), QLatin1Char(' ')).simplified();
+  const QString guid = m_network.getGUID().replace(QLatin1Char(','), QLatin1Char(' ')).simplified();
+  return {m_network.getName(), QString::number(m_network.getVersion()), category, guid};
+}
+
+QByteArray CustomDefinition::block() const {
+  QByteArray text = QORXToLocal8Bit(CustomTransformerHeader::openingLine(headerFields())) + '\n';
+  for (const QByteArray& line : m_body.split('\n')) {
+    if (!line.isEmpty())
+      text += "# " + line + '\n';
+    else
+      text += "#\n";
+  }
+  return text + "# TRANSFORMER_END\n\n";
+}
+
 void CustomDefinition::write(MFBuffer& buffer) const {
-  buffer.write(m_block);
+  buffer.write(block());
 }
 
 bool CustomDefinition::order(Diagnostics& diagnostics) {
@@ -161,8 +172,15 @@ QString CustomDefinition::flowFrom(const SubDocNetworkObj& node, const QString& 
 
 void CustomDefinition::connect(Part& part) const {
   for (const auto& [port, links] : part.node->feeders()) {
-    for (const SubDocNetworkObj::Link& link : links)
-      part.cfg->addInputFeatureType(port, flowFrom(*link.node, link.port));
+    QSet<QString> flows;
+    for (const SubDocNetworkObj::Link& link : links) {
+      // A loop point may bear the name of an input: both are one flow then.
+      const QString flow = flowFrom(*link.node, link.port);
+      if (!flows.contains(flow)) {
+        flows.insert(flow);
+        part.cfg->addInputFeatureType(port, flow);
+      }
+    }
   }
   for (const auto& [port, links] : part.node->consumers()) {
     if (!links.empty())
@@ -191,7 +209,7 @@ void CustomDefinition::check(const Part& part, Diagnostics& diagnostics) const {
   }
 }
 
-QByteArray CustomDefinition::body(Diagnostics& diagnostics) {
+QByteArray CustomDefinition::makeBody(Diagnostics& diagnostics) {
   QByteArray text;
   QBuffer device(&text);
   device.open(QIODevice::WriteOnly);

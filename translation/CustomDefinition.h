@@ -33,8 +33,14 @@ class ORX_EXPORT CustomDefinition {
   // Orders and connects the copies, checks what will be written, makes the text. False when anything was
   // reported as an error.
   bool prepare(Diagnostics& diagnostics);
-  // The block; call after prepare() answered true.
+  // All below: call after prepare() answered true.
   void write(MFBuffer& buffer) const;
+  // The definition's own lines, without the marks around them and without their prefix.
+  QStringList lines() const;
+  // The first fields of the line that opens the block: name, version, category, GUID.
+  QStringList headerFields() const;
+  // The block that write() writes.
+  QByteArray block() const;
 
  private:
   class Listener;
@@ -53,7 +59,7 @@ class ORX_EXPORT CustomDefinition {
   // The flow that a link's end brings, or takes, at that node and port.
   QString flowFrom(const SubDocNetworkObj& node, const QString& port) const;
   QString title(const Part& part) const;
-  QByteArray body(Diagnostics& diagnostics);
+  QByteArray makeBody(Diagnostics& diagnostics);
   QString redirect(const QString& value) const;
 
   const ExternalDocNetwork& m_network;
@@ -62,5 +68,5 @@ class ORX_EXPORT CustomDefinition {
   std::unique_ptr<Listener> m_listener;
   std::vector<const SubDocNetworkObjXformer*> m_order;
   std::vector<Part> m_parts;
-  QByteArray m_block;
+  QByteArray m_body;
 };

@@ -9,6 +9,7 @@
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
 #include <translation/InstanceIdentity.h>
+#include <translation/NetworkDiagnostics.h>
 #include <translation/WorkspaceBuilder.h>
 
 WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
@@ -150,25 +151,14 @@ std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const Transfor
 }
 
 void WorkspaceBuilder::reportCustomTransformers() {
-  const auto report = [this](const ExternalDocNetwork& network, const QString& file) {
-    for (const NetworkProblem& problem : network.problems()) {
-      const Rule rule = problem.kind == NetworkProblem::Kind::Upgraded ? Rule::Upgraded
-                        : problem.kind == NetworkProblem::Kind::UnmetDependency
-                            ? Rule::UnmetDependency
-                            : Rule::CustomTransformerFault;
-      const QString node =
-          problem.node.isEmpty() ? network.getName() : network.getName() + QLatin1Char('/') + problem.node;
-      m_diagnostics.reportIn(file, rule, problem.line, node, problem.text);
-    }
-  };
   for (const ExternalDocNetwork* network : m_workspace->customTransformers())
-    report(*network, m_workspace->fileName);
+    reportNetworkProblems(*network, m_workspace->fileName, m_diagnostics);
   QSet<const CompoundTransformerNetwork*> seen;
   for (const WorkspaceNode& node : m_workspace->nodes) {
     const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(node.cfg.get()));
     if (linked && !seen.contains(linked)) {
       seen.insert(linked);
-      report(*linked, linked->getFileName());
+      reportNetworkProblems(*linked, linked->getFileName(), m_diagnostics);
     }
   }
 }

@@ -1,5 +1,6 @@
 // orxt: the library from the command line.
 #include <apps/orxt/Console.h>
+#include <apps/orxt/ExtractCommand.h>
 #include <apps/orxt/FormatCommand.h>
 #include <apps/orxt/GenerateCommand.h>
 #include <apps/orxt/InfoCommand.h>
@@ -24,6 +25,7 @@ std::vector<std::unique_ptr<Command>> makeCommands() {
   commands.push_back(std::make_unique<ValidateCommand>());
   commands.push_back(std::make_unique<InfoCommand>());
   commands.push_back(std::make_unique<FormatCommand>());
+  commands.push_back(std::make_unique<ExtractCommand>());
   commands.push_back(std::make_unique<LintCommand>());
   commands.push_back(std::make_unique<TransformersCommand>());
   return commands;

@@ -66,7 +66,8 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
 TEST(CommandLine, GeneratesManyWorkspacesAtOnce) {
   QTemporaryDir folder;
   write(folder.filePath("broken.orw"), "#! <WORKSPACE><TRANSFORMERS>\n");
-  QStringList arguments = {"generate", "-d", "out", "--jobs", "3", "broken.orw"};
+  QStringList arguments = {"generate", "--resources", sample("custom"), "-d", "out",
+                           "--jobs",   "3",           "broken.orw"};
   arguments += samples();
   const Outcome run = orxt(arguments, folder.path());
   EXPECT_EQ(run.status, 1);

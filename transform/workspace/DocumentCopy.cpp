@@ -1,7 +1,5 @@
 #include <transform/workspace/DocumentCopy.h>
 
-namespace {
-
 void copySections(const IXMLComponentReader& reader, const QString& document, XMLComponentWriter& writer) {
   writer.setMiscParms(document, reader.GetSubDocParms(document));
   for (const auto& record : reader.GetGlobalParameterList(document))
@@ -21,8 +19,6 @@ void copySections(const IXMLComponentReader& reader, const QString& document, XM
   for (const auto& record : reader.GetAttributeLinkList(document))
     writer.addAttributeLink(document, record);
 }
-
-}  // namespace
 
 void copyDocument(const IXMLComponentReader& reader, XMLComponentWriter& writer) {
   for (const auto& record : reader.GetDatasetList())

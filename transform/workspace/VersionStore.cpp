@@ -188,11 +188,14 @@ QByteArray versionText(const QStringList& fields, const QStringList& definition,
 }  // namespace
 
 bool VersionStore::insert(const QStringList& fields, const QStringList& definition,
-                          const QByteArray& document, QString& error) const {
-  const auto refuse = [&](const QString& reason) {
+                          const QByteArray& document, QString& error, bool* isRefused) const {
+  const auto fail = [&](const QString& reason, bool refused) {
+    if (isRefused)
+      *isRefused = refused;
     error = QStringLiteral("Could not write a version into file %1: %2").arg(m_fileName, reason);
     return false;
   };
+  const auto refuse = [&](const QString& reason) { return fail(reason, true); };
   error = refusal(fields, definition, document);
   if (!error.isEmpty())
     return refuse(error);
@@ -201,10 +204,10 @@ bool VersionStore::insert(const QStringList& fields, const QStringList& definiti
   QFile file(m_fileName);
   if (file.exists()) {
     if (!file.open(QIODevice::ReadOnly))
-      return refuse(file.errorString());
+      return fail(file.errorString(), false);
     old = file.readAll();
     if (file.error() != QFileDevice::NoError)
-      return refuse(file.errorString());
+      return fail(file.errorString(), false);
     QBuffer buffer(&old);
     buffer.open(QIODevice::ReadOnly);
     VersionInfo wanted;
@@ -226,9 +229,9 @@ bool VersionStore::insert(const QStringList& fields, const QStringList& definiti
     head += lineEnd;
   AtomicFile output(m_fileName);
   if (!output.open())
-    return refuse(output.errorString());
+    return fail(output.errorString(), false);
   output.device().write(head);
   output.device().write(versionText(fields, definition, document, lineEnd));
   output.device().write(rest);
-  return output.commit() || refuse(output.errorString());
+  return output.commit() || fail(output.errorString(), false);
 }

@@ -45,9 +45,10 @@ class ORX_EXPORT VersionStore {
   // none. `fields` are those of the opening line: name, version, category and so on. `definition` are the
   // definition's mapping-file lines. `document` is XML text in UTF-8 as XMLComponentWriter writes it. False
   // when a field holds a comma or a line break, a definition line a line break or the end mark, or the file
-  // could not be written; `error` says why, and the file is untouched.
+  // could not be written; `error` says why, and the file is untouched. `isRefused` receives whether the
+  // version itself is the reason, or the file that is there.
   bool insert(const QStringList& fields, const QStringList& definition, const QByteArray& document,
-              QString& error) const;
+              QString& error, bool* isRefused = nullptr) const;
 
  private:
   QString m_fileName;

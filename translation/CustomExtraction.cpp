@@ -1,0 +1,179 @@
+#include <platform/orxparameter/orxparameter.h>
+#include <platform/qorxcore/qorxcore.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/SubDocumentLibrary.h>
+#include <transform/workspace/DocumentCopy.h>
+#include <translation/CustomDefinition.h>
+#include <translation/CustomExtraction.h>
+#include <translation/MacroReferences.h>
+#include <translation/NetworkDiagnostics.h>
+#include <translation/WorkspaceListener.h>
+
+#include <QBuffer>
+#include <QSet>
+
+namespace {
+
+const QString kSubDocumentType = QStringLiteral("SubDocumentTransformer");
+const QString kSubDocumentName = QStringLiteral("SUB_DOC_NAME");
+const QString kVersion = QStringLiteral("VERSION");
+const QString kLastSaveBuild = QStringLiteral("LAST_SAVE_BUILD");
+// One that was made a file of its own is meant to be shared.
+const QLatin1String kLinked("Linked by Default");
+
+// The name by which a record calls its transformer.
+QString calledName(const TransformerStruct& record) {
+  if (record.kind != TransformerKind::SubDocument)
+    return record.type;
+  for (const XformParmStruct& parameter : record.parameters) {
+    if (parameter.parmName == kSubDocumentName)
+      return parameter.parmValue;
+  }
+  return QString();
+}
+
+QString yesOrNo(bool isSet) {
+  return isSet ? QStringLiteral("yes") : QStringLiteral("no");
+}
+
+}  // namespace
+
+CustomExtraction::CustomExtraction(const IXMLComponentReader& reader, const QStringList& headerLines,
+                                   TransformerSource& source)
+    : m_reader(reader), m_source(source) {
+  for (const QString& line : headerLines)
+    m_global.readHeaderLine(line, 0);
+  for (const GlobalParameterStruct& record : reader.GetGlobalParameterList(QString()))
+    m_global.declare(GUIType::fromGuiLine(record.guiLine).getName(), record.defaultValue, record.line);
+}
+
+QStringList CustomExtraction::names() const {
+  QStringList names = m_reader.GetSubDocList();
+  names.removeAll(QString());
+  names.removeDuplicates();
+  return names;
+}
+
+bool CustomExtraction::prepare(const QString& name, int version, Diagnostics& diagnostics) {
+  findParts(name);
+  findWorkspaceParameters();
+  SubDocumentLibrary library(m_reader, &m_source);
+  const ExternalDocNetwork* network = library.network(name);
+  if (!network || !makeDefinition(library, diagnostics))
+    return false;
+  const int stored = version > 0 ? version : network->getVersion();
+  addFields(*network, stored);
+  return makeDocument(name, stored, diagnostics);
+}
+
+void CustomExtraction::findParts(const QString& name) {
+  const QStringList all = names();
+  QSet<QString> known(all.begin(), all.end());
+  QSet<QString> needed{name};
+  QStringList open{name};
+  while (!open.isEmpty()) {
+    for (const TransformerStruct& record : m_reader.GetTransformerList(open.takeLast())) {
+      const QString inner = calledName(record);
+      if (!known.contains(inner) || needed.contains(inner))
+        continue;
+      needed.insert(inner);
+      open.append(inner);
+    }
+  }
+  m_parts.clear();
+  for (const QString& part : all) {
+    if (needed.contains(part))
+      m_parts.append(part);
+  }
+}
+
+void CustomExtraction::findWorkspaceParameters() {
+  m_workspaceParameters.clear();
+  for (const QString& part : m_parts) {
+    QSet<QString> own;
+    for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(part))
+      own.insert(GUIType::fromGuiLine(record.guiLine).getName());
+    const auto look = [&](const QString& value) {
+      MacroReferences references(value);
+      while (references.next()) {
+        const QString name = references.name();
+        if (m_global.find(name) && !own.contains(name) && !m_workspaceParameters.contains(name))
+          m_workspaceParameters.append(name);
+      }
+    };
+    for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(part))
+      look(record.defaultValue);
+    for (const TransformerStruct& record : m_reader.GetTransformerList(part)) {
+      for (const XformParmStruct& parameter : record.parameters)
+        look(parameter.parmValue);
+    }
+  }
+}
+
+bool CustomExtraction::makeDefinition(SubDocumentLibrary& library, Diagnostics& diagnostics) {
+  m_definition.clear();
+  const std::vector<ExternalDocNetwork*>& networks = library.networks();
+  for (const ExternalDocNetwork* network : networks)
+    reportNetworkProblems(*network, diagnostics.file(), diagnostics);
+  if (diagnostics.hasErrors())
+    return false;
+  const WorkspaceListener surroundings(m_global);
+  for (const ExternalDocNetwork* network : networks) {
+    CustomDefinition definition(*network, surroundings);
+    if (!definition.prepare(diagnostics))
+      return false;
+    if (network == networks.back()) {
+      m_fields = definition.headerFields();
+      m_definition += definition.lines();
+      return true;
+    }
+    m_definition += QORXFromLocal8Bit(definition.block().trimmed()).split(QLatin1Char('\n')) << QString();
+  }
+  return false;
+}
+
+void CustomExtraction::addFields(const ExternalDocNetwork& network, int version) {
+  const ParallelSettings parallel = network.getParallelSettings();
+  m_fields[1] = QString::number(version);
+  m_fields += {kLinked,          yesOrNo(network.blockedLooping()), parallel.parallelism,
+               parallel.groupBy, parallel.processSetting,           QString::number(parallel.countSetting),
+               QString(),        yesOrNo(network.isDeprecated())};
+  const QString python = network.getPythonVersion();
+  if (!python.isEmpty())
+    m_fields.append(python);
+}
+
+bool CustomExtraction::makeDocument(const QString& name, int version, Diagnostics& diagnostics) {
+  m_document.clear();
+  QBuffer buffer(&m_document);
+  buffer.open(QIODevice::WriteOnly);
+  XMLComponentWriter writer(&buffer, kTransformerDocument);
+  writer.setEncoding("UTF-8");
+  writer.setMiscParms(QString(), {{kLastSaveBuild, QString::number(TransformerCfg::kThisBuild)}});
+  // The instance tells which of several sub-documents is the one.
+  TransformerStruct instance;
+  instance.identifier = 1;
+  instance.type = kSubDocumentType;
+  instance.version = version;
+  XformParmStruct parameter;
+  parameter.parmName = kSubDocumentName;
+  parameter.parmValue = name;
+  instance.parameters.push_back(parameter);
+  writer.addTransformer(QString(), instance);
+  for (const QString& part : m_parts) {
+    copySections(m_reader, part, writer);
+    if (part == name) {
+      QHash<QString, QString> settings = m_reader.GetSubDocParms(part);
+      settings.insert(kVersion, QString::number(version));
+      writer.setMiscParms(part, settings);
+    }
+  }
+  writer.writeDocument();
+  writer.stream().flush();
+  if (writer.getRefusal().isEmpty())
+    return true;
+  diagnostics.reportText(Rule::CustomTransformerFault, m_reader.GetDocumentLine(name), name,
+                         writer.getRefusal());
+  return false;
+}
