@@ -6,8 +6,8 @@
 #include <transform/workspace/DocumentCopy.h>
 #include <translation/CustomDefinition.h>
 #include <translation/CustomExtraction.h>
-#include <translation/MacroReferences.h>
 #include <translation/NetworkDiagnostics.h>
+#include <translation/ReferencedNames.h>
 #include <translation/WorkspaceListener.h>
 
 #include <QBuffer>
@@ -95,9 +95,7 @@ void CustomExtraction::findWorkspaceParameters() {
     for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(part))
       own.insert(GUIType::fromGuiLine(record.guiLine).getName());
     const auto look = [&](const QString& value) {
-      MacroReferences references(value);
-      while (references.next()) {
-        const QString name = references.name();
+      for (const QString& name : ReferencedNames::inValue(value)) {
         if (m_global.find(name) && !own.contains(name) && !m_workspaceParameters.contains(name))
           m_workspaceParameters.append(name);
       }

@@ -35,7 +35,9 @@ TEST(Validate, SaysWhatIsWrongWithBrokenWorkspaces) {
 
 TEST(Validate, FindsNothingWrongWithTheSamples) {
   // One sample keeps a deprecated transformer on purpose.
-  const Outcome run = orxt(QStringList{"validate", "--json", "--rule", "deprecated=off"} + samples());
+  const Outcome run =
+      orxt(QStringList{"validate", "--json", "--rule", "deprecated=off", "--resources", sample("custom")} +
+           samples());
   EXPECT_EQ(run.status, 0);
   const QJsonArray reports = QJsonDocument::fromJson(run.out.toUtf8()).array();
   ASSERT_EQ(reports.size(), samples().size());
