@@ -1,4 +1,5 @@
 #include <platform/orxparameter/orxparameter.h>
+#include <platform/orxutil/ResourceDirectories.h>
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerSource.h>
@@ -11,6 +12,17 @@
 #include <translation/InstanceIdentity.h>
 #include <translation/NetworkDiagnostics.h>
 #include <translation/WorkspaceBuilder.h>
+
+namespace {
+
+// What a linked custom transformer has is told by its file.
+QString nameWithFile(const TransformerCfg& cfg) {
+  const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(&cfg));
+  return linked ? cfg.getName() + QLatin1String(" (") + linked->getFileName() + QLatin1Char(')')
+                : cfg.getName();
+}
+
+}  // namespace
 
 WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
                                    const QHash<QString, QString>& parameterValues)
@@ -145,7 +157,9 @@ std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const Transfor
     m_diagnostics.report(Rule::UnknownVersion, record.line, nodeName,
                          {type, QString::number(record.version), QString::number(newest->getVersion())});
   } else {
-    m_diagnostics.report(Rule::UnknownTransformer, record.line, nodeName, {type});
+    m_diagnostics.report(Rule::UnknownTransformer, record.line, nodeName,
+                         {type, QString::number(record.version),
+                          ORX_resourcePlaces(QStringLiteral("transformer")).join(QLatin1String(", "))});
   }
   return nullptr;
 }
@@ -175,7 +189,7 @@ void WorkspaceBuilder::applyRecord(const TransformerStruct& record, WorkspaceNod
       continue;
     if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
       m_diagnostics.report(Rule::UnknownParameter, parameter.line, node.name,
-                           {cfg.getName(), parameter.parmName});
+                           {nameWithFile(cfg), parameter.parmName});
     }
   }
   if (record.name.isEmpty())
@@ -296,9 +310,9 @@ bool WorkspaceBuilder::findOutput(const WorkspaceNode& node, const LinkStruct& r
     tag = wanted;
     return true;
   }
-  m_diagnostics.report(
-      Rule::UnknownOutput, record.line, node.name,
-      {node.cfg->getName(), name.isEmpty() ? QString::number(number) : name, tags.join(QLatin1String(", "))});
+  m_diagnostics.report(Rule::UnknownOutput, record.line, node.name,
+                       {nameWithFile(*node.cfg), name.isEmpty() ? QString::number(number) : name,
+                        tags.join(QLatin1String(", "))});
   return false;
 }
 
@@ -323,9 +337,9 @@ bool WorkspaceBuilder::findInput(const WorkspaceNode& node, const LinkStruct& re
     tag = wanted;
     return true;
   }
-  m_diagnostics.report(
-      Rule::UnknownInput, record.line, node.name,
-      {node.cfg->getName(), name.isEmpty() ? QString::number(number) : name, tags.join(QLatin1String(", "))});
+  m_diagnostics.report(Rule::UnknownInput, record.line, node.name,
+                       {nameWithFile(*node.cfg), name.isEmpty() ? QString::number(number) : name,
+                        tags.join(QLatin1String(", "))});
   return false;
 }
 

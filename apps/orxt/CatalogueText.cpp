@@ -1,6 +1,7 @@
 #include <apps/orxt/CatalogueText.h>
 #include <apps/orxt/Console.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QJsonArray>
@@ -20,7 +21,18 @@ QJsonObject summaryAsJson(const TransformerCfg& transformer) {
           {QStringLiteral("categories"), QJsonArray::fromStringList(transformer.tags())},
           {QStringLiteral("visible"), transformer.isVisible()},
           {QStringLiteral("file"), transformer.getFileName()},
+          {QStringLiteral("custom"), isCustomTransformer(&transformer)},
           {QStringLiteral("summary"), firstSentence(transformer.getDescriptionLines())}};
+}
+
+QString summaryAsText(const TransformerCfg& transformer) {
+  const QString summary = firstSentence(transformer.getDescriptionLines());
+  if (!isCustomTransformer(&transformer))
+    return summary;
+  return QStringLiteral("[custom, version %1, %2] ")
+             .arg(transformer.getVersion())
+             .arg(transformer.getFileName()) +
+         summary;
 }
 
 void printSummaries(const std::vector<const TransformerCfg*>& transformers, Console& console) {
@@ -28,8 +40,7 @@ void printSummaries(const std::vector<const TransformerCfg*>& transformers, Cons
   for (const TransformerCfg* transformer : transformers)
     width = std::max(width, transformer->getLocalizedName().size());
   for (const TransformerCfg* transformer : transformers) {
-    console.print(makeColumnString(transformer->getLocalizedName(),
-                                   firstSentence(transformer->getDescriptionLines()), width + 1) +
+    console.print(makeColumnString(transformer->getLocalizedName(), summaryAsText(*transformer), width + 1) +
                   QLatin1Char('\n'));
   }
 }

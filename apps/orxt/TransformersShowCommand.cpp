@@ -2,6 +2,7 @@
 #include <apps/orxt/ParameterSchema.h>
 #include <apps/orxt/TransformersShowCommand.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/text/TextHelpers.h>
 
@@ -88,6 +89,8 @@ void TransformersShowCommand::showText(const TransformerCfg& cfg, Console& conso
   const auto heading = [&](const char* text) { line(QLatin1Char('\n') + QLatin1String(text)); };
   line(
       QStringLiteral("%1 (%2, version %3)").arg(cfg.getLocalizedName(), cfg.getName()).arg(cfg.getVersion()));
+  if (isCustomTransformer(&cfg))
+    line(QStringLiteral("Custom transformer from %1").arg(cfg.getFileName()));
   if (!cfg.tags().isEmpty())
     line(cfg.tags().join(QLatin1String(", ")));
   if (cfg.isDeprecated())

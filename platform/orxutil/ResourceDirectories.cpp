@@ -28,13 +28,17 @@ QString userDataFolder() {
   return set.startsWith(QLatin1Char('/')) ? set : QDir::homePath() + QLatin1String("/.local/share");
 }
 
+enum class SubFolders { Included, LeftOut };
+
 // The places of one kind in order, whether they exist or not.
-QStringList candidates(const QString& kind) {
+QStringList candidates(const QString& kind, SubFolders subFoldersOfHome) {
   const QString folderName = kind + QLatin1Char('s');
   const QString homeFolder = QORXOrxHome() + QLatin1Char('/') + folderName;
   QStringList places{homeFolder};
   const QStringList subFolders =
-      QDir(homeFolder).entryList(QDir::Dirs | QDir::NoDotAndDotDot | QDir::Readable, QDir::Name);
+      subFoldersOfHome == SubFolders::LeftOut
+          ? QStringList()
+          : QDir(homeFolder).entryList(QDir::Dirs | QDir::NoDotAndDotDot | QDir::Readable, QDir::Name);
   for (const QString& subFolder : subFolders) {
     places.append(homeFolder + QLatin1Char('/') + subFolder);
   }
@@ -59,7 +63,7 @@ QStringList ORX_resourceDirectories(const QString& kind) {
     return folders;
   }
   QSet<QString> seen;
-  const QStringList places = candidates(kind);
+  const QStringList places = candidates(kind, SubFolders::Included);
   for (const QString& place : places) {
     if (!holdsReadableFile(place)) {
       continue;
@@ -71,6 +75,17 @@ QStringList ORX_resourceDirectories(const QString& kind) {
     }
   }
   return folders;
+}
+
+QStringList ORX_resourcePlaces(const QString& kind) {
+  QStringList places;
+  if (isPlainWord(kind)) {
+    for (const QString& place : candidates(kind, SubFolders::LeftOut)) {
+      places.append(QORXPrettyUpFileName(place));
+    }
+    places.removeDuplicates();
+  }
+  return places;
 }
 
 void ORX_addResourceDirectory(const QString& folder) {

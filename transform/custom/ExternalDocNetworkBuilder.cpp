@@ -1,3 +1,4 @@
+#include <platform/orxutil/ResourceDirectories.h>
 #include <platform/qorxcore/Lists.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerSource.h>
@@ -173,7 +174,8 @@ std::unique_ptr<TransformerCfg> ExternalDocNetwork::Builder::makeTransformer(con
            {type, QString::number(record.version), QString::number(newest->getVersion())});
   } else {
     report(NetworkProblem::Kind::UnknownTransformer, record.line, title, custom_messages::kUnknownTransformer,
-           {type});
+           {type, QString::number(record.version),
+            ORX_resourcePlaces(QStringLiteral("transformer")).join(QLatin1String(", "))});
   }
   return nullptr;
 }
