@@ -219,8 +219,8 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   virtual void substParametersForToolTips(QStringList& lines) const;
   virtual void addAttributesToList(const AddAttributesInfo& info, QStringList& result) const;
   // Whether substInputs() and substOutputs() are those of TransformerCfg, so that the ports may be filled in
-  // together with the parameters. The base answers for its own class alone, so every other class is asked step
-  // by step; one that overrides neither may answer `typeid(*this) == typeid(ThatClass)`.
+  // together with the parameters. The base answers for its own class alone, so every other class is asked
+  // step by step; one that overrides neither may answer `typeid(*this) == typeid(ThatClass)`.
   virtual bool hasPlainPorts() const;
 
   // --- configuration ---------------------------------------------------------------------------------------

@@ -1,11 +1,11 @@
 // What an instance of a custom transformer writes into the mapping file.
 #include <transform/core/LookupChecks.h>
+#include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CustomMessages.h>
 #include <transform/custom/LookedUpParameters.h>
-#include <transform/core/ParameterReferences.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>

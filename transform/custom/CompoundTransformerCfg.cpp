@@ -1,12 +1,12 @@
 // Everything but the mapping file, which is written in CompoundMappingFile.cpp.
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/MacroText.h>
+#include <transform/core/ParameterReferences.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CustomMessages.h>
 #include <transform/custom/InstancePrototype.h>
 #include <transform/custom/NestedNetworks.h>
-#include <transform/core/ParameterReferences.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
