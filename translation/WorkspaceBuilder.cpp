@@ -148,7 +148,9 @@ std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const Transfor
     return cfg;
   const QString refusal = source.refusalReason();
   if (!refusal.isEmpty()) {
-    m_diagnostics.reportText(Rule::Nesting, record.line, nodeName, refusal);
+    const bool isRegistrys = !m_source.refusalReason().isEmpty();
+    m_diagnostics.reportText(isRegistrys ? Rule::CustomTransformerFault : Rule::Nesting, record.line,
+                             nodeName, refusal);
     return nullptr;
   }
   const std::unique_ptr<TransformerCfg> newest =

@@ -118,6 +118,25 @@ TEST(CustomTransformerFiles, RefusedOnesAreListed) {
         << test.version;
 }
 
+TEST(CustomTransformerFiles, OneOfANewerBuildSaysSo) {
+  RegistryFolders folders;
+  const QString path = customFile(folders, "C.ort", {{9, 99999}});
+  TransformerMgr& registry = folders.load();
+  const struct {
+    const char* name;
+    int version;
+    bool isRefused;
+  } cases[] = {{"Cleaner", 9, true},
+               {"Cleaner", -1, true},
+               {"Cleaner", 3, false},
+               {"Nothing", 9, false},
+               {"Other", 1, false}};
+  for (const auto& test : cases) {
+    const Copy copy(registry.getTransformer(test.name, test.version));
+    EXPECT_EQ(registry.refusalReason().contains(path), test.isRefused) << test.name << test.version;
+  }
+}
+
 TEST(CustomTransformerFiles, ARemoteFileTakesThePlaceOfTheDefinition) {
   RegistryFolders folders;
   const QString first = customFile(folders, "A.ort", {{2, 1}});

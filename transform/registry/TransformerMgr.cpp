@@ -34,6 +34,7 @@ constexpr long kVersionHeading = 370644;
 constexpr long kNamelessDefinition = 370742;
 constexpr long kNamedVersion = 370743;
 constexpr long kAllChanges = 370744;
+constexpr long kNewerBuild = 370745;
 
 }  // namespace
 
@@ -321,7 +322,12 @@ std::unique_ptr<TransformerCfg> TransformerMgr::copyOf(const QString& name, int 
   return copy;
 }
 
+QString TransformerMgr::refusalReason() const {
+  return m_refusal;
+}
+
 std::unique_ptr<TransformerCfg> TransformerMgr::makeTransformer(const QString& name, int version) {
+  m_refusal.clear();
   if (version == OLDEST_VERSION || !findPrototype(name, version))
     loadOnDemand(name, version);
   std::unique_ptr<TransformerCfg> copy = copyOf(name, version);
@@ -335,6 +341,13 @@ std::unique_ptr<TransformerCfg> TransformerMgr::makeTransformer(const QString& n
     copy = copyOf(alias, version);
     if (copy)
       copy->setRequestedAlias(name);
+  }
+  if (!copy && isTransformerIgnored(name, version)) {
+    const auto refused = std::find_if(
+        m_ignored.begin(), m_ignored.end(),
+        [&](const IgnoredTransformer& ignored) { return ignored.name == name && !ignored.isDuplicate; });
+    if (refused != m_ignored.end())
+      m_refusal = TransformResString(kNewerBuild, {name, QString::number(refused->version), refused->path});
   }
   return copy;
 }

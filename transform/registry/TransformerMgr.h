@@ -105,6 +105,9 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
 
   // What the lower floors ask.
   std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override;
+  // That the custom transformer's file was saved by a newer build, when that is why the last one asked for is
+  // not here.
+  QString refusalReason() const override;
   bool isConnectionKnown(const QString& encodedName) const override;
   std::vector<GUIType> memberDefinitions(const GUIType& type) const override;
 
@@ -140,6 +143,7 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   IORXSession* m_session = nullptr;
   bool m_loaded = false;
   std::list<IgnoredTransformer> m_ignored;
+  QString m_refusal;
   std::unique_ptr<ExceptionList> m_exceptions;
   std::unique_ptr<NamedConnections> m_connections;
 };
