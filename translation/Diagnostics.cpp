@@ -2,7 +2,11 @@
 #include <translation/Diagnostics.h>
 
 void Diagnostics::report(Rule rule, int line, const QString& node, const QStringList& arguments) {
-  reportText(rule, line, node, TransformResString(diagnosticRule(rule).message, arguments));
+  const DiagnosticRule& entry = diagnosticRule(rule);
+  const QString text = TransformResString(entry.message, arguments);
+  // Without the message files, under a wrong home, the rule and its arguments still tell what is meant.
+  reportText(rule, line, node,
+             text.isEmpty() ? (QStringList{entry.name} + arguments).join(QLatin1Char(' ')) : text);
 }
 
 void Diagnostics::reportText(Rule rule, int line, const QString& node, const QString& text) {

@@ -90,6 +90,15 @@ TEST(CommandLine, StandardOutputThatTakesNothingIsAnError) {
   }
 }
 
+TEST(CommandLine, WithoutItsHomeADiagnosticStillNamesTheRule) {
+  const QByteArray home = qgetenv("ORX_HOME");
+  qputenv("ORX_HOME", "/nowhere");
+  const Outcome run = orxt({"generate", sample("flood_parcels.orw")});
+  qputenv("ORX_HOME", home);
+  EXPECT_EQ(run.status, 1);
+  EXPECT_TRUE(run.err.contains("unknown-transformer AreaClipper")) << run.err.toStdString();
+}
+
 TEST(CommandLine, TheCatalogueAsJson) {
   const Outcome list = orxt({"transformers", "list", "--json", "--lang", "de"});
   const QJsonArray entries = QJsonDocument::fromJson(list.out.toUtf8()).array();
