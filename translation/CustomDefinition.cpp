@@ -1,4 +1,5 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/core/Keywords.h>
 #include <transform/core/LookupChecks.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/ParameterScopeListener.h>
@@ -6,6 +7,7 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CustomTransformerHeader.h>
 #include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjLoop.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
@@ -60,7 +62,7 @@ QString CustomDefinition::innerName(const QString& name) const {
 
 QString CustomDefinition::redirect(const QString& value) const {
   // Deferred references become ordinary ones as soon as they are written.
-  const bool isDeferred = value.contains(QLatin1String("$[")) && MFBuffer::closesDeferredMacros(value);
+  const bool isDeferred = value.contains(kDeferredOpen) && MFBuffer::closesDeferredMacros(value);
   return replaceParameterReferences(isDeferred ? MFBuffer::withOrdinaryMacros(value) : value,
                                     [this](const QString& name, QString& replacement) {
                                       replacement = QLatin1String("$(") + innerName(name) + QLatin1Char(')');
@@ -166,8 +168,7 @@ QString CustomDefinition::flowFrom(const SubDocNetworkObj& node, const QString& 
   if (!transformer)
     return innerName(node.name());
   const QString flow = innerName(node.name()) + QLatin1Char('_') + port;
-  const bool isCustom = dynamic_cast<const CompoundTransformerCfg*>(transformer->getTransformer()) != nullptr;
-  return isCustom ? flow + QLatin1String("_OUT") : flow;
+  return isCustomTransformer(transformer->getTransformer()) ? flow + QLatin1String("_OUT") : flow;
 }
 
 void CustomDefinition::connect(Part& part) const {

@@ -1,5 +1,6 @@
 #include <transform/core/ParameterReferences.h>
 #include <transform/text/GlobalMacros.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <translation/GlobalParameters.h>
 
 #include <algorithm>
@@ -30,9 +31,9 @@ QString takeWord(QString& text) {
 
 void GlobalParameters::readHeaderLine(const QString& line, int lineNumber) {
   QString rest = line.trimmed();
-  const QString keyword = takeWord(rest);
-  const bool isSetting = keyword == QLatin1String("MACRO");
-  if (!isSetting && keyword != QLatin1String("DEFAULT_MACRO"))
+  const QString keyword = takeWord(rest) + QLatin1Char(' ');
+  const bool isSetting = keyword == kMacroStatement;
+  if (!isSetting && keyword != kDefaultMacroStatement)
     return;
   const QString name = takeWord(rest);
   if (name.isEmpty())

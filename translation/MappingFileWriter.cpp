@@ -3,7 +3,9 @@
 #include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <translation/FlowNames.h>
@@ -78,12 +80,14 @@ bool MappingFileWriter::order() {
 }
 
 void MappingFileWriter::nameFlows() {
+  std::vector<QHash<QString, QSet<QString>>> copied(m_workspace.nodes.size());
   for (const AttributeLink& link : m_workspace.attributeLinks) {
     const QString function = copyAttributeFunction(link.to, link.from);
-    QStringList& functions = m_functions[at(link.source)][link.output];
-    if (functions.contains(function))
+    QSet<QString>& known = copied[at(link.source)][link.output];
+    if (known.contains(function))
       continue;
-    functions.append(function);
+    known.insert(function);
+    m_functions[at(link.source)][link.output].append(function);
     m_copies[at(link.source)][link.output].append(link.to);
   }
 
@@ -103,7 +107,7 @@ void MappingFileWriter::nameFlows() {
   // those come first.
   claimTypes(WorkspaceNode::Kind::Writer);
   for (int node = 0; node < count; ++node) {
-    if (isCustom(node))
+    if (isCustomTransformer(m_workspace.nodes[at(node)].cfg.get()))
       reserveInnerNames(m_workspace.nodes[at(node)], names);
   }
   claimTypes(WorkspaceNode::Kind::Reader);
@@ -115,17 +119,13 @@ void MappingFileWriter::nameFlows() {
       QStringList tags;
       place.cfg->getOutputTags(tags);
       // The plain names of a custom transformer's ports are those that its inside uses.
-      const QString end = isCustom(node) ? QStringLiteral("_OUT") : QString();
+      const QString end = isCustomTransformer(place.cfg.get()) ? QStringLiteral("_OUT") : QString();
       for (const QString& tag : tags) {
         if (connected[at(node)].contains(tag))
           m_flows[at(node)].insert(tag, names.claim(place.name + QLatin1Char('_') + tag + end));
       }
     }
   }
-}
-
-bool MappingFileWriter::isCustom(int node) const {
-  return dynamic_cast<const CompoundTransformerCfg*>(m_workspace.nodes[at(node)].cfg.get()) != nullptr;
 }
 
 void MappingFileWriter::reserveInnerNames(const WorkspaceNode& node, FlowNames& names) {
@@ -236,14 +236,20 @@ void MappingFileWriter::check() {
     if (parameter.isOverridden)
       checkParameter(parameter, parameter.overridingValue);
   }
+  QSet<const ConfiguredDefinition*> sound;  // whose template needs no second look
   for (const WorkspaceNode& node : m_workspace.nodes) {
     checkText(node.name, node.name, node.line, node.name);
     if (!node.isTransformer()) {
       checkText(node.keyword, node.keyword, node.line, node.name);
       continue;
     }
-    for (const QString& line : node.cfg->getTemplateLines())
-      checkText(line, node.cfg->getName(), node.line, node.name);
+    if (!sound.contains(node.cfg->definition())) {
+      const std::size_t before = m_diagnostics.all().size();
+      for (const QString& line : node.cfg->getTemplateLines())
+        checkText(line, node.cfg->getName(), node.line, node.name);
+      if (m_diagnostics.all().size() == before)
+        sound.insert(node.cfg->definition());
+    }
     const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(node.cfg.get());
     const QHash<QString, QString> faults =
         custom ? custom->findUnwritableParameters() : node.cfg->findUnwritableValues();
@@ -281,9 +287,9 @@ void MappingFileWriter::writeParameters(MFBuffer& buffer) const {
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
     const QString name = parameter.name + QLatin1Char(' ');
     if (!parameter.setInHeader)
-      writeStatement(buffer, QLatin1String("DEFAULT_MACRO ") + name + parameter.value);
+      writeStatement(buffer, kDefaultMacroStatement + name + parameter.value);
     if (parameter.isOverridden)
-      writeStatement(buffer, QLatin1String("MACRO ") + name + parameter.overridingValue);
+      writeStatement(buffer, kMacroStatement + name + parameter.overridingValue);
   }
 }
 

@@ -32,7 +32,6 @@ class ORX_EXPORT MappingFileWriter {
  private:
   bool order();
   bool prepareDefinitions();
-  bool isCustom(int node) const;
   void reserveInnerNames(const WorkspaceNode& node, FlowNames& names);
   void nameFlows();
   void connect();

@@ -1,5 +1,6 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
 #include <translation/RouteStatement.h>
 
@@ -7,7 +8,7 @@
 
 void writeRoute(MFBuffer& buffer, const QString& factoryName, const QStringList& from, const QString& to,
                 const QStringList& functions) {
-  buffer.add(QStringLiteral("FACTORY_DEF * TeeFactory"));
+  buffer.add(QString(kTeeFactoryStatement));
   buffer.add(QLatin1String("  FACTORY_NAME ") + quotifyStringForMF(factoryName));
   QSet<QString> named;
   for (const QString& flow : from) {

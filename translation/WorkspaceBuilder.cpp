@@ -261,11 +261,7 @@ bool WorkspaceBuilder::addLink(const LinkStruct& record) {
   }
 
   const auto readPort = [&](const QString& description, bool wantsOutput, unsigned& number, QString& name) {
-    bool isFeaturePort = false;
-    bool isOutput = false;
-    unsigned second = 0;
-    if (decodePortDescription(description, isFeaturePort, isOutput, number, second, name) && isFeaturePort &&
-        isOutput == wantsOutput)
+    if (readFeaturePort(description, wantsOutput, number, name))
       return true;
     m_diagnostics.report(Rule::BadPort, record.line, wantsOutput ? source.name : target.name,
                          {QString::number(record.identifier), description});

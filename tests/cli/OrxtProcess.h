@@ -55,3 +55,22 @@ inline void write(const QString& path, const QByteArray& bytes) {
   ASSERT_TRUE(file.open(QIODevice::WriteOnly));
   ASSERT_EQ(file.write(bytes), bytes.size());
 }
+
+// One command line: its exit status and a piece of each stream; an empty piece means that nothing may be
+// said.
+struct CommandCase {
+  QStringList arguments;
+  int status;
+  const char* out;
+  const char* err;
+};
+
+inline void expectOutcome(const CommandCase& test, const QString& folder) {
+  const Outcome run = orxt(test.arguments, folder);
+  const std::string line = test.arguments.join(' ').toStdString();
+  EXPECT_EQ(run.status, test.status) << line << "\n" << run.err.toStdString();
+  EXPECT_TRUE(*test.out ? run.out.contains(test.out) : run.out.isEmpty()) << line << "\n"
+                                                                          << run.out.toStdString();
+  EXPECT_TRUE(*test.err ? run.err.contains(test.err) : run.err.isEmpty()) << line << "\n"
+                                                                          << run.err.toStdString();
+}

@@ -17,12 +17,7 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
   write(folder.filePath("empty.orw"), "");
   write(folder.filePath("cut.orw"), readAll(samples().first()).left(3000));
   const QString good = samples().first();
-  const struct {
-    QStringList arguments;
-    int status;
-    const char* out;  // a piece of what is printed; empty: nothing may be printed
-    const char* err;
-  } cases[] = {
+  const CommandCase cases[] = {
       {{"--help"}, 0, "Example:", ""},
       {{"--version"}, 0, "orxt ", ""},
       {{"generate", "--help"}, 0, "--param NAME=VALUE", ""},
@@ -54,15 +49,8 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
       {{"lint", QStringLiteral(ORX_SOURCE_DIR) + "/resources/transformers"}, 0, "", ""},
       {{"lint", "missing.ort"}, 3, "", "missing.ort"},
   };
-  for (const auto& test : cases) {
-    const Outcome run = orxt(test.arguments, folder.path());
-    const std::string line = test.arguments.join(' ').toStdString();
-    EXPECT_EQ(run.status, test.status) << line << "\n" << run.err.toStdString();
-    EXPECT_TRUE(*test.out ? run.out.contains(test.out) : run.out.isEmpty()) << line << "\n"
-                                                                            << run.out.toStdString();
-    EXPECT_TRUE(*test.err ? run.err.contains(test.err) : run.err.isEmpty()) << line << "\n"
-                                                                            << run.err.toStdString();
-  }
+  for (const CommandCase& test : cases)
+    expectOutcome(test, folder.path());
   EXPECT_FALSE(QFile::exists(folder.filePath("cut.mf")));
 }
 

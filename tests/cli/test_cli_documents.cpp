@@ -87,12 +87,7 @@ TEST(DocumentCommands, EndWithTheStatusThatFits) {
   write(folder.filePath("other.orw"), "<FOO/>");
   write(folder.filePath("versions.ort"), kVersions);
   write(folder.filePath("hollow.ort"), "# ORW custom transformers\n");
-  const struct {
-    QStringList arguments;
-    int status;
-    const char* out;  // a piece of what is printed; empty: nothing may be printed
-    const char* err;
-  } cases[] = {
+  const CommandCase cases[] = {
       {{"info", "--help"}, 0, "Example:", ""},
       {{"format", "--help"}, 0, "--drop", ""},
       {{"info"}, 2, "", "workspace"},
@@ -124,15 +119,8 @@ TEST(DocumentCommands, EndWithTheStatusThatFits) {
       {{"format", "--check", good, "small.orw", "missing.orw"}, 3, "", "small.orw:2: error: "},
   };
   const QByteArray cut = readAll(folder.filePath("cut.orw"));
-  for (const auto& test : cases) {
-    const Outcome run = orxt(test.arguments, folder.path());
-    const std::string line = test.arguments.join(' ').toStdString();
-    EXPECT_EQ(run.status, test.status) << line << "\n" << run.err.toStdString();
-    EXPECT_TRUE(*test.out ? run.out.contains(test.out) : run.out.isEmpty()) << line << "\n"
-                                                                            << run.out.toStdString();
-    EXPECT_TRUE(*test.err ? run.err.contains(test.err) : run.err.isEmpty()) << line << "\n"
-                                                                            << run.err.toStdString();
-  }
+  for (const CommandCase& test : cases)
+    expectOutcome(test, folder.path());
   EXPECT_EQ(readAll(folder.filePath("cut.orw")), cut);
   EXPECT_EQ(readAll(folder.filePath("small.orw")), QByteArray(kSmall));
   EXPECT_EQ(readAll(folder.filePath("versions.ort")), QByteArray(kVersions));

@@ -18,6 +18,7 @@
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueConversion.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QScopeGuard>
@@ -386,7 +387,7 @@ QString TransformerCfg::writeChoiceLookupTclFunc(MFBuffer& buffer, const QString
 // -------------------------------------------------------------------------
 
 QString TransformerCfg::getDefaultMacroLine(const QString& parameter) const {
-  return QLatin1String("DEFAULT_MACRO ") + parameter + QLatin1Char(' ') +
+  return kDefaultMacroStatement + parameter + QLatin1Char(' ') +
          getDefaultMacroValue(parameter, UnpackLevel::Resolved);
 }
 

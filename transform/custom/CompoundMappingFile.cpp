@@ -9,6 +9,7 @@
 #include <transform/custom/ScriptParameters.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
 
 #include <algorithm>
@@ -19,7 +20,6 @@ namespace {
 // The flag of parameters whose references become those of the instance's own macros.
 constexpr unsigned kInstanceMacros = 2048;
 const QLatin1String kSetterAttributeType("STRING_OR_ATTR_ENCODED");
-const QString kTeeFactory = QStringLiteral("FACTORY_DEF * TeeFactory");
 
 QString factoryName(const QString& id, const QString& tag, const char* role) {
   return QLatin1String("  FACTORY_NAME \"") + id + QLatin1Char(' ') + tag + QLatin1String(role) +
@@ -70,7 +70,7 @@ bool CompoundTransformerCfg::doInstantiate(MFBuffer& buffer, bool inlineFlag) {
   const bool hasParameters = !(m_network->blockedLooping() && inlineFlag);
   Statements before = inputCollectors();
   if (hasParameters) {
-    before.push_back({QLatin1String("MACRO ") + prefix + QLatin1Char(' ') + id});
+    before.push_back({kMacroStatement + prefix + QLatin1Char(' ') + id});
     for (const QString& statement : parameterStatements(prefix, false))
       before.push_back({statement});
   }
@@ -103,7 +103,7 @@ CompoundTransformerCfg::Statements CompoundTransformerCfg::inputCollectors() con
     const QStringList featureTypes = getInputFeatureTypes(tag);
     if (featureTypes.isEmpty())
       continue;
-    QStringList lines{kTeeFactory, factoryName(id, tag, " Input Collector")};
+    QStringList lines{QString(kTeeFactoryStatement), factoryName(id, tag, " Input Collector")};
     for (const QString& featureType : featureTypes)
       lines.append(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(featureType));
     lines.append(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag));
@@ -119,7 +119,7 @@ CompoundTransformerCfg::Statements CompoundTransformerCfg::outputRenamers() cons
   Statements statements;
   for (const QString& tag : qAsConst(tags)) {
     QStringList lines{
-        kTeeFactory, factoryName(id, tag, " Output Renamer/Nuker"),
+        QString(kTeeFactoryStatement), factoryName(id, tag, " Output Renamer/Nuker"),
         QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag)};
     QString featureType;
     getOutputFeatureType(tag, featureType);
@@ -155,7 +155,7 @@ void CompoundTransformerCfg::writeParametersToMappingFile(MFBuffer& buffer, cons
 
 QStringList CompoundTransformerCfg::parameterStatements(const QString& prefixMacro, bool defaultsOnly) const {
   QStringList statements;
-  const QLatin1String keyword(defaultsOnly ? "DEFAULT_MACRO " : "MACRO ");
+  const QLatin1String keyword = defaultsOnly ? kDefaultMacroStatement : kMacroStatement;
   std::optional<QSet<QString>> setterDestinations;  // found when the first parameter asks for them
   for (const QString& parameter : getParameters()) {
     const GUIType& type = getParameterGUIType(parameter);

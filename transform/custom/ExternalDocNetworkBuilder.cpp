@@ -310,11 +310,7 @@ void ExternalDocNetwork::Builder::addLink(const LinkStruct& record) {
     return;
   const auto readPort = [&](const Place& place, const QString& description, bool wantsOutput,
                             unsigned& number, QString& name) {
-    bool isFeaturePort = false;
-    bool isOutput = false;
-    unsigned second = 0;
-    if (decodePortDescription(description, isFeaturePort, isOutput, number, second, name) && isFeaturePort &&
-        isOutput == wantsOutput)
+    if (readFeaturePort(description, wantsOutput, number, name))
       return true;
     reportPort(record, place, description);
     return false;

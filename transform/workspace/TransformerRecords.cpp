@@ -1,4 +1,5 @@
 #include <platform/qorxcore/Lists.h>
+#include <transform/text/TextHelpers.h>
 #include <transform/workspace/TransformerRecords.h>
 
 QString transformerTitle(const TransformerStruct& record) {
@@ -14,6 +15,14 @@ QString subDocumentName(const TransformerStruct& record) {
       return parameter.parmValue;
   }
   return QString();
+}
+
+bool readFeaturePort(const QString& description, bool wantsOutput, unsigned& number, QString& name) {
+  bool isFeaturePort = false;
+  bool isOutput = false;
+  unsigned second = 0;
+  return decodePortDescription(description, isFeaturePort, isOutput, number, second, name) && isFeaturePort &&
+         isOutput == wantsOutput;
 }
 
 std::vector<QStringList> readPortOrder(const QString& text) {

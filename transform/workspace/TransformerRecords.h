@@ -18,6 +18,10 @@ inline const QLatin1String kSubDocumentNameParameter("SUB_DOC_NAME");
 // Empty when the record is no instance of a custom transformer, or names none.
 ORX_EXPORT QString subDocumentName(const TransformerStruct& record);
 
+// Reads the description of a feature port at one end of a link. False when it describes something else.
+ORX_EXPORT bool readFeaturePort(const QString& description, bool wantsOutput, unsigned& number,
+                                QString& name);
+
 // The ports of an input order. Its text is a list packed with commas, one entry per port; each entry is a
 // list packed with blanks: the port's tag, then the flows that enter there, in their order.
 ORX_EXPORT std::vector<QStringList> readPortOrder(const QString& text);

@@ -1,5 +1,6 @@
 #include <platform/orxparameter/GUIType.h>
 #include <platform/vtl/SystemEncoding.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/workspace/DocumentLimits.h>
 #include <transform/workspace/FileLines.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
@@ -154,7 +155,7 @@ void WorkspaceSplitter::collectPrompts(const QStringList& headerLines, QHash<QSt
 void WorkspaceSplitter::collectMacros(const QStringList& headerLines, QHash<QString, QString>& macros) {
   for (const QString& line : headerLines) {
     int at = 0;
-    for (const QLatin1String keyword : {QLatin1String("DEFAULT_MACRO "), QLatin1String("MACRO ")}) {
+    for (const QLatin1String keyword : {kDefaultMacroStatement, kMacroStatement}) {
       if (line.startsWith(keyword))
         at = keyword.size();
     }
