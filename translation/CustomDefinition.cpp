@@ -7,7 +7,6 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CustomTransformerHeader.h>
 #include <transform/custom/ExternalDocNetwork.h>
-#include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjLoop.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
@@ -15,6 +14,7 @@
 #include <transform/text/MFBuffer.h>
 #include <transform/text/TextHelpers.h>
 #include <translation/CustomDefinition.h>
+#include <translation/FlowNames.h>
 #include <translation/FlowOrder.h>
 #include <translation/InstanceIdentity.h>
 #include <translation/MFDeviceBuffer.h>
@@ -149,14 +149,13 @@ void CustomDefinition::makePart(const SubDocNetworkObjXformer& node) {
   Part part;
   part.node = &node;
   part.cfg.reset(node.getTransformer()->getCopy());
-  part.name = innerName(node.name());
   for (const QString& parameter : part.cfg->getParameters()) {
     const QString value = part.cfg->getParameterValue(parameter);
     const QString redirected = redirect(value);
     if (redirected != value)
       part.cfg->setParameterValue(parameter, redirected, false);
   }
-  part.cfg->setIdentifier(part.name);
+  part.cfg->setIdentifier(innerName(node.name()));
   part.cfg->setBaseGuid(instanceStem({m_network.getName()}, node.number(), node.name()));
   part.cfg->setListener(m_listener.get());
   m_parts.push_back(std::move(part));
@@ -167,8 +166,7 @@ QString CustomDefinition::flowFrom(const SubDocNetworkObj& node, const QString& 
   // What enters by an input, and what a loop point sends back, arrives under the port's inner name.
   if (!transformer)
     return innerName(node.name());
-  const QString flow = innerName(node.name()) + QLatin1Char('_') + port;
-  return isCustomTransformer(transformer->getTransformer()) ? flow + QLatin1String("_OUT") : flow;
+  return outputFlowName(*transformer->getTransformer(), innerName(node.name()), port);
 }
 
 void CustomDefinition::connect(Part& part) const {

@@ -48,7 +48,6 @@ class ORX_EXPORT CustomDefinition {
   struct Part {
     const SubDocNetworkObjXformer* node = nullptr;
     std::unique_ptr<TransformerCfg> cfg;
-    QString name;  // with the prefix macro
   };
 
   bool order(Diagnostics& diagnostics);

@@ -1,4 +1,11 @@
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/NestedNetworks.h>
 #include <translation/FlowNames.h>
+
+QString outputFlowName(const TransformerCfg& cfg, const QString& identifier, const QString& tag) {
+  const QString name = identifier + QLatin1Char('_') + tag;
+  return isCustomTransformer(&cfg) ? name + QLatin1String("_OUT") : name;
+}
 
 QString FlowNames::claim(const QString& wanted) {
   auto taken = m_lastSuffix.find(wanted);

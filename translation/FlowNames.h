@@ -7,6 +7,12 @@
 #include <QHash>
 #include <QString>
 
+class TransformerCfg;
+
+// The name that is wanted for what leaves an output of a transformer written as `identifier`. The plain names
+// of a custom transformer's ports are those that its inside uses, so its outputs are named apart from them.
+QString outputFlowName(const TransformerCfg& cfg, const QString& identifier, const QString& tag);
+
 class ORX_EXPORT FlowNames {
  public:
   // `wanted` itself, or with "_2", "_3" and so on behind when it is taken.

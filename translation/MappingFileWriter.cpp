@@ -118,11 +118,9 @@ void MappingFileWriter::nameFlows() {
     } else if (place.isTransformer()) {
       QStringList tags;
       place.cfg->getOutputTags(tags);
-      // The plain names of a custom transformer's ports are those that its inside uses.
-      const QString end = isCustomTransformer(place.cfg.get()) ? QStringLiteral("_OUT") : QString();
       for (const QString& tag : tags) {
         if (connected[at(node)].contains(tag))
-          m_flows[at(node)].insert(tag, names.claim(place.name + QLatin1Char('_') + tag + end));
+          m_flows[at(node)].insert(tag, names.claim(outputFlowName(*place.cfg, place.name, tag)));
       }
     }
   }
