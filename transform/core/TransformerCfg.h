@@ -392,6 +392,10 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   void deepCopyParameterInfo(const TransformerCfg* other);
   void deepCopyAttributeInfo(const TransformerCfg* other);
   void addDefaultParms();
+  // What the base's getParameterValueForMappingFile() makes of a value, for classes that write another one
+  // than is stored.
+  QString textForMappingFile(QString value, const QString& name, const TransformParamCfg* parameter,
+                             MFBuffer& buffer) const;
   void writeChoiceBoxLookup(MFBuffer& buffer, const ChoiceList& lookup, const QString& value,
                             const QString& prompt, const QString& macro, bool optional) const;
   void writeListBoxLookup(MFBuffer& buffer, const ChoiceList& lookup, const QString& value,

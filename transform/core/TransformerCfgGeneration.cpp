@@ -271,7 +271,11 @@ QStringList TransformerCfg::getTransformFactoryInputLines() const {
 QString TransformerCfg::getParameterValueForMappingFile(const QString& name,
                                                         const TransformParamCfg* parameter,
                                                         MFBuffer& buffer) const {
-  QString value = stripBasicStringInfo(getParameterValue(name));
+  return textForMappingFile(stripBasicStringInfo(getParameterValue(name)), name, parameter, buffer);
+}
+
+QString TransformerCfg::textForMappingFile(QString value, const QString& name,
+                                           const TransformParamCfg* parameter, MFBuffer& buffer) const {
   if (name == kIdentifierParameter) {
     return value.contains(kMacroOpen) ? quotifyString(value, QStringLiteral(" ")) : quotifyStringForMF(value);
   }
