@@ -171,6 +171,8 @@ const std::vector<GUITypeEntry>& ORX_guiTypes() {
            "A text that is not shown while it is typed, or an attribute that holds it; any characters.")},
       {QLatin1String("PUBLISHED_PARAMETER"), kNoConfig, kPlain,
        QLatin1String("A parameter of the workspace.")},
+      {QLatin1String("PUBLISHED_PARAMETER_LIST"), kNoConfig, kPlain,
+       QLatin1String("Any number of parameters of the workspace, as references.")},
       {QLatin1String("RANGE_SLIDER"), kConfig, kPlain,
        QLatin1String("A number set with a slider; the configuration is smallest%largest%decimals.")},
       {QLatin1String("RANGE_SLIDER_OR_ATTR"), kConfig, kPlain,

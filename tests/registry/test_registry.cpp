@@ -2,7 +2,6 @@
 #include <platform/session/session.h>
 #include <tests/registry/RegistryFolders.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/specialised/TransformerCfgFactory.h>
 
 #include <QFile>
 #include <gtest/gtest.h>
@@ -388,26 +387,4 @@ TEST(Registry, NamedConnectionsAndMembers) {
   EXPECT_EQ(registry.parameterNotSetDisplayString(), "<not set>");
   const Copy copy(TransformerMgr::getTransformerMgr().getTransformer("T", 1));
   EXPECT_EQ(copy->definitionDirectory(), &registry);
-}
-
-TEST(Factory, TheFirstFittingRuleDecides) {
-  const auto make = [] { return new TransformerCfg; };
-  const std::vector<TransformerCfgRule> rules = {
-      {QLatin1String("A"), 0, 1, QLatin1String("Old"), make},
-      {QLatin1String("A"), 3, TransformerCfgRule::kAnyVersion, QLatin1String("New"), make},
-      {QLatin1String("A"), 0, TransformerCfgRule::kAnyVersion, QLatin1String("Rest"), make},
-      {QLatin1String("B"), 2, 2, QLatin1String("Two"), make},
-  };
-  struct Case {
-    const char* name;
-    int version;
-    const char* className;
-  };
-  const Case cases[] = {
-      {"A", 0, "Old"}, {"A", 1, "Old"}, {"A", 2, "Rest"}, {"A", 3, "New"}, {"A", 2147483647, "New"},
-      {"B", 1, ""},    {"B", 2, "Two"}, {"B", 3, ""},     {"a", 0, ""},    {"", 0, ""}};
-  for (const Case& c : cases) {
-    const TransformerCfgRule* rule = findTransformerCfgRule(rules, QString::fromLatin1(c.name), c.version);
-    EXPECT_STREQ(rule ? rule->className.data() : "", c.className) << c.name << " " << c.version;
-  }
 }

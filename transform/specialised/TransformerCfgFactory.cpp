@@ -1,8 +1,24 @@
 #include <transform/core/TransformerCfg.h>
+#include <transform/specialised/ParameterFetcherTransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 
+namespace {
+
+constexpr int kLowest = TransformerCfgRule::kLowestVersion;
+constexpr int kHighest = TransformerCfgRule::kHighestVersion;
+
+template <typename Class>
+TransformerCfg* make() {
+  return new Class;
+}
+
+}  // namespace
+
 const std::vector<TransformerCfgRule>& transformerCfgRules() {
-  static const std::vector<TransformerCfgRule> rules = {};
+  static const std::vector<TransformerCfgRule> rules = {
+      {QLatin1String("ParameterFetcher"), kLowest, kHighest, QLatin1String("ParameterFetcherTransformerCfg"),
+       make<ParameterFetcherTransformerCfg>},
+  };
   return rules;
 }
 

@@ -13,7 +13,8 @@ class TransformerCfg;
 
 // One row of the table: the class of the transformers of that name whose version lies in the range.
 struct TransformerCfgRule {
-  static constexpr int kAnyVersion = std::numeric_limits<int>::max();
+  static constexpr int kLowestVersion = std::numeric_limits<int>::min();
+  static constexpr int kHighestVersion = std::numeric_limits<int>::max();
 
   QLatin1String name;
   int firstVersion;

@@ -1,0 +1,69 @@
+#include "SpecialisedSetup.h"
+#include <transform/specialised/TransformerCfgFactory.h>
+
+#include <gtest/gtest.h>
+
+#include <typeinfo>
+
+namespace {
+
+struct Case {
+  const char* name;
+  int version;
+  const char* className;  // empty for the plain class
+};
+
+}  // namespace
+
+TEST(Factory, TheTableGivesEachTransformerItsClass) {
+  const Case cases[] = {
+      {"ParameterFetcher", 0, "ParameterFetcherTransformerCfg"},
+      {"ParameterFetcher", 3, "ParameterFetcherTransformerCfg"},
+      {"parameterfetcher", 3, ""},
+      {"ParameterFetcher ", 3, ""},
+      {"", 0, ""},
+      // Names whose class serves none of these versions.
+      {"ORXServerJobSubmitter", 2, ""},
+      {"AttributeSplitter", 1, ""},
+      {"Deaggregator", 6, ""},
+      {"TclCaller", 3, ""},
+      {"TestSuite.WorkspaceRunner", 0, ""},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(std::string(c.name) + " " + std::to_string(c.version));
+    const QString name = QString::fromLatin1(c.name);
+    const TransformerCfgRule* rule = findTransformerCfgRule(name, c.version);
+    EXPECT_STREQ(rule ? rule->className.data() : "", c.className);
+    const std::unique_ptr<TransformerCfg> made(createTransformerCfg(name, c.version));
+    EXPECT_EQ(typeid(*made) == typeid(TransformerCfg), rule == nullptr);
+  }
+}
+
+// Copies are what the registry hands out.
+TEST(Factory, CopiesAreOfTheSameClass) {
+  for (const TransformerCfgRule& rule : transformerCfgRules()) {
+    const std::unique_ptr<TransformerCfg> made(rule.make());
+    const std::unique_ptr<TransformerCfg> copy(made->getCopy());
+    EXPECT_EQ(typeid(*copy), typeid(*made)) << rule.className.data();
+    EXPECT_NE(typeid(*copy), typeid(TransformerCfg)) << rule.className.data();
+    EXPECT_TRUE(QString::fromLatin1(typeid(*made).name()).contains(rule.className)) << rule.className.data();
+  }
+}
+
+TEST(Factory, TheFirstFittingRuleDecides) {
+  const auto make = [] { return new TransformerCfg; };
+  constexpr int kHighest = TransformerCfgRule::kHighestVersion;
+  const std::vector<TransformerCfgRule> rules = {
+      {QLatin1String("A"), 0, 1, QLatin1String("Old"), make},
+      {QLatin1String("A"), 3, kHighest, QLatin1String("New"), make},
+      {QLatin1String("A"), 0, kHighest, QLatin1String("Rest"), make},
+      {QLatin1String("B"), 2, 2, QLatin1String("Two"), make},
+  };
+  const Case cases[] = {{"A", 0, "Old"},        {"A", 1, "Old"}, {"A", 2, "Rest"}, {"A", 3, "New"},
+                        {"A", kHighest, "New"}, {"B", 1, ""},    {"B", 2, "Two"},  {"B", 3, ""},
+                        {"a", 0, ""},           {"", 0, ""}};
+  for (const Case& c : cases) {
+    const TransformerCfgRule* rule = findTransformerCfgRule(rules, QString::fromLatin1(c.name), c.version);
+    EXPECT_STREQ(rule ? rule->className.data() : "", c.className) << c.name << " " << c.version;
+  }
+}

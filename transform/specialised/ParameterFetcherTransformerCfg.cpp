@@ -1,0 +1,219 @@
+#include <platform/qorxcore/Lists.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/WorkspaceParameterDirectory.h>
+#include <transform/specialised/ParameterFetcherTransformerCfg.h>
+#include <transform/text/GlobalMacros.h>
+#include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
+
+namespace {
+
+constexpr long kUnknownParameterMessage = 370617;
+constexpr int kFirstListVersion = 2;
+constexpr int kFirstBlankVersion = 3;  // entries in braces, separated by blanks
+
+const QLatin1String kListParameter("ATTR_LIST");
+const QLatin1String kPublishedParameterType("PUBLISHED_PARAMETER");
+const QLatin1Char kReferenceEnd(')');
+
+QString separatorOf(int version) {
+  return QLatin1String(version < kFirstBlankVersion ? "," : " ");
+}
+
+QStringList entriesOf(const QString& value, const QString& separator) {
+  return value == kUnusedValue ? QStringList() : value.split(separator, Qt::SkipEmptyParts);
+}
+
+QString referenceTo(const QString& name) {
+  return kMacroOpen + name + kReferenceEnd;
+}
+
+bool isReference(const QString& text) {
+  return text.startsWith(kMacroOpen) && text.endsWith(kReferenceEnd);
+}
+
+bool isWrapped(const QString& entry, char open, char close) {
+  return entry.size() >= 2 && entry.startsWith(QLatin1Char(open)) && entry.endsWith(QLatin1Char(close));
+}
+
+// Between a quote or brace at either end; the two need not match.
+bool isWrappedReference(const QString& entry) {
+  const auto stands = [&](int position, const char* any) {
+    return QLatin1String(any).contains(entry.at(position));
+  };
+  return entry.size() >= 5 && stands(0, "\"{") && stands(entry.size() - 1, "\"}") &&
+         isReference(entry.mid(1, entry.size() - 2));
+}
+
+}  // namespace
+
+TransformerCfg* ParameterFetcherTransformerCfg::getCopy() const {
+  auto copy = std::make_unique<ParameterFetcherTransformerCfg>();
+  copy->assign(this);
+  return copy.release();
+}
+
+QString ParameterFetcherTransformerCfg::attrListSeparator() const {
+  return separatorOf(getVersion());
+}
+
+QString ParameterFetcherTransformerCfg::macroNameFromMacroDef(const QString& entry) const {
+  if (isReference(entry)) {
+    return entry.mid(2, entry.size() - 3);
+  }
+  return isWrappedReference(entry) ? entry.mid(3, entry.size() - 5) : globalMacroName(entry);
+}
+
+bool ParameterFetcherTransformerCfg::isPublishedParameter(const QString& parameter) const {
+  return getVersion() < kFirstListVersion && getParameterType(parameter) == kPublishedParameterType;
+}
+
+bool ParameterFetcherTransformerCfg::holdsList(const QString& parameter) const {
+  return getVersion() >= kFirstListVersion && parameter == kListParameter && hasParameter(parameter);
+}
+
+QStringList ParameterFetcherTransformerCfg::entries() const {
+  return entriesOf(getParameterValue(kListParameter), attrListSeparator());
+}
+
+// --- version 1
+// ------------------------------------------------------------------------------------------------
+
+bool ParameterFetcherTransformerCfg::applyParameterValue(const QString& parameter, const QString& value) {
+  if (!isPublishedParameter(parameter)) {
+    return TransformerCfg::applyParameterValue(parameter, value);
+  }
+  QString reference = value == kUnusedValue ? QString() : value;
+  if (!reference.isEmpty() && !reference.startsWith(QLatin1Char('$'))) {
+    reference = referenceTo(reference);
+  }
+  // Without a directory nobody can say that there is no such parameter.
+  if (parameterDirectory() && !parameterDirectory()->knows(reference)) {
+    reference.clear();
+  }
+  return TransformerCfg::applyParameterValue(parameter, reference);
+}
+
+QString ParameterFetcherTransformerCfg::getParameterDisplayValue(const QString& parameter,
+                                                                 UnpackLevel level) const {
+  if (!isPublishedParameter(parameter)) {
+    return TransformerCfg::getParameterDisplayValue(parameter, level);
+  }
+  const QString value = getParameterValue(parameter);
+  return value.size() > 3 && isReference(value) ? value.mid(2, value.size() - 3) : value;
+}
+
+QString ParameterFetcherTransformerCfg::getDefaultMacroLine(const QString& parameter) const {
+  return isPublishedParameter(parameter)
+             ? kDefaultMacroStatement + parameter + QLatin1Char(' ') + getParameterDisplayValue(parameter)
+             : TransformerCfg::getDefaultMacroLine(parameter);
+}
+
+bool ParameterFetcherTransformerCfg::canCreateGlobalParameter(const QString& parameter) const {
+  return !isPublishedParameter(parameter) && TransformerCfg::canCreateGlobalParameter(parameter);
+}
+
+// --- the list
+// -------------------------------------------------------------------------------------------------
+
+bool ParameterFetcherTransformerCfg::parameterSupportsAttributeReference(const QString& parameter) const {
+  return parameter == kListParameter || TransformerCfg::parameterSupportsAttributeReference(parameter);
+}
+
+bool ParameterFetcherTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
+  if (!holdsList(parameter)) {
+    return TransformerCfg::validateParameter(parameter, message);
+  }
+  if (!parameterDirectory()) {
+    return true;
+  }
+  for (const QString& entry : entries()) {
+    if (!parameterDirectory()->knows(referenceTo(macroNameFromMacroDef(entry)))) {
+      message = TransformResString(kUnknownParameterMessage, entry);
+      return false;
+    }
+  }
+  return true;
+}
+
+QString ParameterFetcherTransformerCfg::getParameterValueForMappingFile(const QString& name,
+                                                                        const TransformParamCfg* parameter,
+                                                                        MFBuffer& buffer) const {
+  if (name != kListParameter) {
+    return TransformerCfg::getParameterValueForMappingFile(name, parameter, buffer);
+  }
+  const QString stored = stripBasicStringInfo(getParameterValue(name));
+  QStringList list = entriesOf(stored, attrListSeparator());
+  if (list.size() < 2) {
+    return textForMappingFile(stored, name, parameter, buffer);
+  }
+  const bool usesBraces = getVersion() >= kFirstBlankVersion;
+  const char open = usesBraces ? '{' : '"';
+  const char close = usesBraces ? '}' : '"';
+  for (QString& entry : list) {
+    if (!isWrapped(entry, open, close)) {
+      entry = QLatin1Char(open) + entry + QLatin1Char(close);
+    }
+  }
+  return textForMappingFile(list.join(attrListSeparator()), name, parameter, buffer);
+}
+
+QStringList ParameterFetcherTransformerCfg::fetchedAttributes() const {
+  const QString value = getParameterValue(kListParameter);
+  const QStringList list = QORXStringToList(value, attrListSeparator().at(0));
+  QStringList names;
+  for (const QString& entry : list) {
+    const QString macro = macroNameFromMacroDef(entry);
+    // A single text that names no macro is not known to be a name at all.
+    if (!macro.isEmpty() || list.size() > 1) {
+      names.append(macro.isEmpty() ? entry : macro);
+    }
+  }
+  return names;
+}
+
+void ParameterFetcherTransformerCfg::transformAllAttrs(QStringList& incoming, QStringList& result,
+                                                       const QString& inputTag,
+                                                       const QString& outputTag) const {
+  TransformerCfg::transformAllAttrs(incoming, result, inputTag, outputTag);
+  if (getVersion() >= kFirstListVersion) {
+    result += fetchedAttributes();
+  }
+}
+
+void ParameterFetcherTransformerCfg::getTooltipLines(QStringList& lines, bool asHtml) const {
+  TransformerCfg::getTooltipLines(lines, asHtml);
+  const QStringList names = getVersion() >= kFirstListVersion ? fetchedAttributes() : QStringList();
+  if (!names.isEmpty()) {
+    const QString text = names.join(QLatin1String(", "));
+    lines.append(asHtml ? text.toHtmlEscaped() : text);
+  }
+}
+
+bool ParameterFetcherTransformerCfg::upgradeTransformer(TransformerCfg* older) {
+  const bool isComplete = TransformerCfg::upgradeTransformer(older);
+  if (!older || older == this || !holdsList(kListParameter)) {
+    return isComplete;
+  }
+  QStringList list;
+  const int version = older->getVersion();
+  if (version < kFirstListVersion) {
+    for (const QString& name : older->getParameters()) {
+      const QString value = older->getParameterValue(name);
+      if (older->getParameterType(name) == kPublishedParameterType && !value.isEmpty()) {
+        list.append(value);
+      }
+    }
+  } else {
+    for (const QString& entry : entriesOf(older->getParameterValue(kListParameter), separatorOf(version))) {
+      const bool isBare = !isWrapped(entry, '"', '"') && !isWrapped(entry, '{', '}');
+      const QString text = isBare ? entry : entry.mid(1, entry.size() - 2);
+      // Names that are shown to people may hold the new separator, those of macros do not.
+      const QString macro = globalMacroName(text);
+      list.append(macro.isEmpty() ? text : macro);
+    }
+  }
+  setParameterValue(kListParameter, list.join(attrListSeparator()), false);
+  return isComplete;
+}
