@@ -153,9 +153,9 @@ void MappingFileWriter::connect() {
   for (std::size_t target = 0; target < m_workspace.nodes.size(); ++target) {
     const WorkspaceNode& node = m_workspace.nodes[target];
     QHash<QString, QHash<QString, int>> ranks;
-    for (const QStringList& port : node.inputOrder) {
-      for (int position = 1; position < port.size(); ++position)
-        ranks[port.first()].insert(port.at(position), position);
+    for (auto port = node.inputOrder.cbegin(); port != node.inputOrder.cend(); ++port) {
+      for (int position = 0; position < port->size(); ++position)
+        ranks[port.key()].insert(port->at(position), position);
     }
     const auto rank = [&](int number) {
       constexpr int last = std::numeric_limits<int>::max();

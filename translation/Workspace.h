@@ -33,9 +33,8 @@ struct WorkspaceNode {
 
   // Transformers.
   std::unique_ptr<TransformerCfg> cfg;
-  QStringList outputs;                  // the record's output ports, in its order
-  std::vector<QStringList> inputOrder;  // per input port of the record: tag, then its sources in order
-  QHash<QString, QStringList> exposed;  // output tag to the attributes that a user added there
+  QHash<QString, QStringList> inputOrder;  // input tag to the flows that enter there, in order
+  QHash<QString, QStringList> exposed;     // output tag to the attributes that a user added there
 
   // Whether a link at this end was left out: it, or the node at its other end, is disabled or at fault.
   bool lacksInputLink = false;

@@ -36,6 +36,7 @@ std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& re
   m_workspace->firstHeaderLine = reader.GetFirstHeaderLineNumber();
   m_places.clear();
   m_linesByName.clear();
+  m_ports.clear();
 
   m_workspace->library = std::make_unique<SubDocumentLibrary>(reader, &m_source);
   const QString mainDocument;
@@ -116,12 +117,15 @@ void WorkspaceBuilder::addTransformer(const TransformerStruct& record) {
     placeNode(record.identifier, record.line, title, -1);
     return;
   }
-  applyRecord(record, node);
+  TransformerPorts ports = applyRecord(record, node);
   // The identifier may have come out shorter than the record's name; it is what the statements hold.
   node.name = node.cfg->getIdentifier();
   takeName(node.name, record.line);
-  if (placeNode(record.identifier, record.line, node.name, static_cast<int>(m_workspace->nodes.size())))
-    m_workspace->nodes.push_back(std::move(node));
+  const int number = static_cast<int>(m_workspace->nodes.size());
+  if (!placeNode(record.identifier, record.line, node.name, number))
+    return;
+  m_ports.emplace(number, std::move(ports));
+  m_workspace->nodes.push_back(std::move(node));
 }
 
 void WorkspaceBuilder::takeName(const QString& name, int line) {
@@ -179,7 +183,7 @@ void WorkspaceBuilder::reportCustomTransformers() {
   }
 }
 
-void WorkspaceBuilder::applyRecord(const TransformerStruct& record, WorkspaceNode& node) {
+TransformerPorts WorkspaceBuilder::applyRecord(const TransformerStruct& record, WorkspaceNode& node) {
   TransformerCfg& cfg = *node.cfg;
   if (record.lastParmEdit > 0)
     cfg.setLastParmEditBuild(record.lastParmEdit);
@@ -197,29 +201,21 @@ void WorkspaceBuilder::applyRecord(const TransformerStruct& record, WorkspaceNod
   if (record.name.isEmpty())
     cfg.setIdentifier(node.name);
 
-  QStringList tags;
-  cfg.getOutputTags(tags);
-  for (const OutputFeatStruct& output : record.outputFeats)
-    node.outputs.append(output.name);
-  node.inputOrder = readPortOrder(record.inputFtOrder);
-  const QStringList& ports = node.outputs.isEmpty() ? tags : node.outputs;
-  for (const XformAttrStruct& attribute : record.attributes) {
-    if (!attribute.isUserCreated || !attribute.attrIsEnabled)
-      continue;
-    if (attribute.featIndex >= 0 && attribute.featIndex < ports.size()) {
-      node.exposed[ports.at(attribute.featIndex)].append(attribute.attrName);
-    } else {
-      for (const QString& tag : ports)
-        node.exposed[tag].append(attribute.attrName);
-    }
-  }
-
   cfg.autoUpgradeTransformer();
   if (cfg.isAutoUpgraded())
     m_diagnostics.report(Rule::Upgraded, record.line, node.name, {cfg.getName()});
   cfg.setListener(&m_workspace->listener);
   if (!cfg.dependencyMet())
     m_diagnostics.report(Rule::UnmetDependency, record.line, node.name, {cfg.getName(), cfg.dependencyMsg()});
+
+  TransformerPorts ports(record, cfg);
+  node.exposed = ports.exposedAttributes(record);
+  for (const QStringList& port : readPortOrder(record.inputFtOrder)) {
+    const QString tag = ports.input(0, port.value(0));
+    if (!tag.isNull())
+      node.inputOrder.insert(tag, port.mid(1));
+  }
+  return ports;
 }
 
 bool WorkspaceBuilder::placeNode(int identifier, int line, const QString& name, int node) {
@@ -270,12 +266,12 @@ bool WorkspaceBuilder::addLink(const LinkStruct& record) {
   unsigned number = 0;
   QString name;
   if (!readPort(record.sourcePortDesc, true, number, name) ||
-      (source.isTransformer() && !findOutput(source, record, number, name, link.output)))
+      !findPort(link.source, record, true, number, name, link.output))
     return false;
   number = 0;
   name.clear();
   if (!readPort(record.targetPortDesc, false, number, name) ||
-      (target.isTransformer() && !findInput(target, record, number, name, link.input)))
+      !findPort(link.target, record, false, number, name, link.input))
     return false;
   link.executionIndex = record.executionIdx;
   link.line = record.line;
@@ -292,51 +288,22 @@ void WorkspaceBuilder::noteLeftOut(const LinkStruct& record) {
     m_workspace->nodes[static_cast<std::size_t>(target)].lacksInputLink = true;
 }
 
-bool WorkspaceBuilder::findOutput(const WorkspaceNode& node, const LinkStruct& record, unsigned number,
-                                  const QString& name, QString& tag) {
-  QStringList tags;
-  node.cfg->getOutputTags(tags);
-  QString wanted = name;
-  if (wanted.isEmpty()) {
-    const QStringList& ports = node.outputs.isEmpty() ? tags : node.outputs;
-    if (number < static_cast<unsigned>(ports.size()))
-      wanted = ports.at(static_cast<int>(number));
-  }
-  if (!tags.contains(wanted))
-    wanted = node.cfg->renamedOutputTags(node.cfg->getVersion(), nullptr).value(wanted, wanted);
-  if (tags.contains(wanted)) {
-    tag = wanted;
+bool WorkspaceBuilder::findPort(int node, const LinkStruct& record, bool isOutput, unsigned number,
+                                const QString& name, QString& tag) {
+  const WorkspaceNode& place = m_workspace->nodes[static_cast<std::size_t>(node)];
+  if (!place.isTransformer())
     return true;
-  }
-  m_diagnostics.report(Rule::UnknownOutput, record.line, node.name,
-                       {nameWithFile(*node.cfg), name.isEmpty() ? QString::number(number) : name,
-                        tags.join(QLatin1String(", "))});
-  return false;
-}
-
-bool WorkspaceBuilder::findInput(const WorkspaceNode& node, const LinkStruct& record, unsigned number,
-                                 const QString& name, QString& tag) {
-  QStringList tags;
-  node.cfg->getInputTags(tags);
-  QString wanted = name;
-  if (wanted.isEmpty()) {
-    if (number < node.inputOrder.size() && !node.inputOrder[number].isEmpty())
-      wanted = node.inputOrder[number].first();
-    else if (number < static_cast<unsigned>(tags.size()))
-      wanted = tags.at(static_cast<int>(number));
-  }
-  if (!tags.contains(wanted)) {
-    const QString byAlias = node.cfg->getInputTagAliases().key(wanted);
-    wanted = byAlias.isEmpty()
-                 ? node.cfg->renamedInputTags(node.cfg->getVersion(), nullptr).value(wanted, wanted)
-                 : byAlias;
-  }
-  if (tags.contains(wanted)) {
-    tag = wanted;
+  const TransformerPorts& ports = m_ports.at(node);
+  tag = isOutput ? ports.output(number, name) : ports.input(number, name);
+  if (!tag.isNull())
     return true;
-  }
-  m_diagnostics.report(Rule::UnknownInput, record.line, node.name,
-                       {nameWithFile(*node.cfg), name.isEmpty() ? QString::number(number) : name,
+  QStringList tags;
+  if (isOutput)
+    place.cfg->getOutputTags(tags);
+  else
+    place.cfg->getInputTags(tags);
+  m_diagnostics.report(isOutput ? Rule::UnknownOutput : Rule::UnknownInput, record.line, place.name,
+                       {nameWithFile(*place.cfg), name.isEmpty() ? QString::number(number) : name,
                         tags.join(QLatin1String(", "))});
   return false;
 }
@@ -366,6 +333,6 @@ void WorkspaceBuilder::addAttributeLink(const LinkStruct& record) {
   }
   if (link.from == link.to)
     return;
-  if (!source.isTransformer() || findOutput(source, record, port, QString(), link.output))
+  if (findPort(link.source, record, true, port, QString(), link.output))
     m_workspace->attributeLinks.push_back(link);
 }

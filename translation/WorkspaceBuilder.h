@@ -3,11 +3,13 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/custom/TransformerPorts.h>
 #include <translation/Diagnostics.h>
 #include <translation/Workspace.h>
 
 #include <QHash>
 
+#include <map>
 #include <memory>
 
 class IXMLComponentReader;
@@ -38,7 +40,7 @@ class ORX_EXPORT WorkspaceBuilder {
   void addTransformer(const TransformerStruct& record);
   std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& nodeName);
   void reportCustomTransformers();
-  void applyRecord(const TransformerStruct& record, WorkspaceNode& node);
+  TransformerPorts applyRecord(const TransformerStruct& record, WorkspaceNode& node);
   void takeName(const QString& name, int line);
   bool placeNode(int identifier, int line, const QString& name, int node);
   // False when the link cannot be placed; `source` and `target` are -1 when it leads to a node that is left
@@ -48,15 +50,15 @@ class ORX_EXPORT WorkspaceBuilder {
   bool addLink(const LinkStruct& record);
   void noteLeftOut(const LinkStruct& record);
   void addAttributeLink(const LinkStruct& record);
-  bool findOutput(const WorkspaceNode& node, const LinkStruct& record, unsigned number, const QString& name,
-                  QString& tag);
-  bool findInput(const WorkspaceNode& node, const LinkStruct& record, unsigned number, const QString& name,
-                 QString& tag);
+  // `tag` stays empty for a feature type.
+  bool findPort(int node, const LinkStruct& record, bool isOutput, unsigned number, const QString& name,
+                QString& tag);
 
   TransformerSource& m_source;
   Diagnostics& m_diagnostics;
   const QHash<QString, QString> m_parameterValues;
   std::unique_ptr<Workspace> m_workspace;
-  QHash<int, Place> m_places;         // by identifier in the document
-  QHash<QString, int> m_linesByName;  // of transformers
+  QHash<int, Place> m_places;               // by identifier in the document
+  QHash<QString, int> m_linesByName;        // of transformers
+  std::map<int, TransformerPorts> m_ports;  // by node
 };

@@ -1,5 +1,4 @@
 #include <platform/orxutil/ResourceDirectories.h>
-#include <platform/qorxcore/Lists.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerSource.h>
 #include <transform/custom/CustomMessages.h>
@@ -9,33 +8,6 @@
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
-
-#include <algorithm>
-
-namespace {
-
-// Every name under which a transformer's tags are known; a tag itself goes before an older or a second name.
-QHash<QString, QString> namesOfTags(const QStringList& tags, const QHash<QString, QString>& aliases,
-                                    const QHash<QString, QString>& renamed) {
-  QHash<QString, QString> names;
-  for (const QString& tag : tags)
-    names.insert(tag, tag);
-  for (const QString& tag : tags) {
-    const QString alias = aliases.value(tag);
-    if (!alias.isEmpty() && !names.contains(alias))
-      names.insert(alias, tag);
-  }
-  QStringList olds = renamed.keys();
-  olds.sort();
-  for (const QString& old : qAsConst(olds)) {
-    const QString tag = renamed.value(old);
-    if (!names.contains(old) && names.value(tag) == tag)
-      names.insert(old, tag);
-  }
-  return names;
-}
-
-}  // namespace
 
 void ExternalDocNetwork::build(const IXMLComponentReader& reader, const QString& subDocumentName,
                                TransformerSource& source) {
@@ -147,7 +119,7 @@ void ExternalDocNetwork::Builder::addTransformer(const TransformerStruct& record
   if (!enter(record.identifier, place) || !cfg)
     return;
   SubDocNetworkObjXformer* node = m_network.addTransformer(cfg.release(), {}, record.identifier);
-  node->setExposedAttributes(exposedAttributes(record, place));
+  node->setExposedAttributes(place.ports.exposedAttributes(record));
   m_network.m_transformerNames.insert(place.title);
 }
 
@@ -203,36 +175,7 @@ void ExternalDocNetwork::Builder::configure(const TransformerStruct& record, Pla
            {cfg.getName(), cfg.dependencyMsg()});
   }
 
-  for (const OutputFeatStruct& output : record.outputFeats)
-    place.recordOutputs.append(output.name);
-  for (const QStringList& port : readPortOrder(record.inputFtOrder))
-    place.recordInputs.append(port.value(0));
-  QStringList tags;
-  cfg.getInputTags(tags);
-  tags += cfg.getDynamicInputTags();
-  place.inputs = namesOfTags(tags, cfg.getInputTagAliases(), cfg.renamedInputTags(record.version, &cfg));
-  cfg.getOutputTags(tags);
-  place.outputs = namesOfTags(tags, {}, cfg.renamedOutputTags(record.version, &cfg));
-}
-
-QHash<QString, QStringList> ExternalDocNetwork::Builder::exposedAttributes(const TransformerStruct& record,
-                                                                           const Place& place) const {
-  QHash<QString, QStringList> exposed;
-  QStringList tags;
-  place.cfg->getOutputTags(tags);
-  const QStringList& ports = place.recordOutputs.isEmpty() ? tags : place.recordOutputs;
-  for (const XformAttrStruct& attribute : record.attributes) {
-    if (!attribute.isUserCreated || !attribute.attrIsEnabled)
-      continue;
-    if (attribute.featIndex >= 0 && attribute.featIndex < ports.size()) {
-      const QString port = ports.at(attribute.featIndex);
-      exposed[place.outputs.value(port, port)].append(attribute.attrName);
-      continue;
-    }
-    for (const QString& tag : qAsConst(tags))
-      exposed[tag].append(attribute.attrName);
-  }
-  return exposed;
+  place.ports = TransformerPorts(record, cfg);
 }
 
 // --- links -------------------------------------------------------------------------------------------------
@@ -256,49 +199,23 @@ void ExternalDocNetwork::Builder::reportPort(const LinkStruct& record, const Pla
          {QString::number(record.identifier), description});
 }
 
-bool ExternalDocNetwork::Builder::findOutput(const LinkStruct& record, const Place& place, unsigned number,
-                                             const QString& name, QString& tag) {
+bool ExternalDocNetwork::Builder::findPort(const LinkStruct& record, const Place& place, bool isOutput,
+                                           unsigned number, const QString& name, QString& tag) {
   if (place.kind != Kind::Transformer) {
     tag = place.title;
     return true;
   }
+  tag = isOutput ? place.ports.output(number, name) : place.ports.input(number, name);
+  if (!tag.isNull())
+    return true;
   QStringList tags;
-  place.cfg->getOutputTags(tags);
-  const QStringList& ports = place.recordOutputs.isEmpty() ? tags : place.recordOutputs;
-  const QString wanted = name.isEmpty() && number < static_cast<unsigned>(ports.size())
-                             ? ports.at(static_cast<int>(number))
-                             : name;
-  const auto found = place.outputs.constFind(wanted);
-  if (found != place.outputs.constEnd()) {
-    tag = *found;
-    return true;
-  }
-  report(NetworkProblem::Kind::UnknownOutput, record.line, place.title, custom_messages::kUnknownOutput,
-         {place.cfg->getName(), wanted.isEmpty() ? QString::number(number) : wanted,
-          tags.join(QLatin1String(", "))});
-  return false;
-}
-
-bool ExternalDocNetwork::Builder::findInput(const LinkStruct& record, const Place& place, unsigned number,
-                                            const QString& name, QString& tag) {
-  if (place.kind != Kind::Transformer) {
-    tag = place.title;
-    return true;
-  }
-  QStringList tags;
-  place.cfg->getInputTags(tags);
-  QString wanted = name;
-  if (wanted.isEmpty())
-    wanted = place.recordInputs.value(static_cast<int>(std::min(number, 0x7fffffffU)));
-  if (wanted.isEmpty())
-    wanted = tags.value(static_cast<int>(std::min(number, 0x7fffffffU)));
-  const auto found = place.inputs.constFind(wanted);
-  if (found != place.inputs.constEnd()) {
-    tag = *found;
-    return true;
-  }
-  report(NetworkProblem::Kind::UnknownInput, record.line, place.title, custom_messages::kUnknownInput,
-         {place.cfg->getName(), wanted.isEmpty() ? QString::number(number) : wanted,
+  if (isOutput)
+    place.cfg->getOutputTags(tags);
+  else
+    place.cfg->getInputTags(tags);
+  report(isOutput ? NetworkProblem::Kind::UnknownOutput : NetworkProblem::Kind::UnknownInput, record.line,
+         place.title, isOutput ? custom_messages::kUnknownOutput : custom_messages::kUnknownInput,
+         {place.cfg->getName(), name.isEmpty() ? QString::number(number) : name,
           tags.join(QLatin1String(", "))});
   return false;
 }
@@ -325,13 +242,13 @@ void ExternalDocNetwork::Builder::addLink(const LinkStruct& record) {
   QString name;
   QString output;
   if (!readPort(*source, record.sourcePortDesc, true, number, name) ||
-      !findOutput(record, *source, number, name, output))
+      !findPort(record, *source, true, number, name, output))
     return;
   number = 0;
   name.clear();
   QString input;
   if (readPort(*target, record.targetPortDesc, false, number, name) &&
-      findInput(record, *target, number, name, input))
+      findPort(record, *target, false, number, name, input))
     m_network.addLink(record.sourceNode, output, record.targetNode, input);
 }
 
@@ -358,7 +275,7 @@ void ExternalDocNetwork::Builder::addAttributeLink(const LinkStruct& record) {
     return;
   }
   QString tag;
-  if (from != to && findOutput(record, *source, port, QString(), tag))
+  if (from != to && findPort(record, *source, true, port, QString(), tag))
     m_network.nodeByNumber(record.sourceNode)->addAttributeCopy(tag, from, to);
 }
 

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/TransformerPorts.h>
 #include <transform/workspace/WorkspaceRecords.h>
 
 #include <memory>
@@ -22,17 +23,13 @@ class ExternalDocNetwork::Builder {
     bool isLeftOut = false;  // disabled or not built: links to it are dropped without a word
     QString title;
     TransformerCfg* cfg = nullptr;
-    QStringList recordOutputs;       // of a transformer's record, in its order
-    QStringList recordInputs;        // likewise
-    QHash<QString, QString> inputs;  // every name by which a tag is known, to the tag
-    QHash<QString, QString> outputs;
+    TransformerPorts ports;  // of a transformer
   };
 
   void addPorts();
   void addTransformer(const TransformerStruct& record);
   std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& title);
   void configure(const TransformerStruct& record, Place& place);
-  QHash<QString, QStringList> exposedAttributes(const TransformerStruct& record, const Place& place) const;
   void addLink(const LinkStruct& record);
   void addAttributeLink(const LinkStruct& record);
   void addParameters();
@@ -40,10 +37,8 @@ class ExternalDocNetwork::Builder {
   bool enter(int identifier, const Place& place);
   // False, with a problem, when an end is unknown; also false, without one, when an end is left out.
   bool findEnds(const LinkStruct& record, Place*& source, Place*& target);
-  bool findOutput(const LinkStruct& record, const Place& place, unsigned number, const QString& name,
-                  QString& tag);
-  bool findInput(const LinkStruct& record, const Place& place, unsigned number, const QString& name,
-                 QString& tag);
+  bool findPort(const LinkStruct& record, const Place& place, bool isOutput, unsigned number,
+                const QString& name, QString& tag);
   void report(NetworkProblem::Kind kind, int line, const QString& node, long message,
               const QStringList& arguments);
   void reportPort(const LinkStruct& record, const Place& place, const QString& description);
