@@ -1,4 +1,5 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/LookupChecks.h>
 #include <transform/core/ParameterReferences.h>
@@ -7,6 +8,7 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CustomTransformerHeader.h>
 #include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjLoop.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
@@ -22,6 +24,8 @@
 
 #include <QBuffer>
 #include <QSet>
+
+#include <algorithm>
 
 // Inside a definition the published parameters are macros whose values only the instance knows: whatever
 // refers to them also refers to the prefix macro.
@@ -70,15 +74,49 @@ QString CustomDefinition::redirect(const QString& value) const {
                                     });
 }
 
-bool CustomDefinition::prepare(Diagnostics& diagnostics) {
-  if (!order(diagnostics))
+bool CustomDefinition::arrange(Diagnostics& diagnostics) {
+  m_isArranged = order(diagnostics);
+  if (!m_isArranged)
     return false;
   for (const SubDocNetworkObjXformer* node : m_order)
     makePart(*node);
-  for (Part& part : m_parts) {
+  for (Part& part : m_parts)
     connect(part);
-    check(part, diagnostics);
+  return true;
+}
+
+bool CustomDefinition::namesAttributes() const {
+  const QString token = kMacroOpen + kSchemaToken + QLatin1Char(')');
+  return std::any_of(m_parts.begin(), m_parts.end(), [&](const Part& part) {
+    const QStringList parameters = part.cfg->getParameters();
+    return TransformerCfg::containsToken(part.cfg->getTemplateLines(), kSchemaToken) ||
+           std::any_of(parameters.begin(), parameters.end(), [&](const QString& parameter) {
+             return part.cfg->getParameterValue(parameter).contains(token);
+           });
+  });
+}
+
+void CustomDefinition::passAttributes(const InnerAttributes::ByPort& arriving) {
+  std::vector<InnerAttributes::Member> members;
+  for (const Part& part : m_parts)
+    members.push_back({part.node, part.cfg.get()});
+  InnerAttributes(m_network, members).pass(arriving);
+}
+
+std::vector<const TransformerCfg*> CustomDefinition::customTransformers() const {
+  std::vector<const TransformerCfg*> found;
+  for (const Part& part : m_parts) {
+    if (isCustomTransformer(part.cfg.get()))
+      found.push_back(part.cfg.get());
   }
+  return found;
+}
+
+bool CustomDefinition::prepare(Diagnostics& diagnostics) {
+  if (!m_isArranged)
+    return false;
+  for (const Part& part : m_parts)
+    check(part, diagnostics);
   for (const SubDocNetworkObj* node : m_network.nodes()) {
     if (!lookup_checks::isOneLine(node->name()))
       diagnostics.report(Rule::LineBreak, 0, m_network.getName(), {node->name().simplified()});

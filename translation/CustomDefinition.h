@@ -8,6 +8,7 @@
 #include <platform/Export.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <translation/Diagnostics.h>
+#include <translation/InnerAttributes.h>
 
 #include <QByteArray>
 #include <QHash>
@@ -30,8 +31,18 @@ class ORX_EXPORT CustomDefinition {
   CustomDefinition(const ExternalDocNetwork& network, const TransformerCfgListener& surroundings);
   ~CustomDefinition();
 
-  // Orders and connects the copies, checks what will be written, makes the text. False when anything was
-  // reported as an error.
+  const ExternalDocNetwork& network() const { return m_network; }
+
+  // Orders and connects the copies. False when they feed each other in a circle.
+  bool arrange(Diagnostics& diagnostics);
+  // The four below: call after arrange() answered true. Whether a statement names the attributes that reach
+  // it.
+  bool namesAttributes() const;
+  // Tells the copies what reaches them when `arriving` reaches the inputs.
+  void passAttributes(const InnerAttributes::ByPort& arriving);
+  // Those of the copies that are custom transformers, in the order of their statements.
+  std::vector<const TransformerCfg*> customTransformers() const;
+  // Checks what will be written, makes the text. False when anything was reported as an error.
   bool prepare(Diagnostics& diagnostics);
   // All below: call after prepare() answered true.
   void write(MFBuffer& buffer) const;
@@ -67,5 +78,6 @@ class ORX_EXPORT CustomDefinition {
   std::unique_ptr<Listener> m_listener;
   std::vector<const SubDocNetworkObjXformer*> m_order;
   std::vector<Part> m_parts;
+  bool m_isArranged = false;
   QByteArray m_body;
 };

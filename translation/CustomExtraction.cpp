@@ -4,7 +4,7 @@
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/workspace/DocumentCopy.h>
-#include <translation/CustomDefinition.h>
+#include <translation/CustomDefinitions.h>
 #include <translation/CustomExtraction.h>
 #include <translation/NetworkDiagnostics.h>
 #include <translation/ReferencedNames.h>
@@ -117,18 +117,17 @@ bool CustomExtraction::makeDefinition(SubDocumentLibrary& library, Diagnostics& 
   if (diagnostics.hasErrors())
     return false;
   const WorkspaceListener surroundings(m_global);
-  for (const ExternalDocNetwork* network : networks) {
-    CustomDefinition definition(*network, surroundings);
-    if (!definition.prepare(diagnostics))
-      return false;
-    if (network == networks.back()) {
-      m_fields = definition.headerFields();
-      m_definition += definition.lines();
-      return true;
-    }
-    m_definition += QORXFromLocal8Bit(definition.block().trimmed()).split(QLatin1Char('\n')) << QString();
+  CustomDefinitions definitions(networks, surroundings);
+  if (!definitions.prepare(diagnostics))
+    return false;
+  const CustomDefinition& itself = definitions.all().back();
+  for (const CustomDefinition& definition : definitions.all()) {
+    if (&definition != &itself)
+      m_definition += QORXFromLocal8Bit(definition.block().trimmed()).split(QLatin1Char('\n')) << QString();
   }
-  return false;
+  m_fields = itself.headerFields();
+  m_definition += itself.lines();
+  return true;
 }
 
 void CustomExtraction::addFields(const ExternalDocNetwork& network, int version) {

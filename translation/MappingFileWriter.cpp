@@ -32,7 +32,9 @@ void writeStatement(MFBuffer& buffer, const QString& line) {
 }  // namespace
 
 MappingFileWriter::MappingFileWriter(Workspace& workspace, Diagnostics& diagnostics)
-    : m_workspace(workspace), m_diagnostics(diagnostics) {}
+    : m_workspace(workspace),
+      m_diagnostics(diagnostics),
+      m_definitions(workspace.customTransformers(), workspace.listener) {}
 
 bool MappingFileWriter::prepare() {
   const std::size_t count = m_workspace.nodes.size();
@@ -48,15 +50,9 @@ bool MappingFileWriter::prepare() {
     pushAttributes();
   }
   check();
-  return prepareDefinitions();
-}
-
-bool MappingFileWriter::prepareDefinitions() {
-  for (const ExternalDocNetwork* network : m_workspace.customTransformers()) {
-    m_definitions.emplace_back(*network, m_workspace.listener);
-    m_definitions.back().prepare(m_diagnostics);
-  }
-  return !m_diagnostics.hasErrors();
+  for (const WorkspaceNode& node : m_workspace.nodes)
+    m_definitions.addInstance(node.cfg.get());
+  return m_definitions.prepare(m_diagnostics);
 }
 
 bool MappingFileWriter::order() {
@@ -270,7 +266,7 @@ bool MappingFileWriter::write(MFBuffer& buffer) {
   }
   writeParameters(buffer);
   writeFeatureTypes(buffer);
-  for (const CustomDefinition& definition : m_definitions)
+  for (const CustomDefinition& definition : m_definitions.all())
     definition.write(buffer);
   for (const int number : m_order) {
     const WorkspaceNode& node = m_workspace.nodes[at(number)];

@@ -2,14 +2,13 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <translation/CustomDefinition.h>
+#include <translation/CustomDefinitions.h>
 #include <translation/Diagnostics.h>
 #include <translation/Workspace.h>
 
 #include <QString>
 #include <QStringList>
 
-#include <deque>
 #include <vector>
 
 class FlowNames;
@@ -31,7 +30,6 @@ class ORX_EXPORT MappingFileWriter {
 
  private:
   bool order();
-  bool prepareDefinitions();
   void reserveInnerNames(const WorkspaceNode& node, FlowNames& names);
   void nameFlows();
   void connect();
@@ -53,7 +51,7 @@ class ORX_EXPORT MappingFileWriter {
   std::vector<QHash<QString, QString>> m_flows;          // per node: output tag to flow; "" for feature types
   std::vector<QHash<QString, QStringList>> m_functions;  // per node: output tag to output functions
   std::vector<QHash<QString, QStringList>> m_copies;  // per node: output tag to attributes that functions add
-  std::vector<QString> m_copiedFlows;  // per reader with copied attributes: the flow behind the copies
-  std::deque<CustomDefinition> m_definitions;  // embedded ones, innermost first
-  std::vector<std::vector<int>> m_incoming;    // per node: its links, in the order of the sources
+  std::vector<QString> m_copiedFlows;        // per reader with copied attributes: the flow behind the copies
+  CustomDefinitions m_definitions;           // of the embedded custom transformers
+  std::vector<std::vector<int>> m_incoming;  // per node: its links, in the order of the sources
 };

@@ -133,8 +133,9 @@ class SmallWorkspace {
   int m_linkCount = 0;
 };
 
-// Makes the transformers "Copy" (INPUT to OUTPUT, REST), "Join" (LEFT, RIGHT to OUTPUT), "Pick" (a lookup
-// choice), "Map" (a choice with a lookup table) and "Broken" (a template that cannot be written).
+// Makes the transformers "Copy" (INPUT to OUTPUT, REST), "Add" (the same, with a new attribute), "Join"
+// (LEFT, RIGHT to OUTPUT), "Pick" (a lookup choice), "Map" (a choice with a lookup table) and "Broken" (a
+// template that cannot be written).
 class SmallSource : public TransformerSource {
  public:
   std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override {
@@ -151,6 +152,10 @@ class SmallSource : public TransformerSource {
     if (name == "Join") {
       definition.inputTags = QStringList{"LEFT", "RIGHT:R"};
       definition.outputTags = QStringList{"OUTPUT"};
+    } else if (name == "Add") {
+      definition.attributesAdded = QStringList{"$(NEW)"};
+      parameter = "NEW";
+      type = "OPTIONAL NEW_ATTR";
     } else if (name == "Pick") {
       parameter = "MODE";
       type = "LOOKUP_CHOICE Fast,fast%Slow<space>one,slow";

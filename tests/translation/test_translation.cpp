@@ -1,51 +1,8 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <tests/support/QtPrinters.h>
-#include <tests/translation/SmallWorkspace.h>
-#include <translation/WorkspaceTranslation.h>
-
-#include <QRegularExpression>
-#include <gtest/gtest.h>
+#include <tests/translation/TranslatedWorkspace.h>
 
 namespace {
-
-struct Outcome {
-  TranslationResult result;
-  QStringList diagnostics;  // "line rule node"
-  QString text;
-};
-
-QStringList describe(const Diagnostics& diagnostics) {
-  QStringList result;
-  for (const Diagnostic& diagnostic : diagnostics.all()) {
-    EXPECT_FALSE(diagnostic.text.isEmpty()) << diagnosticRule(diagnostic.rule).name.latin1();
-    result << QString("%1 %2").arg(diagnosticRule(diagnostic.rule).name, diagnostic.node);
-  }
-  return result;
-}
-
-QString readAll(const QString& path) {
-  QFile file(path);
-  return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
-}
-
-Outcome translate(const SmallWorkspace& workspace, const QHash<QString, QString>& values = {}) {
-  QTemporaryDir folder;
-  SmallSource source;
-  const QString file = workspace.save(folder);
-  Diagnostics diagnostics(file);
-  QString error;
-  const QString output = folder.filePath("out.mf");
-  Outcome outcome;
-  outcome.result = translateWorkspace({file, output, values}, source, diagnostics, error);
-  EXPECT_EQ(error, QString());
-  outcome.diagnostics = describe(diagnostics);
-  // Continuation lines joined and padding dropped: what is compared is the statements.
-  outcome.text = readAll(output)
-                     .replace(QRegularExpression(" +\\\\\n(# )?"), " ")
-                     .replace(QRegularExpression(" +"), " ")
-                     .replace("\n\n", "\n");
-  return outcome;
-}
 
 SmallWorkspace copyBetween() {
   SmallWorkspace workspace;

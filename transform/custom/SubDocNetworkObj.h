@@ -47,6 +47,8 @@ class ORX_EXPORT SubDocNetworkObj {
   };
   void addAttributeCopy(const QString& port, const QString& from, const QString& to);
   const std::map<QString, std::vector<AttributeCopy>>& attributeCopies() const { return m_copies; }
+  // `attributes`, and behind them the copies made at the port.
+  QStringList withCopies(const QString& port, const QStringList& attributes) const;
 
   static void addLink(SubDocNetworkObj& from, const QString& fromPort, SubDocNetworkObj& to,
                       const QString& toPort);
@@ -65,8 +67,6 @@ class ORX_EXPORT SubDocNetworkObj {
   QStringList collect(const std::vector<Link>& links, QHash<QString, QString>& origins) const;
   // The same over all ports, in name order.
   QStringList collectAll(QHash<QString, QString>& origins) const;
-  // `attributes`, and behind them the copies made at the port.
-  QStringList withCopies(const QString& port, const QStringList& attributes) const;
 
   // Notes that compute() ran. `arrived` is what reaches the node.
   void noteComputed(const QStringList& arrived);

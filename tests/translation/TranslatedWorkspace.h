@@ -1,0 +1,55 @@
+// Translates a small workspace and tells what came of it.
+#pragma once
+
+#include <tests/translation/SmallWorkspace.h>
+#include <translation/WorkspaceTranslation.h>
+
+#include <QRegularExpression>
+#include <gtest/gtest.h>
+
+struct Outcome {
+  TranslationResult result;
+  QStringList diagnostics;  // "rule node"
+  QStringList texts;        // of the diagnostics
+  QString text;
+};
+
+inline QStringList describe(const Diagnostics& diagnostics) {
+  QStringList result;
+  for (const Diagnostic& diagnostic : diagnostics.all()) {
+    EXPECT_FALSE(diagnostic.text.isEmpty()) << diagnosticRule(diagnostic.rule).name.latin1();
+    result << QString("%1 %2").arg(diagnosticRule(diagnostic.rule).name, diagnostic.node);
+  }
+  return result;
+}
+
+inline QString readAll(const QString& path) {
+  QFile file(path);
+  return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
+}
+
+inline Outcome translate(const SmallWorkspace& workspace, TransformerSource& source,
+                         const QHash<QString, QString>& values = {}) {
+  QTemporaryDir folder;
+  const QString file = workspace.save(folder);
+  Diagnostics diagnostics(file);
+  QString error;
+  const QString output = folder.filePath("out.mf");
+  Outcome outcome;
+  outcome.result = translateWorkspace({file, output, values}, source, diagnostics, error);
+  EXPECT_EQ(error, QString());
+  outcome.diagnostics = describe(diagnostics);
+  for (const Diagnostic& diagnostic : diagnostics.all())
+    outcome.texts << diagnostic.text;
+  // Continuation lines joined and padding dropped: what is compared is the statements.
+  outcome.text = readAll(output)
+                     .replace(QRegularExpression(" +\\\\\n(# )?"), " ")
+                     .replace(QRegularExpression(" +"), " ")
+                     .replace("\n\n", "\n");
+  return outcome;
+}
+
+inline Outcome translate(const SmallWorkspace& workspace, const QHash<QString, QString>& values = {}) {
+  SmallSource source;
+  return translate(workspace, source, values);
+}

@@ -1,0 +1,103 @@
+// Workspaces with custom transformers, translated as a whole.
+#include <tests/support/QtPrinters.h>
+#include <tests/translation/TranslatedWorkspace.h>
+
+namespace {
+
+const QString kInstance = QStringLiteral("SubDocumentTransformer");
+
+// --- statements that name the attributes which reach them
+// ---------------------------------------------------
+
+// The attributes that the statement of the transformer "Names" lists, in the blocks of the file.
+QStringList namedAttributes(const QString& text) {
+  const QRegularExpression statement(
+      "# FACTORY_DEF \\* CopyFactory FACTORY_NAME \\S+_Names [^\n]* P (\\S*)\n");
+  QStringList named;
+  for (auto found = statement.globalMatch(text); found.hasNext();) {
+    const QStringList schema = found.next().captured(1).split(',', Qt::SkipEmptyParts);
+    for (int i = 0; i < schema.size(); i += 2) {
+      named << schema.at(i);
+      EXPECT_EQ(schema.value(i + 1), QString("varchar<leftparenthesis>255<rightparenthesis>"));
+    }
+  }
+  return named;
+}
+
+// Instances of "Schema" fed by the readers A (id, a) and B (id, b), in this order.
+SmallWorkspace schemaWorkspace(const QString& readers) {
+  SmallWorkspace workspace;
+  workspace.reader(1, "A", {"id", "a"}).reader(2, "B", {"id", "b", "list{}.x"});
+  int id = 10;
+  for (const QChar reader : readers) {
+    workspace.transformer(++id, kInstance,
+                          {"SUB_DOC_NAME", "Schema", "XFORMER_NAME", QString("I%1").arg(id), "KEY", "k"});
+    workspace.link(reader == 'A' ? 1 : 2, "fo 0", id, "fi 0 IN");
+  }
+  return workspace;
+}
+
+TEST(CustomTranslation, StatementsNameTheAttributesOfAllInstances) {
+  const QStringList names = {"XFORMER_NAME", "Names", "VALUE", "$(XFORMER_SCHEMA)"};
+  const auto plain = [&](SmallWorkspace& w) {
+    w.transformer(3, "Copy", names).link(1, "fo 0", 3, "fi 0 INPUT");
+  };
+  const struct {
+    const char* promise;
+    const char* readers;
+    std::function<void(SmallWorkspace&)> inside;
+    QStringList named;
+  } cases[] = {
+      {"of one", "A", plain, {"id", "a"}},
+      {"of both, in their order", "AB", plain, {"id", "a", "b"}},
+      {"in the other order", "BA", plain, {"id", "b", "a"}},
+      {"without an instance that is fed, none", "", plain, {}},
+      {"behind others, whatever lies between",
+       "AB",
+       [&](SmallWorkspace& w) {
+         w.transformer(4, "Copy", {"XFORMER_NAME", "Before"}).transformer(3, "Copy", names);
+         w.link(1, "fo 0", 4, "fi 0 INPUT").link(4, "fo 1", 3, "fi 0 INPUT");
+         w.attributeLink(4, "ao 1 0 id", 3, "ai 0 0 copy");
+       },
+       {"id", "a", "b", "copy"}},
+      {"what comes back by a loop",
+       "A",
+       [&](SmallWorkspace& w) {
+         w.port(8, "AGAIN", "loop").transformer(3, "Copy", names).transformer(4, "Copy", {});
+         w.link(8, "fo 0", 3, "fi 0 INPUT").link(1, "fo 0", 4, "fi 0 INPUT").link(4, "fo 0", 8, "fi 0");
+       },
+       {"id", "a"}},
+      {"nested, one level further in",
+       "BA",
+       [&](SmallWorkspace& w) {
+         w.transformer(3, kInstance, {"SUB_DOC_NAME", "Inside", "XFORMER_NAME", "X"});
+         w.transformer(4, kInstance, {"SUB_DOC_NAME", "Inside", "XFORMER_NAME", "Y"});
+         w.link(1, "fo 0", 3, "fi 0 IN").link(3, "fo 0", 4, "fi 0 IN").endCustom();
+         w.beginCustom("Inside").port(1, "IN", "true").port(2, "OUT", "false");
+         w.transformer(3, "Copy", names).transformer(4, "Add", {"NEW", "new"});
+         w.link(1, "fo 0", 3, "fi 0 INPUT").link(1, "fo 0", 4, "fi 0 INPUT").link(4, "fo 0", 2, "fi 0");
+       },
+       {"id", "b", "a", "new"}},
+      {"not one whose name only the instance knows",
+       "A",
+       [&](SmallWorkspace& w) {
+         w.transformer(3, "Copy", names).transformer(4, "Add", {"NEW", "$(KEY)"});
+         w.link(1, "fo 0", 4, "fi 0 INPUT").link(4, "fo 0", 3, "fi 0 INPUT");
+       },
+       {"id", "a"}},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace = schemaWorkspace(test.readers);
+    if (*test.readers == '\0')
+      workspace.transformer(20, kInstance, {"SUB_DOC_NAME", "Schema", "XFORMER_NAME", "Unfed"});
+    workspace.beginCustom("Schema").parameter("GUI TEXT KEY Key", "none");
+    workspace.port(1, "IN", "true").port(2, "OUT", "false");
+    test.inside(workspace);
+    workspace.endCustom();
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.result, TranslationResult::Done) << outcome.texts.join('\n').toStdString();
+    EXPECT_EQ(namedAttributes(outcome.text), test.named) << test.promise << outcome.text.toStdString();
+  }
+}
+
+}  // namespace
