@@ -17,6 +17,8 @@ struct Case {
 
 TEST(Factory, TheTableGivesEachTransformerItsClass) {
   const Case cases[] = {
+      {"Tester", 1, "TesterTransformerCfg"},
+      {"tester", 1, ""},
       {"ParameterFetcher", 0, "ParameterFetcherTransformerCfg"},
       {"ParameterFetcher", 3, "ParameterFetcherTransformerCfg"},
       {"parameterfetcher", 3, ""},

@@ -1,5 +1,6 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/ParameterFetcherTransformerCfg.h>
+#include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 
 namespace {
@@ -16,6 +17,8 @@ TransformerCfg* make() {
 
 const std::vector<TransformerCfgRule>& transformerCfgRules() {
   static const std::vector<TransformerCfgRule> rules = {
+      {QLatin1String("Tester"), kLowest, kHighest, QLatin1String("TesterTransformerCfg"),
+       make<TesterTransformerCfg>},
       {QLatin1String("ParameterFetcher"), kLowest, kHighest, QLatin1String("ParameterFetcherTransformerCfg"),
        make<ParameterFetcherTransformerCfg>},
   };

@@ -1,0 +1,197 @@
+#include <transform/core/Keywords.h>
+#include <transform/specialised/Formula.h>
+#include <transform/text/MessageStrings.h>
+
+#include <algorithm>
+
+namespace {
+
+constexpr long kNotUnderstoodMessage = 370701;
+constexpr long kIncompleteMessage = 370702;
+constexpr int kLongestQuote = 40;
+
+bool isNameCharacter(QChar c) {
+  return c.isLetterOrNumber() || c == QLatin1Char('_');
+}
+
+bool isWord(const QString& text, const char* word) {
+  return text.compare(QLatin1String(word), Qt::CaseInsensitive) == 0;
+}
+
+int skip(const QString& text, int position, bool (*belongs)(QChar)) {
+  while (position < text.size() && belongs(text.at(position))) {
+    ++position;
+  }
+  return position;
+}
+
+bool isDigit(QChar c) {
+  return c >= QLatin1Char('0') && c <= QLatin1Char('9');
+}
+
+int numberEnd(const QString& text, int position) {
+  int end = skip(text, position, isDigit);
+  if (end < text.size() && text.at(end) == QLatin1Char('.')) {
+    end = skip(text, end + 1, isDigit);
+  }
+  if (end == position || (end == position + 1 && text.at(position) == QLatin1Char('.'))) {
+    return -1;
+  }
+  if (end < text.size() && text.at(end).toLower() == QLatin1Char('e')) {
+    int digits = end + 1;
+    if (digits < text.size() &&
+        (text.at(digits) == QLatin1Char('-') || text.at(digits) == QLatin1Char('+'))) {
+      ++digits;
+    }
+    const int exponentEnd = skip(text, digits, isDigit);
+    end = exponentEnd > digits ? exponentEnd : end;
+  }
+  return end < text.size() && isNameCharacter(text.at(end)) ? -1 : end;
+}
+
+// Behind the closing quote; quotes inside are doubled.
+int textEnd(const QString& text, int position) {
+  for (int i = position + 1; i < text.size(); ++i) {
+    if (text.at(i) != QLatin1Char('"')) {
+      continue;
+    }
+    if (i + 1 == text.size() || text.at(i + 1) != QLatin1Char('"')) {
+      return i + 1;
+    }
+    ++i;
+  }
+  return -1;
+}
+
+// Behind the bracket that closes the one at `open`.
+int bracketEnd(const QString& text, int open) {
+  int depth = 0;
+  for (int i = open; i < text.size(); ++i) {
+    depth += text.at(i) == QLatin1Char('(') ? 1 : text.at(i) == QLatin1Char(')') ? -1 : 0;
+    if (depth == 0) {
+      return i + 1;
+    }
+  }
+  return -1;
+}
+
+int operatorSize(const QString& text, int position) {
+  static const QLatin1String operators[] = {QLatin1String("!="), QLatin1String("<="), QLatin1String(">="),
+                                            QLatin1String("="),  QLatin1String("<"),  QLatin1String(">"),
+                                            QLatin1String("+"),  QLatin1String("-"),  QLatin1String("*"),
+                                            QLatin1String("/"),  QLatin1String("%")};
+  const auto found = std::find_if(std::begin(operators), std::end(operators), [&](QLatin1String candidate) {
+    return text.midRef(position, candidate.size()) == candidate;
+  });
+  return found == std::end(operators) ? 0 : found->size();
+}
+
+}  // namespace
+
+Formula::Formula(const QString& text) : m_text(text) {
+  parse();
+}
+
+bool Formula::take(int& position, bool wantsOperand, Token& token) const {
+  const int start = position;
+  const QChar c = m_text.at(start);
+  const auto finish = [&](Kind kind, int end) {
+    if (end <= start) {
+      return false;
+    }
+    token = {kind, m_text.mid(start, end - start), start};
+    position = end;
+    return true;
+  };
+  if (c == QLatin1Char('(')) {
+    return wantsOperand && finish(Kind::Open, start + 1);
+  }
+  if (c == QLatin1Char(')')) {
+    return finish(Kind::Close, start + 1);
+  }
+  if (c == QLatin1Char(',')) {
+    return !wantsOperand && finish(Kind::Comma, start + 1);
+  }
+  const int nameEnd = skip(m_text, start, isNameCharacter);
+  const QString name = m_text.mid(start, nameEnd - start);
+  const bool isJoin = isWord(name, "and") || isWord(name, "or");
+  if (!wantsOperand) {
+    return finish(Kind::Operator, isJoin ? nameEnd : start + operatorSize(m_text, start));
+  }
+  if (c == QLatin1Char('+') || c == QLatin1Char('-')) {
+    return finish(Kind::Sign, start + 1);
+  }
+  if (c == QLatin1Char('"')) {
+    return finish(Kind::Text, textEnd(m_text, start));
+  }
+  if (m_text.midRef(start, kValueReference.size()) == kValueReference) {
+    return finish(Kind::Attribute, bracketEnd(m_text, start + kValueReference.size() - 1));
+  }
+  if (isDigit(c) || c == QLatin1Char('.')) {
+    return finish(Kind::Number, numberEnd(m_text, start));
+  }
+  if (isWord(name, "not")) {
+    return finish(Kind::Sign, nameEnd);
+  }
+  const int open = skip(m_text, nameEnd, [](QChar blank) { return blank.isSpace(); });
+  const bool isCall =
+      !name.isEmpty() && !isJoin && open < m_text.size() && m_text.at(open) == QLatin1Char('(');
+  return isCall && finish(Kind::Function, open + 1);
+}
+
+void Formula::parse() {
+  std::vector<bool> open;  // for each open bracket whether it is a call's
+  bool wantsOperand = true;
+  int position = 0;
+  while (true) {
+    position = skip(m_text, position, [](QChar blank) { return blank.isSpace(); });
+    if (position == m_text.size()) {
+      break;
+    }
+    Token token;
+    const int start = position;
+    bool isUnderstood = take(position, wantsOperand, token);
+    if (isUnderstood && token.kind == Kind::Close) {
+      const bool closesEmptyCall =
+          wantsOperand && !m_tokens.empty() && m_tokens.back().kind == Kind::Function;
+      isUnderstood = !open.empty() && (!wantsOperand || closesEmptyCall);
+    } else if (isUnderstood && token.kind == Kind::Comma) {
+      isUnderstood = !open.empty() && open.back();
+    }
+    if (!isUnderstood) {
+      m_fault = start;
+      return;
+    }
+    switch (token.kind) {
+      case Kind::Open:
+      case Kind::Function:
+        open.push_back(token.kind == Kind::Function);
+        break;
+      case Kind::Close:
+        open.pop_back();
+        wantsOperand = false;
+        break;
+      case Kind::Operator:
+      case Kind::Comma:
+        wantsOperand = true;
+        break;
+      case Kind::Sign:
+        break;
+      default:
+        wantsOperand = false;
+    }
+    m_tokens.push_back(std::move(token));
+  }
+  if (wantsOperand || !open.empty()) {
+    m_fault = m_text.size();
+  }
+}
+
+QString Formula::faultMessage() const {
+  const QString rest = m_text.mid(m_fault);
+  if (rest.isEmpty()) {
+    return TransformResString(kIncompleteMessage);
+  }
+  return TransformResString(kNotUnderstoodMessage,
+                            rest.size() > kLongestQuote ? rest.left(kLongestQuote) + QChar(0x2026) : rest);
+}

@@ -1,0 +1,39 @@
+// The structure of a formula, as docs/mapping-file.md describes it: numbers, texts, attributes and function
+// calls, joined by operators and brackets. What the functions do and which attributes there are is not
+// looked at.
+#pragma once
+
+#include <QString>
+
+#include <vector>
+
+class Formula {
+ public:
+  enum class Kind { Number, Text, Attribute, Function, Operator, Sign, Open, Close, Comma };
+  struct Token {
+    Kind kind;
+    QString text;
+    int position;
+  };
+
+  // `text` is decoded.
+  explicit Formula(const QString& text);
+
+  // The tokens up to the end, or to what cannot be understood.
+  const std::vector<Token>& tokens() const { return m_tokens; }
+  bool isValid() const { return m_fault < 0; }
+  // Where it cannot be understood any more: a position in the text, its size when something is missing at
+  // the end; -1 when all is well.
+  int fault() const { return m_fault; }
+
+  // A message for the user about the fault.
+  QString faultMessage() const;
+
+ private:
+  bool take(int& position, bool wantsOperand, Token& token) const;
+  void parse();
+
+  QString m_text;
+  std::vector<Token> m_tokens;
+  int m_fault = -1;
+};

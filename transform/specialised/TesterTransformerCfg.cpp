@@ -1,0 +1,237 @@
+#include <platform/qorxcore/Lists.h>
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/AttributeReferences.h>
+#include <transform/core/ExpressionWriter.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/StoredValue.h>
+#include <transform/specialised/Formula.h>
+#include <transform/specialised/TesterTransformerCfg.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
+
+#include <QRegularExpression>
+
+#include <algorithm>
+
+namespace {
+
+constexpr long kMissingValueMessage = 370608;
+constexpr long kBadPatternMessage = 370611;
+constexpr long kUnknownComparisonMessage = 370703;
+constexpr long kNoTestNumberMessage = 370704;
+constexpr long kUnknownTestMessage = 370705;
+
+const QLatin1String kTests("TESTS");
+const QLatin1String kCombination("COMBINATION");
+const QLatin1String kExpression("EXPRESSION");
+const QLatin1String kByExpression("EXPRESSION");
+const QLatin1String kMatches("MATCHES");
+
+// The columns of the table.
+enum Column { kLeft, kComparison, kRight, kColumns };
+
+struct Comparison {
+  QLatin1String name;
+  QLatin1String symbol;  // what earlier builds stored
+  bool takesRight;
+  bool needsAttribute;  // the attribute on the left has to be there
+};
+
+const Comparison* findComparison(const QString& text) {
+  static const Comparison comparisons[] = {
+      {QLatin1String("EQUALS"), QLatin1String("="), true, true},
+      {QLatin1String("DIFFERS"), QLatin1String("!="), true, true},
+      {QLatin1String("LESS"), QLatin1String("<"), true, true},
+      {QLatin1String("AT_MOST"), QLatin1String("<="), true, true},
+      {QLatin1String("GREATER"), QLatin1String(">"), true, true},
+      {QLatin1String("AT_LEAST"), QLatin1String(">="), true, true},
+      {QLatin1String("CONTAINS"), QLatin1String(), true, true},
+      {QLatin1String("BEGINS_WITH"), QLatin1String(), true, true},
+      {QLatin1String("ENDS_WITH"), QLatin1String(), true, true},
+      {kMatches, QLatin1String(), true, true},
+      {QLatin1String("ONE_OF"), QLatin1String(), true, true},
+      {QLatin1String("FILLED"), QLatin1String(), false, true},
+      {QLatin1String("EMPTY"), QLatin1String(), false, true},
+      {QLatin1String("EXISTS"), QLatin1String(), false, false},
+      {QLatin1String("MISSING"), QLatin1String(), false, false},
+  };
+  const auto* found = std::find_if(std::begin(comparisons), std::end(comparisons), [&](const Comparison& c) {
+    return text == c.name || (c.symbol.size() > 0 && text == c.symbol);
+  });
+  return found == std::end(comparisons) ? nullptr : found;
+}
+
+// A value that only the mapping file or the feature gives.
+bool isOpen(const QString& text) {
+  return text.contains(kMacroOpen) || text.contains(kDeferredOpen) ||
+         ExpressionWriter::holdsReference(text) || text.startsWith(kConditionalPrefix);
+}
+
+bool isTable(const TransformParamCfg* record) {
+  return record && record->isTable() && record->members().members().size() == kColumns &&
+         !record->isUnset() && !record->getValue().startsWith(kConditionalPrefix);
+}
+
+}  // namespace
+
+TransformerCfg* TesterTransformerCfg::getCopy() const {
+  auto copy = std::make_unique<TesterTransformerCfg>();
+  copy->assign(this);
+  return copy.release();
+}
+
+bool TesterTransformerCfg::parameterSupportsAttributeReference(const QString& parameter) const {
+  return parameter != kExpression && TransformerCfg::parameterSupportsAttributeReference(parameter);
+}
+
+int TesterTransformerCfg::testCount() const {
+  const int cells = getParameterTableValuesAsParts(kTests, UnpackLevel::Stored).size();
+  return (cells + kColumns - 1) / kColumns;
+}
+
+void TesterTransformerCfg::getMissingAttributeReferences(const QString& parameter, QStringList& missing,
+                                                         bool& hasReferences) const {
+  TransformerCfg::getMissingAttributeReferences(parameter, missing, hasReferences);
+  if (parameter != kTests || missing.isEmpty() || !isTable(getParameterByMacroName(kTests))) {
+    return;
+  }
+  QStringList needed;
+  const QStringList cells = getParameterTableValuesAsParts(kTests, UnpackLevel::Resolved);
+  for (int row = 0; row < cells.size(); row += kColumns) {
+    const Comparison* comparison = findComparison(cells.value(row + kComparison));
+    if (!comparison || comparison->needsAttribute) {
+      needed += valueReferences(cells[row + kLeft]);
+    }
+    if (!comparison || comparison->takesRight) {
+      needed += valueReferences(cells.value(row + kRight));
+    }
+  }
+  const QSet<QString> kept(needed.begin(), needed.end());
+  missing.erase(std::remove_if(missing.begin(), missing.end(),
+                               [&](const QString& name) { return !kept.contains(name); }),
+                missing.end());
+}
+
+bool TesterTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
+  if (!TransformerCfg::validateParameter(parameter, message)) {
+    return false;
+  }
+  if (parameter == kTests) {
+    return validateTests(message);
+  }
+  return parameter != kExpression || validateExpression(message);
+}
+
+bool TesterTransformerCfg::validateTests(QString& message) const {
+  if (!isTable(getParameterByMacroName(kTests))) {
+    return true;
+  }
+  const std::vector<GUIType>& columns = getParameterByMacroName(kTests)->members().members();
+  const QStringList cells = getParameterTableValuesAsParts(kTests, UnpackLevel::Resolved);
+  for (int row = 0; row < cells.size(); row += kColumns) {
+    const QString name = cells.value(row + kComparison);
+    const QString right = cells.value(row + kRight);
+    if (isOpen(name)) {
+      continue;
+    }
+    const Comparison* comparison = findComparison(name);
+    if (!comparison) {
+      message = TransformResString(kUnknownComparisonMessage, {QString::number(row / kColumns + 1), name});
+      return false;
+    }
+    if (comparison->takesRight && right.isEmpty()) {
+      message = TransformResString(kMissingValueMessage, columns[kRight].getDescription());
+      return false;
+    }
+    const QString pattern = QORXWwjdDecode(right);
+    if (comparison->name == kMatches && !isOpen(right) && !QRegularExpression(pattern).isValid()) {
+      message = TransformResString(kBadPatternMessage, pattern);
+      return false;
+    }
+  }
+  return true;
+}
+
+bool TesterTransformerCfg::validateExpression(QString& message) const {
+  const TransformParamCfg* combination = getParameterByMacroName(kCombination);
+  const QString mode = getParameterValue(kCombination, UnpackLevel::Resolved);
+  if (!combination || combination->choices().toStored(mode) != kByExpression) {
+    return true;
+  }
+  const QString value = getParameterValue(kExpression, UnpackLevel::Resolved);
+  if (value.isEmpty() || value == kUnusedValue) {
+    message = TransformResString(kMissingValueMessage, getParameterPrompt(kExpression));
+    return false;
+  }
+  if (value.contains(kMacroOpen) || value.contains(kDeferredOpen)) {
+    return true;
+  }
+  const Formula formula(QORXWwjdDecode(value));
+  if (!formula.isValid()) {
+    message = formula.faultMessage();
+    return false;
+  }
+  const int count = testCount();
+  for (const Formula::Token& token : formula.tokens()) {
+    const bool isWord = token.text.at(0).isLetter();
+    if (token.kind == Formula::Kind::Open || token.kind == Formula::Kind::Close ||
+        ((token.kind == Formula::Kind::Operator || token.kind == Formula::Kind::Sign) && isWord)) {
+      continue;
+    }
+    bool isNumber = false;
+    const int test = token.text.toInt(&isNumber);
+    if (token.kind != Formula::Kind::Number || !isNumber) {
+      message = TransformResString(kNoTestNumberMessage, token.text);
+      return false;
+    }
+    if (test < 1 || test > count) {
+      message = TransformResString(kUnknownTestMessage, {token.text, QString::number(count)});
+      return false;
+    }
+  }
+  return true;
+}
+
+QString TesterTransformerCfg::getParameterValueForMappingFile(const QString& name,
+                                                              const TransformParamCfg* parameter,
+                                                              MFBuffer& buffer) const {
+  const TransformParamCfg* record = parameter ? parameter : getParameterByMacroName(name);
+  if (name != kTests || !isTable(record)) {
+    return TransformerCfg::getParameterValueForMappingFile(name, parameter, buffer);
+  }
+  const QString value = stripBasicStringInfo(getParameterValue(name));
+  QStringList cells = QORXSdfStringToList(value, record->members().separator());
+  for (int row = 0; row + kComparison < cells.size(); row += kColumns) {
+    const Comparison* comparison = findComparison(cells[row + kComparison]);
+    if (!comparison) {
+      continue;
+    }
+    cells[row + kComparison] = comparison->name;
+    if (!comparison->takesRight && row + kRight < cells.size()) {
+      cells[row + kRight].clear();
+    }
+  }
+  return textForMappingFile(QORXListToSdfString(cells, record->members().separator()), name, record, buffer);
+}
+
+void TesterTransformerCfg::autoUpgradeTransformer() {
+  const TransformParamCfg* record = getParameterByMacroName(kTests);
+  if (!isTable(record)) {
+    return;
+  }
+  const MemberList& columns = record->members();
+  const QStringList stored = QORXSdfStringToList(record->getValue(), columns.separator());
+  QStringList cells = stored;
+  for (int i = 0; i < cells.size(); ++i) {
+    const int column = i % kColumns;
+    if (column != kComparison) {
+      cells[i] = withAttributeReference(columns.members()[static_cast<std::size_t>(column)], cells[i]);
+    } else if (const Comparison* comparison = findComparison(cells[i])) {
+      cells[i] = comparison->name;
+    }
+  }
+  if (cells != stored) {
+    applyParameterValue(kTests, QORXListToSdfString(cells, columns.separator()));
+    setAutoUpgraded(true);
+  }
+}
