@@ -49,11 +49,11 @@ int editDistance(const QString& from, const QString& to, int limit) {
 
 }  // namespace
 
-QString NearestSpelling::find(const QString& name, const QStringList& candidates) {
+QString NearestSpelling::find(const QString& name, const QStringList& candidates, int mostEdits) {
   const QString wanted = name.toCaseFolded();
   if (wanted.isEmpty() || wanted.size() > kLongestName)
     return QString();
-  int limit = wanted.size() < 4 ? 1 : wanted.size() < 9 ? 2 : 3;
+  int limit = std::min(mostEdits, wanted.size() < 4 ? 1 : wanted.size() < 9 ? 2 : 3);
   QString nearest;
   const int count = std::min({candidates.size(), kMostCandidates, m_budget});
   m_budget -= count;

@@ -10,8 +10,9 @@
 class ORX_EXPORT NearestSpelling {
  public:
   // The candidate with the fewest letters added, left out, changed or swapped, the first of several; upper
-  // and lower case are alike. Empty when none comes close, or the bounds are reached.
-  QString find(const QString& name, const QStringList& candidates);
+  // and lower case are alike. Empty when none comes close, or the bounds are reached. What counts as close
+  // hangs on the length of the name; it is never more than `mostEdits`.
+  QString find(const QString& name, const QStringList& candidates, int mostEdits = 3);
 
  private:
   int m_budget = 200000;  // candidates that may still be looked at

@@ -1,17 +1,23 @@
 #include <platform/qorxcore/Language.h>
 #include <transform/registry/ChangeLogPage.h>
 
+#include <QVector>
+
+#include <algorithm>
+
 namespace {
 
-// HTML knows of no other control characters than these; the others have no meaning in a text.
+// A page may hold neither control characters nor code points that are no characters.
+bool isAllowed(uint c) {
+  const bool isControl = c < 0x20 || (c >= 0x7f && c < 0xa0);
+  return !isControl && !QChar::isSurrogate(c) && !QChar::isNonCharacter(c);
+}
+
 QString escaped(const QString& text) {
-  QString result;
-  result.reserve(text.size());
-  for (const QChar c : text) {
-    const bool isControl = c.unicode() < 0x20 || (c.unicode() >= 0x7f && c.unicode() < 0xa0);
-    result.append(isControl ? QLatin1Char(' ') : c);
-  }
-  return result.toHtmlEscaped();
+  QVector<uint> characters = text.toUcs4();
+  std::replace_if(
+      characters.begin(), characters.end(), [](uint c) { return !isAllowed(c); }, uint(' '));
+  return QString::fromUcs4(characters.constData(), characters.size()).toHtmlEscaped();
 }
 
 }  // namespace
@@ -19,18 +25,11 @@ QString escaped(const QString& text) {
 ChangeLogPage::ChangeLogPage(const QString& title) : m_title(escaped(title)) {}
 
 void ChangeLogPage::addVersion(const QString& heading, const QStringList& entries) {
-  QStringList items;
-  for (const QString& entry : entries) {
-    if (!entry.trimmed().isEmpty()) {
-      items.append(QLatin1String("<li>") + escaped(entry) + QLatin1String("</li>"));
-    }
-  }
-  if (items.isEmpty()) {
-    return;
-  }
   m_body.append(QLatin1String("<h3>") + escaped(heading) + QLatin1String("</h3>"));
   m_body.append(QStringLiteral("<ul>"));
-  m_body += items;
+  for (const QString& entry : entries) {
+    m_body.append(QLatin1String("<li>") + escaped(entry) + QLatin1String("</li>"));
+  }
   m_body.append(QStringLiteral("</ul>"));
 }
 

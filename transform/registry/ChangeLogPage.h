@@ -9,7 +9,7 @@ class ChangeLogPage {
   // In the current language. Plain texts; they are escaped here, as are those below.
   explicit ChangeLogPage(const QString& title);
 
-  // One version with its entries; a version without entries is left out.
+  // One version with its entries, of which there is at least one.
   void addVersion(const QString& heading, const QStringList& entries);
   // A sentence on its own.
   void addText(const QString& text);

@@ -115,4 +115,12 @@ void CompanionLint::checkCompleteness(const CompanionEntry& entry, const LintedD
     need(parameter.prompt.isEmpty() || translated.contains(parameter.name),
          QStringLiteral("the prompt of '%1'").arg(parameter.name));
   }
+  QSet<QString> describedPorts;
+  for (const CompanionEntry::Text& tag : entry.tagDescriptions) {
+    describedPorts.insert(tag.name);
+  }
+  for (const QString& port : definition.inputs() + definition.outputs()) {
+    need(definition.fields().tagDescriptions.value(port).isEmpty() || describedPorts.contains(port),
+         QStringLiteral("the description of port '%1'").arg(port));
+  }
 }

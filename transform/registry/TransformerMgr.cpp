@@ -6,7 +6,6 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/files/FolderListing.h>
-#include <transform/registry/ChangeLogPage.h>
 #include <transform/registry/CompanionFileParser.h>
 #include <transform/registry/CustomTransformerFiles.h>
 #include <transform/registry/DefinitionFileParser.h>
@@ -28,12 +27,7 @@ namespace {
 
 const QString kResourceKind = QStringLiteral("transformer");
 
-constexpr long kNoChanges = 370642;
-constexpr long kChanges = 370643;
-constexpr long kVersionHeading = 370644;
 constexpr long kNamelessDefinition = 370742;
-constexpr long kNamedVersion = 370743;
-constexpr long kAllChanges = 370744;
 constexpr long kNewerBuild = 370745;
 
 }  // namespace
@@ -464,66 +458,6 @@ bool TransformerMgr::isTransformerIgnored(const QString& name, int version) cons
   return std::any_of(m_ignored.begin(), m_ignored.end(), [&](const IgnoredTransformer& ignored) {
     return ignored.name == name && (anyVersion || ignored.version == version);
   });
-}
-
-void TransformerMgr::getChangeLog(ITransformerCfg* configuration, IORXString& page) const {
-  ORXAssign(page, changeLog(dynamic_cast<TransformerCfg*>(configuration)));
-}
-
-QString TransformerMgr::changeLog(TransformerCfg* configuration) const {
-  if (!configuration) {
-    return QString();
-  }
-  const bool isReplaced = !configuration->isVisible() && !configuration->replacedBy().isEmpty();
-  const TransformerCfg* target =
-      m_prototypes.newest(isReplaced ? configuration->replacedBy() : configuration->getName());
-  if (!target) {
-    return QString();
-  }
-  return changeLog(configuration->getName(), configuration->getVersion(), target->getName(),
-                   target->getVersion())
-      .join(QLatin1Char('\n'));
-}
-
-void TransformerMgr::addChanges(ChangeLogPage& page, const QString& name, int first, int last,
-                                bool withName) const {
-  const PrototypeTable::Versions* versions = m_prototypes.versions(name);
-  if (!versions) {
-    return;
-  }
-  for (auto entry = versions->rbegin(); entry != versions->rend(); ++entry) {
-    const auto& [version, prototype] = *entry;
-    if (version >= first && version <= last) {
-      const QString number = QString::number(version);
-      page.addVersion(withName ? TransformResString(kNamedVersion, {prototype->getLocalizedName(), number})
-                               : TransformResString(kVersionHeading, number),
-                      prototype->getChangeLog());
-    }
-  }
-}
-
-QStringList TransformerMgr::changeLog(const QString& name, int fromVersion, const QString& newName,
-                                      int toVersion) const {
-  const auto shownName = [this](const QString& asked) {
-    const TransformerCfg* newest = m_prototypes.newest(asked);
-    return newest ? newest->getLocalizedName() : asked;
-  };
-  const int last = toVersion == NEWEST_VERSION ? currentTransformerVersion(newName) : toVersion;
-  const QString lastText = QString::number(last);
-  ChangeLogPage page(fromVersion < 0
-                         ? TransformResString(kAllChanges, {shownName(newName), lastText})
-                         : TransformResString(kChanges, {shownName(name), QString::number(fromVersion),
-                                                         shownName(newName), lastText}));
-  if (name != newName) {
-    addChanges(page, newName, 0, last, true);
-    addChanges(page, name, std::max(fromVersion, -1) + 1, currentTransformerVersion(name), true);
-  } else {
-    addChanges(page, name, fromVersion == last ? last : std::max(fromVersion, -1) + 1, last, false);
-  }
-  if (page.isEmpty()) {
-    page.addText(TransformResString(kNoChanges));
-  }
-  return page.lines();
 }
 
 QString TransformerMgr::parameterNotSetDisplayString() const {

@@ -22,7 +22,6 @@
 #include <memory>
 #include <vector>
 
-class ChangeLogPage;
 class CustomTransformerFiles;
 class ExceptionList;
 class IORXStringArray;
@@ -41,6 +40,14 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
     int version = 0;
     QString keptPath;          // of the file whose definition was kept; empty unless this is a duplicate
     bool isDuplicate = false;  // clear: the file needs a newer build
+  };
+
+  // What one version changed.
+  struct VersionChanges {
+    QString name;
+    QString localizedName;
+    int version = 0;
+    QStringList entries;  // never empty, and none of them blank
   };
 
   static TransformerMgr& getTransformerMgr();
@@ -95,11 +102,13 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   // A whole HTML page that leads from the configuration to the newest version of the transformer, or of the
   // one that replaces it; empty when neither is known.
   QString changeLog(TransformerCfg* configuration) const;
-  // The same page as lines: what came after `fromVersion` up to `toVersion`, newest first. Under another new
-  // name the later versions of the old name follow those of the new one. With a negative `fromVersion` all
-  // versions count; where both versions are the same one, it alone is shown. `toVersion` may be
-  // NEWEST_VERSION.
+  // The same page as lines, of the changes below.
   QStringList changeLog(const QString& name, int fromVersion, const QString& newName, int toVersion) const;
+  // What came after `fromVersion` up to `toVersion`, newest first. Under another new name the later versions
+  // of the old name follow those of the new one. With a negative `fromVersion` all versions count; where both
+  // versions are the same one, it alone does. `toVersion` may be NEWEST_VERSION.
+  std::vector<VersionChanges> changes(const QString& name, int fromVersion, const QString& newName,
+                                      int toVersion) const;
   // The text shown for a parameter that has no value.
   QString parameterNotSetDisplayString() const;
 
@@ -130,7 +139,7 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   // Null when there is none; aliases are not followed.
   const TransformerCfg* findPrototype(const QString& name, int version) const;
   std::unique_ptr<TransformerCfg> copyOf(const QString& name, int version) const;
-  void addChanges(ChangeLogPage& page, const QString& name, int first, int last, bool withName) const;
+  void addChanges(std::vector<VersionChanges>& changes, const QString& name, qint64 first, int last) const;
 
   std::unique_ptr<CustomTransformerFiles> m_customFiles;  // outlives the prototypes, which listen to networks
   PrototypeTable m_prototypes;
