@@ -1,8 +1,10 @@
 #include <apps/orxt/CatalogueText.h>
 #include <apps/orxt/Console.h>
+#include <apps/orxt/TextTable.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
-#include <transform/text/TextHelpers.h>
+#include <transform/registry/TransformerMgr.h>
+#include <translation/NearestSpelling.h>
 
 #include <QJsonArray>
 
@@ -36,11 +38,55 @@ QString summaryAsText(const TransformerCfg& transformer) {
 }
 
 void printSummaries(const std::vector<const TransformerCfg*>& transformers, Console& console) {
-  int width = 0;
+  TextTable table(0);
   for (const TransformerCfg* transformer : transformers)
-    width = std::max(width, transformer->getLocalizedName().size());
-  for (const TransformerCfg* transformer : transformers) {
-    console.print(makeColumnString(transformer->getLocalizedName(), summaryAsText(*transformer), width + 1) +
-                  QLatin1Char('\n'));
+    table.addRow({transformer->getLocalizedName(), summaryAsText(*transformer)});
+  console.print(table.text());
+}
+
+std::vector<std::unique_ptr<TransformerCfg>> offeredTransformers(TransformerMgr& registry, bool all) {
+  std::vector<std::unique_ptr<TransformerCfg>> result;
+  registry.resetIteration();
+  while (TransformerCfg* next = registry.getNextTransformer()) {
+    std::unique_ptr<TransformerCfg> transformer(next);
+    if (all || transformer->isVisible())
+      result.push_back(std::move(transformer));
   }
+  std::sort(result.begin(), result.end(),
+            [](const auto& left, const auto& right) { return left->getName() < right->getName(); });
+  return result;
+}
+
+QString spellingHint(const QString& name, const QStringList& candidates) {
+  const QString nearest = NearestSpelling().find(name, candidates);
+  return nearest.isEmpty() ? QString() : QStringLiteral("; did you mean '%1'?").arg(nearest);
+}
+
+std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const QString& name, int version,
+                                                QString& error) {
+  std::unique_ptr<TransformerCfg> found(registry.getTransformer(name, version));
+  if (found)
+    return found;
+  error = registry.refusalReason();
+  if (!error.isEmpty())
+    return nullptr;
+  const std::unique_ptr<TransformerCfg> newest(
+      registry.getTransformer(name, ITransformerMgr::NEWEST_VERSION));
+  if (newest) {
+    QStringList versions;
+    for (const int known : registry.transformerVersions(newest->getName()))
+      versions << QString::number(known);
+    error = QStringLiteral("'%1' has no version %2; the newest is %3, and there are: %4")
+                .arg(name)
+                .arg(version)
+                .arg(newest->getVersion())
+                .arg(versions.join(QLatin1String(", ")));
+    return nullptr;
+  }
+  QStringList names = registry.transformerNames() + registry.getVisibleTransformerAliases();
+  for (const auto& transformer : offeredTransformers(registry, true))
+    names << transformer->getLocalizedName();
+  error = QStringLiteral("there is no transformer '%1'").arg(name) + spellingHint(name, names) +
+          QLatin1String("; `orxt transformers list` names them all");
+  return nullptr;
 }

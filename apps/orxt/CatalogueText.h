@@ -5,10 +5,12 @@
 #include <QString>
 #include <QStringList>
 
+#include <memory>
 #include <vector>
 
 class Console;
 class TransformerCfg;
+class TransformerMgr;
 
 // Up to and with the first full stop that ends a word; all of it when there is none.
 QString firstSentence(const QStringList& lines);
@@ -17,3 +19,13 @@ QString summaryAsText(const TransformerCfg& transformer);
 QJsonObject summaryAsJson(const TransformerCfg& transformer);
 // Shown name and first sentence of each, aligned.
 void printSummaries(const std::vector<const TransformerCfg*>& transformers, Console& console);
+
+// Copies of all transformers, newest version each, by name; `all` takes those in that are no longer offered.
+std::vector<std::unique_ptr<TransformerCfg>> offeredTransformers(TransformerMgr& registry, bool all);
+
+// A copy of the version asked for. Null when there is none: `error` then says so, and which name or version
+// was probably meant.
+std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const QString& name, int version,
+                                                QString& error);
+// "; did you mean ...?" when one of the candidates comes close to the name; else empty.
+QString spellingHint(const QString& name, const QStringList& candidates);

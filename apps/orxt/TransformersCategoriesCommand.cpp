@@ -1,14 +1,12 @@
 #include <apps/orxt/Console.h>
+#include <apps/orxt/TextTable.h>
 #include <apps/orxt/TransformersCategoriesCommand.h>
 #include <transform/registry/TransformerMgr.h>
-#include <transform/text/TextHelpers.h>
 
 #include <CLI/CLI.hpp>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
-
-#include <algorithm>
 
 namespace {
 
@@ -46,13 +44,9 @@ ExitStatus TransformersCategoriesCommand::run(Console& console) {
     console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
     return kExitDone;
   }
-  int width = 0;
+  TextTable table(0);
   for (const QString& category : std::as_const(categories))
-    width = std::max(width, registry.getLocalizedCategoryName(category).size());
-  for (const QString& category : std::as_const(categories)) {
-    console.print(
-        makeColumnString(registry.getLocalizedCategoryName(category), descriptionOf(category), width + 1) +
-        QLatin1Char('\n'));
-  }
+    table.addRow({registry.getLocalizedCategoryName(category), descriptionOf(category)});
+  console.print(table.text());
   return kExitDone;
 }

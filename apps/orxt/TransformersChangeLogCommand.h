@@ -14,6 +14,8 @@ class TransformersChangeLogCommand : public Command {
  private:
   std::string m_name;
   int m_fromVersion = -1;
+  int m_version = -1;  // the newest
+  bool m_json = false;
   std::string m_output = "-";
   DefinitionOptions m_definitions;
 };

@@ -32,23 +32,23 @@ ExitStatus TransformersListCommand::run(Console& console) {
   QStringList wanted;
   if (!category.isEmpty()) {
     if (!registry.getCategories().contains(registry.getCategoryNameFromLocalizedCategoryName(category))) {
-      console.fail(QStringLiteral("there is no category '%1'; there are: %2")
-                       .arg(category, registry.getCategories().join(QLatin1String(", "))));
+      QStringList shown;
+      for (const QString& known : registry.getCategories())
+        shown << registry.getLocalizedCategoryName(known);
+      console.fail(QStringLiteral("there is no category '%1'%2; there are: %3")
+                       .arg(category, spellingHint(category, shown + registry.getCategories()),
+                            shown.join(QLatin1String(", "))));
       return kExitRefused;
     }
     wanted = registry.getCategoryTransformers(category);
   }
 
-  std::vector<std::unique_ptr<TransformerCfg>> found;
-  registry.resetIteration();
-  while (TransformerCfg* next = registry.getNextTransformer()) {
-    std::unique_ptr<TransformerCfg> cfg(next);
-    if ((m_all || cfg->isVisible()) && (category.isEmpty() || wanted.contains(cfg->getName())))
-      found.push_back(std::move(cfg));
+  std::vector<std::unique_ptr<TransformerCfg>> found = offeredTransformers(registry, m_all);
+  if (!category.isEmpty()) {
+    found.erase(std::remove_if(found.begin(), found.end(),
+                               [&](const auto& cfg) { return !wanted.contains(cfg->getName()); }),
+                found.end());
   }
-  std::sort(found.begin(), found.end(),
-            [](const auto& left, const auto& right) { return left->getName() < right->getName(); });
-
   if (m_json) {
     QJsonArray list;
     for (const auto& cfg : found)

@@ -37,7 +37,7 @@ const char* placeName(CatalogueSearch::Place place) {
 TransformersSearchCommand::TransformersSearchCommand() : Command(kFacts) {}
 
 void TransformersSearchCommand::declare(CLI::App& app) {
-  app.add_option("word", m_words, "Words that must all be found; case does not count")
+  app.add_option("word", m_words, "Words to be found; case, accents and endings do not count")
       ->type_name("WORD")
       ->required();
   app.add_flag("--all", m_all, "Also those that are no longer offered");
@@ -49,12 +49,22 @@ ExitStatus TransformersSearchCommand::run(Console& console) {
   QStringList words;
   for (const std::string& word : m_words)
     words << QString::fromStdString(word);
-  const CatalogueSearch search(words);
+  CatalogueSearch search(words);
   if (search.isEmpty()) {
     console.fail(QStringLiteral("give at least one word to search for"));
     return kExitUsage;
   }
   const std::vector<CatalogueSearch::Hit> hits = search.find(m_definitions.load(console), m_all);
+  if (!search.unknownWords().isEmpty()) {
+    console.fail(QStringLiteral("no transformer has '%1'; `orxt transformers categories` shows where to look")
+                     .arg(search.unknownWords().join(QLatin1String("' or '"))));
+  }
+  for (int i = 0; !hits.empty() && i + 1 < search.misspeltWords().size(); i += 2) {
+    console.fail(QStringLiteral("no transformer has '%1'; searching for '%2'")
+                     .arg(search.misspeltWords().at(i), search.misspeltWords().at(i + 1)));
+  }
+  if (search.isPartial())
+    console.fail(QStringLiteral("no transformer has all of these words; these have the most of them"));
   if (m_json) {
     QJsonArray list;
     for (const CatalogueSearch::Hit& hit : hits) {
@@ -69,9 +79,5 @@ ExitStatus TransformersSearchCommand::run(Console& console) {
       transformers.push_back(hit.transformer.get());
     printSummaries(transformers, console);
   }
-  if (!hits.empty())
-    return kExitDone;
-  console.fail(QStringLiteral("no transformer has '%1'; `orxt transformers categories` shows where to look")
-                   .arg(words.join(QLatin1String("' and '"))));
-  return kExitRefused;
+  return hits.empty() ? kExitRefused : kExitDone;
 }

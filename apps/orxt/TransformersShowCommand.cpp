@@ -1,9 +1,12 @@
+#include <apps/orxt/CatalogueText.h>
 #include <apps/orxt/Console.h>
 #include <apps/orxt/ParameterSchema.h>
+#include <apps/orxt/PrintableText.h>
 #include <apps/orxt/TransformersShowCommand.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 
 #include <CLI/CLI.hpp>
@@ -21,6 +24,21 @@ constexpr CommandFacts kFacts = {"show", "Show one transformer: its ports, param
 
 constexpr int kTagColumn = 24;
 constexpr int kParameterColumn = 28;
+constexpr int kLongestLine = 4000;
+
+constexpr long kHeadline = 370880;
+constexpr long kCustomFile = 370881;
+constexpr long kOtherVersions = 370882;
+constexpr long kReplaced = 370883;
+constexpr long kUnmetDependency = 370884;
+constexpr long kInputs = 370885;
+constexpr long kOutputs = 370886;
+constexpr long kParameters = 370887;
+constexpr long kChanges = 370888;
+constexpr long kOneOf = 370889;
+constexpr long kMadeOf = 370890;
+constexpr long kOptional = 370891;
+constexpr long kDefault = 370892;
 
 QJsonArray portsAsJson(const TransformerCfg& cfg, const QStringList& tags) {
   QJsonArray ports;
@@ -33,14 +51,16 @@ QJsonArray portsAsJson(const TransformerCfg& cfg, const QStringList& tags) {
 
 // The type, and what its configuration says in words a person reads.
 QString typeAsText(const TransformParamCfg& parameter) {
-  QStringList parts;
+  QStringList choices;
+  QStringList members;
   for (const auto& [shown, stored] : parameter.choices().entries())
-    parts.append(shown);
+    choices.append(shown);
   for (const GUIType& member : parameter.members().members())
-    parts.append(member.getName());
-  if (parts.isEmpty())
-    return parameter.getTypeWithConfig();
-  return parameter.getType() + QLatin1String(" of ") + parts.join(QLatin1String(" | "));
+    members.append(member.getDescription().isEmpty() ? member.getName() : member.getDescription());
+  return choices.isEmpty() && members.isEmpty()
+             ? parameter.getTypeWithConfig()
+             : TransformResString(members.isEmpty() ? kOneOf : kMadeOf,
+                                  {parameter.getType(), (choices + members).join(QLatin1String(" | "))});
 }
 
 }  // namespace
@@ -65,80 +85,96 @@ ExitStatus TransformersShowCommand::run(Console& console) {
   const int number = version == QLatin1String("newest")   ? ITransformerMgr::NEWEST_VERSION
                      : version == QLatin1String("oldest") ? ITransformerMgr::OLDEST_VERSION
                                                           : version.toInt();
-  const std::unique_ptr<TransformerCfg> cfg(registry.getTransformer(name, number));
+  QString error;
+  const std::unique_ptr<TransformerCfg> cfg = findTransformer(registry, name, number, error);
   if (!cfg) {
-    const int newest = registry.currentTransformerVersion(name);
-    console.fail(
-        newest < 0
-            ? QStringLiteral("there is no transformer '%1'; `orxt transformers list` names them all")
-                  .arg(name)
-            : QStringLiteral("'%1' has no version %2; the newest is %3").arg(name, version).arg(newest));
+    console.fail(error);
     return kExitRefused;
   }
   if (m_schema)
     console.print(QString::fromUtf8(QJsonDocument(ParameterSchema(*cfg).schema()).toJson()));
   else if (m_json)
-    showJson(*cfg, console);
+    showJson(*cfg, registry, console);
   else
-    showText(*cfg, console);
+    showText(*cfg, registry, console);
   return kExitDone;
 }
 
-void TransformersShowCommand::showText(const TransformerCfg& cfg, Console& console) const {
+void TransformersShowCommand::showText(const TransformerCfg& cfg, const TransformerMgr& registry,
+                                       Console& console) const {
   const auto line = [&](const QString& text) { console.print(text + QLatin1Char('\n')); };
-  const auto heading = [&](const char* text) { line(QLatin1Char('\n') + QLatin1String(text)); };
-  line(
-      QStringLiteral("%1 (%2, version %3)").arg(cfg.getLocalizedName(), cfg.getName()).arg(cfg.getVersion()));
+  const auto heading = [&](long message) { line(QLatin1Char('\n') + TransformResString(message)); };
+  const auto printable = [](const QString& text) { return onOneLine(text, kLongestLine); };
+  const auto row = [&](const QString& left, const QString& right, int width) {
+    line(QLatin1String("  ") + makeColumnString(printable(left), printable(right), width));
+  };
+  line(printable(TransformResString(
+      kHeadline, {cfg.getLocalizedName(), cfg.getName(), QString::number(cfg.getVersion())})));
   if (isCustomTransformer(&cfg))
-    line(QStringLiteral("Custom transformer from %1").arg(cfg.getFileName()));
-  if (!cfg.tags().isEmpty())
-    line(cfg.tags().join(QLatin1String(", ")));
+    line(printable(TransformResString(kCustomFile, cfg.getFileName())));
+  QStringList categories;
+  for (const QString& tag : cfg.tags())
+    categories << registry.getLocalizedCategoryName(tag);
+  if (!categories.isEmpty())
+    line(printable(categories.join(QLatin1String(", "))));
+  QStringList others;
+  for (const int version : registry.transformerVersions(cfg.getName())) {
+    if (version != cfg.getVersion())
+      others << QString::number(version);
+  }
+  if (!others.isEmpty())
+    line(TransformResString(kOtherVersions, others.join(QLatin1String(", "))));
   if (cfg.isDeprecated())
-    line(QStringLiteral("No longer offered; use %1 instead.").arg(cfg.replacedBy()));
+    line(printable(TransformResString(kReplaced, cfg.replacedBy())));
   if (!cfg.dependencyMet())
-    line(QStringLiteral("May not run here: %1").arg(cfg.dependencyMsg()));
+    line(printable(TransformResString(kUnmetDependency, cfg.dependencyMsg())));
   line(QString());
   for (const QString& text : cfg.getDescriptionLines())
-    line(text);
+    line(printable(text));
 
   QStringList inputs;
   QStringList outputs;
   cfg.getInputTags(inputs);
   cfg.getOutputTags(outputs);
-  const auto ports = [&](const char* title, const QStringList& tags) {
+  const auto ports = [&](long title, const QStringList& tags) {
     if (tags.isEmpty())
       return;
     heading(title);
     for (const QString& tag : tags)
-      line(QLatin1String("  ") + makeColumnString(tag, cfg.getTagDescription(tag), kTagColumn));
+      row(tag, cfg.getTagDescription(tag), kTagColumn);
   };
-  ports("Inputs", inputs);
-  ports("Outputs", outputs);
+  ports(kInputs, inputs);
+  ports(kOutputs, outputs);
 
-  heading("Parameters");
+  heading(kParameters);
   for (const QString& name : cfg.getParameters()) {
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
-    line(QLatin1String("  ") + makeColumnString(name, parameter->getDescription(), kParameterColumn));
-    QString facts = typeAsText(*parameter);
+    row(name, parameter->getDescription(), kParameterColumn);
+    QStringList facts{typeAsText(*parameter)};
     if (parameter->getFlag(kGUITypeOptional))
-      facts += QLatin1String(", optional");
+      facts << TransformResString(kOptional);
     if (!parameter->getDefaultValue().isEmpty())
-      facts += QLatin1String(", default ") + cfg.getParameterDisplayValue(name);
-    line(QLatin1String("  ") + makeColumnString(QString(), facts, kParameterColumn));
+      facts << TransformResString(kDefault,
+                                  cfg.formatParamDisplayString(name, parameter->getDefaultValue(), false));
+    row(QString(), facts.join(QLatin1String(", ")), kParameterColumn);
   }
   const QStringList changes = cfg.getChangeLog();
   if (!changes.isEmpty()) {
-    heading("Changes");
+    heading(kChanges);
     for (const QString& text : changes)
-      line(QLatin1String("  ") + text);
+      line(QLatin1String("  ") + printable(text));
   }
 }
 
-void TransformersShowCommand::showJson(const TransformerCfg& cfg, Console& console) const {
+void TransformersShowCommand::showJson(const TransformerCfg& cfg, const TransformerMgr& registry,
+                                       Console& console) const {
   QStringList inputs;
   QStringList outputs;
   cfg.getInputTags(inputs);
   cfg.getOutputTags(outputs);
+  QJsonArray versions;
+  for (const int version : registry.transformerVersions(cfg.getName()))
+    versions.append(version);
   QJsonArray parameters;
   for (const QString& name : cfg.getParameters()) {
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
@@ -151,6 +187,7 @@ void TransformersShowCommand::showJson(const TransformerCfg& cfg, Console& conso
   const QJsonObject object{
       {QStringLiteral("name"), cfg.getName()},
       {QStringLiteral("version"), cfg.getVersion()},
+      {QStringLiteral("versions"), versions},
       {QStringLiteral("localizedName"), cfg.getLocalizedName()},
       {QStringLiteral("categories"), QJsonArray::fromStringList(cfg.tags())},
       {QStringLiteral("aliases"), QJsonArray::fromStringList(cfg.aliases())},

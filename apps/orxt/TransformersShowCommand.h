@@ -6,6 +6,7 @@
 #include <string>
 
 class TransformerCfg;
+class TransformerMgr;
 
 class TransformersShowCommand : public Command {
  public:
@@ -14,8 +15,8 @@ class TransformersShowCommand : public Command {
   ExitStatus run(Console& console) override;
 
  private:
-  void showText(const TransformerCfg& cfg, Console& console) const;
-  void showJson(const TransformerCfg& cfg, Console& console) const;
+  void showText(const TransformerCfg& cfg, const TransformerMgr& registry, Console& console) const;
+  void showJson(const TransformerCfg& cfg, const TransformerMgr& registry, Console& console) const;
 
   std::string m_name;
   std::string m_version = "newest";
