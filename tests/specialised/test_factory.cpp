@@ -17,6 +17,7 @@ struct Case {
 
 TEST(Factory, TheTableGivesEachTransformerItsClass) {
   const Case cases[] = {
+      {"BulkAttributeRemover", 1, "AttributeExpressionRemoverTransformerCfg"},
       {"Tester", 1, "TesterTransformerCfg"},
       {"tester", 1, ""},
       {"ParameterFetcher", 0, "ParameterFetcherTransformerCfg"},

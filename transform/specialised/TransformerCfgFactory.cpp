@@ -1,4 +1,5 @@
 #include <transform/core/TransformerCfg.h>
+#include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
 #include <transform/specialised/ParameterFetcherTransformerCfg.h>
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
@@ -17,6 +18,9 @@ TransformerCfg* make() {
 
 const std::vector<TransformerCfgRule>& transformerCfgRules() {
   static const std::vector<TransformerCfgRule> rules = {
+      {QLatin1String("BulkAttributeRemover"), kLowest, kHighest,
+       QLatin1String("AttributeExpressionRemoverTransformerCfg"),
+       make<AttributeExpressionRemoverTransformerCfg>},
       {QLatin1String("Tester"), kLowest, kHighest, QLatin1String("TesterTransformerCfg"),
        make<TesterTransformerCfg>},
       {QLatin1String("ParameterFetcher"), kLowest, kHighest, QLatin1String("ParameterFetcherTransformerCfg"),
