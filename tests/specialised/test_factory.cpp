@@ -18,6 +18,7 @@ struct Case {
 TEST(Factory, TheTableGivesEachTransformerItsClass) {
   const Case cases[] = {
       {"BulkAttributeRemover", 1, "AttributeExpressionRemoverTransformerCfg"},
+      {"ExpressionEvaluator", 1, "ExpressionEvaluatorCfg"},
       {"Tester", 1, "TesterTransformerCfg"},
       {"tester", 1, ""},
       {"ParameterFetcher", 0, "ParameterFetcherTransformerCfg"},

@@ -195,3 +195,43 @@ QString Formula::faultMessage() const {
   return TransformResString(kNotUnderstoodMessage,
                             rest.size() > kLongestQuote ? rest.left(kLongestQuote) + QChar(0x2026) : rest);
 }
+
+QString Formula::withOwnOperators(const QString& text) {
+  struct Foreign {
+    QLatin1String theirs;
+    QLatin1String ours;
+  };
+  // "!=" is one of ours and comes before what it begins with.
+  static const Foreign foreign[] = {
+      {QLatin1String("=="), QLatin1String("=")},     {QLatin1String("<>"), QLatin1String("!=")},
+      {QLatin1String("&&"), QLatin1String(" and ")}, {QLatin1String("||"), QLatin1String(" or ")},
+      {QLatin1String("!="), QLatin1String("!=")},    {QLatin1String("!"), QLatin1String(" not ")}};
+  QString result;
+  int position = 0;
+  while (position < text.size()) {
+    int end = position;
+    if (text.at(position) == QLatin1Char('"')) {
+      end = textEnd(text, position);
+    } else if (text.midRef(position, kValueReference.size()) == kValueReference) {
+      end = bracketEnd(text, position + kValueReference.size() - 1);
+    }
+    if (end < 0) {
+      break;
+    }
+    if (end > position) {
+      result += text.midRef(position, end - position);
+      position = end;
+      continue;
+    }
+    const auto* found = std::find_if(std::begin(foreign), std::end(foreign), [&](const Foreign& candidate) {
+      return text.midRef(position, candidate.theirs.size()) == candidate.theirs;
+    });
+    if (found == std::end(foreign)) {
+      result += text.at(position++);
+    } else {
+      result += found->ours;
+      position += found->theirs.size();
+    }
+  }
+  return result + text.midRef(position);
+}

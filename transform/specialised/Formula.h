@@ -29,6 +29,10 @@ class Formula {
   // A message for the user about the fault.
   QString faultMessage() const;
 
+  // The text with "==", "<>", "&&", "||" and "!" as the operators that formulas have for them. Texts and
+  // attributes stay as they are.
+  static QString withOwnOperators(const QString& text);
+
  private:
   bool take(int& position, bool wantsOperand, Token& token) const;
   void parse();

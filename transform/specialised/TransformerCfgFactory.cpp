@@ -1,5 +1,6 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
+#include <transform/specialised/ExpressionEvaluatorCfg.h>
 #include <transform/specialised/ParameterFetcherTransformerCfg.h>
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
@@ -21,6 +22,8 @@ const std::vector<TransformerCfgRule>& transformerCfgRules() {
       {QLatin1String("BulkAttributeRemover"), kLowest, kHighest,
        QLatin1String("AttributeExpressionRemoverTransformerCfg"),
        make<AttributeExpressionRemoverTransformerCfg>},
+      {QLatin1String("ExpressionEvaluator"), kLowest, kHighest, QLatin1String("ExpressionEvaluatorCfg"),
+       make<ExpressionEvaluatorCfg>},
       {QLatin1String("Tester"), kLowest, kHighest, QLatin1String("TesterTransformerCfg"),
        make<TesterTransformerCfg>},
       {QLatin1String("ParameterFetcher"), kLowest, kHighest, QLatin1String("ParameterFetcherTransformerCfg"),
