@@ -68,6 +68,11 @@ QStringList statementsOf(TransformerCfg& cfg) {
   return statements;
 }
 
+bool isWritten(TransformerCfg& cfg) {
+  TextBuffer buffer;
+  return cfg.instantiate(buffer, QString());
+}
+
 QString writtenValue(const TransformerCfg& cfg, const char* parameter) {
   TextBuffer buffer;
   const QString name = QString::fromLatin1(parameter);

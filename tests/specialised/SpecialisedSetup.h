@@ -26,6 +26,7 @@ std::unique_ptr<TransformerCfg> makeShipped(const char* name, int version = -1);
 
 // The statements of one instance, continuation lines joined and blanks folded.
 QStringList statementsOf(TransformerCfg& cfg);
+bool isWritten(TransformerCfg& cfg);
 // The text that takes the place of the parameter's token.
 QString writtenValue(const TransformerCfg& cfg, const char* parameter);
 // Empty when the parameter is accepted, "?" when it is refused without a message.

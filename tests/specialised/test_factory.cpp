@@ -17,6 +17,7 @@ struct Case {
 
 TEST(Factory, TheTableGivesEachTransformerItsClass) {
   const Case cases[] = {
+      {"AttributeValueMapper", 1, "ValueMapperTransformerCfg"},
       {"BulkAttributeRemover", 1, "AttributeExpressionRemoverTransformerCfg"},
       {"ExpressionEvaluator", 1, "ExpressionEvaluatorCfg"},
       {"Tester", 1, "TesterTransformerCfg"},

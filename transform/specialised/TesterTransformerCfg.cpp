@@ -1,10 +1,9 @@
-#include <platform/qorxcore/Lists.h>
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/StoredValue.h>
 #include <transform/specialised/Formula.h>
+#include <transform/specialised/ParameterTable.h>
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
@@ -67,11 +66,6 @@ bool isOpen(const QString& text) {
          ExpressionWriter::holdsReference(text) || text.startsWith(kConditionalPrefix);
 }
 
-bool isTable(const TransformParamCfg* record) {
-  return record && record->isTable() && record->members().members().size() == kColumns &&
-         !record->isUnset() && !record->getValue().startsWith(kConditionalPrefix);
-}
-
 }  // namespace
 
 TransformerCfg* TesterTransformerCfg::getCopy() const {
@@ -84,26 +78,24 @@ bool TesterTransformerCfg::parameterSupportsAttributeReference(const QString& pa
   return parameter != kExpression && TransformerCfg::parameterSupportsAttributeReference(parameter);
 }
 
-int TesterTransformerCfg::testCount() const {
-  const int cells = getParameterTableValuesAsParts(kTests, UnpackLevel::Stored).size();
-  return (cells + kColumns - 1) / kColumns;
-}
-
 void TesterTransformerCfg::getMissingAttributeReferences(const QString& parameter, QStringList& missing,
                                                          bool& hasReferences) const {
   TransformerCfg::getMissingAttributeReferences(parameter, missing, hasReferences);
-  if (parameter != kTests || missing.isEmpty() || !isTable(getParameterByMacroName(kTests))) {
+  if (parameter != kTests || missing.isEmpty()) {
+    return;
+  }
+  const ParameterTable tests(*this, kTests, kColumns, UnpackLevel::Resolved);
+  if (!tests.isValid()) {
     return;
   }
   QStringList needed;
-  const QStringList cells = getParameterTableValuesAsParts(kTests, UnpackLevel::Resolved);
-  for (int row = 0; row < cells.size(); row += kColumns) {
-    const Comparison* comparison = findComparison(cells.value(row + kComparison));
+  for (int row = 0; row < tests.rowCount(); ++row) {
+    const Comparison* comparison = findComparison(tests.cell(row, kComparison));
     if (!comparison || comparison->needsAttribute) {
-      needed += valueReferences(cells[row + kLeft]);
+      needed += valueReferences(tests.cell(row, kLeft));
     }
     if (!comparison || comparison->takesRight) {
-      needed += valueReferences(cells.value(row + kRight));
+      needed += valueReferences(tests.cell(row, kRight));
     }
   }
   const QSet<QString> kept(needed.begin(), needed.end());
@@ -123,24 +115,20 @@ bool TesterTransformerCfg::validateParameter(const QString& parameter, QString& 
 }
 
 bool TesterTransformerCfg::validateTests(QString& message) const {
-  if (!isTable(getParameterByMacroName(kTests))) {
-    return true;
-  }
-  const std::vector<GUIType>& columns = getParameterByMacroName(kTests)->members().members();
-  const QStringList cells = getParameterTableValuesAsParts(kTests, UnpackLevel::Resolved);
-  for (int row = 0; row < cells.size(); row += kColumns) {
-    const QString name = cells.value(row + kComparison);
-    const QString right = cells.value(row + kRight);
+  const ParameterTable tests(*this, kTests, kColumns, UnpackLevel::Resolved);
+  for (int row = 0; row < tests.rowCount(); ++row) {
+    const QString name = tests.cell(row, kComparison);
+    const QString right = tests.cell(row, kRight);
     if (isOpen(name)) {
       continue;
     }
     const Comparison* comparison = findComparison(name);
     if (!comparison) {
-      message = TransformResString(kUnknownComparisonMessage, {QString::number(row / kColumns + 1), name});
+      message = TransformResString(kUnknownComparisonMessage, {QString::number(row + 1), name});
       return false;
     }
     if (comparison->takesRight && right.isEmpty()) {
-      message = TransformResString(kMissingValueMessage, columns[kRight].getDescription());
+      message = TransformResString(kMissingValueMessage, tests.prompt(kRight));
       return false;
     }
     const QString pattern = QORXWwjdDecode(right);
@@ -171,7 +159,7 @@ bool TesterTransformerCfg::validateExpression(QString& message) const {
     message = formula.faultMessage();
     return false;
   }
-  const int count = testCount();
+  const int count = ParameterTable(*this, kTests, kColumns).rowCount();
   for (const Formula::Token& token : formula.tokens()) {
     const bool isWord = token.text.at(0).isLetter();
     if (token.kind == Formula::Kind::Open || token.kind == Formula::Kind::Close ||
@@ -196,42 +184,29 @@ QString TesterTransformerCfg::getParameterValueForMappingFile(const QString& nam
                                                               const TransformParamCfg* parameter,
                                                               MFBuffer& buffer) const {
   const TransformParamCfg* record = parameter ? parameter : getParameterByMacroName(name);
-  if (name != kTests || !isTable(record)) {
+  ParameterTable tests(record, stripBasicStringInfo(getParameterValue(name)), kColumns);
+  if (name != kTests || !tests.isValid()) {
     return TransformerCfg::getParameterValueForMappingFile(name, parameter, buffer);
   }
-  const QString value = stripBasicStringInfo(getParameterValue(name));
-  QStringList cells = QORXSdfStringToList(value, record->members().separator());
-  for (int row = 0; row + kComparison < cells.size(); row += kColumns) {
-    const Comparison* comparison = findComparison(cells[row + kComparison]);
-    if (!comparison) {
-      continue;
-    }
-    cells[row + kComparison] = comparison->name;
-    if (!comparison->takesRight && row + kRight < cells.size()) {
-      cells[row + kRight].clear();
+  for (int row = 0; row < tests.rowCount(); ++row) {
+    if (const Comparison* comparison = findComparison(tests.cell(row, kComparison))) {
+      tests.setCell(row, kComparison, comparison->name);
+      tests.setCell(row, kRight, comparison->takesRight ? tests.cell(row, kRight) : QString());
     }
   }
-  return textForMappingFile(QORXListToSdfString(cells, record->members().separator()), name, record, buffer);
+  return textForMappingFile(tests.packed(), name, record, buffer);
 }
 
 void TesterTransformerCfg::autoUpgradeTransformer() {
-  const TransformParamCfg* record = getParameterByMacroName(kTests);
-  if (!isTable(record)) {
-    return;
-  }
-  const MemberList& columns = record->members();
-  const QStringList stored = QORXSdfStringToList(record->getValue(), columns.separator());
-  QStringList cells = stored;
-  for (int i = 0; i < cells.size(); ++i) {
-    const int column = i % kColumns;
-    if (column != kComparison) {
-      cells[i] = withAttributeReference(columns.members()[static_cast<std::size_t>(column)], cells[i]);
-    } else if (const Comparison* comparison = findComparison(cells[i])) {
-      cells[i] = comparison->name;
+  ParameterTable tests(*this, kTests, kColumns);
+  tests.replaceAttributeMarks();
+  for (int row = 0; row < tests.rowCount(); ++row) {
+    if (const Comparison* comparison = findComparison(tests.cell(row, kComparison))) {
+      tests.setCell(row, kComparison, comparison->name);
     }
   }
-  if (cells != stored) {
-    applyParameterValue(kTests, QORXListToSdfString(cells, columns.separator()));
+  if (tests.isChanged()) {
+    applyParameterValue(kTests, tests.packed());
     setAutoUpgraded(true);
   }
 }

@@ -24,5 +24,4 @@ class ORX_EXPORT TesterTransformerCfg : public TransformerCfg {
  private:
   bool validateTests(QString& message) const;
   bool validateExpression(QString& message) const;
-  int testCount() const;
 };

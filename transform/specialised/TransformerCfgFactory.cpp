@@ -4,6 +4,7 @@
 #include <transform/specialised/ParameterFetcherTransformerCfg.h>
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
+#include <transform/specialised/ValueMapperTransformerCfg.h>
 
 namespace {
 
@@ -22,6 +23,8 @@ const std::vector<TransformerCfgRule>& transformerCfgRules() {
       {QLatin1String("BulkAttributeRemover"), kLowest, kHighest,
        QLatin1String("AttributeExpressionRemoverTransformerCfg"),
        make<AttributeExpressionRemoverTransformerCfg>},
+      {QLatin1String("AttributeValueMapper"), kLowest, kHighest, QLatin1String("ValueMapperTransformerCfg"),
+       make<ValueMapperTransformerCfg>},
       {QLatin1String("ExpressionEvaluator"), kLowest, kHighest, QLatin1String("ExpressionEvaluatorCfg"),
        make<ExpressionEvaluatorCfg>},
       {QLatin1String("Tester"), kLowest, kHighest, QLatin1String("TesterTransformerCfg"),

@@ -1,0 +1,26 @@
+#include <transform/core/Keywords.h>
+#include <transform/core/MacroText.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/FactoryOption.h>
+#include <transform/text/MFBuffer.h>
+#include <transform/text/TextHelpers.h>
+
+namespace {
+
+const QLatin1String kFactoryOption("FACTORY_OPTION ");
+
+}  // namespace
+
+bool writeFactoryOption(const TransformerCfg& cfg, const QString& key, const QString& value,
+                        MFBuffer& buffer) {
+  const QString name =
+      encodeAroundReferences(stripBasicStringInfo(cfg.getParameterValue(kIdentifierParameter)));
+  const QString statement = kFactoryOption + name + QLatin1Char(' ') + key + QLatin1Char(' ') + value;
+  if (!MFBuffer::closesDeferredMacros(statement) || statement.contains(QLatin1Char('\n')) ||
+      statement.endsWith(QLatin1Char('\\'))) {
+    return false;
+  }
+  buffer.add(statement);
+  buffer.flush();
+  return true;
+}

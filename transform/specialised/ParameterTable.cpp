@@ -1,0 +1,50 @@
+#include <platform/qorxcore/Lists.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/StoredValue.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/ParameterTable.h>
+
+ParameterTable::ParameterTable(const TransformerCfg& cfg, const QString& parameter, int columns,
+                               UnpackLevel level)
+    : m_columns(columns) {
+  read(cfg.getParameterByMacroName(parameter), cfg.getParameterValue(parameter, level));
+}
+
+ParameterTable::ParameterTable(const TransformParamCfg* record, const QString& value, int columns)
+    : m_columns(columns) {
+  read(record, value);
+}
+
+void ParameterTable::read(const TransformParamCfg* record, const QString& value) {
+  m_value = value;
+  if (!record || !record->isTable() || static_cast<int>(record->members().members().size()) != m_columns ||
+      value.isEmpty() || value == kUnusedValue || value.startsWith(kConditionalPrefix)) {
+    return;
+  }
+  m_record = record;
+  m_cells = QORXSdfStringToList(value, record->members().separator());
+}
+
+void ParameterTable::setCell(int row, int column, const QString& text) {
+  const int index = row * m_columns + column;
+  if (index < m_cells.size() && m_cells[index] != text) {
+    m_cells[index] = text;
+    m_isChanged = true;
+  }
+}
+
+QString ParameterTable::prompt(int column) const {
+  return m_record ? m_record->members().members()[static_cast<std::size_t>(column)].getDescription()
+                  : QString();
+}
+
+void ParameterTable::replaceAttributeMarks() {
+  for (int i = 0; i < m_cells.size(); ++i) {
+    const GUIType& type = m_record->members().members()[static_cast<std::size_t>(i % m_columns)];
+    setCell(i / m_columns, i % m_columns, withAttributeReference(type, m_cells[i]));
+  }
+}
+
+QString ParameterTable::packed() const {
+  return m_isChanged ? QORXListToSdfString(m_cells, m_record->members().separator()) : m_value;
+}

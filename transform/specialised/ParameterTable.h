@@ -1,0 +1,42 @@
+// The cells of a table-valued parameter, row by row, to read and to change.
+#pragma once
+
+#include <transform/core/UnpackLevel.h>
+
+#include <QString>
+#include <QStringList>
+
+class TransformerCfg;
+class TransformParamCfg;
+
+class ParameterTable {
+ public:
+  // Empty, and not valid, unless the parameter is a table of that many columns with rows of its own: a value
+  // that is unset or conditional has none. A last row that lacks cells has empty ones.
+  ParameterTable(const TransformerCfg& cfg, const QString& parameter, int columns,
+                 UnpackLevel level = UnpackLevel::Stored);
+  // Of a packed value.
+  ParameterTable(const TransformParamCfg* record, const QString& value, int columns);
+
+  bool isValid() const { return m_record != nullptr; }
+  int rowCount() const { return (m_cells.size() + m_columns - 1) / m_columns; }
+  QString cell(int row, int column) const { return m_cells.value(row * m_columns + column); }
+  // A cell that is not there stays so.
+  void setCell(int row, int column, const QString& text);
+  QString prompt(int column) const;
+
+  // "&NAME" becomes an attribute reference in every column that takes one in this form.
+  void replaceAttributeMarks();
+  bool isChanged() const { return m_isChanged; }
+  // As it was given, unless cells have changed.
+  QString packed() const;
+
+ private:
+  void read(const TransformParamCfg* record, const QString& value);
+
+  const TransformParamCfg* m_record = nullptr;
+  int m_columns;
+  QString m_value;
+  QStringList m_cells;
+  bool m_isChanged = false;
+};
