@@ -49,6 +49,7 @@ class OpenNetwork : public ExternalDocNetwork {
   using CompoundTransformerNetwork::addTransformer;
   using CompoundTransformerNetwork::clearNodes;
   using CompoundTransformerNetwork::createAncestorList;
+  using CompoundTransformerNetwork::NodeSet;
   using ExternalDocNetwork::setParallelSettings;
 
   void publish(const QString& guiLine, const QString& value);

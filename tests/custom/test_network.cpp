@@ -1,4 +1,5 @@
 #include "CustomFixtures.h"
+#include <transform/custom/NetworkSorter.h>
 #include <transform/custom/SubDocNetworkObj.h>
 
 #include <gtest/gtest.h>
@@ -76,7 +77,7 @@ TEST(Network, OrdersAncestors) {
       QStringLiteral("out O;in B;in A;pass S;pass T;pass U;S -> O;U -> O;T -> S;A -> S;S -> T;B -> T;A -> U")
           .split(QLatin1Char(';')));
   std::vector<SubDocNetworkObj*> ancestors;
-  NodeSet set;
+  OpenNetwork::NodeSet set;
   OpenNetwork::createAncestorList(network.nodeByNumber(0), ancestors, set);
   const auto namesOf = [](const std::vector<SubDocNetworkObj*>& nodes) {
     QStringList list;
@@ -85,11 +86,11 @@ TEST(Network, OrdersAncestors) {
     return list.join(QLatin1Char(' '));
   };
   EXPECT_EQ(namesOf(ancestors), QStringLiteral("O S T B A U"));
-  const NetworkOrder order(ancestors);
-  EXPECT_EQ(namesOf(order.nodes()), QStringLiteral("B A S T U O"));
-  ASSERT_EQ(order.cycles().size(), 1U);
-  EXPECT_EQ(order.cycles().front().begin, 2U);
-  EXPECT_EQ(order.cycles().front().end, 4U);
+  const NetworkOrder order = NetworkSorter(network.nodes().size()).sort(*network.nodeByNumber(0));
+  EXPECT_EQ(namesOf(order.nodes), QStringLiteral("B A S T U O"));
+  ASSERT_EQ(order.cycles.size(), 1U);
+  EXPECT_EQ(order.cycles.front().begin, 2U);
+  EXPECT_EQ(order.cycles.front().end, 4U);
 }
 
 TEST(Network, WalksLongChainsWithoutRecursion) {

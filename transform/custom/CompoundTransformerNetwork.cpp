@@ -5,6 +5,7 @@
 #include <transform/custom/CompoundTransformerNetworkListener.h>
 #include <transform/custom/InnerTransformerListener.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/NetworkSorter.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjLoop.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
@@ -120,8 +121,21 @@ void CompoundTransformerNetwork::addPublishedParameter(const QString& name, cons
 
 void CompoundTransformerNetwork::createAncestorList(SubDocNetworkObj* node,
                                                     std::vector<SubDocNetworkObj*>& list, NodeSet& set) {
-  if (node)
-    NetworkOrder::appendAncestors(*node, list, set);
+  std::vector<SubDocNetworkObj*> open{node};
+  while (!open.empty()) {
+    SubDocNetworkObj* next = open.back();
+    open.pop_back();
+    if (!next || set.contains(next))
+      continue;
+    set.insert(next);
+    list.push_back(next);
+    // The last one entered is visited first.
+    const SubDocNetworkObj::Ports& ports = next->feeders();
+    for (auto port = ports.rbegin(); port != ports.rend(); ++port) {
+      for (auto link = port->second.rbegin(); link != port->second.rend(); ++link)
+        open.push_back(link->node);
+    }
+  }
 }
 
 void CompoundTransformerNetwork::doneAdding(bool parametersChanged) {
@@ -134,12 +148,9 @@ void CompoundTransformerNetwork::ensureOrders() const {
   if (m_ordersValid)
     return;
   m_orders.clear();
-  for (const auto& [name, output] : m_outputNodes) {
-    std::vector<SubDocNetworkObj*> ancestors;
-    NodeSet set;
-    createAncestorList(output, ancestors, set);
-    m_orders.emplace_hint(m_orders.end(), name, NetworkOrder(ancestors));
-  }
+  NetworkSorter sorter(m_nodes.size());
+  for (const auto& [name, output] : m_outputNodes)
+    m_orders.emplace_hint(m_orders.end(), name, sorter.sort(*output));
   m_ordersValid = true;
 }
 

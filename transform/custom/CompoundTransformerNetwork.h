@@ -24,6 +24,7 @@
 #include <list>
 #include <map>
 #include <memory>
+#include <vector>
 
 class CompoundTransformerNetworkListener;
 class InnerTransformerListener;
@@ -183,6 +184,9 @@ class ORX_EXPORT CompoundTransformerNetwork {
   // Gives a parameter its default value; a new one is entered without a type.
   void addPublishedParameter(const QString& name, const QString& value);
   void onNetworkChanged(bool parametersChanged);
+  using NodeSet = QSet<const SubDocNetworkObj*>;
+  // Appends the node and everything upstream of it, depth first, ports in name order, links in the order of
+  // adding. What stands in `set` ends a branch; what is appended is added to it.
   static void createAncestorList(SubDocNetworkObj* node, std::vector<SubDocNetworkObj*>& list, NodeSet& set);
   // clear() without telling the listeners.
   void clearNodes();

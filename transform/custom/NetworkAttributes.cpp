@@ -131,15 +131,16 @@ QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& outpu
 QStringList CompoundTransformerNetwork::evaluate(SubDocNetworkObjOutput& output, const NetworkOrder& order,
                                                  QHash<QString, QString>& origins) const {
   const AttributeQuery query(m_isEvaluating);
-  const std::vector<SubDocNetworkObj*>& nodes = order.nodes();
-  for (SubDocNetworkObj* node : nodes)
-    node->beginQuery();
-  auto cycle = order.cycles().begin();
-  for (std::size_t at = 0; at < nodes.size();) {
-    if (cycle == order.cycles().end() || cycle->begin != at) {
-      nodes[at++]->compute(origins);
+  auto cycle = order.cycles.begin();
+  for (std::size_t at = 0; at < order.nodes.size();) {
+    if (cycle == order.cycles.end() || cycle->begin != at) {
+      SubDocNetworkObj* node = order.nodes[at++];
+      node->beginQuery();
+      node->compute(origins);
       continue;
     }
+    for (SubDocNetworkObj* node : cycle->flow)
+      node->beginQuery();
     bool hasChanged = true;
     for (int round = 0; hasChanged && round < kMostRounds; ++round) {
       hasChanged = false;
@@ -160,8 +161,8 @@ QStringList CompoundTransformerNetwork::getUpstreamInputs(const QString& output)
   const auto order = m_orders.find(output);
   if (order == m_orders.end())
     return inputs;
-  for (SubDocNetworkObj* node : order->second.nodes()) {
-    if (dynamic_cast<const SubDocNetworkObjInput*>(node))
+  for (const SubDocNetworkObj* node : order->second.nodes) {
+    if (node->kind() == SubDocNetworkObj::Kind::Input)
       inputs.append(node->name());
   }
   return inputs;

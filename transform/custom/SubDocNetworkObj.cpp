@@ -1,19 +1,44 @@
+#include <transform/core/TransformerCfg.h>
 #include <transform/custom/SubDocNetworkObj.h>
+#include <transform/custom/SubDocNetworkObjXformer.h>
 
 #include <QSet>
 
 #include <algorithm>
 
+SubDocNetworkObj::SubDocNetworkObj(Kind kind, int number, const QString& name)
+    : m_kind(kind), m_number(number), m_name(name) {
+  m_common.node = this;
+}
+
 SubDocNetworkObj::~SubDocNetworkObj() = default;
+
+QString SubDocNetworkObj::name() const {
+  return m_kind == Kind::Transformer
+             ? static_cast<const SubDocNetworkObjXformer*>(this)->getTransformer()->getIdentifier()
+             : m_name;
+}
+
+// --- links -------------------------------------------------------------------------------------------------
 
 void SubDocNetworkObj::addAttributeCopy(const QString& port, const QString& from, const QString& to) {
   m_copies[port].push_back({from, to});
+  const auto fed = m_consumers.find(port);
+  if (fed == m_consumers.end())
+    return;
+  for (const Link& link : fed->second)
+    link.node->m_knowsSources = false;
 }
 
 void SubDocNetworkObj::addLink(SubDocNetworkObj& from, const QString& fromPort, SubDocNetworkObj& to,
                                const QString& toPort) {
   from.m_consumers[fromPort].push_back({&to, toPort});
-  to.m_feeders[toPort].push_back({&from, fromPort});
+  const auto port = to.m_feeders.try_emplace(toPort).first;
+  port->second.push_back({&from, fromPort});
+  if (std::next(port) != to.m_feeders.end())
+    to.m_knowsSources = false;
+  else if (to.m_knowsSources)
+    to.m_sources.push_back(&from.outlet(fromPort));
 }
 
 void SubDocNetworkObj::removeLinks() {
@@ -32,82 +57,114 @@ void SubDocNetworkObj::removeLinks() {
   const Ports consumers = std::move(m_consumers);
   m_feeders.clear();
   m_consumers.clear();
+  m_knowsSources = false;
   for (const auto& [port, links] : feeders) {
     for (const Link& link : links)
       takeOut(link.node->m_consumers, link.port);
   }
   for (const auto& [port, links] : consumers) {
-    for (const Link& link : links)
+    for (const Link& link : links) {
       takeOut(link.node->m_feeders, link.port);
+      link.node->m_knowsSources = false;
+    }
   }
 }
 
-void SubDocNetworkObj::beginQuery() {
-  m_arrived.clear();
-  m_isComputed = false;
-  m_hasChanged = true;
+const std::vector<SubDocNetworkObj::Outlet*>& SubDocNetworkObj::sources() {
+  if (!m_knowsSources) {
+    m_knowsSources = true;
+    m_sources.clear();
+    for (const auto& [port, links] : m_feeders) {
+      for (const Link& link : links)
+        m_sources.push_back(&link.node->outlet(link.port));
+    }
+  }
+  return m_sources;
 }
 
-void SubDocNetworkObj::noteComputed(const QStringList& arrived) {
-  m_hasChanged = !m_isComputed || m_arrived != arrived;
-  m_arrived = arrived;
+// --- computing ---------------------------------------------------------------------------------------------
+
+SubDocNetworkObj::Outlet& SubDocNetworkObj::outlet(const QString& port) {
+  if (m_kind != Kind::Transformer && m_copies.count(port) == 0)
+    return m_common;
+  Outlet& own = m_outlets[port];
+  own.node = this;
+  own.port = port;
+  m_hasOutlets = true;
+  return own;
+}
+
+void SubDocNetworkObj::forgetOutlets() {
+  for (auto& [port, outlet] : m_outlets)
+    outlet.isCurrent = false;
+}
+
+void SubDocNetworkObj::fill(Outlet& outlet, QHash<QString, QString>& origins) {
+  outlet.isCurrent = true;
+  outlet.attributes = getAttributes(outlet.port);
+  // A list that passes through unchanged stays one list, all of whose attributes are known already.
+  if (!m_sources.empty() && m_sources.front()->attributes == outlet.attributes)
+    outlet.attributes = m_sources.front()->attributes;
+  else
+    noteOrigins(outlet.attributes, origins);
+}
+
+void SubDocNetworkObj::setLeaving(const QStringList& attributes) {
+  m_hasChanged = !m_isComputed || m_common.attributes != attributes;
+  if (!m_common.attributes.isSharedWith(attributes))
+    m_common.attributes = attributes;
+  m_common.isCurrent = true;
   m_isComputed = true;
+  if (m_hasOutlets)
+    forgetOutlets();
 }
 
 void SubDocNetworkObj::noteComputed(bool changed) {
-  m_hasChanged = !m_isComputed || changed;
+  m_hasChanged = changed;
   m_isComputed = true;
+  if (changed)
+    forgetOutlets();
 }
 
-namespace {
-
-void noteOrigins(const QStringList& attributes, const SubDocNetworkObj& node,
-                 QHash<QString, QString>& origins) {
-  QString name;
+void SubDocNetworkObj::noteOrigins(const QStringList& attributes, QHash<QString, QString>& origins) const {
   for (const QString& attribute : attributes) {
-    QString& origin = origins[attribute];
-    if (!origin.isNull())
-      continue;
-    if (name.isNull()) {
-      name = node.name();
-      if (name.isNull())
-        name = QLatin1String("");
-    }
-    origin = name;
+    if (!origins.contains(attribute))
+      origins.insert(attribute, name());
   }
 }
 
-}  // namespace
-
-QStringList SubDocNetworkObj::collect(const std::vector<Link>& links,
-                                      QHash<QString, QString>& origins) const {
-  if (links.size() == 1) {
-    const QStringList attributes = links.front().node->getAttributes(links.front().port);
-    noteOrigins(attributes, *links.front().node, origins);
-    return attributes;
-  }
-  QStringList collected;
+const QStringList& SubDocNetworkObj::collect(Source begin, Source end, QStringList& merged,
+                                             QHash<QString, QString>& origins) {
+  const QStringList* first = &merged;  // empty
   QSet<QString> seen;
-  for (const Link& link : links) {
-    const QStringList attributes = link.node->getAttributes(link.port);
-    noteOrigins(attributes, *link.node, origins);
+  for (Source source = begin; source != end; ++source) {
+    if (!(*source)->isCurrent)
+      (*source)->node->fill(**source, origins);
+    const QStringList& attributes = (*source)->attributes;
+    if (first->isEmpty()) {
+      first = &attributes;
+      continue;
+    }
+    if (attributes == *first)
+      continue;
+    if (first != &merged) {
+      merged = *first;
+      seen = QSet<QString>(merged.begin(), merged.end());
+      first = &merged;
+    }
     for (const QString& attribute : attributes) {
       const int before = seen.size();
       seen.insert(attribute);
       if (seen.size() != before)
-        collected.append(attribute);
+        merged.append(attribute);
     }
   }
-  return collected;
+  return *first;
 }
 
-QStringList SubDocNetworkObj::collectAll(QHash<QString, QString>& origins) const {
-  if (m_feeders.size() == 1)
-    return collect(m_feeders.begin()->second, origins);
-  std::vector<Link> all;
-  for (const auto& [port, links] : m_feeders)
-    all.insert(all.end(), links.begin(), links.end());
-  return all.empty() ? QStringList() : collect(all, origins);
+const QStringList& SubDocNetworkObj::collect(QStringList& merged, QHash<QString, QString>& origins) {
+  const std::vector<Outlet*>& all = sources();
+  return collect(all.data(), all.data() + all.size(), merged, origins);
 }
 
 QStringList SubDocNetworkObj::withCopies(const QString& port, const QStringList& attributes) const {

@@ -13,6 +13,8 @@
 
 class ORX_EXPORT SubDocNetworkObj {
  public:
+  enum class Kind : quint8 { Input, Output, Transformer, Loop };
+
   // One end of a link: a node, and its port there.
   struct Link {
     SubDocNetworkObj* node = nullptr;
@@ -31,10 +33,10 @@ class ORX_EXPORT SubDocNetworkObj {
   // What leaves the port; nothing before compute().
   virtual QStringList getAttributes(const QString& port) const = 0;
 
-  // The port's or loop's name; the identifier of an inner transformer.
-  virtual QString name() const = 0;
-
+  Kind kind() const { return m_kind; }
   int number() const { return m_number; }
+  // The port's or loop's name; the identifier of an inner transformer.
+  QString name() const;
   // The nodes that feed this one, by the port of this node.
   const Ports& feeders() const { return m_feeders; }
   // The nodes that this one feeds, by the port of this node.
@@ -55,36 +57,71 @@ class ORX_EXPORT SubDocNetworkObj {
   // Takes out every link from and to this node.
   void removeLinks();
 
-  // Forgets what was computed.
+  // Forgets that the node was computed.
   void beginQuery();
-  // Whether what reaches the node is other than at the compute() before; true for the first one.
+  // Whether what leaves the node may be other than at the compute() before; true for the first one.
   bool hasChanged() const { return m_hasChanged; }
 
  protected:
-  explicit SubDocNetworkObj(int number) : m_number(number) {}
+  // What leaves by a port, kept until the node is computed anew.
+  struct Outlet {
+    QStringList attributes;
+    SubDocNetworkObj* node = nullptr;
+    QString port;
+    bool isCurrent = false;
+  };
+  using Source = Outlet* const*;
 
-  // What the links bring to one port, each name once, in the order of the links.
-  QStringList collect(const std::vector<Link>& links, QHash<QString, QString>& origins) const;
-  // The same over all ports, in name order.
-  QStringList collectAll(QHash<QString, QString>& origins) const;
+  SubDocNetworkObj(Kind kind, int number, const QString& name);
 
-  // Notes that compute() ran. `arrived` is what reaches the node.
-  void noteComputed(const QStringList& arrived);
+  void setName(const QString& name) { m_name = name; }
+
+  // Where the links come from: ports in name order, links in the order of adding.
+  const std::vector<Outlet*>& sources();
+  // What the sources bring, each name once, in their order. `merged` is room for a list that none of them
+  // has by itself.
+  static const QStringList& collect(Source begin, Source end, QStringList& merged,
+                                    QHash<QString, QString>& origins);
+  // The same over all ports.
+  const QStringList& collect(QStringList& merged, QHash<QString, QString>& origins);
+  // Enters those that were not met before as attributes of this node.
+  void noteOrigins(const QStringList& attributes, QHash<QString, QString>& origins) const;
+
+  // Ends compute(). The same attributes leave by every port, but for copies.
+  void setLeaving(const QStringList& attributes);
+  const QStringList& leaving() const { return m_common.attributes; }
+  // Ends compute() where each port has to be asked.
   void noteComputed(bool changed);
   bool isComputed() const { return m_isComputed; }
-  const QStringList& arrived() const { return m_arrived; }
 
  private:
-  friend class NodeSet;
-  friend class NetworkOrder;
+  friend class NetworkSorter;
 
+  Outlet& outlet(const QString& port);
+  void fill(Outlet& outlet, QHash<QString, QString>& origins);
+  void forgetOutlets();
+
+  // What a query works with stands together.
+  Outlet m_common;  // of all ports that have none of their own
+  std::vector<Outlet*> m_sources;
+  Kind m_kind;
+  bool m_knowsSources = true;
+  bool m_isComputed = false;
+  bool m_hasChanged = true;
+  bool m_hasOutlets = false;
+  int m_place = -1;  // in the NetworkSorter that met the node last
   int m_number;
+  std::map<QString, Outlet> m_outlets;  // of transformers, and where copies are made
+
+  QString m_name;
   Ports m_feeders;
   Ports m_consumers;
   std::map<QString, std::vector<AttributeCopy>> m_copies;
-  QStringList m_arrived;
-  bool m_isComputed = false;
-  bool m_hasChanged = true;
-  quint64 m_mark = 0;   // of the NodeSet that it was last entered in
-  int m_position = -1;  // in the list that is being ordered
 };
+
+inline void SubDocNetworkObj::beginQuery() {
+  m_isComputed = false;
+  m_common.isCurrent = false;
+  if (m_hasOutlets)
+    forgetOutlets();
+}

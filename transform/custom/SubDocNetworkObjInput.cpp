@@ -1,18 +1,21 @@
 #include <transform/custom/SubDocNetworkObjInput.h>
 
 SubDocNetworkObjInput::SubDocNetworkObjInput(const QString& name, int number, int position)
-    : SubDocNetworkObj(number), m_name(name), m_position(position) {}
+    : SubDocNetworkObj(Kind::Input, number, name), m_position(position) {}
 
 void SubDocNetworkObjInput::compute(QHash<QString, QString>& origins) {
-  noteComputed(collectAll(origins));
-  if (m_staticAttributes.isEmpty() && arrived().isEmpty()) {
-    m_leaving = m_attributes;
-    return;
+  QStringList merged;
+  const QStringList& arriving = collect(merged, origins);
+  if (m_staticAttributes.isEmpty() && arriving.isEmpty()) {
+    setLeaving(m_attributes);
+  } else {
+    QStringList all = m_staticAttributes + m_attributes + arriving;
+    all.removeDuplicates();
+    setLeaving(all);
   }
-  m_leaving = m_staticAttributes + m_attributes + arrived();
-  m_leaving.removeDuplicates();
+  noteOrigins(leaving(), origins);
 }
 
 QStringList SubDocNetworkObjInput::getAttributes(const QString& port) const {
-  return isComputed() ? withCopies(port, m_leaving) : QStringList();
+  return isComputed() ? withCopies(port, leaving()) : QStringList();
 }

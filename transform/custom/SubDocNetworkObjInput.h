@@ -10,9 +10,8 @@ class ORX_EXPORT SubDocNetworkObjInput : public SubDocNetworkObj {
   void compute(QHash<QString, QString>& origins) override;
   // The static attributes, those that were set, then those that links send back, each name once.
   QStringList getAttributes(const QString& port) const override;
-  QString name() const override { return m_name; }
 
-  void setName(const QString& name) { m_name = name; }
+  using SubDocNetworkObj::setName;
   // Among the input ports, as the document has them.
   int position() const { return m_position; }
   const QStringList& setAttributes() const { return m_attributes; }
@@ -21,9 +20,7 @@ class ORX_EXPORT SubDocNetworkObjInput : public SubDocNetworkObj {
   void setStaticAttributes(const QStringList& attributes) { m_staticAttributes = attributes; }
 
  private:
-  QString m_name;
   int m_position;
   QStringList m_attributes;
   QStringList m_staticAttributes;  // what the port's author declared
-  QStringList m_leaving;
 };

@@ -1,12 +1,13 @@
 #include <transform/custom/SubDocNetworkObjLoop.h>
 
 SubDocNetworkObjLoop::SubDocNetworkObjLoop(const QString& name, int number)
-    : SubDocNetworkObj(number), m_name(name) {}
+    : SubDocNetworkObj(Kind::Loop, number, name) {}
 
 void SubDocNetworkObjLoop::compute(QHash<QString, QString>& origins) {
-  noteComputed(collectAll(origins));
+  QStringList merged;
+  setLeaving(collect(merged, origins));
 }
 
 QStringList SubDocNetworkObjLoop::getAttributes(const QString& port) const {
-  return isComputed() ? withCopies(port, arrived()) : QStringList();
+  return isComputed() ? withCopies(port, leaving()) : QStringList();
 }

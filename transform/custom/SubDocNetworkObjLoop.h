@@ -10,8 +10,4 @@ class ORX_EXPORT SubDocNetworkObjLoop : public SubDocNetworkObj {
   void compute(QHash<QString, QString>& origins) override;
   // What reaches the loop point passes on.
   QStringList getAttributes(const QString& port) const override;
-  QString name() const override { return m_name; }
-
- private:
-  QString m_name;
 };

@@ -3,8 +3,7 @@
 SubDocNetworkObjOutput::SubDocNetworkObjOutput(const QString& name, int number,
                                                OutgoingAttributePropogationMode mode,
                                                const QStringList& ownAttributes, int position)
-    : SubDocNetworkObj(number),
-      m_name(name),
+    : SubDocNetworkObj(Kind::Output, number, name),
       m_position(position),
       m_mode(mode),
       m_ownAttributes(ownAttributes) {}
@@ -16,16 +15,16 @@ void SubDocNetworkObjOutput::setMode(OutgoingAttributePropogationMode mode,
 }
 
 void SubDocNetworkObjOutput::compute(QHash<QString, QString>& origins) {
-  noteComputed(collectAll(origins));
-  m_computed = m_mode == kOutgoingOwnList ? m_ownAttributes : arrived();
-  if (m_mode != kOutgoingOwnList)
-    return;
-  for (const QString& attribute : qAsConst(m_ownAttributes)) {
-    if (!origins.contains(attribute))
-      origins.insert(attribute, m_name);
+  QStringList merged;
+  const QStringList& arriving = collect(merged, origins);
+  if (m_mode == kOutgoingOwnList) {
+    setLeaving(m_ownAttributes);
+    noteOrigins(m_ownAttributes, origins);
+  } else {
+    setLeaving(arriving);
   }
 }
 
 QStringList SubDocNetworkObjOutput::getAttributes(const QString&) const {
-  return isComputed() ? m_computed : QStringList();
+  return isComputed() ? leaving() : QStringList();
 }

@@ -11,9 +11,8 @@ class ORX_EXPORT SubDocNetworkObjOutput : public SubDocNetworkObj {
 
   void compute(QHash<QString, QString>& origins) override;
   QStringList getAttributes(const QString& port) const override;
-  QString name() const override { return m_name; }
 
-  void setName(const QString& name) { m_name = name; }
+  using SubDocNetworkObj::setName;
   // Among the output ports, as the document has them.
   int position() const { return m_position; }
   OutgoingAttributePropogationMode mode() const { return m_mode; }
@@ -21,9 +20,7 @@ class ORX_EXPORT SubDocNetworkObjOutput : public SubDocNetworkObj {
   void setMode(OutgoingAttributePropogationMode mode, const QStringList& ownAttributes);
 
  private:
-  QString m_name;
   int m_position;
-  QStringList m_computed;
   OutgoingAttributePropogationMode m_mode;
   QStringList m_ownAttributes;
 };

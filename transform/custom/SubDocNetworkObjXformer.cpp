@@ -4,49 +4,56 @@
 SubDocNetworkObjXformer::SubDocNetworkObjXformer(std::unique_ptr<TransformerCfg> cfg,
                                                  const QHash<QString, QStringList>& inputAttributes,
                                                  int number)
-    : SubDocNetworkObj(number), m_cfg(std::move(cfg)), m_inputAttributes(inputAttributes) {}
+    : SubDocNetworkObj(Kind::Transformer, number, QString()),
+      m_cfg(std::move(cfg)),
+      m_inputAttributes(inputAttributes),
+      m_arrivedByTag(inputAttributes) {}
 
 SubDocNetworkObjXformer::~SubDocNetworkObjXformer() = default;
 
 void SubDocNetworkObjXformer::compute(QHash<QString, QString>& origins) {
-  QHash<QString, QStringList> byTag = m_inputAttributes;
+  bool isOther = m_inlets.size() != feeders().size();
+  m_inlets.resize(feeders().size());
+  auto inlet = m_inlets.begin();
+  Source source = sources().data();
   for (const auto& [port, links] : feeders()) {
-    const QStringList arrived = collect(links, origins);
-    const auto known = byTag.find(port);
-    if (known == byTag.end() || known->isEmpty()) {
-      byTag.insert(port, arrived);
-    } else {
-      *known += arrived;
-      known->removeDuplicates();
+    QStringList merged;
+    const QStringList& arriving = collect(source, source + links.size(), merged, origins);
+    if (inlet->port != port || inlet->attributes != arriving) {
+      *inlet = {port, arriving};
+      isOther = true;
     }
+    ++inlet;
+    source += links.size();
   }
-  noteComputed(byTag != m_arrivedByTag);
-  if (!hasChanged())
-    return;
-  m_arrivedByTag = byTag;
-  m_leaving.clear();
-  m_cfg->setInputAttributes(byTag);
+  if (isOther)
+    m_arrivedByTag = arrivedByTag();
+  noteComputed(isOther || !isComputed());
+  if (hasChanged())
+    m_cfg->setInputAttributes(m_arrivedByTag);
+}
+
+QHash<QString, QStringList> SubDocNetworkObjXformer::arrivedByTag() const {
+  QHash<QString, QStringList> byTag = m_inputAttributes;
+  for (const Inlet& inlet : m_inlets) {
+    QStringList& all = byTag[inlet.port];
+    all += inlet.attributes;
+    if (all.size() > inlet.attributes.size())
+      all.removeDuplicates();
+  }
+  return byTag;
 }
 
 QStringList SubDocNetworkObjXformer::getAttributes(const QString& port) const {
   if (!isComputed())
     return QStringList();
-  const auto known = m_leaving.constFind(port);
-  if (known != m_leaving.constEnd())
-    return *known;
   QStringList leaving = m_cfg->getOutputAttributes(port);
   const auto exposed = m_exposed.constFind(port);
   if (exposed != m_exposed.constEnd()) {
     leaving += *exposed;
     leaving.removeDuplicates();
   }
-  leaving = withCopies(port, leaving);
-  m_leaving.insert(port, leaving);
-  return leaving;
-}
-
-QString SubDocNetworkObjXformer::name() const {
-  return m_cfg->getIdentifier();
+  return withCopies(port, leaving);
 }
 
 TransformerCfg* SubDocNetworkObjXformer::getTransformer() const {

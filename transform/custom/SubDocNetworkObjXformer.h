@@ -15,9 +15,8 @@ class ORX_EXPORT SubDocNetworkObjXformer : public SubDocNetworkObj {
   ~SubDocNetworkObjXformer() override;
 
   void compute(QHash<QString, QString>& origins) override;
-  // Asks the configuration, once per port between two changes of what arrives.
+  // Asks the configuration.
   QStringList getAttributes(const QString& port) const override;
-  QString name() const override;
   virtual TransformerCfg* getTransformer() const;
 
   // Attributes that a user added to what leaves an output, by output tag.
@@ -25,9 +24,17 @@ class ORX_EXPORT SubDocNetworkObjXformer : public SubDocNetworkObj {
   void setExposedAttributes(const QHash<QString, QStringList>& attributes) { m_exposed = attributes; }
 
  private:
+  // What reached a port at the last compute().
+  struct Inlet {
+    QString port;
+    QStringList attributes;
+  };
+
+  QHash<QString, QStringList> arrivedByTag() const;
+
   std::unique_ptr<TransformerCfg> m_cfg;
   QHash<QString, QStringList> m_inputAttributes;
   QHash<QString, QStringList> m_exposed;
-  QHash<QString, QStringList> m_arrivedByTag;
-  mutable QHash<QString, QStringList> m_leaving;  // of the ports that were asked for
+  std::vector<Inlet> m_inlets;
+  QHash<QString, QStringList> m_arrivedByTag;  // what the configuration is given
 };
