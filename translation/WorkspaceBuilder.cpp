@@ -13,17 +13,6 @@
 #include <translation/NetworkDiagnostics.h>
 #include <translation/WorkspaceBuilder.h>
 
-namespace {
-
-// What a linked custom transformer has is told by its file.
-QString nameWithFile(const TransformerCfg& cfg) {
-  const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(&cfg));
-  return linked ? cfg.getName() + QLatin1String(" (") + linked->getFileName() + QLatin1Char(')')
-                : cfg.getName();
-}
-
-}  // namespace
-
 WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
                                    const QHash<QString, QString>& parameterValues)
     : m_source(source), m_diagnostics(diagnostics), m_parameterValues(parameterValues) {}
@@ -152,9 +141,9 @@ std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const Transfor
     return cfg;
   const QString refusal = source.refusalReason();
   if (!refusal.isEmpty()) {
-    const bool isRegistrys = !m_source.refusalReason().isEmpty();
-    m_diagnostics.reportText(isRegistrys ? Rule::CustomTransformerFault : Rule::Nesting, record.line,
-                             nodeName, refusal);
+    const bool isEmbedded = m_workspace->library->holds(type);
+    m_diagnostics.reportText(isEmbedded ? Rule::Nesting : Rule::CustomTransformerFault, record.line, nodeName,
+                             refusal);
     return nullptr;
   }
   const std::unique_ptr<TransformerCfg> newest =
@@ -173,13 +162,14 @@ std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const Transfor
 void WorkspaceBuilder::reportCustomTransformers() {
   for (const ExternalDocNetwork* network : m_workspace->customTransformers())
     reportNetworkProblems(*network, m_workspace->fileName, m_diagnostics);
-  QSet<const CompoundTransformerNetwork*> seen;
+  std::vector<CompoundTransformerNetwork*> placed;
   for (const WorkspaceNode& node : m_workspace->nodes) {
-    const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(node.cfg.get()));
-    if (linked && !seen.contains(linked)) {
-      seen.insert(linked);
+    if (CompoundTransformerNetwork* network = networkOf(node.cfg.get()))
+      placed.push_back(network);
+  }
+  for (const CompoundTransformerNetwork* network : nestedNetworks(placed)) {
+    if (const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(network))
       reportNetworkProblems(*linked, linked->getFileName(), m_diagnostics);
-    }
   }
 }
 

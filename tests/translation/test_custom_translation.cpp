@@ -2,6 +2,8 @@
 #include <tests/support/QtPrinters.h>
 #include <tests/translation/TranslatedWorkspace.h>
 
+#include <QElapsedTimer>
+
 namespace {
 
 const QString kInstance = QStringLiteral("SubDocumentTransformer");
@@ -97,6 +99,90 @@ TEST(CustomTranslation, StatementsNameTheAttributesOfAllInstances) {
     const Outcome outcome = translate(workspace);
     EXPECT_EQ(outcome.result, TranslationResult::Done) << outcome.texts.join('\n').toStdString();
     EXPECT_EQ(namedAttributes(outcome.text), test.named) << test.promise << outcome.text.toStdString();
+  }
+}
+
+// --- nesting
+// -------------------------------------------------------------------------------------------------
+
+// A custom transformer that has `inner` inside, `times` in a row; plain when that is empty.
+void addLevel(SmallWorkspace& workspace, const QString& name, const QString& inner, int times) {
+  workspace.beginCustom(name).port(1, "IN", "true").port(2, "OUT", "false");
+  int from = 1;
+  for (int id = 3; id < 3 + times; from = id++) {
+    if (inner.isEmpty())
+      workspace.transformer(id, "Copy", {"XFORMER_NAME", QString("T%1").arg(id)});
+    else
+      workspace.transformer(id, kInstance, {"SUB_DOC_NAME", inner, "XFORMER_NAME", QString("T%1").arg(id)});
+    workspace.link(from, "fo 0", id, "fi 0");
+  }
+  workspace.link(from, "fo 0", 2, "fi 0").endCustom();
+}
+
+SmallWorkspace nestedWorkspace(int levels, int times) {
+  SmallWorkspace workspace;
+  workspace.reader(1, "Parcels", {"id"}).writer(2, "Flooded");
+  workspace.transformer(3, kInstance,
+                        {"SUB_DOC_NAME", QString("L%1").arg(levels - 1), "XFORMER_NAME", "Outer"});
+  workspace.link(1, "fo 0", 3, "fi 0").link(3, "fo 0", 2, "fi 0");
+  for (int level = 0; level < levels; ++level)
+    addLevel(workspace, QString("L%1").arg(level), level == 0 ? QString() : QString("L%1").arg(level - 1),
+             times);
+  return workspace;
+}
+
+TEST(CustomTranslation, NestsUpTo64Deep) {
+  const struct {
+    int levels;
+    int times;
+    QStringList diagnostics;
+  } cases[] = {
+      {3, 1, {}},
+      {64, 1, {}},
+      {64, 2, {}},
+      {65, 1, {"custom-transformer-fault L1/T3"}},
+  };
+  for (const auto& test : cases) {
+    QElapsedTimer timer;
+    timer.start();
+    const Outcome outcome = translate(nestedWorkspace(test.levels, test.times));
+    EXPECT_LT(timer.elapsed(), 30000) << "what is placed twice on each level costs no more than its levels";
+    EXPECT_EQ(outcome.diagnostics, test.diagnostics) << outcome.texts.join('\n').toStdString();
+    if (!test.diagnostics.isEmpty()) {
+      EXPECT_EQ(outcome.result, TranslationResult::Refused);
+      EXPECT_TRUE(outcome.texts.first().contains("64")) << outcome.texts.first().toStdString();
+      continue;
+    }
+    EXPECT_EQ(outcome.text.count("# TRANSFORMER_BEGIN L"), test.levels);
+    EXPECT_EQ(outcome.text.count("INCLUDE_CUSTOM_TRANSFORMER_VER L"), (test.levels - 1) * test.times + 1);
+    int before = 0;
+    for (int level = 0; level < test.levels; ++level) {
+      const int block = outcome.text.indexOf(QString("# TRANSFORMER_BEGIN L%1,").arg(level));
+      EXPECT_GT(block, before) << "innermost first";
+      before = block;
+    }
+    EXPECT_TRUE(outcome.text.contains("# MACRO L1_WORKSPACE_NAME $(L2_WORKSPACE_NAME)_T3\n"));
+  }
+}
+
+TEST(CustomTranslation, NothingStandsInsideItself) {
+  const struct {
+    QStringList inside;  // what stands in A, B and C
+    const char* way;
+  } cases[] = {
+      {{"A", "", ""}, "A > A"},
+      {{"B", "A", ""}, "A > B > A"},
+      {{"B", "C", "B"}, "B > C > B"},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.transformer(3, kInstance, {"SUB_DOC_NAME", "A", "XFORMER_NAME", "Outer"});
+    for (int i = 0; i < 3; ++i)
+      addLevel(workspace, QString("ABC").mid(i, 1), test.inside.at(i), 1);
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.result, TranslationResult::Refused) << test.way;
+    ASSERT_EQ(outcome.texts.size(), 1) << test.way;
+    EXPECT_TRUE(outcome.texts.first().contains(test.way)) << outcome.texts.first().toStdString();
   }
 }
 

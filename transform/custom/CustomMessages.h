@@ -32,5 +32,6 @@ constexpr long kPromptIterationCount = 370849;
 constexpr long kPromptGroupBy = 370850;
 constexpr long kNoInstance = 370851;
 constexpr long kNoMacroName = 370852;
+constexpr long kEncipheredBody = 370854;
 
 }  // namespace custom_messages

@@ -15,23 +15,18 @@
 namespace {
 
 constexpr int kFieldsWithSettings = 8;
-
-// Where the version with the header stands in its file; a negative length when it is not there any more.
-VersionInfo findVersion(const QString& fileName, const CustomTransformerHeader& header, int& versions) {
-  QString error;
-  const QList<VersionInfo> all = VersionStore(fileName).versions(error);
-  versions = all.size();
-  for (const VersionInfo& version : all) {
-    if (version.byteOffset == header.byteOffset && version.name == header.name() &&
-        version.version == header.version())
-      return version;
-  }
-  VersionInfo none;
-  none.byteLength = -1;
-  return none;
-}
+const QString kTemporaryName = QStringLiteral("kx-custom-xform-ver-XXXXXX");
 
 }  // namespace
+
+// As a whole: an enciphered body is copied as it is.
+bool ExternalTransformerNetwork::isEnciphered() const {
+  try {
+    return PlainFile(m_fileName, kTemporaryName).fileName() != m_fileName;
+  } catch (const WorkspaceLoaderException&) {
+    return false;
+  }
+}
 
 bool ExternalTransformerNetwork::extractToFile(const QString& fileName) {
   const auto refuse = [this](const QString& reason) {
@@ -39,14 +34,9 @@ bool ExternalTransformerNetwork::extractToFile(const QString& fileName) {
     return false;
   };
   setExtractError(QString());
-  int versions = 0;
-  const VersionInfo version = findVersion(m_fileName, m_header, versions);
-  try {
-    if (PlainFile(m_fileName, QStringLiteral("kx-custom-xform-ver-XXXXXX")).fileName() != m_fileName)
-      return refuse(TransformResString(custom_messages::kEnciphered, m_fileName));
-  } catch (const WorkspaceLoaderException& exception) {
-    return refuse(exception.getMessage());
-  }
+  if (isEnciphered())
+    return refuse(TransformResString(custom_messages::kEnciphered, m_fileName));
+  const VersionInfo version = findVersion(m_fileName);
   if (!m_isLoaded || version.byteLength < 0)
     return refuse(TransformResString(custom_messages::kFileChanged, m_fileName));
 
@@ -81,14 +71,14 @@ bool ExternalTransformerNetwork::isDefinitionDeletable() const {
   const QFileInfo file(m_fileName);
   const QString home = QORXOrxHome() + QLatin1Char('/');
   return m_isLoaded && file.isFile() && file.isWritable() && QFileInfo(file.absolutePath()).isWritable() &&
-         !QORXPrettyUpFileName(m_fileName).startsWith(home);
+         !QORXPrettyUpFileName(m_fileName).startsWith(home) && !isEnciphered();
 }
 
 bool ExternalTransformerNetwork::deleteDefinition() {
   if (!isDefinitionDeletable())
     return false;
   int versions = 0;
-  const VersionInfo version = findVersion(m_fileName, m_header, versions);
+  const VersionInfo version = findVersion(m_fileName, &versions);
   if (version.byteLength < 0)
     return false;
   if (versions == 1)

@@ -3,6 +3,7 @@
 #include <transform/core/TransformerSource.h>
 #include <transform/custom/CustomMessages.h>
 #include <transform/custom/ExternalDocNetworkBuilder.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
@@ -162,7 +163,7 @@ void ExternalDocNetwork::Builder::configure(const TransformerStruct& record, Pla
       continue;
     if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
       report(NetworkProblem::Kind::UnknownParameter, parameter.line, place.title,
-             custom_messages::kUnknownParameter, {cfg.getName(), parameter.parmName});
+             custom_messages::kUnknownParameter, {nameWithFile(cfg), parameter.parmName});
     }
   }
   cfg.autoUpgradeTransformer();
@@ -215,7 +216,7 @@ bool ExternalDocNetwork::Builder::findPort(const LinkStruct& record, const Place
     place.cfg->getInputTags(tags);
   report(isOutput ? NetworkProblem::Kind::UnknownOutput : NetworkProblem::Kind::UnknownInput, record.line,
          place.title, isOutput ? custom_messages::kUnknownOutput : custom_messages::kUnknownInput,
-         {place.cfg->getName(), name.isEmpty() ? QString::number(number) : name,
+         {nameWithFile(*place.cfg), name.isEmpty() ? QString::number(number) : name,
           tags.join(QLatin1String(", "))});
   return false;
 }

@@ -1,4 +1,5 @@
 // Header, answers and lazy loading; what changes files stands in CustomTransformerFiles.cpp.
+#include <platform/orxutil/Decipher.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CustomMessages.h>
@@ -7,6 +8,7 @@
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/TransformerRecords.h>
+#include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 #include <transform/workspace/XMLComponentReader.h>
 
@@ -113,7 +115,7 @@ void ExternalTransformerNetwork::forceLoad() {
   // Files may name each other in a long row: a row longer than custom transformers may nest is left where it
   // is, and the nesting refused when it is written.
   static thread_local int depth = 0;
-  if (m_isComplete || !m_isLoaded || m_isLoading || !m_manager || depth > kDeepestNesting)
+  if (isBodyLoaded() || m_isLoading || !m_manager || depth > kDeepestNesting)
     return;
   ++depth;
   m_isLoading = true;
@@ -121,34 +123,66 @@ void ExternalTransformerNetwork::forceLoad() {
     m_isLoading = false;
     --depth;
   });
+  m_isComplete = false;
+  m_bodyFault.clear();
+  m_lacksRoutine = false;
+  clearProblems();
   try {
     loadBody();
   } catch (const WorkspaceLoaderException& exception) {
-    addProblem(NetworkProblem::Kind::NoBody, exception.line(), QString(),
-               TransformResString(custom_messages::kNoBody, {getName(), m_fileName, exception.getMessage()}));
+    m_lacksRoutine = lacksRoutine();
+    m_bodyFault =
+        m_lacksRoutine
+            ? TransformResString(custom_messages::kEncipheredBody, {getName(), m_fileName})
+            : TransformResString(custom_messages::kNoBody, {getName(), m_fileName, exception.getMessage()});
+    addProblem(NetworkProblem::Kind::NoBody, exception.line(), QString(), m_bodyFault);
     doneAdding(true);
   }
 }
 
-void ExternalTransformerNetwork::loadBody() {
-  PlainFile plain(m_fileName, kTemporaryName);
+bool ExternalTransformerNetwork::isBodyLoaded() const {
+  // A routine may be registered at any time.
+  return !m_isLoaded || (m_isComplete && !(m_lacksRoutine && ORW_hasDecipherRoutine()));
+}
+
+bool ExternalTransformerNetwork::lacksRoutine() const {
+  const VersionInfo version = findVersion(m_fileName);
+  try {
+    return !ORW_hasDecipherRoutine() && version.byteLength >= 0 &&
+           VersionStore(m_fileName).read(version.byteOffset, version.byteLength).isUnreadable;
+  } catch (const WorkspaceLoaderException&) {
+    return false;
+  }
+}
+
+VersionInfo ExternalTransformerNetwork::findVersion(const QString& fileName, int* count) const {
   QString error;
-  qint64 length = -1;
-  for (const VersionInfo& version : XMLComponentReader::getVersions(plain.fileName(), error)) {
+  const QList<VersionInfo> all = VersionStore(fileName).versions(error);
+  if (count)
+    *count = all.size();
+  for (const VersionInfo& version : all) {
     if (version.byteOffset == m_header.byteOffset && version.name == m_header.name() &&
         version.version == m_header.version())
-      length = version.byteLength;
+      return version;
   }
-  if (length < 0)
+  VersionInfo none;
+  none.byteLength = -1;
+  return none;
+}
+
+void ExternalTransformerNetwork::loadBody() {
+  PlainFile plain(m_fileName, kTemporaryName);
+  const VersionInfo version = findVersion(plain.fileName());
+  if (version.byteLength < 0)
     throw WorkspaceLoaderException(TransformResString(custom_messages::kFileChanged, m_fileName));
   XMLComponentReader reader;
-  QStringList headerLines;
-  QByteArray before;
-  QByteArray behind;
-  reader.ReadVersionedInput(plain.fileName(), m_header.byteOffset, length, false, headerLines, before,
-                            behind);
-  before.clear();
-  behind.clear();
+  {
+    QStringList headerLines;
+    QByteArray before;
+    QByteArray behind;
+    reader.ReadVersionedInput(plain.fileName(), version.byteOffset, version.byteLength, false, headerLines,
+                              before, behind);
+  }
   m_library = std::make_unique<SubDocumentLibrary>(reader, m_manager);
   build(reader, bodyName(reader, getName()), *m_library);
   m_library->forgetReader();
@@ -165,7 +199,7 @@ void ExternalTransformerNetwork::doneAdding(bool parametersChanged) {
 
 // A body that is read when it is first asked for is no change of the network.
 void ExternalTransformerNetwork::ensureBody() const {
-  if (!m_isComplete)
+  if (!isBodyLoaded())
     const_cast<ExternalTransformerNetwork*>(this)->forceLoad();
 }
 

@@ -6,6 +6,7 @@
 
 #include <transform/custom/CustomTransformerHeader.h>
 #include <transform/custom/ExternalDocNetwork.h>
+#include <transform/workspace/VersionInfo.h>
 
 #include <memory>
 
@@ -20,6 +21,9 @@ class ORX_EXPORT ExternalTransformerNetwork : public ExternalDocNetwork {
 
   // Whether the file holds the wanted version.
   bool isLoaded() const { return m_isLoaded; }
+  // Why there is nothing inside, as a message for the user; empty unless the body was asked for and could not
+  // be read. A body that wants a routine for deciphering is tried again once there is one.
+  const QString& bodyFault() const { return m_bodyFault; }
   // The lines of the definition block, without their prefix.
   const QStringList& definitionLines() const { return m_header.definitionLines; }
 
@@ -54,7 +58,7 @@ class ORX_EXPORT ExternalTransformerNetwork : public ExternalDocNetwork {
   bool isDefinitionDeletable() const override;
   // Takes this version out of the file; the file goes with the last one.
   bool deleteDefinition() override;
-  bool isBodyLoaded() const override { return m_isComplete || !m_isLoaded; }
+  bool isBodyLoaded() const override;
 
  protected:
   // The header has the last word.
@@ -63,6 +67,12 @@ class ORX_EXPORT ExternalTransformerNetwork : public ExternalDocNetwork {
  private:
   void readHeader(int version);
   void loadBody();
+  // Whether the body is unreadable for want of a routine for deciphering.
+  bool lacksRoutine() const;
+  // Where the version stands in its file, or in a plain copy of that; a negative length when it is not there
+  // any more. `count` receives how many versions there are.
+  VersionInfo findVersion(const QString& fileName, int* count = nullptr) const;
+  bool isEnciphered() const;
   void ensureBody() const;
 
   QString m_fileName;
@@ -72,7 +82,9 @@ class ORX_EXPORT ExternalTransformerNetwork : public ExternalDocNetwork {
   bool m_isLoaded = false;
   bool m_isComplete = false;
   bool m_isLoading = false;
+  bool m_lacksRoutine = false;
   bool m_settingsChanged = false;
+  QString m_bodyFault;
   std::unique_ptr<SubDocumentLibrary>
       m_library;  // the custom transformers that stand inside, in the same file
 };

@@ -2,6 +2,7 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CustomMessages.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/text/MessageStrings.h>
 
@@ -19,18 +20,32 @@ CompoundTransformerNetwork* networkOf(const TransformerCfg* cfg) {
   return custom ? custom->getNetwork() : nullptr;
 }
 
+QString nameWithFile(const TransformerCfg& cfg) {
+  const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(&cfg));
+  return linked ? cfg.getName() + QLatin1String(" (") + linked->getFileName() + QLatin1Char(')')
+                : cfg.getName();
+}
+
 std::vector<CompoundTransformerNetwork*> nestedNetworks(CompoundTransformerNetwork& root) {
-  std::vector<CompoundTransformerNetwork*> found{&root};
-  QSet<const CompoundTransformerNetwork*> seen{&root};
+  return nestedNetworks(std::vector<CompoundTransformerNetwork*>{&root});
+}
+
+std::vector<CompoundTransformerNetwork*> nestedNetworks(
+    const std::vector<CompoundTransformerNetwork*>& roots) {
+  std::vector<CompoundTransformerNetwork*> found;
+  QSet<const CompoundTransformerNetwork*> seen;
+  const auto enter = [&](CompoundTransformerNetwork* network) {
+    if (!network || seen.contains(network))
+      return;
+    seen.insert(network);
+    found.push_back(network);
+  };
+  for (CompoundTransformerNetwork* root : roots)
+    enter(root);
   for (std::size_t at = 0; at < found.size(); ++at) {
     found[at]->forceLoad();
-    for (const TransformerCfg* cfg : found[at]->customTransformers()) {
-      CompoundTransformerNetwork* inner = networkOf(cfg);
-      if (!inner || seen.contains(inner))
-        continue;
-      seen.insert(inner);
-      found.push_back(inner);
-    }
+    for (const TransformerCfg* cfg : found[at]->customTransformers())
+      enter(networkOf(cfg));
   }
   return found;
 }

@@ -2,6 +2,8 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CustomMessages.h>
 #include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/IXMLComponentReader.h>
@@ -62,9 +64,9 @@ std::unique_ptr<TransformerCfg> SubDocumentLibrary::makeTransformer(const QStrin
     if (!m_others)
       return nullptr;
     std::unique_ptr<TransformerCfg> cfg = m_others->makeTransformer(name, version);
-    if (!cfg)
-      m_refusal = m_others->refusalReason();
-    return cfg;
+    const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(cfg.get()));
+    m_refusal = linked ? linked->bodyFault() : cfg ? QString() : m_others->refusalReason();
+    return m_refusal.isEmpty() ? std::move(cfg) : nullptr;
   }
   Entry* entry = find(name);
   if (!entry)

@@ -29,6 +29,7 @@ class ORX_EXPORT SubDocumentLibrary : public TransformerSource {
   std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override;
   QString refusalReason() const override { return m_refusal; }
 
+  bool holds(const QString& name) const { return m_entries.contains(name); }
   // Null for a name that the document does not have, or when it is being built. Owned by the library.
   ExternalDocNetwork* network(const QString& name);
   // Those that were asked for, each behind the ones that stand inside it.

@@ -1,10 +1,11 @@
+#include <platform/orxutil/Decipher.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/registry/CustomTransformerFiles.h>
 #include <transform/registry/ITransformerMgr.h>
+#include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
-
-#include <QFile>
+#include <transform/workspace/WorkspaceLoaderException.h>
 
 #include <algorithm>
 
@@ -12,12 +13,21 @@ namespace {
 
 // The build that saved a version last, told by its document without parsing it; 0 when it does not say.
 int lastSaveBuild(const QString& path, const VersionInfo& version) {
-  QFile file(path);
-  if (!file.open(QIODevice::ReadOnly) || !file.seek(version.byteOffset))
-    return 0;
-  const QByteArray text = file.read(version.byteLength);
   static const QByteArray mark("LAST_SAVE_BUILD=\"");
-  const int place = text.lastIndexOf(mark);
+  QByteArray text;
+  int place = -1;
+  try {
+    PlainFile plain(path, QStringLiteral("kx-in-XXXXXX"));
+    if (plain.device().seek(version.byteOffset))
+      text = plain.device().read(version.byteLength);
+    place = text.lastIndexOf(mark);
+    if (place < 0 && ORW_hasDecipherRoutine()) {
+      text = VersionStore(path).read(version.byteOffset, version.byteLength).document;
+      place = text.lastIndexOf(mark);
+    }
+  } catch (const WorkspaceLoaderException&) {
+    return 0;
+  }
   if (place < 0)
     return 0;
   const int begin = place + mark.size();

@@ -1,4 +1,6 @@
+#include <platform/orxutil/Decipher.h>
 #include <transform/files/AtomicFile.h>
+#include <transform/files/TemporaryFile.h>
 #include <transform/workspace/FileLines.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
@@ -6,7 +8,6 @@
 
 #include <QBuffer>
 #include <QFile>
-#include <QFileInfo>
 
 const char* const VersionStore::kFirstLine = "# ORW custom transformers";
 const char* const VersionStore::kBegin = "# TRANSFORMER_BEGIN ";
@@ -18,6 +19,8 @@ namespace {
 constexpr int kNeededFields = 3;
 const char* const kDefinitionPrefix = "# ";
 const char* const kDocumentPrefix = "#! ";
+const QString kCopyName = QStringLiteral("kx-in-XXXXXX");
+const QString kVersionCopyName = QStringLiteral("kx-custom-xform-ver-XXXXXX");
 
 QByteArray currentLine(const FileLines& lines) {
   QByteArray line(lines.data(), lines.size());
@@ -74,42 +77,75 @@ QList<VersionInfo> scan(QIODevice& device) {
   return found;
 }
 
-// The definition's lines between the two marks; with the comment prefix of a document, should they lack it.
-QByteArray definitionLines(const QByteArray& version) {
+// What stands in a version beside its marks.
+struct Content {
+  QByteArray definition;  // without the prefix of its lines
+  QByteArray behind;      // from the line behind the end mark on
+  int behindLine = 0;     // lines of the version in front of that
+};
+
+Content contentOf(const QByteArray& version) {
+  Content content;
   QBuffer buffer;
   buffer.setData(version);
   buffer.open(QIODevice::ReadOnly);
   FileLines lines(buffer);
-  QList<QByteArray> kept;
-  bool isPrefixed = false;
   lines.next();  // the opening line
   while (lines.next() && !lines.startsWith(VersionStore::kEnd)) {
     QByteArray line(lines.data(), lines.size());
     if (lines.startsLine() && line.startsWith(kDefinitionPrefix))
       line.remove(0, static_cast<int>(qstrlen(kDefinitionPrefix)));
-    isPrefixed = isPrefixed || line.startsWith(kDocumentPrefix);
-    kept.append(line);
+    content.definition += line;
   }
-  QByteArray text;
-  for (const QByteArray& line : qAsConst(kept))
-    text += isPrefixed ? line : kDocumentPrefix + line;
-  return text;
+  content.behindLine = lines.lineNumber();
+  while (lines.next())
+    content.behind.append(lines.data(), lines.size());
+  return content;
+}
+
+bool isDocument(const QByteArray& text) {
+  const QByteArray start = text.trimmed();
+  return (start.startsWith("#!") ? start.mid(2).trimmed() : start).startsWith('<');
+}
+
+// With the prefix of a document's lines, should it lack that.
+QByteArray asComment(const QByteArray& text) {
+  if (text.startsWith(kDocumentPrefix) || text.contains(QByteArray("\n") + kDocumentPrefix))
+    return text;
+  QByteArray commented;
+  for (int at = 0; at < text.size();) {
+    const int end = text.indexOf('\n', at) < 0 ? text.size() : text.indexOf('\n', at) + 1;
+    commented += kDocumentPrefix + text.mid(at, end - at);
+    at = end;
+  }
+  return commented;
+}
+
+// The plain text of what the registered routine takes for enciphered; empty for anything else.
+QByteArray deciphered(const QByteArray& text) {
+  if (!ORW_hasDecipherRoutine() || text.trimmed().isEmpty())
+    return QByteArray();
+  TemporaryFile copy(kVersionCopyName);
+  if (!copy.open() || copy.write(text) != text.size() || !copy.flush())
+    throw WorkspaceLoaderException(couldNotOpenMessage(copy.fileTemplate()));
+  PlainFile plain(copy.fileName(), kVersionCopyName);
+  return plain.fileName() == copy.fileName() ? QByteArray() : plain.device().readAll();
 }
 
 }  // namespace
 
 QList<VersionInfo> VersionStore::versions(QString& error) const {
   error.clear();
-  QFile file(m_fileName);
-  if (QFileInfo(m_fileName).isDir() || !file.open(QIODevice::ReadOnly)) {
-    error = couldNotOpenMessage(m_fileName);
+  try {
+    return scan(PlainFile(m_fileName, kCopyName).device());
+  } catch (const WorkspaceLoaderException& exception) {
+    error = exception.getMessage();
     return {};
   }
-  return scan(file);
 }
 
 VersionStore::Piece VersionStore::read(qint64 offset, qint64 length) const {
-  PlainFile plain(m_fileName, QStringLiteral("kx-in-XXXXXX"));
+  PlainFile plain(m_fileName, kCopyName);
   const QByteArray all = plain.device().readAll();
   if (offset < 0 || length <= 0 || offset > all.size() || length > all.size() - offset) {
     throw WorkspaceLoaderException(QStringLiteral("File Error!\nThere is no version at byte %1 of file: %2")
@@ -126,10 +162,25 @@ VersionStore::Piece VersionStore::read(qint64 offset, qint64 length) const {
     piece.document = version.mid(start);
     piece.documentLine = firstLine + version.left(start).count('\n');
   } else {
-    piece.document = definitionLines(version);
-    piece.documentLine = firstLine + 1;
+    const Content content = contentOf(version);
+    const bool hasDefinition = !content.definition.trimmed().isEmpty();
+    piece.document = hasDefinition ? content.definition : content.behind;
+    piece.documentLine = firstLine + (hasDefinition ? 1 : content.behindLine);
+    if (!isDocument(piece.document)) {
+      const QByteArray plainBehind = deciphered(content.behind);
+      const QByteArray plainDefinition =
+          plainBehind.isEmpty() ? deciphered(content.definition) : QByteArray();
+      if (!plainBehind.isEmpty()) {
+        piece.document = plainBehind;
+        piece.documentLine = firstLine + content.behindLine;
+      } else if (!plainDefinition.isEmpty()) {
+        piece.document = plainDefinition;
+      }
+      piece.isUnreadable = !isDocument(piece.document);
+    }
+    piece.document = asComment(piece.document);
   }
-  if (piece.document.isEmpty()) {
+  if (piece.document.trimmed().isEmpty()) {
     throw WorkspaceLoaderException(
         QStringLiteral("File Error!\nThe version at byte %1 holds no document, in file: %2")
             .arg(offset)

@@ -7,7 +7,9 @@
 //   #! <?xml version="1.0" ... ?>                           (the version's document)
 //   #! ...
 //
-// Text is UTF-8. A version reaches from its first line to the end of its document.
+// Text is UTF-8. A version reaches from its first line to the end of its document. An enciphered document
+// stands behind the end mark or between the two marks; enciphered files and documents are read as their plain
+// text.
 #pragma once
 
 #include <platform/Export.h>
@@ -35,6 +37,8 @@ class ORX_EXPORT VersionStore {
     QByteArray before;
     QByteArray document;   // comment lines; without a document of its own, the definition's lines
     int documentLine = 1;  // file line at which the document begins
+    bool isUnreadable =
+        false;  // there is something in its place: an enciphered document, or no document at all
     QByteArray behind;
   };
   // The version of `length` bytes at `offset`. Throws WorkspaceLoaderException when the file cannot be read,

@@ -65,8 +65,11 @@ const QTextCodec* fileCodec(const QByteArray& name) {
 }  // namespace
 
 WorkspaceFile::Form WorkspaceFile::recognise(const QString& fileName) {
-  QFile file(fileName);
-  return file.open(QIODevice::ReadOnly) ? formOf(file.read(kFirstBytes)) : Form::Unknown;
+  try {
+    return formOf(PlainFile(fileName, kCopyName).device().read(kFirstBytes));
+  } catch (const WorkspaceLoaderException&) {
+    return Form::Unknown;
+  }
 }
 
 void WorkspaceFile::read(IXMLComponentReader& reader, const QString& fileName, QStringList& headerLines) {

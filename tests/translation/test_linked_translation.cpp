@@ -1,0 +1,232 @@
+// Workspaces with custom transformers that live in files of their own.
+#include <platform/orxutil/Decipher.h>
+#include <tests/registry/RegistryFolders.h>
+#include <tests/support/QtPrinters.h>
+#include <tests/translation/TranslatedWorkspace.h>
+#include <transform/workspace/VersionStore.h>
+#include <transform/workspace/WorkspaceFile.h>
+
+namespace {
+// -----------------------------------------------------------------------------------
+
+// The document of the custom transformer "Tidy": IN, OUT, LIMIT, inside "Other".
+QByteArray tidyDocument(int build = 1) {
+  return QString(
+             "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n<TRANSFORMER>\n<SUBDOCUMENTS>\n"
+             "<SUBDOCUMENT NAME=\"Tidy\" LAST_SAVE_BUILD=\"%1\">\n<GLOBAL_PARAMETERS>\n"
+             "<GLOBAL_PARAMETER GUI_LINE=\"GUI TEXT LIMIT Limit\" DEFAULT_VALUE=\"5\"/>\n"
+             "</GLOBAL_PARAMETERS>\n<TRANSFORMERS>\n<TRANSFORMER IDENTIFIER=\"3\" TYPE=\"Other\" "
+             "VERSION=\"1\"/>\n"
+             "</TRANSFORMERS>\n<SUBDOCUMENT_IOS>\n"
+             "<SUBDOCUMENT_IO IDENTIFIER=\"1\" NAME=\"IN\" IS_SOURCE=\"true\"/>\n"
+             "<SUBDOCUMENT_IO IDENTIFIER=\"2\" NAME=\"OUT\" IS_SOURCE=\"false\"/>\n</SUBDOCUMENT_IOS>\n"
+             "<FEAT_LINKS>\n<FEAT_LINK IDENTIFIER=\"1\" SOURCE_NODE=\"1\" TARGET_NODE=\"2\" "
+             "SOURCE_PORT_DESC=\"fo 0\" TARGET_PORT_DESC=\"fi 0\"/>\n</FEAT_LINKS>\n"
+             "</SUBDOCUMENT>\n</SUBDOCUMENTS>\n</TRANSFORMER>\n")
+      .arg(build)
+      .toUtf8();
+}
+
+const QByteArray kSecret = QByteArrayLiteral("ORW-SECRET ");
+
+QByteArray enciphered(const QByteArray& plain) {
+  return kSecret + plain.toBase64();
+}
+
+bool decipher(const QString& fileName, const QString& plainCopy) {
+  QFile file(fileName);
+  QFile copy(plainCopy);
+  if (!file.open(QIODevice::ReadOnly) || !copy.open(QIODevice::WriteOnly))
+    return false;
+  const QByteArray text = file.readAll().trimmed();
+  return text.startsWith(kSecret) && copy.write(QByteArray::fromBase64(text.mid(kSecret.size()))) > 0;
+}
+
+class LinkedTranslation : public testing::Test {
+ protected:
+  LinkedTranslation() {
+    folders.define("Other.ort", definitionText("Other", 1, "PRESERVES_ATTRIBUTES: <ALL>\n"));
+    file = folders.path("extra/Tidy.ort");
+  }
+  ~LinkedTranslation() override { ORW_setDecipherRoutine({}); }
+
+  void store(const QByteArray& document, const QString& name = "Tidy") {
+    folders.write("extra/unused.txt", "");
+    QString error;
+    EXPECT_TRUE(VersionStore(folders.path("extra/" + name + ".ort"))
+                    .insert({name, "1", "Mine", "G"}, {"# none"}, document, error))
+        << error.toStdString();
+  }
+  void storeBody(const QByteArray& behind, const QByteArray& between = QByteArray()) {
+    folders.write("extra/Tidy.ort", "# ORW custom transformers\n# TRANSFORMER_BEGIN Tidy,1,Mine,G\n" +
+                                        between + "# TRANSFORMER_END\n" + behind);
+  }
+
+  // A workspace with an instance of Tidy; `isInside` puts it into an embedded custom transformer.
+  static SmallWorkspace workspace(bool isInside = false, const QString& version = "1") {
+    SmallWorkspace workspace;
+    workspace.reader(1, "Parcels", {"id"}).writer(2, "Flooded");
+    const auto place = [&] {
+      workspace.transformer(3, "Tidy", {"XFORMER_NAME", "T", "LIMIT", "7"}, {"VERSION", version});
+      workspace.link(1, "fo 0", 3, "fi 0 IN").link(3, "fo 0 OUT", 2, "fi 0");
+    };
+    if (!isInside) {
+      place();
+      return workspace;
+    }
+    workspace.transformer(3, "SubDocumentTransformer", {"SUB_DOC_NAME", "Around", "XFORMER_NAME", "A"});
+    workspace.link(1, "fo 0", 3, "fi 0 IN").link(3, "fo 0 OUT", 2, "fi 0");
+    workspace.beginCustom("Around").port(1, "IN", "true").port(2, "OUT", "false");
+    place();
+    workspace.endCustom();
+    return workspace;
+  }
+
+  RegistryFolders folders;
+  QString file;
+};
+
+TEST_F(LinkedTranslation, TellsWhatDoesNotFit) {
+  const QString all = folders.path("home/transformers");
+  const struct {
+    const char* promise;
+    std::function<void()> make;
+    const char* version;
+    QStringList diagnostics;  // inside an embedded one each is a fault of that, at the node AROUND/T
+    QStringList inText;       // of the first
+  } cases[] = {
+      {"fits", [&] { store(tidyDocument()); }, "1", {}, {}},
+      {"missing", [] {}, "4", {"unknown-transformer T"}, {"'Tidy'", "4", all, folders.path("extra")}},
+      {"version missing", [&] { store(tidyDocument()); }, "2", {"unknown-version T"}, {"'Tidy'", "2", "1"}},
+      {"newer build",
+       [&] { store(tidyDocument(18287)); },
+       "1",
+       {"custom-transformer-fault T"},
+       {"'Tidy'", file}},
+      {"input gone",
+       [&] { store(tidyDocument().replace("NAME=\"IN\"", "NAME=\"INTO\"")); },
+       "1",
+       {"unknown-input T"},
+       {file, "'IN'", "INTO"}},
+      {"output gone",
+       [&] { store(tidyDocument().replace("NAME=\"OUT\"", "NAME=\"DONE\"")); },
+       "1",
+       {"unknown-output T"},
+       {file, "'OUT'", "DONE"}},
+      {"parameter gone",
+       [&] { store(tidyDocument().replace("LIMIT", "BOUND")); },
+       "1",
+       {"unknown-parameter T"},
+       {file, "'LIMIT'"}},
+      {"inside at fault",
+       [&] { store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Gone\"")); },
+       "1",
+       {"custom-transformer-fault Tidy/Gone_3"},
+       {"'Gone'"}},
+      {"body broken",
+       [&] { store("<?xml version=\"1.0\"?>\n<TRANSFORMER>\n"); },
+       "1",
+       {"custom-transformer-fault T"},
+       {"'Tidy'", file}},
+      {"body missing", [&] { storeBody({}); }, "1", {"custom-transformer-fault T"}, {"'Tidy'", file}},
+      {"body enciphered",
+       [&] { storeBody(enciphered(tidyDocument())); },
+       "1",
+       {"custom-transformer-fault T"},
+       {"'Tidy'", file, "decipher"}},
+      {"inside itself",
+       [&] { store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Tidy\"")); },
+       "1",
+       {"custom-transformer-fault Tidy/Tidy_3"},
+       {"Tidy > Tidy"}},
+      {"by way of another file",
+       [&] {
+         store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Mess\""));
+         store(tidyDocument()
+                   .replace("TYPE=\"Other\"", "TYPE=\"Tidy\"")
+                   .replace("NAME=\"Tidy\"", "NAME=\"Mess\""),
+               "Mess");
+       },
+       "1",
+       {"nesting T"},
+       {"Tidy > Mess > Tidy"}},
+  };
+  for (const auto& test : cases) {
+    for (const bool isInside : {false, true}) {
+      for (const char* linked : {"extra/Tidy.ort", "extra/Mess.ort"})
+        QFile::remove(folders.path(linked));
+      test.make();
+      const Outcome outcome = translate(workspace(isInside, test.version), folders.load());
+      QStringList expected = test.diagnostics;
+      if (isInside && expected.contains("nesting T"))
+        expected = QStringList{"nesting A"};
+      else if (isInside && !expected.isEmpty() && !expected.first().contains('/'))
+        expected = QStringList{"custom-transformer-fault Around/T"};
+      EXPECT_EQ(outcome.diagnostics, expected) << test.promise << isInside;
+      EXPECT_EQ(outcome.result, expected.isEmpty() ? TranslationResult::Done : TranslationResult::Refused);
+      for (const QString& part : test.inText)
+        EXPECT_TRUE(outcome.texts.value(0).contains(part))
+            << test.promise << isInside << outcome.texts.value(0).toStdString();
+      EXPECT_EQ(outcome.text.count("INCLUDE_CUSTOM_TRANSFORMER_VER Tidy:1\n"), expected.isEmpty() ? 1 : 0);
+    }
+  }
+}
+
+// Whatever form the enciphered text takes: it is read as soon as there is a routine, also by a registry that
+// met it before.
+TEST_F(LinkedTranslation, EncipheredOnesAreReadByARoutine) {
+  QByteArray comments;
+  for (const QByteArray& line : tidyDocument().split('\n'))
+    comments += "#! " + line + '\n';
+  store(tidyDocument());
+  QFile whole(file);
+  ASSERT_TRUE(whole.open(QIODevice::ReadOnly));
+  const QByteArray plainFile = whole.readAll();
+  const struct {
+    const char* promise;
+    std::function<void()> make;
+    bool isSeenBefore;
+    bool isRead;
+  } cases[] = {
+      {"a document behind the definition", [&] { storeBody(enciphered(tidyDocument())); }, true, true},
+      {"its lines prefixed", [&] { storeBody(enciphered(comments) + "\n"); }, true, true},
+      {"in place of the definition", [&] { storeBody({}, "# " + enciphered(tidyDocument()) + "\n"); }, true,
+       true},
+      {"one of a newer build", [&] { storeBody(enciphered(tidyDocument(18287))); }, true, false},
+      {"the whole file", [&] { folders.write("extra/Tidy.ort", enciphered(plainFile)); }, false, true},
+  };
+  for (const auto& test : cases) {
+    ORW_setDecipherRoutine({});
+    test.make();
+    TransformerMgr& registry = folders.load();
+    EXPECT_EQ(translate(workspace(), registry).diagnostics,
+              QStringList(test.isSeenBefore ? "custom-transformer-fault T" : "unknown-transformer T"))
+        << test.promise;
+    ORW_setDecipherRoutine(decipher);
+    if (!test.isSeenBefore || !test.isRead)
+      folders.load();
+    const Outcome outcome = translate(workspace(), registry);
+    EXPECT_EQ(outcome.diagnostics, test.isRead ? QStringList() : QStringList("custom-transformer-fault T"))
+        << test.promise << outcome.texts.join('\n').toStdString();
+    EXPECT_EQ(outcome.text.contains("INCLUDE_CUSTOM_TRANSFORMER_VER Tidy:1\n"), test.isRead);
+  }
+}
+
+TEST_F(LinkedTranslation, AnEncipheredWorkspaceIsReadByARoutine) {
+  store(tidyDocument());
+  TransformerMgr& registry = folders.load();
+  const QString path = folders.write("w.orw", enciphered(workspace().text().toUtf8()));
+  const QString output = folders.path("w.mf");
+  for (const bool hasRoutine : {false, true}) {
+    ORW_setDecipherRoutine(hasRoutine ? ORWDecipherRoutine(decipher) : ORWDecipherRoutine());
+    Diagnostics diagnostics(path);
+    QString error;
+    const TranslationResult result = translateWorkspace({path, output, {}}, registry, diagnostics, error);
+    EXPECT_EQ(result, hasRoutine ? TranslationResult::Done : TranslationResult::Refused);
+    EXPECT_EQ(describe(diagnostics), hasRoutine ? QStringList() : QStringList("malformed-document "));
+    EXPECT_EQ(WorkspaceFile::recognise(path) == WorkspaceFile::Form::Workspace, hasRoutine);
+    EXPECT_EQ(readAll(output).contains("INCLUDE_CUSTOM_TRANSFORMER_VER Tidy:1"), hasRoutine);
+  }
+}
+
+}  // namespace
