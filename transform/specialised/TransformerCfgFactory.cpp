@@ -5,6 +5,7 @@
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 #include <transform/specialised/ValueMapperTransformerCfg.h>
+#include <transform/specialised/XMLTemplaterTransformerCfg.h>
 
 namespace {
 
@@ -14,6 +15,17 @@ constexpr int kHighest = TransformerCfgRule::kHighestVersion;
 template <typename Class>
 TransformerCfg* make() {
   return new Class;
+}
+
+// Of the classes that serve both languages.
+template <typename Class>
+TransformerCfg* makeXml() {
+  return new Class(false);
+}
+
+template <typename Class>
+TransformerCfg* makeJson() {
+  return new Class(true);
 }
 
 }  // namespace
@@ -31,6 +43,10 @@ const std::vector<TransformerCfgRule>& transformerCfgRules() {
        make<TesterTransformerCfg>},
       {QLatin1String("ParameterFetcher"), kLowest, kHighest, QLatin1String("ParameterFetcherTransformerCfg"),
        make<ParameterFetcherTransformerCfg>},
+      {QLatin1String("XMLTemplater"), kLowest, kHighest, QLatin1String("XMLTemplaterTransformerCfg"),
+       makeXml<XMLTemplaterTransformerCfg>},
+      {QLatin1String("JSONTemplater"), kLowest, kHighest, QLatin1String("XMLTemplaterTransformerCfg"),
+       makeJson<XMLTemplaterTransformerCfg>},
   };
   return rules;
 }

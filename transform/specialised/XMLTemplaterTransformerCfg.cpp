@@ -1,0 +1,192 @@
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/Keywords.h>
+#include <transform/specialised/FactoryOption.h>
+#include <transform/specialised/ParameterTable.h>
+#include <transform/specialised/TemplateText.h>
+#include <transform/specialised/XMLTemplaterTransformerCfg.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
+
+#include <QRegularExpression>
+#include <QSet>
+
+namespace {
+
+constexpr long kMissingValueMessage = 370608;
+constexpr long kNotWellFormedMessage = 370708;
+constexpr long kBadNameMessage = 370709;
+constexpr long kNameTwiceMessage = 370710;
+constexpr long kNoTemplateMessage = 370711;
+constexpr long kCircleMessage = 370712;
+
+const QLatin1String kRootTemplate("ROOT_TEMPLATE");
+const QLatin1String kSubTemplates("SUB_TEMPLATES");
+const QLatin1String kTemplateKey("TEMPLATE");
+
+enum Column { kName, kTemplate, kColumns };
+
+// Whether an input may bear the name: it stands bare in statements.
+bool isTag(const QString& name) {
+  static const QRegularExpression tag(QStringLiteral("^[A-Za-z][A-Za-z0-9_]*$"));
+  return tag.match(name).hasMatch();
+}
+
+TemplateText::Language languageOf(bool isJson) {
+  return isJson ? TemplateText::Language::Json : TemplateText::Language::Xml;
+}
+
+bool refuse(QString& message, long number, const QString& argument) {
+  message = TransformResString(number, argument);
+  return false;
+}
+
+// The name of a template that asks for itself, by way of others or not; empty when there is none.
+QString findCircle(const QHash<QString, QStringList>& inserted, const QStringList& names) {
+  // What asks for nothing, or only for what has been taken away, is taken away.
+  QHash<QString, QStringList> askers;
+  QHash<QString, int> open;
+  for (const QString& name : names) {
+    for (const QString& other : inserted.value(name)) {
+      askers[other].append(name);
+      ++open[name];
+    }
+  }
+  QStringList done;
+  for (const QString& name : names) {
+    if (open.value(name) == 0) {
+      done.append(name);
+    }
+  }
+  for (int i = 0; i < done.size(); ++i) {
+    for (const QString& asker : askers.value(done[i])) {
+      if (--open[asker] == 0) {
+        done.append(asker);
+      }
+    }
+  }
+  // From one that is left on, every step leads to another that is left, until one comes again.
+  for (const QString& name : names) {
+    if (open.value(name) == 0) {
+      continue;
+    }
+    QSet<QString> seen;
+    QString current = name;
+    while (!seen.contains(current)) {
+      seen.insert(current);
+      const QStringList next = inserted.value(current);
+      const auto left =
+          std::find_if(next.begin(), next.end(), [&](const QString& other) { return open.value(other) > 0; });
+      if (left == next.end()) {
+        return QString();
+      }
+      current = *left;
+    }
+    return current;
+  }
+  return QString();
+}
+
+}  // namespace
+
+TransformerCfg* XMLTemplaterTransformerCfg::getCopy() const {
+  auto copy = std::make_unique<XMLTemplaterTransformerCfg>(m_isJson);
+  copy->assign(this);
+  return copy.release();
+}
+
+void XMLTemplaterTransformerCfg::getInputTags(QStringList& tags, QHash<QString, QString>* shownNames) const {
+  TransformerCfg::getInputTags(tags, shownNames);
+  const ParameterTable templates(*this, kSubTemplates, kColumns, UnpackLevel::Resolved);
+  for (int row = 0; row < templates.rowCount(); ++row) {
+    const QString name = templates.cell(row, kName);
+    if (isTag(name)) {
+      tags.append(name);
+    }
+  }
+  tags.removeDuplicates();
+}
+
+bool XMLTemplaterTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
+  return TransformerCfg::validateParameter(parameter, message) &&
+         (parameter != kRootTemplate || validateRoot(message)) &&
+         (parameter != kSubTemplates || validateSubTemplates(message));
+}
+
+bool XMLTemplaterTransformerCfg::validateRoot(QString& message) const {
+  const QString value = getParameterValue(kRootTemplate, UnpackLevel::Resolved);
+  if (value.isEmpty() || value == kUnusedValue || value.startsWith(kConditionalPrefix)) {
+    return true;
+  }
+  const TemplateText text(value, languageOf(m_isJson));
+  int line = 0;
+  if (!text.isWellFormed(TemplateText::Extent::Document, line)) {
+    return refuse(message, kNotWellFormedMessage, QString::number(line));
+  }
+  QSet<QString> known;
+  const ParameterTable templates(*this, kSubTemplates, kColumns, UnpackLevel::Resolved);
+  for (int row = 0; row < templates.rowCount(); ++row) {
+    known.insert(QORXWwjdDecode(templates.cell(row, kName)));
+  }
+  for (const QString& name : text.insertedTemplates()) {
+    if (!known.contains(name)) {
+      return refuse(message, kNoTemplateMessage, name);
+    }
+  }
+  return true;
+}
+
+bool XMLTemplaterTransformerCfg::validateSubTemplates(QString& message) const {
+  const ParameterTable templates(*this, kSubTemplates, kColumns, UnpackLevel::Resolved);
+  QStringList taken;
+  TransformerCfg::getInputTags(taken);
+  QSet<QString> known(taken.begin(), taken.end());
+  QStringList names;
+  QHash<QString, QStringList> inserted;
+  for (int row = 0; row < templates.rowCount(); ++row) {
+    const QString name = QORXWwjdDecode(templates.cell(row, kName));
+    if (!isTag(name)) {
+      return refuse(message, kBadNameMessage, name);
+    }
+    if (known.contains(name)) {
+      return refuse(message, kNameTwiceMessage, name);
+    }
+    if (templates.cell(row, kTemplate).isEmpty()) {
+      return refuse(message, kMissingValueMessage, templates.prompt(kTemplate));
+    }
+    known.insert(name);
+    names.append(name);
+    const TemplateText text(templates.cell(row, kTemplate), languageOf(m_isJson));
+    int line = 0;
+    if (!text.isWellFormed(TemplateText::Extent::Fragment, line)) {
+      message = name + QLatin1String(": ") + TransformResString(kNotWellFormedMessage, QString::number(line));
+      return false;
+    }
+    inserted.insert(name, text.insertedTemplates());
+  }
+  for (const QString& name : std::as_const(names)) {
+    for (const QString& other : inserted.value(name)) {
+      if (!inserted.contains(other)) {
+        return refuse(message, kNoTemplateMessage, other);
+      }
+    }
+  }
+  const QString circle = findCircle(inserted, names);
+  return circle.isEmpty() || refuse(message, kCircleMessage, circle);
+}
+
+bool XMLTemplaterTransformerCfg::doInstantiate(MFBuffer& buffer, bool inlineFlag) {
+  const TransformParamCfg* record = getParameterByMacroName(kSubTemplates);
+  const ParameterTable templates(record, stripBasicStringInfo(getParameterValue(kSubTemplates)), kColumns);
+  if (!TransformerCfg::doInstantiate(buffer, inlineFlag)) {
+    return false;
+  }
+  for (int row = 0; row < templates.rowCount(); ++row) {
+    if (!writeFactoryOption(*this, kTemplateKey,
+                            templates.cell(row, kName) + QLatin1Char(' ') +
+                                quotifyStringForMF(templates.cell(row, kTemplate)),
+                            buffer)) {
+      return false;
+    }
+  }
+  return true;
+}
