@@ -27,6 +27,8 @@ TEST(Factory, TheTableGivesEachTransformerItsClass) {
       {"XMLTemplater", 1, "XMLTemplaterTransformerCfg"},
       {"JSONTemplater", 1, "XMLTemplaterTransformerCfg"},
       {"JsonTemplater", 1, ""},
+      {"XMLUpdater", 1, "XMLUpdaterTransformerCfg"},
+      {"JSONUpdater", 1, "XMLUpdaterTransformerCfg"},
       {"parameterfetcher", 3, ""},
       {"ParameterFetcher ", 3, ""},
       {"", 0, ""},

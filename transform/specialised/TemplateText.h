@@ -11,6 +11,7 @@ class TemplateText {
   // A whole document has one root; a fragment is what may stand inside another text.
   enum class Extent { Document, Fragment };
 
+  static Language languageOf(bool isJson) { return isJson ? Language::Json : Language::Xml; }
   // `encoded` is as parameters store it.
   TemplateText(const QString& encoded, Language language);
 

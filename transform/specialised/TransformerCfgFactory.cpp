@@ -6,6 +6,7 @@
 #include <transform/specialised/TransformerCfgFactory.h>
 #include <transform/specialised/ValueMapperTransformerCfg.h>
 #include <transform/specialised/XMLTemplaterTransformerCfg.h>
+#include <transform/specialised/XMLUpdaterTransformerCfg.h>
 
 namespace {
 
@@ -47,6 +48,10 @@ const std::vector<TransformerCfgRule>& transformerCfgRules() {
        makeXml<XMLTemplaterTransformerCfg>},
       {QLatin1String("JSONTemplater"), kLowest, kHighest, QLatin1String("XMLTemplaterTransformerCfg"),
        makeJson<XMLTemplaterTransformerCfg>},
+      {QLatin1String("XMLUpdater"), kLowest, kHighest, QLatin1String("XMLUpdaterTransformerCfg"),
+       makeXml<XMLUpdaterTransformerCfg>},
+      {QLatin1String("JSONUpdater"), kLowest, kHighest, QLatin1String("XMLUpdaterTransformerCfg"),
+       makeJson<XMLUpdaterTransformerCfg>},
   };
   return rules;
 }

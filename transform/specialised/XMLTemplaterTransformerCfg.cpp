@@ -31,10 +31,6 @@ bool isTag(const QString& name) {
   return tag.match(name).hasMatch();
 }
 
-TemplateText::Language languageOf(bool isJson) {
-  return isJson ? TemplateText::Language::Json : TemplateText::Language::Xml;
-}
-
 bool refuse(QString& message, long number, const QString& argument) {
   message = TransformResString(number, argument);
   return false;
@@ -117,7 +113,7 @@ bool XMLTemplaterTransformerCfg::validateRoot(QString& message) const {
   if (value.isEmpty() || value == kUnusedValue || value.startsWith(kConditionalPrefix)) {
     return true;
   }
-  const TemplateText text(value, languageOf(m_isJson));
+  const TemplateText text(value, TemplateText::languageOf(m_isJson));
   int line = 0;
   if (!text.isWellFormed(TemplateText::Extent::Document, line)) {
     return refuse(message, kNotWellFormedMessage, QString::number(line));
@@ -155,7 +151,7 @@ bool XMLTemplaterTransformerCfg::validateSubTemplates(QString& message) const {
     }
     known.insert(name);
     names.append(name);
-    const TemplateText text(templates.cell(row, kTemplate), languageOf(m_isJson));
+    const TemplateText text(templates.cell(row, kTemplate), TemplateText::languageOf(m_isJson));
     int line = 0;
     if (!text.isWellFormed(TemplateText::Extent::Fragment, line)) {
       message = name + QLatin1String(": ") + TransformResString(kNotWellFormedMessage, QString::number(line));

@@ -1,0 +1,150 @@
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/ExpressionWriter.h>
+#include <transform/core/Keywords.h>
+#include <transform/specialised/ParameterTable.h>
+#include <transform/specialised/TemplateText.h>
+#include <transform/specialised/XMLUpdaterTransformerCfg.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
+
+namespace {
+
+constexpr long kMissingValueMessage = 370608;
+constexpr long kNotWellFormedMessage = 370708;
+constexpr long kBadPathMessage = 370713;
+constexpr long kInRowMessage = 370714;
+
+const QLatin1String kDocument("DOCUMENT");
+const QLatin1String kUpdates("UPDATES");
+const QLatin1String kRemove("REMOVE");
+const QLatin1String kTextKind("TEXT");
+const QLatin1String kJsonRoot("$");
+
+enum Column { kPath, kAction, kValue, kKind, kColumns };
+
+// Only the feature or the mapping file tells what it is.
+bool isOpen(const QString& value) {
+  return ExpressionWriter::holdsReference(value) || value.contains(kMacroOpen) ||
+         value.contains(kDeferredOpen) || value.startsWith(kConditionalPrefix);
+}
+
+// Steps joined by "/", or by "." in JSON, with conditions in square brackets. In JSON a step may be a bracket
+// alone.
+bool isPath(const QString& path, bool isJson) {
+  const QLatin1Char separator(isJson ? '.' : '/');
+  int depth = 0;
+  int stepLength = 0;
+  QChar quote;
+  for (const QChar c : path) {
+    ++stepLength;
+    if (!quote.isNull()) {
+      quote = c == quote ? QChar() : quote;
+    } else if (depth > 0 && (c == QLatin1Char('"') || c == QLatin1Char('\''))) {
+      quote = c;
+    } else if (c == QLatin1Char('[')) {
+      if (stepLength == 1 && !isJson) {
+        return false;
+      }
+      ++depth;
+    } else if (c == QLatin1Char(']')) {
+      if (--depth < 0) {
+        return false;
+      }
+    } else if (depth == 0 && c == separator) {
+      if (stepLength == 1 && isJson) {
+        return false;
+      }
+      stepLength = 0;
+    } else if (depth == 0 && c.isSpace()) {
+      return false;
+    }
+  }
+  return depth == 0 && stepLength > 0 && !path.contains(QLatin1String("///"));
+}
+
+// In JSON "$" stands for the root, which every path begins at.
+QString fromRoot(const QString& encodedPath, bool isJson) {
+  QString path = QORXWwjdDecode(encodedPath).trimmed();
+  if (isJson && path.startsWith(kJsonRoot)) {
+    const bool hasSteps = path.size() > 1;
+    path.remove(0, hasSteps && path.at(1) == QLatin1Char('.')   ? 2
+                   : hasSteps && path.at(1) == QLatin1Char('[') ? 1
+                                                                : 0);
+  }
+  return path;
+}
+
+}  // namespace
+
+TransformerCfg* XMLUpdaterTransformerCfg::getCopy() const {
+  auto copy = std::make_unique<XMLUpdaterTransformerCfg>(m_isJson);
+  copy->assign(this);
+  return copy.release();
+}
+
+bool XMLUpdaterTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
+  return TransformerCfg::validateParameter(parameter, message) &&
+         (parameter != kDocument || validateDocument(message)) &&
+         (parameter != kUpdates || validateUpdates(message));
+}
+
+bool XMLUpdaterTransformerCfg::validateDocument(QString& message) const {
+  const QString value = getParameterValue(kDocument, UnpackLevel::Resolved);
+  int line = 0;
+  if (value.isEmpty() || value == kUnusedValue || isOpen(value) ||
+      TemplateText(value, TemplateText::languageOf(m_isJson))
+          .isWellFormed(TemplateText::Extent::Document, line)) {
+    return true;
+  }
+  message = TransformResString(kNotWellFormedMessage, QString::number(line));
+  return false;
+}
+
+bool XMLUpdaterTransformerCfg::validateUpdates(QString& message) const {
+  const ParameterTable updates(*this, kUpdates, kColumns, UnpackLevel::Resolved);
+  for (int row = 0; row < updates.rowCount(); ++row) {
+    const auto refuse = [&](long number, const QString& argument) {
+      message = TransformResString(
+          kInRowMessage, QStringList{QString::number(row + 1), TransformResString(number, argument)});
+      return false;
+    };
+    const QString path = updates.cell(row, kPath);
+    if (!isOpen(path) && !isPath(fromRoot(path, m_isJson), m_isJson)) {
+      return refuse(kBadPathMessage, QORXWwjdDecode(path));
+    }
+    if (updates.cell(row, kAction) == kRemove) {
+      continue;
+    }
+    const QString value = updates.cell(row, kValue);
+    if (value.isEmpty()) {
+      return refuse(kMissingValueMessage, updates.prompt(kValue));
+    }
+    int line = 0;
+    if (updates.cell(row, kKind) != kTextKind && !value.startsWith(kConditionalPrefix) &&
+        !TemplateText(value, TemplateText::languageOf(m_isJson))
+             .isWellFormed(TemplateText::Extent::Fragment, line)) {
+      return refuse(kNotWellFormedMessage, QString::number(line));
+    }
+  }
+  return true;
+}
+
+QString XMLUpdaterTransformerCfg::getParameterValueForMappingFile(const QString& name,
+                                                                  const TransformParamCfg* parameter,
+                                                                  MFBuffer& buffer) const {
+  const TransformParamCfg* record = parameter ? parameter : getParameterByMacroName(name);
+  ParameterTable updates(record, stripBasicStringInfo(getParameterValue(name)), kColumns);
+  if (name != kUpdates || !updates.isValid()) {
+    return TransformerCfg::getParameterValueForMappingFile(name, parameter, buffer);
+  }
+  for (int row = 0; row < updates.rowCount(); ++row) {
+    const QString path = updates.cell(row, kPath);
+    if (!isOpen(path)) {
+      updates.setCell(row, kPath, QORXWwjdEncode(fromRoot(path, m_isJson)));
+    }
+    if (updates.cell(row, kAction) == kRemove) {
+      updates.setCell(row, kValue, QString());
+    }
+  }
+  return textForMappingFile(updates.packed(), name, record, buffer);
+}
