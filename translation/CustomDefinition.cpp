@@ -14,6 +14,7 @@
 #include <transform/custom/SubDocNetworkObjOutput.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
 #include <translation/CustomDefinition.h>
 #include <translation/FlowNames.h>
@@ -270,7 +271,7 @@ QByteArray CustomDefinition::makeBody(Diagnostics& diagnostics) {
       if (flows.isEmpty())
         continue;
       const QString port = isOutput ? node->name() : m_network.getLoopOutput();
-      writeRoute(buffer, innerName(node->name()) + QLatin1String(" Collector"), flows, innerName(port), {});
+      writeRoute(buffer, innerName(node->name()) + kCollectorName, flows, innerName(port), {});
     }
   }
   while (text.endsWith('\n'))

@@ -298,7 +298,7 @@ void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer) const {
       const QString type = quotifyStringForMF(place.name);
       const QString shownFlow = quotifyStringForMF(flow);
       writeStatement(
-          buffer, QLatin1String(isReader ? "READER_FEATURE_TYPE " : "WRITER_FEATURE_TYPE ") +
+          buffer, (isReader ? kReaderTypeStatement : kWriterTypeStatement) + QLatin1Char(' ') +
                       quotifyStringForMF(place.keyword) + QLatin1Char(' ') +
                       (isReader ? type + QLatin1Char(' ') + shownFlow : shownFlow + QLatin1Char(' ') + type));
     }
@@ -319,7 +319,7 @@ void MappingFileWriter::writeWriterRoutes(MFBuffer& buffer) const {
       const WorkspaceLink& link = m_workspace.links[at(number)];
       flows.append(flowOf(link.source, link.output));
     }
-    writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + QLatin1String(" Output Renamer/Nuker"),
-               flows, m_flows[node].value(QString()), {});
+    writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + kOutputRenamerName, flows,
+               m_flows[node].value(QString()), {});
   }
 }

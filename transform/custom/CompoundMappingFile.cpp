@@ -21,8 +21,8 @@ namespace {
 constexpr unsigned kInstanceMacros = 2048;
 const QLatin1String kSetterAttributeType("STRING_OR_ATTR_ENCODED");
 
-QString factoryName(const QString& id, const QString& tag, const char* role) {
-  return QLatin1String("  FACTORY_NAME \"") + id + QLatin1Char(' ') + tag + QLatin1String(role) +
+QString factoryName(const QString& id, const QString& tag, QLatin1String role) {
+  return QLatin1String("  FACTORY_NAME \"") + id + QLatin1Char(' ') + tag + role +
          QLatin1Char('"');
 }
 
@@ -103,7 +103,7 @@ CompoundTransformerCfg::Statements CompoundTransformerCfg::inputCollectors() con
     const QStringList featureTypes = getInputFeatureTypes(tag);
     if (featureTypes.isEmpty())
       continue;
-    QStringList lines{QString(kTeeFactoryStatement), factoryName(id, tag, " Input Collector")};
+    QStringList lines{QString(kTeeFactoryStatement), factoryName(id, tag, kInputCollectorName)};
     for (const QString& featureType : featureTypes)
       lines.append(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(featureType));
     lines.append(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag));
@@ -119,7 +119,7 @@ CompoundTransformerCfg::Statements CompoundTransformerCfg::outputRenamers() cons
   Statements statements;
   for (const QString& tag : qAsConst(tags)) {
     QStringList lines{
-        QString(kTeeFactoryStatement), factoryName(id, tag, " Output Renamer/Nuker"),
+        QString(kTeeFactoryStatement), factoryName(id, tag, kOutputRenamerName),
         QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag)};
     QString featureType;
     getOutputFeatureType(tag, featureType);

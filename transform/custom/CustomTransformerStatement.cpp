@@ -4,6 +4,7 @@
 #include <transform/custom/CustomTransformerStatement.h>
 #include <transform/custom/InstancePrototype.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {
@@ -81,8 +82,7 @@ void writeCustomTransformerStatement(MFBuffer& buffer, const CompoundTransformer
     writeLoopFactory(buffer, network, instance);
   } else {
     const bool isBuiltIn = instance.transformerType() == TransformerCfg::kBuiltIn;
-    buffer.add(QLatin1String(isBuiltIn ? "INCLUDE_BUILTIN_CUSTOM_TRANSFORMER_VER "
-                                       : "INCLUDE_CUSTOM_TRANSFORMER_VER ") +
+    buffer.add((isBuiltIn ? kIncludeBuiltInStatement : kIncludeCustomStatement) + QLatin1Char(' ') +
                network.getName() + QLatin1Char(':') + QString::number(network.getVersion()));
   }
   buffer.flush();

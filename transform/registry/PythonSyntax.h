@@ -1,6 +1,8 @@
 // Has Python compile scripts without running them: one interpreter for all that were given.
 #pragma once
 
+#include <platform/Export.h>
+
 #include <QString>
 #include <QStringList>
 
@@ -12,7 +14,7 @@ struct PythonFault {
   QString text;
 };
 
-class PythonSyntax {
+class ORX_EXPORT PythonSyntax {
  public:
   // False when there is no interpreter, or it did not answer in time: errorString() then tells why and no
   // script counts as checked.

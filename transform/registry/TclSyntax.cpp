@@ -26,11 +26,14 @@ class Parser {
     const auto brackets =
         std::count_if(script.begin(), script.end(), [](char c) { return c == '[' || c == '(' || c == '"'; });
     if (brackets > kMostBrackets) {
-      m_fault = {1, QStringLiteral("holds more brackets than can be checked")};
+      m_fault = {1, 0, QStringLiteral("holds more brackets than can be checked")};
       return;
     }
-    m_interpreter.reset(Tcl_CreateInterp());
-    parseScript(script.constData(), script.size(), 0);
+    // An interpreter is there for its messages alone, and making one takes longer than parsing.
+    if (!parseScript(script.constData(), script.size(), 0)) {
+      m_interpreter.reset(Tcl_CreateInterp());
+      parseScript(script.constData(), script.size(), 0);
+    }
   }
   const TclFault& fault() const { return m_fault; }
 
@@ -43,7 +46,10 @@ class Parser {
 
   bool refuse(const char* at) {
     m_fault.line = 1 + static_cast<int>(std::count(m_begin, at, '\n'));
-    m_fault.text = QString::fromUtf8(Tcl_GetStringResult(m_interpreter.get()));
+    m_fault.offset = static_cast<int>(at - m_begin);
+    if (m_interpreter) {
+      m_fault.text = QString::fromUtf8(Tcl_GetStringResult(m_interpreter.get()));
+    }
     if (m_fault.text.isEmpty()) {
       m_fault.text = QStringLiteral("cannot be parsed");
     }

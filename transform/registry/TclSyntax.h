@@ -2,12 +2,15 @@
 // the usual control structures, and expressions in braces.
 #pragma once
 
+#include <platform/Export.h>
+
 #include <QString>
 
-// The line, from 1, at which the script cannot be parsed, and why; an empty text when it is sound.
+// Where the script cannot be parsed, and why; an empty text when it is sound.
 struct TclFault {
-  int line = 0;
+  int line = 0;    // from 1
+  int offset = 0;  // of the command, in bytes of UTF-8
   QString text;
 };
 
-TclFault findTclFault(const QString& script);
+ORX_EXPORT TclFault findTclFault(const QString& script);

@@ -1,5 +1,6 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/text/GlobalMacros.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/ScriptBlocks.h>
 #include <transform/text/TextHelpers.h>
 
@@ -172,7 +173,7 @@ QStringList tclBodyLines(const QString& prefix, const QString& encodedCode) {
 
 void getPythonParameterLines(const QString& prefix, const QString& parameterName, const QString& encodedCode,
                              QStringList& lines) {
-  lines << QStringLiteral("INCLUDE PYTHON") << QStringLiteral("def ParamFunc():");
+  lines << kIncludePython << QStringLiteral("def ParamFunc():");
   lines << pythonBodyLines(prefix, encodedCode);
   lines << QStringLiteral("value = ParamFunc()");
   lines << (prefix.isEmpty() ? QStringLiteral("macroName = '") + parameterName + QLatin1Char('\'')
@@ -180,12 +181,12 @@ void getPythonParameterLines(const QString& prefix, const QString& parameterName
                                    QStringLiteral("'] + '_") + parameterName + QLatin1Char('\''));
   lines << QStringLiteral("if value == None:") << QStringLiteral("  return { macroName : '' }")
         << QStringLiteral("else:") << QStringLiteral("  return { macroName : str(value) }")
-        << QStringLiteral("END_INCLUDE");
+        << kIncludeEnd;
 }
 
 void getTclParameterLines(const QString& prefix, const QString& parameterName, const QString& encodedCode,
                           QStringList& lines) {
-  lines << QStringLiteral("INCLUDE TCL") << QStringLiteral("proc ParamFunc {} {")
+  lines << kIncludeTcl << QStringLiteral("proc ParamFunc {} {")
         << QStringLiteral(" upvar ORX_MacroValues ORX_MacroValues");
   lines << tclBodyLines(prefix, encodedCode);
   lines << QStringLiteral("}");
@@ -196,5 +197,5 @@ void getTclParameterLines(const QString& prefix, const QString& parameterName, c
                  parameterName + QLatin1Char('"')
           << QStringLiteral("puts \"MACRO $macroName [ParamFunc]\" ");
   }
-  lines << QStringLiteral("END_INCLUDE");
+  lines << kIncludeEnd;
 }

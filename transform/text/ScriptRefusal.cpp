@@ -1,3 +1,4 @@
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/ScriptRefusal.h>
 
@@ -38,7 +39,7 @@ ScriptRefusal refuseUnwritableLines(const QStringList& codeLines) {
         return {script_refusal::kCharacter, number};
       }
     }
-    if (line.trimmed() == QLatin1String("END_INCLUDE")) {
+    if (line.trimmed() == kIncludeEnd) {
       return {script_refusal::kBlockEnd, number};
     }
   }
