@@ -1,7 +1,9 @@
 // Validation against generation of the same workspaces, in which every tenth transformer refers to an
-// attribute that does not arrive: the time per transformer must not grow with the workspace.
+// attribute that does not arrive, and the checks of the mapping files written: the time per transformer must
+// not grow with the workspace.
 #include <platform/session/session.h>
 #include <transform/registry/TransformerMgr.h>
+#include <translation/MappingFileLint.h>
 #include <translation/WorkspaceTranslation.h>
 #include <translation/WorkspaceValidation.h>
 
@@ -64,7 +66,8 @@ int main() {
   registry.loadTransformers(&session);
   QTemporaryDir folder;
   const QString file = folder.filePath(QStringLiteral("w.orw"));
-  std::printf("transformers   faults   us/transformer validated   generated   ratio\n");
+  const QString written = folder.filePath(QStringLiteral("w.mf"));
+  std::printf("transformers   faults   us/transformer validated   generated   ratio   linted\n");
   for (const int count : {1000, 10000, 100000}) {
     QFile input(file);
     if (!input.open(QIODevice::WriteOnly) || input.write(makeWorkspace(count)) < 0)
@@ -72,6 +75,7 @@ int main() {
     input.close();
     double validated = 0;
     double generated = 0;
+    double linted = 0;
     for (int run = 0; run < (count <= 1000 ? 5 : count <= 10000 ? 2 : 1); ++run) {
       QElapsedTimer timer;
       timer.start();
@@ -84,15 +88,22 @@ int main() {
       Diagnostics diagnostics(file);
       QString error;
       timer.restart();
-      if (translateWorkspace({file, folder.filePath(QStringLiteral("w.mf")), {}}, registry, diagnostics,
-                             error) != TranslationResult::Done)
+      if (translateWorkspace({file, written, {}}, registry, diagnostics, error) != TranslationResult::Done)
         return 1;
       const double generation = static_cast<double>(timer.nsecsElapsed()) / 1000 / count;
+      timer.restart();
+      const MappingFileFindings findings = lintMappingFile(written, written, {});
+      const double lint = static_cast<double>(timer.nsecsElapsed()) / 1000 / count;
+      if (!findings.readError.isEmpty() || !findings.findings.empty()) {
+        std::printf("%zu findings in the mapping file\n", findings.findings.size());
+        return 1;
+      }
       validated = run == 0 ? validation : std::min(validated, validation);
       generated = run == 0 ? generation : std::min(generated, generation);
+      linted = run == 0 ? lint : std::min(linted, lint);
     }
-    std::printf("%12d %8d %26.1f %11.1f %7.2f\n", count, count / 10, validated, generated,
-                validated / generated);
+    std::printf("%12d %8d %26.1f %11.1f %7.2f %8.1f\n", count, count / 10, validated, generated,
+                validated / generated, linted);
   }
   return 0;
 }

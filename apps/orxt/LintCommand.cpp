@@ -1,59 +1,168 @@
 #include <apps/orxt/Console.h>
 #include <apps/orxt/LintCommand.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/NestedNetworks.h>
+#include <transform/files/InputFile.h>
 #include <transform/registry/DefinitionLint.h>
+#include <transform/registry/TransformerMgr.h>
+#include <transform/workspace/VersionStore.h>
+#include <translation/MappingFileLint.h>
 
 #include <CLI/CLI.hpp>
+#include <QDirIterator>
+#include <QFile>
 #include <QFileInfo>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
 
+#include <algorithm>
+#include <tuple>
+
 namespace {
 
 constexpr CommandFacts kFacts = {"lint",
-                                 "Check definition files: grammar, tokens, references, script fragments",
-                                 "orxt lint resources/transformers\norxt lint --json MyTransformer.ort"};
+                                 "Check definition files and mapping files: grammar, references, scripts",
+                                 "orxt lint resources/transformers samples\n"
+                                 "orxt lint --json MyTransformer.ort\n"
+                                 "orxt generate parcels.orw | orxt lint -"};
+
+const QString kMappingFileSuffix = QStringLiteral(".mf");
+const QString kDefinitionFileSuffix = QStringLiteral(".ort");
+// What is read of a file to tell its kind.
+constexpr qint64 kBeginning = 64 * 1024;
+
+bool startsLike(const QByteArray& text, const char* word) {
+  return text.startsWith(word) || text.contains(QByteArray("\n") + word);
+}
+
+bool isDefinitionFile(const QByteArray& beginning) {
+  return startsLike(beginning, "TRANSFORMER_NAME:") || startsLike(beginning, "TEMPLATE_START") ||
+         startsLike(beginning, "CATEGORY_DESCRIPTION_START");
+}
+
+// The name decides, as far as it can. Custom transformers are written as mapping files are.
+bool isMappingFile(const QString& path, const QString& shownName) {
+  if (shownName.endsWith(kMappingFileSuffix))
+    return true;
+  QFile file(path);
+  const QByteArray beginning = file.open(QIODevice::ReadOnly) ? file.read(kBeginning) : QByteArray();
+  if (beginning.startsWith(VersionStore::kFirstLine))
+    return true;
+  const QString name = QFileInfo(shownName).fileName();
+  return !name.endsWith(kDefinitionFileSuffix) && !name.contains(QLatin1String("-localized.")) &&
+         !name.startsWith(QLatin1String("CategoryDefinitions")) && !isDefinitionFile(beginning);
+}
 
 }  // namespace
 
 LintCommand::LintCommand() : Command(kFacts) {}
 
+LintCommand::~LintCommand() = default;
+
 void LintCommand::declare(CLI::App& app) {
-  app.add_option("path", m_paths, "Definition files, or folders of them")->type_name("PATH")->required();
+  app.add_option("path", m_paths, "Definition files, mapping files, or folders of them; - is standard input")
+      ->type_name("PATH")
+      ->required();
   app.add_flag("--json", m_json, "As JSON");
+  m_definitionOptions.declare(app);
 }
 
 ExitStatus LintCommand::run(Console& console) {
-  DefinitionLint lint;
-  bool isUnreadable = false;
+  m_definitionOptions.setLanguage();
+  m_definitions = std::make_unique<DefinitionLint>();
+  bool isReadable = true;
   for (const std::string& text : m_paths) {
     const QString path = QString::fromStdString(text);
-    if (!QFileInfo::exists(path)) {
-      console.failFile(path, QStringLiteral("no such file or folder"));
-      isUnreadable = true;
-      continue;
-    }
-    lint.checkPath(path);
+    const bool isRead = QFileInfo(path).isDir() ? checkFolder(path, console) : checkFile(path, console);
+    isReadable = isRead && isReadable;
   }
-  bool hasErrors = false;
+  takeDefinitionFindings();
+  show(console);
+  if (!isReadable)
+    return kExitFile;
+  const bool hasErrors = std::any_of(m_findings.begin(), m_findings.end(), [](const Finding& finding) {
+    return finding.severity == Severity::Error;
+  });
+  return hasErrors ? kExitRefused : kExitDone;
+}
+
+bool LintCommand::checkFolder(const QString& folder, Console& console) {
+  m_definitions->checkPath(folder);
+  QStringList paths;
+  QDirIterator entries(QDir::cleanPath(folder),
+                       {QLatin1Char('*') + kMappingFileSuffix, QLatin1Char('*') + kDefinitionFileSuffix},
+                       QDir::Files, QDirIterator::Subdirectories);
+  while (entries.hasNext())
+    paths.append(entries.next());
+  paths.sort();
+  bool isReadable = true;
+  for (const QString& path : qAsConst(paths)) {
+    if (isMappingFile(path, path))
+      isReadable = checkMappingFile(path, path, console) && isReadable;
+  }
+  return isReadable;
+}
+
+bool LintCommand::checkFile(const QString& path, Console& console) {
+  auto input = std::make_unique<InputFile>(path);
+  const QString shownName = InputFile::shownName(path);
+  if (!input->open()) {
+    console.failFile(shownName, input->errorString());
+    return false;
+  }
+  const QString readable = input->path();
+  if (isMappingFile(readable, shownName))
+    return checkMappingFile(readable, shownName, console);
+  m_definitions->checkPath(readable);
+  if (input->isCopy()) {
+    m_shownNames.insert(readable, shownName);
+    m_copies.push_back(std::move(input));
+  }
+  return true;
+}
+
+bool LintCommand::checkMappingFile(const QString& path, const QString& shownName, Console& console) {
+  const QString real = QFileInfo(path).canonicalFilePath();
+  if (m_checked.contains(real))
+    return true;
+  m_checked.insert(real);
+  const MappingFileFindings result = lintMappingFile(path, shownName, [&](const QString& name, int version) {
+    return isCustomTransformer(m_definitionOptions.load(console).makeTransformer(name, version).get());
+  });
+  for (const Diagnostic& finding : result.findings) {
+    m_findings.push_back({finding.file, finding.line, finding.severity,
+                          QString(diagnosticRule(finding.rule).name), finding.text});
+  }
+  if (!result.readError.isEmpty())
+    console.failFile(shownName, result.readError);
+  return result.readError.isEmpty();
+}
+
+void LintCommand::takeDefinitionFindings() {
+  for (const LintFinding& finding : m_definitions->findings()) {
+    m_findings.push_back({m_shownNames.value(finding.file, finding.file), finding.line,
+                          finding.isError ? Severity::Error : Severity::Warning, finding.rule, finding.text});
+  }
+  std::stable_sort(m_findings.begin(), m_findings.end(), [](const Finding& a, const Finding& b) {
+    return std::tie(a.file, a.line) < std::tie(b.file, b.line);
+  });
+}
+
+void LintCommand::show(Console& console) const {
   QJsonArray list;
-  for (const LintFinding& finding : lint.findings()) {
-    hasErrors = hasErrors || finding.isError;
-    const QString severity = severityName(finding.isError ? Severity::Error : Severity::Warning);
+  for (const Finding& finding : m_findings) {
     if (m_json) {
       list.append(QJsonObject{{QStringLiteral("file"), finding.file},
                               {QStringLiteral("line"), finding.line},
-                              {QStringLiteral("severity"), severity},
+                              {QStringLiteral("severity"), severityName(finding.severity)},
                               {QStringLiteral("rule"), finding.rule},
                               {QStringLiteral("text"), finding.text}});
     } else {
-      console.showFinding(finding.file, finding.line, finding.isError ? Severity::Error : Severity::Warning,
+      console.showFinding(finding.file, finding.line, finding.severity,
                           finding.text + QLatin1String(" [") + finding.rule + QLatin1Char(']'));
     }
   }
   if (m_json)
     console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
-  if (isUnreadable)
-    return kExitFile;
-  return hasErrors ? kExitRefused : kExitDone;
 }

@@ -2,17 +2,48 @@
 
 #include <apps/orxt/Command.h>
 #include <apps/orxt/DefinitionOptions.h>
+#include <translation/Diagnostics.h>
 
+#include <QHash>
+#include <QSet>
+#include <QString>
+
+#include <memory>
 #include <string>
 #include <vector>
+
+class DefinitionLint;
+class InputFile;
 
 class LintCommand : public Command {
  public:
   LintCommand();
+  ~LintCommand() override;
   void declare(CLI::App& app) override;
   ExitStatus run(Console& console) override;
 
  private:
+  struct Finding {
+    QString file;
+    int line;
+    Severity severity;
+    QString rule;
+    QString text;
+  };
+
+  // Each is false when something cannot be read.
+  bool checkFolder(const QString& folder, Console& console);
+  bool checkFile(const QString& path, Console& console);
+  bool checkMappingFile(const QString& path, const QString& shownName, Console& console);
+  void takeDefinitionFindings();
+  void show(Console& console) const;
+
   std::vector<std::string> m_paths;
   bool m_json = false;
+  DefinitionOptions m_definitionOptions;
+  std::unique_ptr<DefinitionLint> m_definitions;
+  std::vector<std::unique_ptr<InputFile>> m_copies;  // of streams that hold definitions
+  QHash<QString, QString> m_shownNames;              // of those copies
+  QSet<QString> m_checked;                           // mapping files, by their canonical paths
+  std::vector<Finding> m_findings;
 };

@@ -1,6 +1,6 @@
 // Validation as a person runs it: broken workspaces against what is to be said about them, sound ones
 // against silence, and the forms for programs.
-#include <tests/cli/OrxtProcess.h>
+#include <tests/cli/BrokenFiles.h>
 #include <tests/support/QtPrinters.h>
 
 #include <QJsonArray>
@@ -11,29 +11,12 @@
 
 namespace {
 
-QString brokenFolder() {
-  return QStringLiteral(ORX_SOURCE_DIR) + "/tests/data/broken";
-}
-
 Outcome validateBroken(const QStringList& arguments) {
   return orxt(QStringList{"validate", "--resources", "definitions"} + arguments, brokenFolder());
 }
 
-// scripts/renew-expectations writes the expectations.
 TEST(Validate, SaysWhatIsWrongWithBrokenWorkspaces) {
-  qputenv("XDG_DATA_HOME", "/nowhere");
-  const QStringList names = QDir(brokenFolder()).entryList({"*.orw"});
-  ASSERT_GE(names.size(), 12);
-  for (const QString& name : names) {
-    const QByteArray before = readAll(brokenFolder() + "/" + name);
-    const Outcome run = validateBroken({"--lang", "en", name});
-    QString said = run.err;
-    said.append(run.out).replace(ORX_SOURCE_DIR, "SOURCE");
-    EXPECT_EQ(said + QString("exit status %1\n").arg(run.status),
-              QString::fromUtf8(readAll(brokenFolder() + "/" + name.chopped(4) + ".expected")))
-        << name.toStdString();
-    EXPECT_EQ(readAll(brokenFolder() + "/" + name), before) << name.toStdString();
-  }
+  expectSaidOfBroken("validate", brokenFolder(), ".orw", 12);
 }
 
 TEST(Validate, FindsNothingWrongWithTheSamples) {

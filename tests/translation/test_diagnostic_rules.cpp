@@ -18,7 +18,7 @@ TEST(DiagnosticRules, AreDescribedInTheirOrder) {
   const QStringList sections = QString::fromUtf8(file.readAll()).split("\n## ").mid(1);
   ASSERT_EQ(sections.size(), static_cast<int>(diagnosticRules().size()));
   static const QRegularExpression kForm(
-      "^([a-z-]+)\n\nSeverity: ([a-z]+)\n\n> ([^\n]+)\n\nMeaning: [^\n].{15,}\n\nRemedy: [^\n].{10,}$",
+      "^([a-z0-9-]+)\n\nSeverity: ([a-z]+)\n\n> ([^\n]+)\n\nMeaning: [^\n].{15,}\n\nRemedy: [^\n].{10,}$",
       QRegularExpression::DotMatchesEverythingOption);
   for (int i = 0; i < sections.size(); ++i) {
     const DiagnosticRule& rule = diagnosticRules()[static_cast<std::size_t>(i)];

@@ -1,0 +1,40 @@
+#include <translation/MappingFileLint.h>
+#include <translation/MappingFileReader.h>
+#include <translation/MappingFileReport.h>
+#include <translation/MappingFileStatements.h>
+
+#include <algorithm>
+
+MappingFileFindings lintMappingFile(const QString& path, const QString& shownName,
+                                    const CustomTransformerLookup& isInstalled) {
+  Diagnostics diagnostics(shownName);
+  MappingFileReport report(diagnostics);
+  MappingFileReader reader(path, report);
+  if (!reader.open())
+    return {reader.errorString(), {}};
+  MappingFileStatements statements(report);
+  for (MappingFileReader::Item item = reader.next(); item != MappingFileReader::Item::End;
+       item = reader.next()) {
+    switch (item) {
+      case MappingFileReader::Item::Statement:
+        statements.check(reader.statement());
+        break;
+      case MappingFileReader::Item::ScriptLine:
+        statements.addScriptLine(reader.statement());
+        break;
+      case MappingFileReader::Item::BlockBegin:
+        statements.beginBlock(reader.statement());
+        break;
+      case MappingFileReader::Item::BlockEnd:
+        statements.endBlock();
+        break;
+      case MappingFileReader::Item::End:
+        break;
+    }
+  }
+  statements.finish(isInstalled);
+  std::vector<Diagnostic> findings = diagnostics.all();
+  std::stable_sort(findings.begin(), findings.end(),
+                   [](const Diagnostic& a, const Diagnostic& b) { return a.line < b.line; });
+  return {reader.errorString(), std::move(findings)};
+}
