@@ -103,6 +103,34 @@ TEST(ConfigSerial, StoredValuesOfEveryTypeComeBack) {
   }
 }
 
+// A class adds keys behind the others, and finds them again; parameters that a value brings come behind it.
+TEST(ConfigSerial, ClassesAddKeysAndParameters) {
+  struct Noted : TransformerCfg {
+    QString serialize() const override {
+      return TransformerCfg::serialize() + QLatin1Char(',') +
+             QORXListToSdfString({qs("NOTE"), note}, QLatin1Char(','));
+    }
+    void deserialize(QHash<QString, QString>& fields) override {
+      TransformerCfg::deserialize(fields);
+      note = fields.value(qs("NOTE"));
+    }
+    QString note;
+  };
+  Noted cfg;
+  Noted restored;
+  for (Noted* each : {&cfg, &restored}) {
+    each->configure(makeDefinition(kParameters));
+    each->setDynparamsParameters({qs("A")});
+  }
+  cfg.note = qs("\"a\",\nNOTE,");
+  cfg.setParameterValue(qs("A"), qs("ROAD,RIVER"), true);
+  QHash<QString, QString> fields = fieldsOf(cfg.serialize());
+  restored.deserialize(fields);
+  EXPECT_EQ(restored.note, cfg.note);
+  EXPECT_EQ(restored.getParameters(), words("A B XFORMER_NAME DYNGROUP_A_1 DYNGROUP_A_2"));
+  EXPECT_EQ(restored.serialize(), cfg.serialize());
+}
+
 TEST(ConfigSerial, ListsAreAppended) {
   TransformerCfg cfg;
   cfg.configure(makeDefinition(kParameters));

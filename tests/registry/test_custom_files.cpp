@@ -5,8 +5,10 @@
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/workspace/VersionStore.h>
 
+#include <QFile>
 #include <gtest/gtest.h>
 
+#include <cstdlib>
 #include <memory>
 
 namespace {
@@ -151,16 +153,93 @@ TEST(CustomTransformerFiles, ARemoteFileTakesThePlaceOfTheDefinition) {
   EXPECT_EQ(after->getFileName(), remote);
 }
 
+// Copies stay usable in whatever order they, the file and the registry's own go.
 TEST(CustomTransformerFiles, InstancesOutliveAReload) {
+  // n: a new copy; c: a copy of the last one; f, l: the first, the last one goes; u: all are used;
+  // r: everything is loaded anew; R: custom transformers are; m: the file takes its own place; d: the file
+  // goes
+  const char* const sequences[] = {"nru",       "nrrufr",    "ncrfurlr",      "ncrlurfr",
+                                   "nrnrflur",  "nRumRufr",  "nmurfr",        "ncdrufur",
+                                   "ndRucrflr", "nnnrfrlru", "nmncdrrufurlu", "nlrncrfrul"};
+  for (const char* sequence : sequences) {
+    SCOPED_TRACE(sequence);
+    RegistryFolders folders;
+    const QString path = customFile(folders, "A.ort", {{2, 1}});
+    TransformerMgr& registry = folders.load();
+    std::vector<Copy> copies;
+    for (const char* step = sequence; *step; ++step) {
+      switch (*step) {
+        case 'n':
+          copies.emplace_back(registry.getTransformer("Cleaner", 2));
+          ASSERT_TRUE(copies.back());
+          break;
+        case 'c':
+          copies.emplace_back(copies.back()->getCopy());
+          break;
+        case 'f':
+          copies.erase(copies.begin());
+          break;
+        case 'l':
+          copies.pop_back();
+          break;
+        case 'r':
+          folders.load();
+          break;
+        case 'R':
+          registry.reloadCustomTransformers();
+          break;
+        case 'm':
+          registry.loadRemoteTransformer(path, 2);
+          break;
+        case 'd':
+          ASSERT_TRUE(QFile::remove(path));
+          break;
+        default:
+          break;
+      }
+      for (std::size_t i = 0; *step == 'u' && i < copies.size(); ++i) {
+        const QString attribute = QString("a%1").arg(i);
+        copies[i]->setInputAttributes("IN", QStringList{attribute});
+        EXPECT_EQ(copies[i]->getOutputAttributes("OUT2"), QStringList{attribute});
+        EXPECT_TRUE(copies[i]->setParameterValue("LIMIT", attribute, true));
+        EXPECT_EQ(Copy(copies[i]->getCopy())->getParameterValue("LIMIT"), attribute);
+      }
+    }
+    EXPECT_TRUE(registry.ignoredTransformers().empty());
+  }
+}
+
+// The last copy goes after the registry.
+TEST(CustomTransformerFiles, InstancesOutliveTheRegistry) {
   RegistryFolders folders;
   customFile(folders, "A.ort", {{2, 1}});
+  EXPECT_EXIT(
+      {
+        static Copy survivor;
+        survivor.reset(folders.load().getTransformer("Cleaner", 2));
+        std::exit(survivor && survivor->getOutputAttributes("OUT2").isEmpty() ? 0 : 1);
+      },
+      testing::ExitedWithCode(0), "");
+}
+
+// A serialised instance finds its file's version again.
+TEST(CustomTransformerFiles, InstancesAreRestored) {
+  RegistryFolders folders;
+  customFile(folders, "A.ort", {{1, 1}, {2, 1}});
   TransformerMgr& registry = folders.load();
-  const Copy copy(registry.getTransformer("Cleaner", 2));
-  ASSERT_TRUE(copy);
-  folders.load();
-  folders.load();
-  copy->setInputAttributes("IN", QStringList{"a"});
-  EXPECT_EQ(copy->getOutputAttributes("OUT2"), QStringList{"a"});
+  for (const int version : {1, 2}) {
+    const Copy copy(registry.getTransformer("Cleaner", version));
+    ASSERT_TRUE(copy);
+    copy->setParameterValue("LIMIT", "a,\"b\"\n", false);
+    copy->addInputFeatureType("IN", "x,\"y\"");
+    copy->setInputAttributes("IN", QStringList{"p,q"});
+    copy->setOutputFeatureType(QString("OUT%1").arg(version), "z");
+    const Copy restored(registry.deserialize(copy->serialize()));
+    ASSERT_TRUE(restored);
+    EXPECT_EQ(restored->serialize(), copy->serialize());
+    EXPECT_EQ(restored->getParameterValue("LIMIT"), "a,\"b\"\n");
+    EXPECT_EQ(restored->getOutputAttributes(QString("OUT%1").arg(version)), QStringList{"p,q"});
+  }
 }
 
 }  // namespace

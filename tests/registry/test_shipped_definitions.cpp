@@ -1,5 +1,6 @@
 #include <platform/qorxcore/qorxcore.h>
-#include <platform/session/ORXSession.h>
+#include <platform/session/session.h>
+#include <tests/support/QtPrinters.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/DefinitionLint.h>
 #include <transform/registry/TransformerMgr.h>
@@ -9,7 +10,9 @@
 #include <QBuffer>
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <memory>
+#include <random>
 
 namespace {
 
@@ -44,11 +47,257 @@ class ShippedDefinitions : public testing::TestWithParam<const char*> {
   void TearDown() override { QORXSetLanguage(m_language); }
   static TransformerMgr& registry() { return TransformerMgr::getTransformerMgr(); }
 
+  // A copy of every version of every definition.
+  static void forEach(const std::function<void(TransformerCfg&)>& ask) {
+    for (const QString& name : registry().transformerNames()) {
+      for (const int version : registry().transformerVersions(name)) {
+        SCOPED_TRACE(name.toStdString() + " version " + std::to_string(version));
+        const std::unique_ptr<TransformerCfg> cfg(registry().getTransformer(name, version));
+        ASSERT_TRUE(cfg);
+        ask(*cfg);
+      }
+    }
+  }
+
   QString m_language;
   ORXSession m_session;
 };
 
+using ShippedInEnglish = ShippedDefinitions;
+
+// Pieces of text that mean something to one of the packed forms, put together at random.
+QString nastyText(std::mt19937& random) {
+  static const QString pieces[] = {",",
+                                   "\"",
+                                   "\"\"",
+                                   "\n",
+                                   "\r",
+                                   " ",
+                                   "\t",
+                                   "&",
+                                   "@Value(",
+                                   "a",
+                                   "{",
+                                   "}",
+                                   "\\",
+                                   "$(A)",
+                                   "$[",
+                                   "%",
+                                   ";",
+                                   "<comma>",
+                                   "=",
+                                   "'",
+                                   "NAME",
+                                   "<Unused>",
+                                   "\u00e4\U0001d11e",
+                                   "<",
+                                   "a,\"b\"",
+                                   "\v"};
+  // Marks count at the beginning alone.
+  QString text(static_cast<int>(random() % 4), QLatin1Char(random() % 2 == 0 ? '&' : ' '));
+  for (std::size_t count = random() % 7; count > 0; --count) {
+    const std::size_t piece = random() % (std::size(pieces) + 2);
+    text +=
+        piece < std::size(pieces) ? pieces[piece] : QString(QChar(piece == std::size(pieces) ? 0 : 0xd800));
+  }
+  return text;
+}
+
 }  // namespace
+
+INSTANTIATE_TEST_SUITE_P(Language, ShippedInEnglish, testing::Values("en"));
+
+// Whatever is set, a restored object and every kind of copy hold the same.
+TEST_P(ShippedInEnglish, HostileValuesSurviveEveryCopy) {
+  std::mt19937 random(20);
+  int values = 0;
+  forEach([&](TransformerCfg& cfg) {
+    QStringList inputs;
+    QStringList outputs;
+    cfg.getInputTags(inputs);
+    cfg.getOutputTags(outputs);
+    for (int round = 0; round < 8; ++round) {
+      for (const QString& name : QStringList(cfg.getParameters())) {
+        // Also through a member, whose value the whole packs once more.
+        const TransformParamCfg* record = cfg.getParameterByMacroName(name);
+        const QStringList macros = record ? record->getMacroNames() : QStringList();
+        const bool isWhole = macros.isEmpty() || random() % 2 == 0;
+        cfg.setParameterValue(isWhole ? name : macros.at(static_cast<int>(random() % macros.size())),
+                              nastyText(random), false);
+        ++values;
+      }
+      for (const QString& tag : inputs) {
+        cfg.addInputFeatureType(tag, nastyText(random));
+        cfg.addInputFilter(tag, nastyText(random));
+        cfg.setInputAttributes(tag, {nastyText(random), nastyText(random)});
+      }
+      for (const QString& tag : outputs) {
+        cfg.setOutputFeatureType(tag, nastyText(random));
+        cfg.setOutputTagFuncs(tag, {nastyText(random), nastyText(random)});
+      }
+      const QString text = cfg.serialize();
+      const std::unique_ptr<TransformerCfg> restored(registry().deserialize(text));
+      const std::unique_ptr<TransformerCfg> copied(cfg.getCopy());
+      const std::unique_ptr<TransformerCfg> assigned(registry().getTransformer(cfg.getName(), -2));
+      const std::unique_ptr<TransformerCfg> filled(
+          registry().getTransformer(cfg.getName(), cfg.getVersion()));
+      ASSERT_TRUE(restored && copied && assigned && filled);
+      assigned->assign(&cfg);
+      filled->copyValues(&cfg);
+      for (const TransformerCfg* other : {restored.get(), copied.get(), assigned.get(), filled.get()}) {
+        ASSERT_EQ(other->getParameters(), cfg.getParameters());
+        for (const QString& name : cfg.getParameters())
+          ASSERT_EQ(other->getParameterValue(name), cfg.getParameterValue(name)) << name.toStdString();
+        ASSERT_EQ(other->getInputAttributes(), cfg.getInputAttributes());
+        ASSERT_EQ(other->serialize(), text) << "round " << round;
+      }
+    }
+  });
+  EXPECT_GT(values, 1000);
+}
+
+// The face for callers without the string library, and what depends on the version alone.
+TEST_P(ShippedInEnglish, OperationsAgree) {
+  forEach([&](TransformerCfg& cfg) {
+    ITransformerCfg& face = cfg;
+    ORXString text;
+    ORXStringArray list;
+    QStringList inputs;
+    QStringList outputs;
+    cfg.getInputTags(inputs);
+    cfg.getOutputTags(outputs);
+    face.getName(text);
+    EXPECT_EQ(ORXToQString(text), cfg.getName());
+    face.getFileName(text);
+    EXPECT_EQ(ORXToQString(text), cfg.getFileName());
+    face.getInputTags(list);
+    EXPECT_EQ(ORXToQStringList(list), inputs);
+    face.getOutputTags(list);
+    EXPECT_EQ(ORXToQStringList(list), outputs);
+    face.getParameters(list);
+    EXPECT_EQ(ORXToQStringList(list), cfg.getParameters());
+    face.getInputTagAliases(list);
+    EXPECT_GE(list.entries(), static_cast<std::size_t>(cfg.getInputTagAliases().size()));
+    for (const QString& tag : inputs) {
+      EXPECT_EQ(face.lookupInputTagAlias(ORXString(tag), text), cfg.getInputTagAliases().contains(tag));
+      face.addInputFeatureType(ORXString(tag), ORXString("type"));
+      face.addInputFilter(ORXString(tag), ORXString("filter"));
+      face.getInputFeatureTypes(ORXString(tag), list);
+      EXPECT_EQ(ORXToQStringList(list), QStringList("type"));
+      cfg.clearInputFeatureType(tag);
+      EXPECT_EQ(cfg.getInputFeatureTypes(tag), QStringList());
+    }
+    face.addInputFeatureType(ORXString("everywhere"));
+    face.addInputFilter(ORXString("everywhere"));
+    EXPECT_EQ(cfg.getTransformFactoryInputLines().isEmpty(), inputs.isEmpty());
+    face.clearInputFeatureTypes();
+    for (const QString& tag : inputs)
+      EXPECT_EQ(cfg.getInputFeatureTypes(tag), QStringList());
+    for (const QString& tag : outputs) {
+      QString featureType;
+      face.setOutputFeatureType(ORXString(tag), ORXString("type"));
+      face.setOutputTagFuncs(ORXString(tag), ORXStringArray(QStringList("function")));
+      EXPECT_TRUE(face.getOutputFeatureType(ORXString(tag), text) &&
+                  cfg.getOutputFeatureType(tag, featureType));
+      EXPECT_EQ(featureType, "type");
+      EXPECT_EQ(cfg.getOutputTagFuncs(tag), QStringList("function"));
+    }
+    face.setIdentifier(ORXString("name"));
+    EXPECT_EQ(cfg.getIdentifier(), "name");
+    EXPECT_FALSE(face.setParameterValue(ORXString("NO_SUCH"), ORXString("x"), true));
+    EXPECT_TRUE(face.setParameterValue(ORXString("XFORMER_NAME"), ORXString("other"), true));
+    EXPECT_EQ(cfg.getIdentifier(), "other");
+    face.turnOffMultiProcessing();
+    EXPECT_EQ(face.platformSupported(), cfg.platformSupported());
+    ORXStringArray readers;
+    ORXStringArray writers;
+    face.getUsedComponents(readers, writers, list, true);
+    EXPECT_EQ(ORXToQStringList(list), QStringList(cfg.getName()));
+    EXPECT_EQ(readers.entries() + writers.entries(), 0u);
+    MemoryBuffer buffer;
+    EXPECT_TRUE(face.instantiate(&buffer, ORXString("document"), true));
+
+    EXPECT_FALSE(cfg.getIsEmbeddable() || cfg.isDefinitionDeletable());
+    EXPECT_EQ(cfg.getLinkedVersion(), nullptr);
+    EXPECT_EQ(cfg.getTransformerFile() + cfg.getGUID(), QString());
+    EXPECT_EQ(cfg.getRequiresVisualizerLauncher(), cfg.getName() == "Inspector");
+    EXPECT_TRUE(cfg.getIsDefinitionValid());
+    EXPECT_EQ(cfg.getInsertMode(), 0);
+    EXPECT_EQ(cfg.attributeConnectionStatus(inputs.value(0), "a", true, cfg.getOrxSession()), 0);
+    EXPECT_TRUE(cfg.getUsesTransformer(cfg.getName(), nullptr));
+    EXPECT_FALSE(cfg.getUsesTransformer("NoSuchThing", nullptr));
+    EXPECT_EQ(cfg.getVisualName().isEmpty(), false);
+    EXPECT_EQ(cfg.getIsBlocking(), cfg.featureHolding() > 1);
+    EXPECT_FALSE(cfg.getIsAsynchronous() && inputs.isEmpty());
+    EXPECT_TRUE(cfg.getHiddenInputTag().isEmpty() || !inputs.contains(cfg.getHiddenInputTag()));
+    EXPECT_TRUE(cfg.getHiddenOutputTag().isEmpty() || !outputs.contains(cfg.getHiddenOutputTag()));
+    EXPECT_EQ(cfg.getDynamicInputTags().removeDuplicates(), 0);
+
+    cfg.beginEditParms();
+    for (const QString& name : cfg.getParameters()) {
+      QString message;
+      EXPECT_TRUE(cfg.validateParameter(name, message) || !message.isEmpty()) << name.toStdString();
+      EXPECT_TRUE(cfg.applyParameterValue(name, cfg.getParameterValue(name)));
+      QStringList missing;
+      bool hasReferences = true;
+      cfg.getMissingAttributeReferences(name, missing, hasReferences);
+      EXPECT_EQ(hasReferences, !cfg.getAttributeNamesInValue(name).isEmpty()) << name.toStdString();
+      EXPECT_EQ(cfg.getSupportedValueTypes(name).contains("EXPRESSION"),
+                cfg.canEditParm(name) && cfg.parameterSupportsAttributeReference(name))
+          << name.toStdString();
+      EXPECT_TRUE(cfg.canEditParm(name) || !cfg.canCreateGlobalParameter(name)) << name.toStdString();
+      EXPECT_TRUE(cfg.supportsInspect(name) || cfg.inspectParameters(name).isEmpty());
+      EXPECT_TRUE(cfg.supportsOpenFolder(name) || cfg.openFolderParameters(name).isEmpty());
+      EXPECT_FALSE(
+          cfg.getParameterValueForMappingFile(name, cfg.getParameterByMacroName(name), buffer).contains('\n'))
+          << name.toStdString();
+      cfg.parmValueAffectsOutputAttrs(name);
+    }
+    cfg.endEditParms();
+    QStringList named;
+    cfg.getAttributesByType("ATTR", named, false);
+    QStringList reaching;
+    cfg.getAttributesByType("ATTR", reaching, true);
+    EXPECT_LE(reaching.size(), named.size());
+    cfg.containsPython();
+  });
+}
+
+// Every older version leads to the newest one without loss.
+TEST_P(ShippedInEnglish, OlderVersionsUpgrade) {
+  int upgrades = 0;
+  forEach([&](TransformerCfg& older) {
+    const std::unique_ptr<TransformerCfg> newest(
+        registry().getTransformer(older.getName(), ITransformerMgr::NEWEST_VERSION));
+    if (newest->getVersion() == older.getVersion())
+      return;
+    ++upgrades;
+    QStringList before;
+    QStringList after;
+    older.getOutputTags(before);
+    newest->getOutputTags(after);
+    for (const QString& tag : before)
+      older.setOutputFeatureType(tag, "type of " + tag);
+    const QHash<QString, QString> renamed = newest->renamedOutputTags(older.getVersion(), &older);
+    for (const QString& tag : before) {
+      EXPECT_TRUE(after.contains(renamed.value(tag, tag))) << tag.toStdString();
+    }
+    QStringList inputs;
+    newest->getInputTags(inputs);
+    QStringList oldInputs;
+    older.getInputTags(oldInputs);
+    const QHash<QString, QString> renamedInputs = newest->renamedInputTags(older.getVersion(), &older);
+    for (const QString& tag : oldInputs)
+      EXPECT_TRUE(inputs.contains(renamedInputs.value(tag, tag))) << tag.toStdString();
+    EXPECT_TRUE(newest->upgradeTransformer(&older));
+    for (const QString& tag : before) {
+      QString featureType;
+      newest->getOutputFeatureType(renamed.value(tag, tag), featureType);
+      EXPECT_EQ(featureType, "type of " + tag);
+    }
+  });
+  EXPECT_GT(upgrades, 0);
+}
 
 // Every operation that asks something, and one instantiation, of every shipped definition.
 TEST_P(ShippedDefinitions, AnswerEveryQuestion) {

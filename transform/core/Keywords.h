@@ -27,6 +27,8 @@ inline const QLatin1String kDynamicGroupType("NAMEDGROUP NO_EDIT");
 inline const QLatin1String kMultiParameterType("MULTIPARAMETER");
 inline const QLatin1String kTableType("GUI_LINE_TABLE");
 inline const QLatin1String kAttributeType("ATTR");
+// Before the name of an attribute where a value may also be a text.
+inline const QLatin1Char kAttributeMark('&');
 inline const QLatin1String kNewAttributeType("NEW_ATTR");
 inline const QLatin1String kTextType("TEXT");
 inline const QLatin1String kTextEncodedType("TEXT_ENCODED");

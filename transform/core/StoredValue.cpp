@@ -5,7 +5,6 @@
 
 namespace {
 
-const QLatin1Char kAttributeMark('&');
 const QLatin1String kExpressionType("EXPRESSION");
 
 }  // namespace

@@ -10,8 +10,16 @@ TransformParamCfg::TransformParamCfg(const GUIType& type, const QStringList& loo
   rebuildLookupData();
 }
 
+bool TransformParamCfg::losesMark(const QString& value) const {
+  return value.startsWith(kAttributeMark) && getType().startsWith(kAttributeType);
+}
+
 void TransformParamCfg::setValue(const QString& value) {
-  m_value = value.startsWith(QLatin1Char('&')) && getType().startsWith(kAttributeType) ? value.mid(1) : value;
+  m_value = losesMark(value) ? value.mid(1) : value;
+}
+
+QString TransformParamCfg::settable(const QString& value) const {
+  return losesMark(value) ? kAttributeMark + value : value;
 }
 
 QString TransformParamCfg::getTypeWithConfig() const {

@@ -21,6 +21,8 @@ class ORX_EXPORT TransformParamCfg : public GUIType {
   const QString& getValue() const { return m_value; }
   // Attribute types (not new-attribute types) lose a leading "&": they store the bare attribute name.
   void setValue(const QString& value);
+  // What setValue() is to be given for this record to hold `value`, which was stored in a record before.
+  QString settable(const QString& value) const;
   // Empty or "<Unused>".
   bool isUnset() const { return m_value.isEmpty() || m_value == kUnusedValue; }
 
@@ -39,6 +41,9 @@ class ORX_EXPORT TransformParamCfg : public GUIType {
   bool isTable() const;
 
  private:
+  // Whether setting the value would take its first character away.
+  bool losesMark(const QString& value) const;
+
   struct LookupData;
   void rebuildLookupData();
 

@@ -71,7 +71,8 @@ void TransformerCfg::copyValues(const TransformerCfg* other) {
   for (const TransformParamCfg& theirs : other->m_parameters.records()) {
     const int own = m_parameters.indexOf(theirs.getName());
     if (own >= 0) {
-      m_parameters.records()[static_cast<std::size_t>(own)].setValue(theirs.getValue());
+      TransformParamCfg& record = m_parameters.records()[static_cast<std::size_t>(own)];
+      record.setValue(record.settable(theirs.getValue()));
     }
   }
   deepCopyAttributeInfo(other);

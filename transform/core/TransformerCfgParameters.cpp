@@ -268,7 +268,7 @@ void TransformerCfg::addParameter(const TransformParamCfg& parameter) {
   TransformParamCfg& record = m_parameters.records()[static_cast<std::size_t>(index)];
   const QString value = record.getValue();
   record = parameter;
-  record.setValue(value);
+  record.setValue(record.settable(value));
 }
 
 bool TransformerCfg::removeParameter(const QString& name) {

@@ -37,15 +37,6 @@ QString valueText(const QStringList& value) {
   return pack(value);
 }
 
-// As it is to be set for the record to hold what it holds now: setting takes one mark away from attribute
-// names.
-QString settableValue(const TransformParamCfg& record) {
-  const QString& value = record.getValue();
-  TransformParamCfg again = record;
-  again.setValue(value);
-  return again.getValue() == value ? value : QLatin1Char('&') + value;
-}
-
 // The table's entries by tag: those of the ports first, in their order, then any others by name.
 template <typename Value>
 QString packTable(const QHash<QString, Value>& table, const QStringList& tagOrder) {
@@ -102,7 +93,7 @@ void appendLists(const QString& text, QHash<QString, QStringList>& table) {
 QString TransformerCfg::serialize() const {
   QStringList values;
   for (const TransformParamCfg& record : m_parameters.records()) {
-    values << record.getName() << settableValue(record);
+    values << record.getName() << record.settable(record.getValue());
   }
   const QStringList inputs = allInputTags();
   QStringList outputs;

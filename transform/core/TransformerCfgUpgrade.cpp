@@ -41,7 +41,8 @@ bool TransformerCfg::upgradeTransformer(TransformerCfg* older) {
   const std::vector<TransformParamCfg> records = older->m_parameters.records();
   for (const TransformParamCfg& record : records) {
     const QString name = configured().renamedParameters.renamed(record.getName(), fromVersion);
-    const bool isTaken = setParameterValue(name, record.getValue(), false);
+    const TransformParamCfg* own = getParameterByMacroName(name);
+    const bool isTaken = own && setParameterValue(name, own->settable(record.getValue()), false);
     const bool saysSomething = !record.isUnset() && record.getValue() != record.getDefaultValue();
     isComplete = isComplete && (isTaken || !saysSomething);
   }

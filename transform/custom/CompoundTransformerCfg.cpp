@@ -383,7 +383,7 @@ void CompoundTransformerCfg::takeParameters() {
   for (TransformParamCfg& parameter : parameters().records()) {
     const auto value = values.constFind(parameter.getName());
     if (value != values.constEnd())
-      parameter.setValue(*value);
+      parameter.setValue(parameter.settable(*value));
   }
   if (getName() != prototype.getName())
     setName(prototype.getName());
