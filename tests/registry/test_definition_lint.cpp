@@ -271,6 +271,7 @@ TEST(DefinitionLint, Companions) {
       {"unknown-in-companion", "VERSION: 2", "VERSION: 1"},
       {"unknown-in-companion", "PARAMETER_NAME: TEXT", "PARAMETER_NAME: TEXTE"},
       {"unknown-in-companion", "TAG_DESCRIPTION BASE", "TAG_DESCRIPTION BASIS"},
+      {"repeated-keyword", "TAG_DESCRIPTION BASE", "TAG_DESCRIPTION BASE x\nTAG_DESCRIPTION BASE"},
       {"unknown-in-companion", "CATEGORY_NAME: Tests", "CATEGORY_NAME: Test"},
       {"unknown-in-companion", "CATEGORY_DESCRIPTION_START Tests", "CATEGORY_DESCRIPTION_START Test"},
       {"unknown-keyword", "CATEGORY_NAME: Tests,", "CATEGORY_NAME: Tests "},

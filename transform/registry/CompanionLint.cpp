@@ -55,7 +55,20 @@ void CompanionLint::check(QIODevice& device, bool isComplete) {
   }
 }
 
+void CompanionLint::checkRepetitions(const std::vector<CompanionEntry::Text>& texts) {
+  QSet<QString> names;
+  for (const CompanionEntry::Text& text : texts) {
+    if (names.contains(text.name)) {
+      add(kRepeatedKeyword, text.line,
+          QStringLiteral("This replaces an earlier text of '%1'").arg(text.name));
+    }
+    names.insert(text.name);
+  }
+}
+
 void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
+  checkRepetitions(entry.prompts);
+  checkRepetitions(entry.tagDescriptions);
   bool isKnown = false;
   for (const auto& definition : m_catalogue.named(entry.name)) {
     const int version = definition->fields().version;

@@ -43,6 +43,7 @@ class CompanionLint {
 
  private:
   void add(const LintRule& rule, int line, const QString& text);
+  void checkRepetitions(const std::vector<CompanionEntry::Text>& texts);
   void checkEntry(const CompanionEntry& entry, bool isComplete);
   void checkCompleteness(const CompanionEntry& entry, const LintedDefinition& definition);
 
