@@ -29,6 +29,8 @@ TEST(Factory, TheTableGivesEachTransformerItsClass) {
       {"JsonTemplater", 1, ""},
       {"XMLUpdater", 1, "XMLUpdaterTransformerCfg"},
       {"JSONUpdater", 1, "XMLUpdaterTransformerCfg"},
+      {"ChartGenerator", 1, "ChartGeneratorTransformerCfg"},
+      {"HTMLReportGenerator", 1, "ReportGeneratorTransformerCfg"},
       {"parameterfetcher", 3, ""},
       {"ParameterFetcher ", 3, ""},
       {"", 0, ""},

@@ -1,8 +1,15 @@
 #include <platform/qorxcore/Lists.h>
+#include <transform/core/AttributeReferences.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/ParameterTable.h>
+
+namespace {
+
+const QLatin1Char kAttributeMark('&');
+
+}  // namespace
 
 ParameterTable::ParameterTable(const TransformerCfg& cfg, const QString& parameter, int columns,
                                UnpackLevel level)
@@ -33,15 +40,39 @@ void ParameterTable::setCell(int row, int column, const QString& text) {
   }
 }
 
-QString ParameterTable::prompt(int column) const {
-  return m_record ? m_record->members().members()[static_cast<std::size_t>(column)].getDescription()
-                  : QString();
+const GUIType& ParameterTable::column(int index) const {
+  return m_record ? m_record->members().members()[static_cast<std::size_t>(index)] : GUIType::kNullGuiType;
+}
+
+QString ParameterTable::prompt(int index) const {
+  return column(index).getDescription();
+}
+
+QStringList ParameterTable::attributeNames(const IsUsed& isUsed) const {
+  AttributeReferences references;
+  for (int i = 0; i < m_cells.size(); ++i) {
+    if (isUsed(i / m_columns, i % m_columns)) {
+      references.addValue(column(i % m_columns), m_cells[i]);
+    }
+  }
+  return references.names();
+}
+
+void ParameterTable::clearUnused(const IsUsed& isUsed) {
+  for (int i = 0; i < m_cells.size(); ++i) {
+    if (!isUsed(i / m_columns, i % m_columns)) {
+      setCell(i / m_columns, i % m_columns, QString());
+    }
+  }
 }
 
 void ParameterTable::replaceAttributeMarks() {
   for (int i = 0; i < m_cells.size(); ++i) {
-    const GUIType& type = m_record->members().members()[static_cast<std::size_t>(i % m_columns)];
-    setCell(i / m_columns, i % m_columns, withAttributeReference(type, m_cells[i]));
+    const GUIType& type = column(i % m_columns);
+    const bool isBareName =
+        type.getType().startsWith(kAttributeType) && m_cells[i].startsWith(kAttributeMark);
+    setCell(i / m_columns, i % m_columns,
+            isBareName ? m_cells[i].mid(1) : withAttributeReference(type, m_cells[i]));
   }
 }
 

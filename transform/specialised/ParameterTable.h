@@ -6,6 +6,9 @@
 #include <QString>
 #include <QStringList>
 
+#include <functional>
+
+class GUIType;
 class TransformerCfg;
 class TransformParamCfg;
 
@@ -23,15 +26,20 @@ class ParameterTable {
   QString cell(int row, int column) const { return m_cells.value(row * m_columns + column); }
   // A cell that is not there stays so.
   void setCell(int row, int column, const QString& text);
-  QString prompt(int column) const;
+  QString prompt(int index) const;  // of a column
 
-  // "&NAME" becomes an attribute reference in every column that takes one in this form.
+  using IsUsed = std::function<bool(int row, int column)>;
+  // The attributes that the cells refer to, each once; of those cells alone that are used.
+  QStringList attributeNames(const IsUsed& isUsed) const;
+  void clearUnused(const IsUsed& isUsed);
+  // "&NAME" becomes the name, or a reference to the attribute, as the column takes it.
   void replaceAttributeMarks();
   bool isChanged() const { return m_isChanged; }
   // As it was given, unless cells have changed.
   QString packed() const;
 
  private:
+  const GUIType& column(int index) const;
   void read(const TransformParamCfg* record, const QString& value);
 
   const TransformParamCfg* m_record = nullptr;

@@ -1,5 +1,4 @@
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/core/AttributeReferences.h>
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/Keywords.h>
 #include <transform/specialised/Formula.h>
@@ -88,16 +87,11 @@ void TesterTransformerCfg::getMissingAttributeReferences(const QString& paramete
   if (!tests.isValid()) {
     return;
   }
-  QStringList needed;
-  for (int row = 0; row < tests.rowCount(); ++row) {
+  const QStringList needed = tests.attributeNames([&](int row, int column) {
     const Comparison* comparison = findComparison(tests.cell(row, kComparison));
-    if (!comparison || comparison->needsAttribute) {
-      needed += valueReferences(tests.cell(row, kLeft));
-    }
-    if (!comparison || comparison->takesRight) {
-      needed += valueReferences(tests.cell(row, kRight));
-    }
-  }
+    return !comparison || column == kComparison ||
+           (column == kLeft ? comparison->needsAttribute : comparison->takesRight);
+  });
   const QSet<QString> kept(needed.begin(), needed.end());
   missing.erase(std::remove_if(missing.begin(), missing.end(),
                                [&](const QString& name) { return !kept.contains(name); }),

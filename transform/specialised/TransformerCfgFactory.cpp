@@ -1,7 +1,9 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
+#include <transform/specialised/ChartGeneratorTransformerCfg.h>
 #include <transform/specialised/ExpressionEvaluatorCfg.h>
 #include <transform/specialised/ParameterFetcherTransformerCfg.h>
+#include <transform/specialised/ReportGeneratorTransformerCfg.h>
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 #include <transform/specialised/ValueMapperTransformerCfg.h>
@@ -52,6 +54,10 @@ const std::vector<TransformerCfgRule>& transformerCfgRules() {
        makeXml<XMLUpdaterTransformerCfg>},
       {QLatin1String("JSONUpdater"), kLowest, kHighest, QLatin1String("XMLUpdaterTransformerCfg"),
        makeJson<XMLUpdaterTransformerCfg>},
+      {QLatin1String("ChartGenerator"), kLowest, kHighest, QLatin1String("ChartGeneratorTransformerCfg"),
+       make<ChartGeneratorTransformerCfg>},
+      {QLatin1String("HTMLReportGenerator"), kLowest, kHighest,
+       QLatin1String("ReportGeneratorTransformerCfg"), make<ReportGeneratorTransformerCfg>},
   };
   return rules;
 }

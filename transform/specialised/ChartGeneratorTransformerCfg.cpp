@@ -1,0 +1,139 @@
+#include <transform/core/ExpressionWriter.h>
+#include <transform/core/Keywords.h>
+#include <transform/specialised/ChartGeneratorTransformerCfg.h>
+#include <transform/specialised/ParameterTable.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
+
+#include <QSet>
+
+namespace {
+
+constexpr long kMissingValueMessage = 370608;
+constexpr long kInRowMessage = 370714;
+constexpr long kOutOfRangeMessage = 370715;
+constexpr long kOneSeriesMessage = 370716;
+constexpr long kLabelTwiceMessage = 370717;
+constexpr int kSmallestSize = 16;
+constexpr int kLargestSize = 16384;
+
+const QLatin1String kChartType("CHART_TYPE");
+const QLatin1String kSeries("SERIES");
+const QLatin1String kWidth("WIDTH");
+const QLatin1String kHeight("HEIGHT");
+const QLatin1String kBar("BAR");
+const QLatin1String kFormerBar("COLUMN");
+const QLatin1String kPie("PIE");
+const QLatin1String kHistogram("HISTOGRAM");
+
+enum Column { kLabel, kPosition, kValue, kColumns };
+
+}  // namespace
+
+TransformerCfg* ChartGeneratorTransformerCfg::getCopy() const {
+  auto copy = std::make_unique<ChartGeneratorTransformerCfg>();
+  copy->assign(this);
+  return copy.release();
+}
+
+bool ChartGeneratorTransformerCfg::isKind(const QString& kind, UnpackLevel level) const {
+  const TransformParamCfg* type = getParameterByMacroName(kChartType);
+  return type && type->choices().toStored(getParameterValue(kChartType, level)) == kind;
+}
+
+bool ChartGeneratorTransformerCfg::usesPositions(UnpackLevel level) const {
+  return !isKind(kHistogram, level);
+}
+
+QStringList ChartGeneratorTransformerCfg::getAttributeNamesInValue(const QString& parameter) const {
+  if (parameter != kSeries) {
+    return TransformerCfg::getAttributeNamesInValue(parameter);
+  }
+  const ParameterTable series(*this, kSeries, kColumns, UnpackLevel::Resolved);
+  const bool withPositions = usesPositions(UnpackLevel::Resolved);
+  return series.isValid()
+             ? series.attributeNames([&](int, int column) { return column != kPosition || withPositions; })
+             : TransformerCfg::getAttributeNamesInValue(parameter);
+}
+
+bool ChartGeneratorTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
+  if (!TransformerCfg::validateParameter(parameter, message)) {
+    return false;
+  }
+  if (parameter == kSeries) {
+    return validateSeries(message);
+  }
+  const QString value = getParameterValue(parameter, UnpackLevel::Resolved);
+  bool isNumber = false;
+  const int size = value.toInt(&isNumber);
+  const bool isOpen = value.contains(kMacroOpen) || value.contains(kDeferredOpen) ||
+                      ExpressionWriter::holdsReference(value) || value.startsWith(kConditionalPrefix);
+  if ((parameter != kWidth && parameter != kHeight) || isOpen || value == kUnusedValue ||
+      (isNumber && size >= kSmallestSize && size <= kLargestSize)) {
+    return true;
+  }
+  message = TransformResString(kOutOfRangeMessage,
+                               {value, QString::number(kSmallestSize), QString::number(kLargestSize)});
+  return false;
+}
+
+bool ChartGeneratorTransformerCfg::validateSeries(QString& message) const {
+  const ParameterTable series(*this, kSeries, kColumns, UnpackLevel::Resolved);
+  const bool needsPositions = usesPositions(UnpackLevel::Resolved);
+  QSet<QString> labels;
+  for (int row = 0; row < series.rowCount(); ++row) {
+    const auto refuse = [&](const QString& reason) {
+      message = TransformResString(kInRowMessage, {QString::number(row + 1), reason});
+      return false;
+    };
+    for (const int column : {kPosition, kValue}) {
+      if (series.cell(row, column).isEmpty() && (column == kValue || needsPositions)) {
+        return refuse(TransformResString(kMissingValueMessage, series.prompt(column)));
+      }
+    }
+    const QString label = series.cell(row, kLabel);
+    if (labels.contains(label)) {
+      return refuse(TransformResString(kLabelTwiceMessage));
+    }
+    if (!label.isEmpty()) {
+      labels.insert(label);
+    }
+  }
+  if (series.rowCount() > 1 && isKind(kPie, UnpackLevel::Resolved)) {
+    message = TransformResString(kOneSeriesMessage);
+    return false;
+  }
+  return true;
+}
+
+QString ChartGeneratorTransformerCfg::getParameterValueForMappingFile(const QString& name,
+                                                                      const TransformParamCfg* parameter,
+                                                                      MFBuffer& buffer) const {
+  const TransformParamCfg* record = parameter ? parameter : getParameterByMacroName(name);
+  ParameterTable series(record, stripBasicStringInfo(getParameterValue(name)), kColumns);
+  if (name != kSeries || !series.isValid()) {
+    return TransformerCfg::getParameterValueForMappingFile(name, parameter, buffer);
+  }
+  // A kind that only the mapping file tells may use everything.
+  const bool withPositions = usesPositions(UnpackLevel::Stored);
+  series.clearUnused([&](int, int column) { return column != kPosition || withPositions; });
+  for (int row = 0; row < series.rowCount(); ++row) {
+    if (series.cell(row, kLabel).isEmpty()) {
+      series.setCell(row, kLabel, series.cell(row, kValue));
+    }
+  }
+  return textForMappingFile(series.packed(), name, record, buffer);
+}
+
+void ChartGeneratorTransformerCfg::autoUpgradeTransformer() {
+  ParameterTable series(*this, kSeries, kColumns);
+  series.replaceAttributeMarks();
+  if (series.isChanged()) {
+    applyParameterValue(kSeries, series.packed());
+    setAutoUpgraded(true);
+  }
+  if (getParameterValue(kChartType) == kFormerBar) {
+    applyParameterValue(kChartType, kBar);
+    setAutoUpgraded(true);
+  }
+}
