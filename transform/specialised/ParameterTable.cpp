@@ -5,11 +5,6 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/ParameterTable.h>
 
-namespace {
-
-const QLatin1Char kAttributeMark('&');
-
-}  // namespace
 
 ParameterTable::ParameterTable(const TransformerCfg& cfg, const QString& parameter, int columns,
                                UnpackLevel level)
