@@ -51,7 +51,7 @@ QStringList OpenNetwork::attributesOf(const QString& output) const {
   return getOutputAttributes(output, origins);
 }
 
-void assemble(OpenNetwork& network, const QStringList& lines) {
+void assemble(OpenNetwork& network, const QStringList& lines, CompoundTransformerNetwork* inner) {
   QHash<QString, int> numbers;
   int number = 0;
   for (const QString& line : lines) {
@@ -72,6 +72,8 @@ void assemble(OpenNetwork& network, const QStringList& lines) {
       network.addOutput(name, number, kOutgoingOwnList, names(list), number);
     else if (keyword == QLatin1String("loop"))
       network.addLoop(name, number);
+    else if (keyword == QLatin1String("use"))
+      network.addTransformer(new CompoundTransformerCfg(inner), {}, number);
     else
       network.addTransformer(
           configured(passing(QStringLiteral("Adder"), QStringLiteral("OUT"), list), name).release(), {},

@@ -57,8 +57,8 @@ class OpenNetwork : public ExternalDocNetwork {
 };
 
 // Puts a network together from lines such as "in A", "out B", "own B x,y", "loop L", "pass P", "add P x,y",
-// "P -> B". Node numbers follow the lines; ports are IN and OUT.
-void assemble(OpenNetwork& network, const QStringList& lines);
+// "use P" (an instance of `inner`), "P -> B". Node numbers follow the lines; ports are IN and OUT.
+void assemble(OpenNetwork& network, const QStringList& lines, CompoundTransformerNetwork* inner = nullptr);
 
 class TextBuffer : public MFBuffer {
  public:

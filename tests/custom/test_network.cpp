@@ -36,12 +36,21 @@ const Propagation kPropagations[] = {
     {"circle without an input", "out O;add S s;add T t;S -> T;T -> S;T -> O", "O", "s,t", ""},
     {"through a loop point", "in A;out O;loop L;add T t;A -> T;T -> L;L -> O", "O", "a,k,t", "A"},
     {"sent back to an input", "in A;out O;loop L;add T t;A -> T;T -> L;L -> A;T -> O", "O", "a,k,t", "A"},
+    {"nested", "in A;out O;use T;A -> T;T -> O", "O", "a,k,x", "A"},
+    {"nested twice, each with its own", "in A;in B;out O;out P;use S;use T;A -> S;B -> T;S -> O;T -> P", "P",
+     "b,k,x", "B"},
+    {"nested behind each other", "in A;in B;out O;use S;use T;A -> S;B -> T;S -> T;T -> O", "O", "a,b,k,x",
+     "B,A"},
+    {"nested in a circle", "in A;out O;use T;add S s;A -> T;T -> S;S -> T;S -> O", "O", "a,k,x,s", "A"},
 };
 
 TEST(Network, PropagatesAttributes) {
+  OpenNetwork inner(QStringLiteral("Inner"));
+  assemble(inner, {QStringLiteral("in IN"), QStringLiteral("out OUT"), QStringLiteral("add T x"),
+                   QStringLiteral("IN -> T"), QStringLiteral("T -> OUT")});
   for (const Propagation& row : kPropagations) {
     OpenNetwork network;
-    assemble(network, QString::fromLatin1(row.graph).split(QLatin1Char(';')));
+    assemble(network, QString::fromLatin1(row.graph).split(QLatin1Char(';')), &inner);
     for (const QString& input : network.getInputs())
       network.setInputAttributes(input, {input.toLower(), QStringLiteral("k")});
     const QString output = QLatin1String(row.output);
@@ -67,6 +76,9 @@ TEST(Network, TellsWhereAttributesComeFrom) {
   EXPECT_EQ(network.getOutputAttributes(QStringLiteral("O"), origins), names(QStringLiteral("declared,a,t")));
   EXPECT_EQ(origins.value(QStringLiteral("a")), QStringLiteral("A"));
   EXPECT_EQ(origins.value(QStringLiteral("t")), QStringLiteral("T"));
+  EXPECT_EQ(network.getInputAttributes(QStringLiteral("A"), false), names(QStringLiteral("a")));
+  EXPECT_EQ(network.getInputAttributes(QStringLiteral("A"), true), names(QStringLiteral("declared,a")));
+  EXPECT_EQ(network.getInputAttributes(QStringLiteral("O"), true), QStringList());
 }
 
 // The list and the order of a graph whose circle stands between an input and the output.
@@ -93,20 +105,51 @@ TEST(Network, OrdersAncestors) {
   EXPECT_EQ(order.cycles.front().end, 4U);
 }
 
-TEST(Network, WalksLongChainsWithoutRecursion) {
-  constexpr int kLength = 100000;
+// A row of nodes whose links run both ways: against the order, an attribute gets on by one node a round.
+TEST(Network, CarriesAttributesAgainstTheOrderOfACycle) {
+  constexpr int kLength = 40;
   OpenNetwork network;
+  const QString port = QStringLiteral("P");
+  const auto link = [&](int from, int to) { EXPECT_TRUE(network.addLink(from, port, to, port)); };
   network.addInput(QStringLiteral("A"), 0, 0);
+  network.addOutput(QStringLiteral("O"), kLength + 1, kOutgoingArriving, {}, 0);
   for (int number = 1; number <= kLength; ++number)
     network.addLoop(QString::number(number), number);
-  network.addOutput(QStringLiteral("O"), kLength + 1, kOutgoingArriving, {}, 0);
-  for (int number = 0; number <= kLength; ++number)
-    network.addLink(number, QStringLiteral("OUT"), number + 1, QStringLiteral("IN"));
+  for (int number = 1; number < kLength; ++number)
+    link(number + 1, number);
+  for (int number = 0; number < kLength; ++number)
+    link(number, number + 1);
+  link(1, kLength + 1);
+  link(kLength, kLength + 1);
   network.doneAdding(true);
   network.setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
   EXPECT_EQ(network.attributesOf(QStringLiteral("O")), names(QStringLiteral("a")));
-  // Closed to one circle.
-  network.addLink(kLength, QStringLiteral("OUT"), 0, QStringLiteral("IN"));
+  network.nodeByNumber(kLength)->addAttributeCopy(port, QStringLiteral("a"), QStringLiteral("far"));
+  EXPECT_EQ(network.attributesOf(QStringLiteral("O")), names(QStringLiteral("a,far")));
+}
+
+// Built, ordered, asked, closed to a circle and destroyed; with every second node a transformer.
+TEST(Network, WalksLongChainsWithoutRecursion) {
+  constexpr int kLength = 100000;
+  const QString port = QStringLiteral("P");
+  TransformerDefinition definition = passing(QStringLiteral("Pass"), port);
+  definition.inputTags = QStringList{port};
+  const std::unique_ptr<TransformerCfg> prototype = configured(definition);
+  OpenNetwork network;
+  network.addInput(QStringLiteral("A"), 0, 0);
+  for (int number = 1; number <= kLength; ++number) {
+    if (number % 2 == 0)
+      network.addTransformer(prototype->getCopy(), {}, number);
+    else
+      network.addLoop(QString::number(number), number);
+  }
+  network.addOutput(QStringLiteral("O"), kLength + 1, kOutgoingArriving, {}, 0);
+  for (int number = 0; number <= kLength; ++number)
+    network.addLink(number, port, number + 1, port);
+  network.doneAdding(true);
+  network.setInputAttributes(QStringLiteral("A"), {QStringLiteral("a")});
+  EXPECT_EQ(network.attributesOf(QStringLiteral("O")), names(QStringLiteral("a")));
+  network.addLink(kLength, port, 0, port);
   EXPECT_EQ(network.attributesOf(QStringLiteral("O")), names(QStringLiteral("a")));
   EXPECT_EQ(network.getUpstreamInputs(QStringLiteral("O")), names(QStringLiteral("A")));
 }
@@ -131,6 +174,9 @@ TEST(Network, AnswersAsAWhole) {
   EXPECT_TRUE(network.getIsBlocking());
   EXPECT_TRUE(network.getUsesTransformer(QStringLiteral("Holder"), nullptr));
   EXPECT_FALSE(network.getUsesTransformer(QStringLiteral("holder"), nullptr));
+  QSet<QString> visited;
+  EXPECT_TRUE(network.getUsesTransformer(QStringLiteral("Holder"), &visited));
+  EXPECT_FALSE(network.getUsesTransformer(QStringLiteral("Holder"), &visited)) << "no second look";
   EXPECT_EQ(OpenNetwork::createExposedParmName(QStringLiteral("T"), QStringLiteral("P")),
             QStringLiteral("T_P"));
   EXPECT_EQ(network.addTransformer(configured(holder).release(), {}, 4), nullptr) << "number taken";
@@ -141,6 +187,13 @@ TEST(Network, AnswersAsAWhole) {
   network.getOutputAttributeMode(QStringLiteral("none"), mode, list);
   EXPECT_EQ(mode, kOutgoingArriving);
   EXPECT_EQ(list, names(QStringLiteral("untouched")));
+  network.addOutput(QStringLiteral("O"), 5, kOutgoingArriving, {}, 0);
+  network.setOutputAttributeMode(QStringLiteral("none"), kOutgoingOwnList, names(QStringLiteral("y")));
+  network.setOutputAttributeMode(QStringLiteral("O"), kOutgoingOwnList, names(QStringLiteral("x")));
+  network.getOutputAttributeMode(QStringLiteral("O"), mode, list);
+  EXPECT_EQ(mode, kOutgoingOwnList);
+  EXPECT_EQ(list, names(QStringLiteral("x")));
+  EXPECT_EQ(network.attributesOf(QStringLiteral("O")), list);
 }
 
 // --- editing while instances exist -------------------------------------------------------------------------
@@ -179,7 +232,8 @@ class Watcher : public CompoundTransformerNetworkListener {
 TEST(Network, TellsListenersInOrder) {
   QStringList log;
   auto network = std::make_unique<OpenNetwork>();
-  assemble(*network, {QStringLiteral("in A"), QStringLiteral("out O"), QStringLiteral("A -> O")});
+  assemble(*network, {QStringLiteral("in A"), QStringLiteral("out O"), QStringLiteral("loop L"),
+                      QStringLiteral("A -> O"), QStringLiteral("L -> O")});
   EXPECT_FALSE(network->getIsInUse());
   auto first = std::make_unique<Watcher>(*network, log, QStringLiteral("1"));
   auto second = std::make_unique<Watcher>(*network, log, QStringLiteral("2"));
@@ -189,12 +243,26 @@ TEST(Network, TellsListenersInOrder) {
   EXPECT_FALSE(network->renameInput(QStringLiteral("A"), QStringLiteral("C")));
   EXPECT_EQ(log.join(QLatin1Char(',')), QStringLiteral("1 in A>B,2 in A>B,3 in A>B,1,2,3"));
   log.clear();
-  first->onChange = [&] { second.reset(); };
+  std::unique_ptr<Watcher> fourth;
+  first->onChange = [&] {
+    second.reset();
+    if (!fourth)
+      fourth = std::make_unique<Watcher>(*network, log, QStringLiteral("4"));
+  };
   network->doneAdding(true);
   EXPECT_EQ(log.join(QLatin1Char(',')), QStringLiteral("1!,3!"));
   log.clear();
+  third.reset();
+  EXPECT_TRUE(network->removeLoop(QStringLiteral("L"), 2));
+  EXPECT_FALSE(network->removeLoop(QStringLiteral("L"), 2));
+  EXPECT_TRUE(network->removeOutput(QStringLiteral("O"), 1));
+  EXPECT_TRUE(network->removeInput(QStringLiteral("B"), 0));
+  EXPECT_TRUE(network->nodes().empty());
+  network->clear();
+  EXPECT_EQ(log.join(QLatin1Char(',')), QStringLiteral("1,4,1,4,1,4,1!,4!"));
+  log.clear();
   network.reset();
-  EXPECT_EQ(log.join(QLatin1Char(',')), QStringLiteral("1 gone,3 gone"));
+  EXPECT_EQ(log.join(QLatin1Char(',')), QStringLiteral("1 gone,4 gone"));
 }
 
 TEST(Network, InstancesFollowEditing) {

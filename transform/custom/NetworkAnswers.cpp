@@ -140,13 +140,15 @@ bool CompoundTransformerNetwork::getIsDefinitionValid() const {
 bool CompoundTransformerNetwork::getUsesTransformer(const QString& name, QSet<QString>* visited) const {
   QSet<QString> ownVisited;
   QSet<QString>& done = visited ? *visited : ownVisited;
+  if (done.contains(visitedName(*this)))
+    return false;
   for (const CompoundTransformerNetwork* network : allNetworks(*this)) {
     if (network != this && network->getName() == name)
       return true;
-    const QString id = visitedName(*network);
-    if (network != this && done.contains(id))
+    const int before = done.size();
+    done.insert(visitedName(*network));
+    if (done.size() == before)
       continue;
-    done.insert(id);
     for (const TransformerCfg* cfg : network->getTransformers()) {
       if (!networkOf(cfg) && cfg->getUsesTransformer(name, &done))
         return true;

@@ -5,11 +5,15 @@
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
 
+#include <algorithm>
+
 namespace {
 
-// Rounds through a cycle until nothing changes any more; attributes that still change then (a list that
-// grows with every round) are taken as they are.
-constexpr int kMostRounds = 8;
+// Rounds through a cycle go on until nothing changes any more, at most once for each node that a name may
+// have to pass. When rounds make new names (a list that grows with each), what is there after some of them is
+// taken as it is; so it is in cycles of many thousand nodes most of whose links run against the order.
+constexpr std::size_t kMostRoundsWithNewNames = 8;
+constexpr std::size_t kMostStepsInCycle = 10 * 1000 * 1000;
 // What the custom transformers inside may cost within one outermost query, in characters of the attributes
 // that reach them. Definitions that are placed in each other again and again, each time with other
 // attributes, could ask for more than any machine has: what exceeds this gives what reaches it.
@@ -25,6 +29,23 @@ struct QueryState {
 QueryState& queryState() {
   static thread_local QueryState state;
   return state;
+}
+
+void computeCycle(const NetworkOrder::Cycle& cycle, QHash<QString, QString>& origins) {
+  for (SubDocNetworkObj* node : cycle.flow)
+    node->beginQuery();
+  std::size_t newNames = 0;
+  std::size_t rounds =
+      kMostRoundsWithNewNames + std::min(cycle.flow.size(), kMostStepsInCycle / cycle.flow.size());
+  for (bool hasChanged = true; hasChanged && newNames < kMostRoundsWithNewNames && rounds > 0; --rounds) {
+    const int names = origins.size();
+    hasChanged = false;
+    for (SubDocNetworkObj* node : cycle.flow) {
+      node->compute(origins);
+      hasChanged = hasChanged || node->hasChanged();
+    }
+    newNames += origins.size() > names ? 1 : 0;
+  }
 }
 
 }  // namespace
@@ -139,16 +160,7 @@ QStringList CompoundTransformerNetwork::evaluate(SubDocNetworkObjOutput& output,
       node->compute(origins);
       continue;
     }
-    for (SubDocNetworkObj* node : cycle->flow)
-      node->beginQuery();
-    bool hasChanged = true;
-    for (int round = 0; hasChanged && round < kMostRounds; ++round) {
-      hasChanged = false;
-      for (SubDocNetworkObj* node : cycle->flow) {
-        node->compute(origins);
-        hasChanged = hasChanged || node->hasChanged();
-      }
-    }
+    computeCycle(*cycle, origins);
     at = cycle->end;
     ++cycle;
   }

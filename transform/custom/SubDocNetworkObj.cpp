@@ -103,8 +103,8 @@ void SubDocNetworkObj::fill(Outlet& outlet, QHash<QString, QString>& origins) {
   outlet.isCurrent = true;
   outlet.attributes = getAttributes(outlet.port);
   // A list that passes through unchanged stays one list, all of whose attributes are known already.
-  if (!m_sources.empty() && m_sources.front()->attributes == outlet.attributes)
-    outlet.attributes = m_sources.front()->attributes;
+  if (!sources().empty() && sources().front()->attributes == outlet.attributes)
+    outlet.attributes = sources().front()->attributes;
   else
     noteOrigins(outlet.attributes, origins);
 }
