@@ -12,9 +12,23 @@
 
 namespace {
 
+// A few are compared faster than hashed.
+void dropRepeats(QStringList& names) {
+  constexpr int kFew = 8;
+  if (names.size() > kFew) {
+    names.removeDuplicates();
+    return;
+  }
+  for (int at = names.size() - 1; at > 0; --at) {
+    if (names.indexOf(names.at(at)) < at) {
+      names.removeAt(at);
+    }
+  }
+}
+
 QStringList eachOnce(const QStringList& names) {
   QStringList result = names;
-  result.removeDuplicates();
+  dropRepeats(result);
   return result;
 }
 
@@ -41,7 +55,11 @@ QStringList TransformerCfg::getInputAttributeUnion() const {
 // The tags on which attributes arrive, in the order of the ports; tags that are no ports come last, by name.
 QStringList TransformerCfg::attributeTags() const {
   QStringList tags = allInputTags();
-  QSet<QString> known(tags.begin(), tags.end());
+  const auto arrivesAt = [this](const QString& tag) { return m_ports.inputAttributes.contains(tag); };
+  if (std::count_if(tags.cbegin(), tags.cend(), arrivesAt) == m_ports.inputAttributes.size()) {
+    return tags;
+  }
+  const QSet<QString> known(tags.begin(), tags.end());
   QStringList others;
   for (auto at = m_ports.inputAttributes.keyBegin(); at != m_ports.inputAttributes.keyEnd(); ++at) {
     if (!known.contains(*at)) {
@@ -80,7 +98,7 @@ QStringList TransformerCfg::getOutputAttributes(const QString& tag) const {
     transformAllAttrs(incoming, result, inputTag, tag);
   }
   addAdditionalAttrs(result, tag);
-  result.removeDuplicates();
+  dropRepeats(result);
   return result;
 }
 

@@ -276,7 +276,9 @@ QStringList TransformerCfg::allInputTags() const {
   if (!hidden.isEmpty()) {
     tags += hidden;
   }
-  tags.removeDuplicates();
+  if (tags.size() > 1) {
+    tags.removeDuplicates();
+  }
   return tags;
 }
 
