@@ -33,8 +33,8 @@ std::uint32_t NetworkSorter::numberOf(SubDocNetworkObj& node) {
 std::uint32_t NetworkSorter::readUpstream(SubDocNetworkObj& node) {
   const std::uint32_t number = numberOf(node);
   while (m_rows.size() <= m_nodes.size()) {
-    for (const SubDocNetworkObj::Outlet* source : m_nodes[m_rows.size() - 1]->sources())
-      m_feeders.push_back(numberOf(*source->node));
+    for (const SubDocNetworkObj::Source& source : m_nodes[m_rows.size() - 1]->sources())
+      m_feeders.push_back(numberOf(*source.node));
     m_rows.push_back(static_cast<std::uint32_t>(m_feeders.size()));
   }
   m_states.resize(m_nodes.size());

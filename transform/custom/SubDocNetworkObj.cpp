@@ -7,9 +7,7 @@
 #include <algorithm>
 
 SubDocNetworkObj::SubDocNetworkObj(Kind kind, int number, const QString& name)
-    : m_kind(kind), m_number(number), m_name(name) {
-  m_common.node = this;
-}
+    : m_kind(kind), m_number(number), m_name(name) {}
 
 SubDocNetworkObj::~SubDocNetworkObj() = default;
 
@@ -38,7 +36,7 @@ void SubDocNetworkObj::addLink(SubDocNetworkObj& from, const QString& fromPort, 
   if (std::next(port) != to.m_feeders.end())
     to.m_knowsSources = false;
   else if (to.m_knowsSources)
-    to.m_sources.push_back(&from.outlet(fromPort));
+    to.m_sources.append({&from, &from.outlet(fromPort)});
 }
 
 void SubDocNetworkObj::removeLinks() {
@@ -70,13 +68,13 @@ void SubDocNetworkObj::removeLinks() {
   }
 }
 
-const std::vector<SubDocNetworkObj::Outlet*>& SubDocNetworkObj::sources() {
+const SubDocNetworkObj::Sources& SubDocNetworkObj::sources() {
   if (!m_knowsSources) {
     m_knowsSources = true;
     m_sources.clear();
     for (const auto& [port, links] : m_feeders) {
       for (const Link& link : links)
-        m_sources.push_back(&link.node->outlet(link.port));
+        m_sources.append({link.node, &link.node->outlet(link.port)});
     }
   }
   return m_sources;
@@ -87,8 +85,7 @@ const std::vector<SubDocNetworkObj::Outlet*>& SubDocNetworkObj::sources() {
 SubDocNetworkObj::Outlet& SubDocNetworkObj::outlet(const QString& port) {
   if (m_kind != Kind::Transformer && m_copies.count(port) == 0)
     return m_common;
-  Outlet& own = m_outlets[port];
-  own.node = this;
+  PortOutlet& own = m_outlets[port];
   own.port = port;
   m_hasOutlets = true;
   return own;
@@ -101,10 +98,10 @@ void SubDocNetworkObj::forgetOutlets() {
 
 void SubDocNetworkObj::fill(Outlet& outlet, QHash<QString, QString>& origins) {
   outlet.isCurrent = true;
-  outlet.attributes = getAttributes(outlet.port);
+  outlet.attributes = getAttributes(&outlet == &m_common ? QString() : static_cast<PortOutlet&>(outlet).port);
   // A list that passes through unchanged stays one list, all of whose attributes are known already.
-  if (!sources().empty() && sources().front()->attributes == outlet.attributes)
-    outlet.attributes = sources().front()->attributes;
+  if (!sources().isEmpty() && sources().first().outlet->attributes == outlet.attributes)
+    outlet.attributes = sources().first().outlet->attributes;
   else
     noteOrigins(outlet.attributes, origins);
 }
@@ -133,14 +130,14 @@ void SubDocNetworkObj::noteOrigins(const QStringList& attributes, QHash<QString,
   }
 }
 
-const QStringList& SubDocNetworkObj::collect(Source begin, Source end, QStringList& merged,
+const QStringList& SubDocNetworkObj::collect(const Source* begin, const Source* end, QStringList& merged,
                                              QHash<QString, QString>& origins) {
   const QStringList* first = &merged;  // empty
   QSet<QString> seen;
-  for (Source source = begin; source != end; ++source) {
-    if (!(*source)->isCurrent)
-      (*source)->node->fill(**source, origins);
-    const QStringList& attributes = (*source)->attributes;
+  for (const Source* source = begin; source != end; ++source) {
+    if (!source->outlet->isCurrent)
+      source->node->fill(*source->outlet, origins);
+    const QStringList& attributes = source->outlet->attributes;
     if (first->isEmpty()) {
       first = &attributes;
       continue;
@@ -163,8 +160,8 @@ const QStringList& SubDocNetworkObj::collect(Source begin, Source end, QStringLi
 }
 
 const QStringList& SubDocNetworkObj::collect(QStringList& merged, QHash<QString, QString>& origins) {
-  const std::vector<Outlet*>& all = sources();
-  return collect(all.data(), all.data() + all.size(), merged, origins);
+  const Sources& all = sources();
+  return collect(all.begin(), all.end(), merged, origins);
 }
 
 QStringList SubDocNetworkObj::withCopies(const QString& port, const QStringList& attributes) const {

@@ -7,6 +7,7 @@
 #include <QHash>
 #include <QString>
 #include <QStringList>
+#include <QVarLengthArray>
 
 #include <map>
 #include <vector>
@@ -63,24 +64,27 @@ class ORX_EXPORT SubDocNetworkObj {
   bool hasChanged() const { return m_hasChanged; }
 
  protected:
-  // What leaves by a port, kept until the node is computed anew.
+  // What leaves by the ports of a node, kept until it is computed anew.
   struct Outlet {
     QStringList attributes;
-    SubDocNetworkObj* node = nullptr;
-    QString port;
     bool isCurrent = false;
   };
-  using Source = Outlet* const*;
+  // Where a link comes from.
+  struct Source {
+    SubDocNetworkObj* node;
+    Outlet* outlet;
+  };
+  using Sources = QVarLengthArray<Source, 2>;
 
   SubDocNetworkObj(Kind kind, int number, const QString& name);
 
   void setName(const QString& name) { m_name = name; }
 
-  // Where the links come from: ports in name order, links in the order of adding.
-  const std::vector<Outlet*>& sources();
+  // Ports in name order, links in the order of adding.
+  const Sources& sources();
   // What the sources bring, each name once, in their order. `merged` is room for a list that none of them
   // has by itself.
-  static const QStringList& collect(Source begin, Source end, QStringList& merged,
+  static const QStringList& collect(const Source* begin, const Source* end, QStringList& merged,
                                     QHash<QString, QString>& origins);
   // The same over all ports.
   const QStringList& collect(QStringList& merged, QHash<QString, QString>& origins);
@@ -97,21 +101,26 @@ class ORX_EXPORT SubDocNetworkObj {
  private:
   friend class NetworkSorter;
 
+  // Of one port alone.
+  struct PortOutlet : Outlet {
+    QString port;
+  };
+
   Outlet& outlet(const QString& port);
   void fill(Outlet& outlet, QHash<QString, QString>& origins);
   void forgetOutlets();
 
   // What a query works with stands together.
-  Outlet m_common;  // of all ports that have none of their own
-  std::vector<Outlet*> m_sources;
+  int m_place = -1;  // in the NetworkSorter that met the node last
   Kind m_kind;
   bool m_knowsSources = true;
   bool m_isComputed = false;
   bool m_hasChanged = true;
+  Outlet m_common;  // of all ports that have none of their own
+  Sources m_sources;
   bool m_hasOutlets = false;
-  int m_place = -1;  // in the NetworkSorter that met the node last
   int m_number;
-  std::map<QString, Outlet> m_outlets;  // of transformers, and where copies are made
+  std::map<QString, PortOutlet> m_outlets;  // of transformers, and where copies are made
 
   QString m_name;
   Ports m_feeders;

@@ -15,7 +15,7 @@ void SubDocNetworkObjXformer::compute(QHash<QString, QString>& origins) {
   bool isOther = m_inlets.size() != feeders().size();
   m_inlets.resize(feeders().size());
   auto inlet = m_inlets.begin();
-  Source source = sources().data();
+  const Source* source = sources().constData();
   for (const auto& [port, links] : feeders()) {
     QStringList merged;
     const QStringList& arriving = collect(source, source + links.size(), merged, origins);
