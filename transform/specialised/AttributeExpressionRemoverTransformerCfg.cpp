@@ -1,6 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
 #include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 
 namespace {
@@ -18,9 +19,7 @@ const QLatin1String kFeatureTypeAttribute("orx_feature_type");
 }  // namespace
 
 TransformerCfg* AttributeExpressionRemoverTransformerCfg::getCopy() const {
-  auto copy = std::make_unique<AttributeExpressionRemoverTransformerCfg>();
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this);
 }
 
 bool AttributeExpressionRemoverTransformerCfg::parmValueAffectsOutputAttrs(const QString& parameter) const {
@@ -30,8 +29,7 @@ bool AttributeExpressionRemoverTransformerCfg::parmValueAffectsOutputAttrs(const
 
 bool AttributeExpressionRemoverTransformerCfg::findExpression(QRegularExpression& expression) const {
   const QString value = getParameterValue(kExpression, UnpackLevel::Resolved);
-  if (value.isEmpty() || value == kUnusedValue || value.contains(kMacroOpen) ||
-      value.contains(kDeferredOpen)) {
+  if (isUnsetValue(value) || refersToMacros(value)) {
     return false;
   }
   const bool ignoresCase = getParameterValue(kIgnoreCase, UnpackLevel::Resolved) == kYes;

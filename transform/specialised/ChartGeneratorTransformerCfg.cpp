@@ -2,6 +2,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/specialised/ChartGeneratorTransformerCfg.h>
 #include <transform/specialised/ParameterTable.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 
@@ -31,9 +32,7 @@ enum Column { kLabel, kPosition, kValue, kColumns };
 }  // namespace
 
 TransformerCfg* ChartGeneratorTransformerCfg::getCopy() const {
-  auto copy = std::make_unique<ChartGeneratorTransformerCfg>();
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this);
 }
 
 bool ChartGeneratorTransformerCfg::isKind(const QString& kind, UnpackLevel level) const {
@@ -66,9 +65,7 @@ bool ChartGeneratorTransformerCfg::validateParameter(const QString& parameter, Q
   const QString value = getParameterValue(parameter, UnpackLevel::Resolved);
   bool isNumber = false;
   const int size = value.toInt(&isNumber);
-  const bool isOpen = value.contains(kMacroOpen) || value.contains(kDeferredOpen) ||
-                      ExpressionWriter::holdsReference(value) || value.startsWith(kConditionalPrefix);
-  if ((parameter != kWidth && parameter != kHeight) || isOpen || value == kUnusedValue ||
+  if ((parameter != kWidth && parameter != kHeight) || isOpenValue(value) || isUnsetValue(value) ||
       (isNumber && size >= kSmallestSize && size <= kLargestSize)) {
     return true;
   }
@@ -128,10 +125,7 @@ QString ChartGeneratorTransformerCfg::getParameterValueForMappingFile(const QStr
 void ChartGeneratorTransformerCfg::autoUpgradeTransformer() {
   ParameterTable series(*this, kSeries, kColumns);
   series.replaceAttributeMarks();
-  if (series.isChanged()) {
-    applyParameterValue(kSeries, series.packed());
-    setAutoUpgraded(true);
-  }
+  series.upgrade(*this, kSeries);
   if (getParameterValue(kChartType) == kFormerBar) {
     applyParameterValue(kChartType, kBar);
     setAutoUpgraded(true);

@@ -2,6 +2,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/specialised/ExpressionEvaluatorCfg.h>
 #include <transform/specialised/Formula.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {
@@ -9,14 +10,6 @@ namespace {
 const QLatin1String kExpression("EXPRESSION");
 const QLatin1String kResultType("FLOAT");
 const QLatin1Char kPartSeparator(';');
-
-bool isUnset(const QString& value) {
-  return value.isEmpty() || value == kUnusedValue;
-}
-
-bool refersToMacros(const QString& value) {
-  return value.contains(kMacroOpen) || value.contains(kDeferredOpen);
-}
 
 // The formulas that a value is made of, encoded.
 QStringList formulasOf(const QString& value) {
@@ -28,9 +21,7 @@ QStringList formulasOf(const QString& value) {
 }  // namespace
 
 TransformerCfg* ExpressionEvaluatorCfg::getCopy() const {
-  auto copy = std::make_unique<ExpressionEvaluatorCfg>();
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this);
 }
 
 bool ExpressionEvaluatorCfg::validateParameter(const QString& parameter, QString& message) const {
@@ -38,7 +29,7 @@ bool ExpressionEvaluatorCfg::validateParameter(const QString& parameter, QString
     return false;
   }
   const QString value = getParameterValue(parameter, UnpackLevel::Resolved);
-  if (parameter != kExpression || isUnset(value)) {
+  if (parameter != kExpression || isUnsetValue(value)) {
     return true;
   }
   for (const QString& part : formulasOf(value)) {
@@ -55,14 +46,14 @@ QString ExpressionEvaluatorCfg::getParameterValueForMappingFile(const QString& n
                                                                 const TransformParamCfg* parameter,
                                                                 MFBuffer& buffer) const {
   const QString value = stripBasicStringInfo(getParameterValue(name));
-  return name == kExpression && !isUnset(value)
+  return name == kExpression && !isUnsetValue(value)
              ? wrapInEvaluateExpression(value, name, kResultType, true)
              : TransformerCfg::getParameterValueForMappingFile(name, parameter, buffer);
 }
 
 void ExpressionEvaluatorCfg::autoUpgradeTransformer() {
   const QString value = getParameterValue(kExpression);
-  if (isUnset(value) || refersToMacros(value) || value.startsWith(kConditionalPrefix)) {
+  if (isUnsetValue(value) || refersToMacros(value) || value.startsWith(kConditionalPrefix)) {
     return;
   }
   const QString text = QORXWwjdDecode(value);

@@ -2,6 +2,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/WorkspaceParameterDirectory.h>
 #include <transform/specialised/ParameterFetcherTransformerCfg.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
@@ -49,9 +50,7 @@ bool isWrappedReference(const QString& entry) {
 }  // namespace
 
 TransformerCfg* ParameterFetcherTransformerCfg::getCopy() const {
-  auto copy = std::make_unique<ParameterFetcherTransformerCfg>();
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this);
 }
 
 QString ParameterFetcherTransformerCfg::attrListSeparator() const {

@@ -4,7 +4,7 @@
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/ParameterTable.h>
-
+#include <transform/specialised/SpecialisedValues.h>
 
 ParameterTable::ParameterTable(const TransformerCfg& cfg, const QString& parameter, int columns,
                                UnpackLevel level)
@@ -20,7 +20,7 @@ ParameterTable::ParameterTable(const TransformParamCfg* record, const QString& v
 void ParameterTable::read(const TransformParamCfg* record, const QString& value) {
   m_value = value;
   if (!record || !record->isTable() || static_cast<int>(record->members().members().size()) != m_columns ||
-      value.isEmpty() || value == kUnusedValue || value.startsWith(kConditionalPrefix)) {
+      isUnsetValue(value) || value.startsWith(kConditionalPrefix)) {
     return;
   }
   m_record = record;
@@ -73,4 +73,11 @@ void ParameterTable::replaceAttributeMarks() {
 
 QString ParameterTable::packed() const {
   return m_isChanged ? QORXListToSdfString(m_cells, m_record->members().separator()) : m_value;
+}
+
+void ParameterTable::upgrade(TransformerCfg& cfg, const QString& parameter) const {
+  if (m_isChanged) {
+    cfg.applyParameterValue(parameter, packed());
+    cfg.setAutoUpgraded(true);
+  }
 }

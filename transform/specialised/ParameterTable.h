@@ -34,7 +34,8 @@ class ParameterTable {
   void clearUnused(const IsUsed& isUsed);
   // "&NAME" becomes the name, or a reference to the attribute, as the column takes it.
   void replaceAttributeMarks();
-  bool isChanged() const { return m_isChanged; }
+  // Puts changed cells into the parameter, which counts as upgraded then.
+  void upgrade(TransformerCfg& cfg, const QString& parameter) const;
   // As it was given, unless cells have changed.
   QString packed() const;
 

@@ -3,6 +3,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/specialised/ParameterTable.h>
 #include <transform/specialised/ReportGeneratorTransformerCfg.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 
@@ -55,17 +56,10 @@ ParameterTable::IsUsed usedCells(const ParameterTable& parts) {
   };
 }
 
-bool isOpen(const QString& value) {
-  return ExpressionWriter::holdsReference(value) || value.contains(kMacroOpen) ||
-         value.contains(kDeferredOpen) || value.startsWith(kConditionalPrefix);
-}
-
 }  // namespace
 
 TransformerCfg* ReportGeneratorTransformerCfg::getCopy() const {
-  auto copy = std::make_unique<ReportGeneratorTransformerCfg>();
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this);
 }
 
 QStringList ReportGeneratorTransformerCfg::getAttributeNamesInValue(const QString& parameter) const {
@@ -88,7 +82,7 @@ bool ReportGeneratorTransformerCfg::validateParts(QString& message) const {
       return false;
     };
     const QString kind = parts.cell(row, kKind);
-    if (isOpen(kind)) {
+    if (isOpenValue(kind)) {
       continue;
     }
     const Part* part = findPart(kind);
@@ -103,7 +97,7 @@ bool ReportGeneratorTransformerCfg::validateParts(QString& message) const {
       }
     }
     const QString address = QORXWwjdDecode(content);
-    if (part->isAddress && !isOpen(content) && !QUrl(address, QUrl::StrictMode).isValid()) {
+    if (part->isAddress && !isOpenValue(content) && !QUrl(address, QUrl::StrictMode).isValid()) {
       return refuse(kNoAddressMessage, address);
     }
   }
@@ -130,8 +124,5 @@ void ReportGeneratorTransformerCfg::autoUpgradeTransformer() {
       parts.setCell(row, kKind, part->name);
     }
   }
-  if (parts.isChanged()) {
-    applyParameterValue(kParts, parts.packed());
-    setAutoUpgraded(true);
-  }
+  parts.upgrade(*this, kParts);
 }

@@ -3,6 +3,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/specialised/Formula.h>
 #include <transform/specialised/ParameterTable.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
@@ -59,18 +60,10 @@ const Comparison* findComparison(const QString& text) {
   return found == std::end(comparisons) ? nullptr : found;
 }
 
-// A value that only the mapping file or the feature gives.
-bool isOpen(const QString& text) {
-  return text.contains(kMacroOpen) || text.contains(kDeferredOpen) ||
-         ExpressionWriter::holdsReference(text) || text.startsWith(kConditionalPrefix);
-}
-
 }  // namespace
 
 TransformerCfg* TesterTransformerCfg::getCopy() const {
-  auto copy = std::make_unique<TesterTransformerCfg>();
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this);
 }
 
 bool TesterTransformerCfg::parameterSupportsAttributeReference(const QString& parameter) const {
@@ -113,7 +106,7 @@ bool TesterTransformerCfg::validateTests(QString& message) const {
   for (int row = 0; row < tests.rowCount(); ++row) {
     const QString name = tests.cell(row, kComparison);
     const QString right = tests.cell(row, kRight);
-    if (isOpen(name)) {
+    if (isOpenValue(name)) {
       continue;
     }
     const Comparison* comparison = findComparison(name);
@@ -126,7 +119,7 @@ bool TesterTransformerCfg::validateTests(QString& message) const {
       return false;
     }
     const QString pattern = QORXWwjdDecode(right);
-    if (comparison->name == kMatches && !isOpen(right) && !QRegularExpression(pattern).isValid()) {
+    if (comparison->name == kMatches && !isOpenValue(right) && !QRegularExpression(pattern).isValid()) {
       message = TransformResString(kBadPatternMessage, pattern);
       return false;
     }
@@ -141,11 +134,11 @@ bool TesterTransformerCfg::validateExpression(QString& message) const {
     return true;
   }
   const QString value = getParameterValue(kExpression, UnpackLevel::Resolved);
-  if (value.isEmpty() || value == kUnusedValue) {
+  if (isUnsetValue(value)) {
     message = TransformResString(kMissingValueMessage, getParameterPrompt(kExpression));
     return false;
   }
-  if (value.contains(kMacroOpen) || value.contains(kDeferredOpen)) {
+  if (refersToMacros(value)) {
     return true;
   }
   const Formula formula(QORXWwjdDecode(value));
@@ -199,8 +192,5 @@ void TesterTransformerCfg::autoUpgradeTransformer() {
       tests.setCell(row, kComparison, comparison->name);
     }
   }
-  if (tests.isChanged()) {
-    applyParameterValue(kTests, tests.packed());
-    setAutoUpgraded(true);
-  }
+  tests.upgrade(*this, kTests);
 }

@@ -3,6 +3,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/specialised/FactoryOption.h>
 #include <transform/specialised/ParameterTable.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/specialised/ValueMapperTransformerCfg.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
@@ -29,9 +30,7 @@ QString word(const QString& cell) {
 }  // namespace
 
 TransformerCfg* ValueMapperTransformerCfg::getCopy() const {
-  auto copy = std::make_unique<ValueMapperTransformerCfg>();
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this);
 }
 
 bool ValueMapperTransformerCfg::looksUpRight() const {
@@ -87,10 +86,7 @@ bool ValueMapperTransformerCfg::validateParameter(const QString& parameter, QStr
 void ValueMapperTransformerCfg::autoUpgradeTransformer() {
   ParameterTable mapping(*this, kMapping, kColumns);
   mapping.replaceAttributeMarks();
-  if (mapping.isChanged()) {
-    applyParameterValue(kMapping, mapping.packed());
-    setAutoUpgraded(true);
-  }
+  mapping.upgrade(*this, kMapping);
 }
 
 bool ValueMapperTransformerCfg::doInstantiate(MFBuffer& buffer, bool inlineFlag) {

@@ -2,6 +2,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/specialised/FactoryOption.h>
 #include <transform/specialised/ParameterTable.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/specialised/TemplateText.h>
 #include <transform/specialised/XMLTemplaterTransformerCfg.h>
 #include <transform/text/MessageStrings.h>
@@ -85,9 +86,7 @@ QString findCircle(const QHash<QString, QStringList>& inserted, const QStringLis
 }  // namespace
 
 TransformerCfg* XMLTemplaterTransformerCfg::getCopy() const {
-  auto copy = std::make_unique<XMLTemplaterTransformerCfg>(m_isJson);
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this, m_isJson);
 }
 
 void XMLTemplaterTransformerCfg::getInputTags(QStringList& tags, QHash<QString, QString>* shownNames) const {
@@ -110,7 +109,7 @@ bool XMLTemplaterTransformerCfg::validateParameter(const QString& parameter, QSt
 
 bool XMLTemplaterTransformerCfg::validateRoot(QString& message) const {
   const QString value = getParameterValue(kRootTemplate, UnpackLevel::Resolved);
-  if (value.isEmpty() || value == kUnusedValue || value.startsWith(kConditionalPrefix)) {
+  if (isUnsetValue(value) || value.startsWith(kConditionalPrefix)) {
     return true;
   }
   const TemplateText text(value, TemplateText::languageOf(m_isJson));

@@ -2,6 +2,7 @@
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/Keywords.h>
 #include <transform/specialised/ParameterTable.h>
+#include <transform/specialised/SpecialisedValues.h>
 #include <transform/specialised/TemplateText.h>
 #include <transform/specialised/XMLUpdaterTransformerCfg.h>
 #include <transform/text/MessageStrings.h>
@@ -21,12 +22,6 @@ const QLatin1String kTextKind("TEXT");
 const QLatin1String kJsonRoot("$");
 
 enum Column { kPath, kAction, kValue, kKind, kColumns };
-
-// Only the feature or the mapping file tells what it is.
-bool isOpen(const QString& value) {
-  return ExpressionWriter::holdsReference(value) || value.contains(kMacroOpen) ||
-         value.contains(kDeferredOpen) || value.startsWith(kConditionalPrefix);
-}
 
 // Steps joined by "/", or by "." in JSON, with conditions in square brackets. In JSON a step may be a bracket
 // alone.
@@ -77,9 +72,7 @@ QString fromRoot(const QString& encodedPath, bool isJson) {
 }  // namespace
 
 TransformerCfg* XMLUpdaterTransformerCfg::getCopy() const {
-  auto copy = std::make_unique<XMLUpdaterTransformerCfg>(m_isJson);
-  copy->assign(this);
-  return copy.release();
+  return copyAs(*this, m_isJson);
 }
 
 bool XMLUpdaterTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
@@ -91,7 +84,7 @@ bool XMLUpdaterTransformerCfg::validateParameter(const QString& parameter, QStri
 bool XMLUpdaterTransformerCfg::validateDocument(QString& message) const {
   const QString value = getParameterValue(kDocument, UnpackLevel::Resolved);
   int line = 0;
-  if (value.isEmpty() || value == kUnusedValue || isOpen(value) ||
+  if (isUnsetValue(value) || isOpenValue(value) ||
       TemplateText(value, TemplateText::languageOf(m_isJson))
           .isWellFormed(TemplateText::Extent::Document, line)) {
     return true;
@@ -109,7 +102,7 @@ bool XMLUpdaterTransformerCfg::validateUpdates(QString& message) const {
       return false;
     };
     const QString path = updates.cell(row, kPath);
-    if (!isOpen(path) && !isPath(fromRoot(path, m_isJson), m_isJson)) {
+    if (!isOpenValue(path) && !isPath(fromRoot(path, m_isJson), m_isJson)) {
       return refuse(kBadPathMessage, QORXWwjdDecode(path));
     }
     if (updates.cell(row, kAction) == kRemove) {
@@ -139,7 +132,7 @@ QString XMLUpdaterTransformerCfg::getParameterValueForMappingFile(const QString&
   }
   for (int row = 0; row < updates.rowCount(); ++row) {
     const QString path = updates.cell(row, kPath);
-    if (!isOpen(path)) {
+    if (!isOpenValue(path)) {
       updates.setCell(row, kPath, QORXWwjdEncode(fromRoot(path, m_isJson)));
     }
     if (updates.cell(row, kAction) == kRemove) {
