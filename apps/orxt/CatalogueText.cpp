@@ -57,9 +57,9 @@ std::vector<std::unique_ptr<TransformerCfg>> offeredTransformers(TransformerMgr&
   return result;
 }
 
-QString spellingHint(const QString& name, const QStringList& candidates) {
+QString orNearest(const QString& name, const QStringList& candidates, const QString& otherwise) {
   const QString nearest = NearestSpelling().find(name, candidates);
-  return nearest.isEmpty() ? QString() : QStringLiteral("; did you mean '%1'?").arg(nearest);
+  return nearest.isEmpty() ? otherwise : QStringLiteral("did you mean '%1'?").arg(nearest);
 }
 
 std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const QString& name, int version,
@@ -84,9 +84,12 @@ std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const 
     return nullptr;
   }
   QStringList names = registry.transformerNames() + registry.getVisibleTransformerAliases();
-  for (const auto& transformer : offeredTransformers(registry, true))
+  for (const auto& transformer : offeredTransformers(registry, true)) {
+    if (transformer->getLocalizedName() == name && transformer->getName() != name)
+      return findTransformer(registry, transformer->getName(), version, error);
     names << transformer->getLocalizedName();
-  error = QStringLiteral("there is no transformer '%1'").arg(name) + spellingHint(name, names) +
-          QLatin1String("; `orxt transformers list` names them all");
+  }
+  error = QStringLiteral("there is no transformer '%1'; %2")
+              .arg(name, orNearest(name, names, QStringLiteral("`orxt transformers list` names them all")));
   return nullptr;
 }

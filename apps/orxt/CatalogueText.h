@@ -20,12 +20,13 @@ QJsonObject summaryAsJson(const TransformerCfg& transformer);
 // Shown name and first sentence of each, aligned.
 void printSummaries(const std::vector<const TransformerCfg*>& transformers, Console& console);
 
-// Copies of all transformers, newest version each, by name; `all` takes those in that are no longer offered.
+// Copies of all transformers, newest version each, by name; `all` takes those in that are no longer
+// offered.
 std::vector<std::unique_ptr<TransformerCfg>> offeredTransformers(TransformerMgr& registry, bool all);
 
-// A copy of the version asked for. Null when there is none: `error` then says so, and which name or version
-// was probably meant.
+// A copy of the version asked for, by name, alias or shown name. Null when there is none: `error` then says
+// so, and which name or version was probably meant.
 std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const QString& name, int version,
                                                 QString& error);
-// "; did you mean ...?" when one of the candidates comes close to the name; else empty.
-QString spellingHint(const QString& name, const QStringList& candidates);
+// "did you mean ...?" when one of the candidates comes close to the name, else the other text.
+QString orNearest(const QString& name, const QStringList& candidates, const QString& otherwise);

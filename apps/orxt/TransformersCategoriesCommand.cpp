@@ -1,4 +1,5 @@
 #include <apps/orxt/Console.h>
+#include <apps/orxt/SearchText.h>
 #include <apps/orxt/TextTable.h>
 #include <apps/orxt/TransformersCategoriesCommand.h>
 #include <transform/registry/TransformerMgr.h>
@@ -7,6 +8,8 @@
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
+
+#include <algorithm>
 
 namespace {
 
@@ -25,7 +28,10 @@ void TransformersCategoriesCommand::declare(CLI::App& app) {
 ExitStatus TransformersCategoriesCommand::run(Console& console) {
   const TransformerMgr& registry = m_definitions.load(console);
   QStringList categories = registry.getCategories();
-  categories.sort();
+  std::sort(categories.begin(), categories.end(), [&](const QString& left, const QString& right) {
+    return SearchText::folded(registry.getLocalizedCategoryName(left)) <
+           SearchText::folded(registry.getLocalizedCategoryName(right));
+  });
   const auto descriptionOf = [&](const QString& category) {
     QStringList lines;
     registry.getCategoryDesc(category, lines);

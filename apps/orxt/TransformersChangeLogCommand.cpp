@@ -37,7 +37,9 @@ QByteArray changesAsJson(const std::vector<TransformerMgr::VersionChanges>& vers
 TransformersChangeLogCommand::TransformersChangeLogCommand() : Command(kFacts) {}
 
 void TransformersChangeLogCommand::declare(CLI::App& app) {
-  app.add_option("name", m_name, "Name or alias of the transformer")->type_name("NAME")->required();
+  app.add_option("name", m_name, "Name, alias or shown name of the transformer")
+      ->type_name("NAME")
+      ->required();
   app.add_option("--from", m_fromVersion, "Only what came after this version; without it all versions")
       ->type_name("VERSION")
       ->check(CLI::Range(0, kHighestVersion));

@@ -1,5 +1,6 @@
 #include <apps/orxt/CatalogueText.h>
 #include <apps/orxt/Console.h>
+#include <apps/orxt/SearchText.h>
 #include <apps/orxt/TransformersListCommand.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
@@ -35,9 +36,10 @@ ExitStatus TransformersListCommand::run(Console& console) {
       QStringList shown;
       for (const QString& known : registry.getCategories())
         shown << registry.getLocalizedCategoryName(known);
-      console.fail(QStringLiteral("there is no category '%1'%2; there are: %3")
-                       .arg(category, spellingHint(category, shown + registry.getCategories()),
-                            shown.join(QLatin1String(", "))));
+      console.fail(
+          QStringLiteral("there is no category '%1'; %2")
+              .arg(category, orNearest(category, shown + registry.getCategories(),
+                                       QLatin1String("there are: ") + shown.join(QLatin1String(", ")))));
       return kExitRefused;
     }
     wanted = registry.getCategoryTransformers(category);
@@ -59,6 +61,10 @@ ExitStatus TransformersListCommand::run(Console& console) {
   std::vector<const TransformerCfg*> transformers;
   for (const auto& cfg : found)
     transformers.push_back(cfg.get());
+  // By the names that are shown, letters with and without accents alike.
+  std::stable_sort(transformers.begin(), transformers.end(), [](const auto* left, const auto* right) {
+    return SearchText::folded(left->getLocalizedName()) < SearchText::folded(right->getLocalizedName());
+  });
   printSummaries(transformers, console);
   return kExitDone;
 }

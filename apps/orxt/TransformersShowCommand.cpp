@@ -68,7 +68,9 @@ QString typeAsText(const TransformParamCfg& parameter) {
 TransformersShowCommand::TransformersShowCommand() : Command(kFacts) {}
 
 void TransformersShowCommand::declare(CLI::App& app) {
-  app.add_option("name", m_name, "Name or alias of the transformer")->type_name("NAME")->required();
+  app.add_option("name", m_name, "Name, alias or shown name of the transformer")
+      ->type_name("NAME")
+      ->required();
   app.add_option("--version", m_version, "Version number, newest or oldest")
       ->type_name("VERSION")
       ->check(CLI::IsMember({"newest", "oldest"}) | CLI::NonNegativeNumber)

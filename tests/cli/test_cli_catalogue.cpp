@@ -114,6 +114,7 @@ TEST_F(Catalogue, SaysWhereItDoesNotAnswerAsAsked) {
       {{"list", "--category", "Rodent"}, 1, "did you mean 'Rodents'?"},
       {{"show", "QuokaFeder"}, 1, "did you mean 'QuokkaFeeder'?"},
       {{"show", "Geometriepufer", "--lang", "de"}, 1, "did you mean 'Geometriepuffer'?"},
+      {{"show", "Geometriepuffer", "--lang", "de"}, 0, ""},
       {{"show", "QuokkaFriend", "--version", "2"}, 1, "no version 2; the newest is 1"},
       {{"show", "Quokka", "--version", "2"}, 1, "there are: 1, 3"},
       {{"changelog", "Quoka"}, 1, "did you mean 'Quokka'?"},
@@ -268,31 +269,36 @@ QJsonObject defaultsOf(const QJsonObject& schema) {
 }
 
 TEST(CatalogueSchema, EveryShippedDefaultFits) {
-  const QStringList names = namesIn(orxt({"transformers", "list", "--all", "--json"}));
-  EXPECT_GE(names.size(), 20);
+  std::vector<QStringList> asked;
+  for (const QString& name : namesIn(orxt({"transformers", "list", "--all", "--json"}))) {
+    const Outcome shown = orxt({"transformers", "show", name, "--json"});
+    for (const QJsonValue& version :
+         QJsonDocument::fromJson(shown.out.toUtf8()).object().value("versions").toArray())
+      asked.push_back(
+          {"transformers", "show", name, "--schema", "--version", QString::number(version.toInt())});
+  }
+  EXPECT_GE(asked.size(), 50u);
   int defaults = 0;
-  for (const QString& name : names) {
-    const Outcome run = orxt({"transformers", "show", name, "--schema"});
-    const QJsonObject schema = QJsonDocument::fromJson(run.out.toUtf8()).object();
-    EXPECT_EQ(schema.value("$schema").toString(), QString("https://json-schema.org/draft/2020-12/schema"))
-        << name.toStdString();
+  for (const QStringList& arguments : asked) {
+    SCOPED_TRACE(arguments.join(' ').toStdString());
+    const QJsonObject schema = QJsonDocument::fromJson(orxt(arguments).out.toUtf8()).object();
+    EXPECT_EQ(schema.value("$schema").toString(), QString("https://json-schema.org/draft/2020-12/schema"));
     QJsonObject values = defaultsOf(schema);
     defaults += values.size();
     const QJsonArray required = schema.value("required").toArray();
-    EXPECT_EQ(misfit(schema, values, schema), required.isEmpty() ? QString() : QString("required"))
-        << name.toStdString();
+    EXPECT_EQ(misfit(schema, values, schema), required.isEmpty() ? QString() : QString("required"));
     // With something for those that must be given, the rest fits.
     for (const QJsonValue& must : required) {
-      EXPECT_FALSE(values.contains(must.toString())) << name.toStdString();
+      EXPECT_FALSE(values.contains(must.toString()));
       const QJsonObject property = schema.value("properties").toObject().value(must.toString()).toObject();
       const bool isRows = property.value("items").toObject().value("type") == "object";
       values.insert(must.toString(), property.value("type") != "array" ? QJsonValue("$(GIVEN)")
                                      : isRows                          ? QJsonValue(QJsonArray{QJsonObject()})
                                                                        : QJsonValue(QJsonArray{"given"}));
     }
-    EXPECT_EQ(misfit(schema, values, schema), QString()) << name.toStdString();
+    EXPECT_EQ(misfit(schema, values, schema), QString());
     values.insert("NO_SUCH_PARAMETER", 1);
-    EXPECT_EQ(misfit(schema, values, schema), QString("additionalProperties")) << name.toStdString();
+    EXPECT_EQ(misfit(schema, values, schema), QString("additionalProperties"));
   }
   EXPECT_GE(defaults, 50);
 }
