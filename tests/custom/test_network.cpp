@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <random>
 
 namespace {
 
@@ -103,6 +104,66 @@ TEST(Network, OrdersAncestors) {
   ASSERT_EQ(order.cycles.size(), 1U);
   EXPECT_EQ(order.cycles.front().begin, 2U);
   EXPECT_EQ(order.cycles.front().end, 4U);
+}
+
+// Against the plain reading of the rule: of the nodes and cycles whose feeders are all placed, the one that
+// stands first in the list of ancestors is next.
+TEST(Network, OrdersRandomGraphs) {
+  constexpr int kMostNodes = 10;
+  std::mt19937 random(1);
+  for (int graph = 0; graph < 300; ++graph) {
+    const int count = 2 + static_cast<int>(random() % (kMostNodes - 1));
+    const auto anyNode = [&] { return static_cast<int>(random() % static_cast<unsigned>(count)); };
+    OpenNetwork network;
+    network.addOutput(QStringLiteral("O"), 0, kOutgoingArriving, {}, 0);
+    for (int number = 1; number < count; ++number)
+      network.addLoop(QString::number(number), number);
+    std::vector<std::vector<bool>> feeds(kMostNodes, std::vector<bool>(kMostNodes));
+    for (int links = static_cast<int>(random() % 20); links >= 0; --links) {
+      const int from = anyNode();
+      const int to = anyNode();
+      network.addLink(from, QStringLiteral("P"), to, QString::number(random() % 3));
+      feeds[from][to] = true;
+    }
+    std::vector<std::vector<bool>> reaches = feeds;
+    for (int by = 0; by < count; ++by) {
+      for (int from = 0; from < count; ++from) {
+        for (int to = 0; to < count; ++to)
+          reaches[from][to] = reaches[from][to] || (reaches[from][by] && reaches[by][to]);
+      }
+    }
+
+    std::vector<SubDocNetworkObj*> ancestors;
+    OpenNetwork::NodeSet set;
+    OpenNetwork::createAncestorList(network.nodeByNumber(0), ancestors, set);
+    std::vector<SubDocNetworkObj*> expected;
+    std::vector<bool> isPlaced(kMostNodes);
+    std::size_t cycles = 0;
+    const auto isOneCycle = [&](int left, int right) { return reaches[left][right] && reaches[right][left]; };
+    for (auto next = ancestors.begin(); next != ancestors.end();) {
+      const int number = (*next)->number();
+      const bool isReady =
+          !isPlaced[number] && std::all_of(ancestors.begin(), ancestors.end(), [&](auto* other) {
+            return isPlaced[other->number()] || !reaches[other->number()][number] ||
+                   isOneCycle(other->number(), number);
+          });
+      if (!isReady) {
+        ++next;
+        continue;
+      }
+      cycles += reaches[number][number] ? 1 : 0;
+      for (SubDocNetworkObj* member : ancestors) {
+        if (member->number() == number || isOneCycle(member->number(), number)) {
+          expected.push_back(member);
+          isPlaced[member->number()] = true;
+        }
+      }
+      next = ancestors.begin();
+    }
+    const NetworkOrder order = NetworkSorter(network.nodes().size()).sort(*network.nodeByNumber(0));
+    EXPECT_EQ(order.nodes, expected) << graph;
+    EXPECT_EQ(order.cycles.size(), cycles) << graph;
+  }
 }
 
 // A row of nodes whose links run both ways: against the order, an attribute gets on by one node a round.
