@@ -102,6 +102,9 @@ TEST(CustomTransformerFiles, RefusedOnesAreListed) {
   const QString second = customFile(folders, "B.ort", {{2, 1}});
   const QString newer = customFile(folders, "C.ort", {{9, 99999}});
   TransformerMgr& registry = folders.load();
+  // Whoever asks again is refused again, for the same reason.
+  registry.reloadCustomTransformers();
+  EXPECT_EQ(versionOf(registry, 9), -1);
   ASSERT_EQ(registry.ignoredTransformers().size(), 2u);
   const TransformerMgr::IgnoredTransformer& duplicate = registry.ignoredTransformers().front();
   EXPECT_EQ(duplicate.path, second);

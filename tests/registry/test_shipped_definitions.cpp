@@ -366,6 +366,9 @@ TEST_P(ShippedDefinitions, AnswerEveryQuestion) {
       }
     }
   }
+  ORXStringArray categories;
+  manager.getCategories(categories);
+  EXPECT_EQ(ORXToQStringList(categories), manager.getCategories());
   for (const QString& category : manager.getCategories()) {
     QStringList lines;
     EXPECT_TRUE(manager.getCategoryDesc(category, lines)) << category.toStdString();

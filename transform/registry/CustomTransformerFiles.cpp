@@ -94,7 +94,12 @@ ExternalTransformerNetwork* CustomTransformerFiles::keep(
 
 void CustomTransformerFiles::reset() {
   m_files.clear();
-  m_networks.erase(std::remove_if(m_networks.begin(), m_networks.end(),
-                                  [](const auto& network) { return !network->getIsInUse(); }),
-                   m_networks.end());
+  // A network that goes may have held the last instances of another.
+  std::size_t before = 0;
+  do {
+    before = m_networks.size();
+    m_networks.erase(std::remove_if(m_networks.begin(), m_networks.end(),
+                                    [](const auto& network) { return !network->getIsInUse(); }),
+                     m_networks.end());
+  } while (m_networks.size() < before);
 }

@@ -168,13 +168,13 @@ void TransformerMgr::loadDefinitionFile(const QString& path, bool onlyCustomTran
 void TransformerMgr::loadCustomTransformer(const QString& path, int version, bool replaces) {
   CustomTransformerFiles::Opened opened = CustomTransformerFiles::open(path, version, this);
   if (opened.needsNewerBuild)
-    m_ignored.push_back({path, opened.name, opened.version, QString(), false});
+    noteIgnored({path, opened.name, opened.version, QString(), false});
   if (!opened.network)
     return;
   const TransformerCfg* kept = m_prototypes.find(opened.name, opened.version);
   if (kept && !replaces) {
     if (kept->getFileName() != path)
-      m_ignored.push_back({path, opened.name, opened.version, kept->getFileName(), true});
+      noteIgnored({path, opened.name, opened.version, kept->getFileName(), true});
     return;
   }
   auto prototype = std::make_unique<CompoundTransformerCfg>(m_customFiles->keep(std::move(opened.network)),
@@ -185,6 +185,15 @@ void TransformerMgr::loadCustomTransformer(const QString& path, int version, boo
   const bool isNewest = m_prototypes.add(std::move(prototype));
   if (isNewest || m_customFiles->fileOf(opened.name).isEmpty())
     m_customFiles->noteFile(opened.name, path);
+}
+
+void TransformerMgr::noteIgnored(const IgnoredTransformer& ignored) {
+  const bool isNoted = std::any_of(m_ignored.begin(), m_ignored.end(), [&](const IgnoredTransformer& other) {
+    return other.path == ignored.path && other.name == ignored.name && other.version == ignored.version &&
+           other.isDuplicate == ignored.isDuplicate;
+  });
+  if (!isNoted)
+    m_ignored.push_back(ignored);
 }
 
 void TransformerMgr::loadOnDemand(const QString& name, int version) {

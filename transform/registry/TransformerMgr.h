@@ -129,6 +129,8 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   void loadDefinitionFile(const QString& path, bool onlyCustomTransformers);
   // `replaces` lets it take the place of a definition of the same name and version.
   void loadCustomTransformer(const QString& path, int version, bool replaces);
+  // Each refusal is listed once, however often it is met.
+  void noteIgnored(const IgnoredTransformer& ignored);
   // Reads a further version of a custom transformer whose file is known.
   void loadOnDemand(const QString& name, int version);
   void loadCompanionFile(const QString& path);
