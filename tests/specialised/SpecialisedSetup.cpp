@@ -1,6 +1,7 @@
 #include "SpecialisedSetup.h"
 
 #include <platform/session/ORXSession.h>
+#include <transform/core/MacroText.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 #include <transform/text/MFBuffer.h>
@@ -58,6 +59,46 @@ std::unique_ptr<TransformerCfg> makeShipped(const char* name, int version) {
   return cfg;
 }
 
+QString storedForm(const TransformerCfg& cfg, const QString& parameter, const QString& text) {
+  const TransformParamCfg* record = cfg.getParameterByMacroName(parameter);
+  const auto stored = [](const GUIType& type, const QString& part) {
+    const bool isAsItStands = part == "\"\"" || part == "<Unused>" || part.startsWith('&');
+    return part.startsWith('`')                     ? part.mid(1)
+           : type.valueIsEncoded() && !isAsItStands ? encodeAroundReferences(part)
+                                                    : part;
+  };
+  if (!record || text.startsWith("ORX_") || !record->isTable()) {
+    return record && !text.startsWith("ORX_") ? stored(*record, text) : text;
+  }
+  QStringList cells = text.split(';');
+  const std::vector<GUIType>& columns = record->members().members();
+  for (int i = 0; i < cells.size(); ++i) {
+    cells[i] = stored(columns[static_cast<std::size_t>(i) % columns.size()], cells[i]);
+  }
+  return cells.join(';');
+}
+
+QString applySettings(TransformerCfg& cfg, const char* settings) {
+  QString parameter;
+  for (const QString& setting : QString::fromUtf8(settings).split(" | ")) {
+    parameter = setting.section('=', 0, 0);
+    EXPECT_TRUE(cfg.setParameterValue(parameter, storedForm(cfg, parameter, setting.section('=', 1)), false));
+  }
+  return parameter;
+}
+
+std::unique_ptr<TransformerCfg> makeShippedWith(const char* name, const char* settings, QString* last) {
+  auto cfg = makeShipped(name);
+  QStringList inputs;
+  cfg->getInputTags(inputs);
+  cfg->setInputAttributes(inputs.value(0), {"a", "b", "id", "name"});
+  const QString parameter = applySettings(*cfg, settings);
+  if (last) {
+    *last = parameter;
+  }
+  return cfg;
+}
+
 QStringList statementsOf(TransformerCfg& cfg) {
   TextBuffer buffer;
   EXPECT_TRUE(cfg.instantiate(buffer, QString()));
@@ -73,15 +114,14 @@ bool isWritten(TransformerCfg& cfg) {
   return cfg.instantiate(buffer, QString());
 }
 
-QString writtenValue(const TransformerCfg& cfg, const char* parameter) {
+QString writtenValue(const TransformerCfg& cfg, const QString& parameter) {
   TextBuffer buffer;
-  const QString name = QString::fromLatin1(parameter);
-  return cfg.getParameterValueForMappingFile(name, cfg.getParameterByMacroName(name), buffer);
+  return cfg.getParameterValueForMappingFile(parameter, cfg.getParameterByMacroName(parameter), buffer);
 }
 
-QString refusalOf(const TransformerCfg& cfg, const char* parameter) {
+QString refusalOf(const TransformerCfg& cfg, const QString& parameter) {
   QString message;
-  const bool isAccepted = cfg.validateParameter(QString::fromLatin1(parameter), message);
+  const bool isAccepted = cfg.validateParameter(parameter, message);
   EXPECT_TRUE(!isAccepted || message.isEmpty()) << message.toStdString();
   return isAccepted ? QString() : message.isEmpty() ? QStringLiteral("?") : message;
 }

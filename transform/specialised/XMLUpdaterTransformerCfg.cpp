@@ -54,7 +54,7 @@ bool isPath(const QString& path, bool isJson) {
       return false;
     }
   }
-  return depth == 0 && stepLength > 0 && !path.contains(QLatin1String("///"));
+  return depth == 0 && stepLength > 0 && (isJson || !path.contains(QLatin1String("///")));
 }
 
 // In JSON "$" stands for the root, which every path begins at.
