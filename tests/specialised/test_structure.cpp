@@ -62,6 +62,7 @@ TEST(Statements, RowsBecomeOptions) {
   for (const Case& c : std::vector<Case>{
            {"AttributeValueMapper", "MAPPING=x y;b;c;", {"MAP x<space>y b", "MAP c \"\""}},
            {"AttributeValueMapper", "DIRECTION=BACKWARD | MAPPING=a;b;c;d", {"MAP b a", "MAP d c"}},
+           {"AttributeValueMapper", "MAPPING=`a b;`(c", {"MAP \"a b\" \"(c\""}},
            {"AttributeValueMapper", "MAPPING=a;@Value(a)", {"MAP a " + evaluated}},
            {"XMLTemplater",
             "SUB_TEMPLATES=P;@Value(a);Q;-",
@@ -78,6 +79,7 @@ TEST(Statements, RowsBecomeOptions) {
     EXPECT_EQ(options, c.options) << c.settings;
   }
   EXPECT_FALSE(isWritten(*makeShippedWith("AttributeValueMapper", "MAPPING=a;`$[x")));
+  EXPECT_FALSE(isWritten(*makeShippedWith("AttributeValueMapper", "MAPPING=a;`x\ry")));
   EXPECT_TRUE(isWritten(*makeShippedWith("AttributeValueMapper", "MAPPING=a;`$[x]")));
 }
 

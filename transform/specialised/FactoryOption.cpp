@@ -1,4 +1,5 @@
 #include <transform/core/Keywords.h>
+#include <transform/core/LookupChecks.h>
 #include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/FactoryOption.h>
@@ -16,7 +17,7 @@ bool writeFactoryOption(const TransformerCfg& cfg, const QString& key, const QSt
   const QString name =
       encodeAroundReferences(stripBasicStringInfo(cfg.getParameterValue(kIdentifierParameter)));
   const QString statement = kFactoryOption + name + QLatin1Char(' ') + key + QLatin1Char(' ') + value;
-  if (!MFBuffer::closesDeferredMacros(statement) || statement.contains(QLatin1Char('\n')) ||
+  if (!MFBuffer::closesDeferredMacros(statement) || !lookup_checks::isOneLine(statement) ||
       statement.endsWith(QLatin1Char('\\'))) {
     return false;
   }

@@ -19,12 +19,14 @@ const QLatin1String kMapping("MAPPING");
 const QLatin1String kDirection("DIRECTION");
 const QLatin1String kBackward("BACKWARD");
 const QLatin1String kMapKey("MAP");
+const QLatin1String kCall("@EvaluateExpression(");
 
 enum Column { kLeft, kRight, kColumns };
 
-// As a word of a statement.
+// As a word of a statement. Cells are encoded, or calls of functions, unless they were not stored as they
+// should be.
 QString word(const QString& cell) {
-  return cell.isEmpty() ? quotifyStringForMF(cell) : cell;
+  return cell.startsWith(kCall) ? cell : quotifyStringForMF(cell);
 }
 
 }  // namespace
