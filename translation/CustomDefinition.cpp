@@ -65,18 +65,26 @@ QString CustomDefinition::innerName(const QString& name) const {
   return m_reference + QLatin1Char('_') + name;
 }
 
-QString CustomDefinition::redirect(const QString& value) const {
+QString CustomDefinition::redirect(const TransformerCfg& cfg, const QString& parameter) const {
+  const QString value = cfg.getParameterValue(parameter);
+  // An instance that means its own parameters redirects them itself.
+  const bool meansOwn =
+      isCustomTransformer(&cfg) && cfg.getParameterByMacroName(parameter)->getFlag(kGUITypeInstanceMacros);
   // Deferred references become ordinary ones as soon as they are written.
   const bool isDeferred = value.contains(kDeferredOpen) && MFBuffer::closesDeferredMacros(value);
   return replaceParameterReferences(isDeferred ? MFBuffer::withOrdinaryMacros(value) : value,
-                                    [this](const QString& name, QString& replacement) {
+                                    [&](const QString& name, QString& replacement) {
                                       replacement = QLatin1String("$(") + innerName(name) + QLatin1Char(')');
-                                      return m_network.hasParameter(name);
+                                      return m_network.hasParameter(name) &&
+                                             !(meansOwn && cfg.hasParameter(name));
                                     });
 }
 
 bool CustomDefinition::arrange(Diagnostics& diagnostics) {
-  m_isArranged = order(diagnostics);
+  const QString nameFault = findNameFault(m_network.getName());
+  if (!nameFault.isEmpty())
+    diagnostics.reportText(Rule::CustomTransformerFault, 0, m_network.getName(), nameFault);
+  m_isArranged = nameFault.isEmpty() && order(diagnostics);
   if (!m_isArranged)
     return false;
   for (const SubDocNetworkObjXformer* node : m_order)
@@ -190,7 +198,7 @@ void CustomDefinition::makePart(const SubDocNetworkObjXformer& node) {
   part.cfg.reset(node.getTransformer()->getCopy());
   for (const QString& parameter : part.cfg->getParameters()) {
     const QString value = part.cfg->getParameterValue(parameter);
-    const QString redirected = redirect(value);
+    const QString redirected = redirect(*part.cfg, parameter);
     if (redirected != value)
       part.cfg->setParameterValue(parameter, redirected, false);
   }

@@ -33,7 +33,7 @@ class ORX_EXPORT CustomDefinition {
 
   const ExternalDocNetwork& network() const { return m_network; }
 
-  // Orders and connects the copies. False when they feed each other in a circle.
+  // Orders and connects the copies. False when they feed each other in a circle, or the name cannot be written.
   bool arrange(Diagnostics& diagnostics);
   // The four below: call after arrange() answered true. Whether a statement names the attributes that reach
   // it.
@@ -70,7 +70,8 @@ class ORX_EXPORT CustomDefinition {
   QString flowFrom(const SubDocNetworkObj& node, const QString& port) const;
   QString title(const Part& part) const;
   QByteArray makeBody(Diagnostics& diagnostics);
-  QString redirect(const QString& value) const;
+  // The value of a copy's parameter, its references to published parameters led to the instance's macros.
+  QString redirect(const TransformerCfg& cfg, const QString& parameter) const;
 
   const ExternalDocNetwork& m_network;
   const QString m_prefix;     // the prefix macro's name

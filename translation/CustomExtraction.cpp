@@ -4,6 +4,7 @@
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/workspace/DocumentCopy.h>
+#include <transform/workspace/TransformerRecords.h>
 #include <translation/CustomDefinitions.h>
 #include <translation/CustomExtraction.h>
 #include <translation/NetworkDiagnostics.h>
@@ -16,7 +17,6 @@
 namespace {
 
 const QString kSubDocumentType = QStringLiteral("SubDocumentTransformer");
-const QString kSubDocumentName = QStringLiteral("SUB_DOC_NAME");
 const QString kVersion = QStringLiteral("VERSION");
 const QString kLastSaveBuild = QStringLiteral("LAST_SAVE_BUILD");
 // One that was made a file of its own is meant to be shared.
@@ -24,13 +24,7 @@ const QLatin1String kLinked("Linked by Default");
 
 // The name by which a record calls its transformer.
 QString calledName(const TransformerStruct& record) {
-  if (record.kind != TransformerKind::SubDocument)
-    return record.type;
-  for (const XformParmStruct& parameter : record.parameters) {
-    if (parameter.parmName == kSubDocumentName)
-      return parameter.parmValue;
-  }
-  return QString();
+  return record.kind == TransformerKind::SubDocument ? subDocumentName(record) : record.type;
 }
 
 QString yesOrNo(bool isSet) {
@@ -89,23 +83,27 @@ void CustomExtraction::findParts(const QString& name) {
 }
 
 void CustomExtraction::findWorkspaceParameters() {
-  m_workspaceParameters.clear();
+  QSet<QString> needed;
   for (const QString& part : m_parts) {
+    ReferencedNames names;
     QSet<QString> own;
-    for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(part))
+    for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(part)) {
       own.insert(GUIType::fromGuiLine(record.guiLine).getName());
-    const auto look = [&](const QString& value) {
-      for (const QString& name : ReferencedNames::inValue(value)) {
-        if (m_global.find(name) && !own.contains(name) && !m_workspaceParameters.contains(name))
-          m_workspaceParameters.append(name);
-      }
-    };
-    for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(part))
-      look(record.defaultValue);
+      names.add(record.defaultValue);
+    }
     for (const TransformerStruct& record : m_reader.GetTransformerList(part)) {
       for (const XformParmStruct& parameter : record.parameters)
-        look(parameter.parmValue);
+        names.add(parameter.parmValue);
     }
+    for (const GlobalParameters::Parameter& parameter : m_global.all()) {
+      if (names.contains(parameter.name) && !own.contains(parameter.name))
+        needed.insert(parameter.name);
+    }
+  }
+  m_workspaceParameters.clear();
+  for (const GlobalParameters::Parameter& parameter : m_global.all()) {
+    if (needed.contains(parameter.name))
+      m_workspaceParameters.append(parameter.name);
   }
 }
 
@@ -135,10 +133,7 @@ void CustomExtraction::addFields(const ExternalDocNetwork& network, int version)
   m_fields[1] = QString::number(version);
   m_fields += {kLinked,          yesOrNo(network.blockedLooping()), parallel.parallelism,
                parallel.groupBy, parallel.processSetting,           QString::number(parallel.countSetting),
-               QString(),        yesOrNo(network.isDeprecated())};
-  const QString python = network.getPythonVersion();
-  if (!python.isEmpty())
-    m_fields.append(python);
+               QString(),        yesOrNo(network.isDeprecated()),   network.getPythonVersion()};
 }
 
 bool CustomExtraction::makeDocument(const QString& name, int version, Diagnostics& diagnostics) {
@@ -154,7 +149,7 @@ bool CustomExtraction::makeDocument(const QString& name, int version, Diagnostic
   instance.type = kSubDocumentType;
   instance.version = version;
   XformParmStruct parameter;
-  parameter.parmName = kSubDocumentName;
+  parameter.parmName = kSubDocumentNameParameter;
   parameter.parmValue = name;
   instance.parameters.push_back(parameter);
   writer.addTransformer(QString(), instance);

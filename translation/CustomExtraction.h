@@ -35,7 +35,8 @@ class ORX_EXPORT CustomExtraction {
   const QByteArray& document() const { return m_document; }
   // Itself and those that it needs, in the document's order.
   const QStringList& parts() const { return m_parts; }
-  // Parameters and header macros of the workspace that the inside refers to: the file does not hold them.
+  // Parameters and header macros of the workspace that the inside refers to, in the workspace's order: the
+  // file does not hold them. A script that looks macros up may refer to each whose name stands in it.
   const QStringList& workspaceParameters() const { return m_workspaceParameters; }
 
  private:

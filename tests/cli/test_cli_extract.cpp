@@ -101,7 +101,7 @@ TEST(ExtractCommand, SaysWhatItCannotDo) {
   } cases[] = {
       {{good, "Tidy", "-o", "a.ort"}, 1, "there are: Tidy Area, Repair Geometry"},
       {{sample("road_network.orw"), "Tidy", "-o", "a.ort"}, 1, "embeds no custom transformers"},
-      {{"comma.orw", "Tidy, Area", "-o", "a.ort"}, 1, "holds a comma"},
+      {{"comma.orw", "Tidy, Area", "-o", "a.ort"}, 1, "a comma"},
       {{"unknown.orw", kCustom, "-o", "a.ort"}, 1, "Tidy Area/Thin vertices: "},
       {{good, kCustom, "-o", "other.ort"}, 1, "no file of custom transformers"},
       {{good, kCustom, "-o", "no/such/a.ort"}, 3, "a.ort"},

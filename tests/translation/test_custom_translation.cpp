@@ -8,8 +8,7 @@ namespace {
 
 const QString kInstance = QStringLiteral("SubDocumentTransformer");
 
-// --- statements that name the attributes which reach them
-// ---------------------------------------------------
+// --- statements inside ----------------------------------------------------------------------------
 
 // The attributes that the statement of the transformer "Names" lists, in the blocks of the file.
 QStringList namedAttributes(const QString& text) {
@@ -102,8 +101,33 @@ TEST(CustomTranslation, StatementsNameTheAttributesOfAllInstances) {
   }
 }
 
-// --- nesting
-// -------------------------------------------------------------------------------------------------
+TEST(CustomTranslation, ReferencesOfNestedInstancesMeanTheParametersOfTheirScope) {
+  const struct {
+    const char* type;   // of the parameter P of the inner one, which also has Q
+    const char* value;  // of P in an instance inside Outer, which has Q and LIMIT
+    const char* written;
+  } cases[] = {
+      {"TEXT", "$(LIMIT)-$(Q)", "$($(Outer_WORKSPACE_NAME)_LIMIT)-$($(Outer_WORKSPACE_NAME)_Q)"},
+      {"INSTANCE_MACROS TEXT", "$(LIMIT)-$(Q)",
+       "$($(Outer_WORKSPACE_NAME)_LIMIT)-$($(Inner_WORKSPACE_NAME)_Q)"},
+      {"INSTANCE_MACROS TEXT", "$(ORX_HOME)", "$(ORX_HOME)"},
+      {"TEXT", "$[LIMIT]", "$($(Outer_WORKSPACE_NAME)_LIMIT)"},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.transformer(3, kInstance, {"SUB_DOC_NAME", "Outer", "XFORMER_NAME", "O"});
+    workspace.beginCustom("Outer").parameter("GUI TEXT LIMIT Limit", "1").parameter("GUI TEXT Q Q", "2");
+    workspace.transformer(3, kInstance, {"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "I", "P", test.value});
+    workspace.endCustom().beginCustom("Inner");
+    workspace.parameter(QString("GUI %1 P P").arg(test.type), "3").parameter("GUI TEXT Q Q", "4").endCustom();
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.diagnostics, QStringList()) << test.value;
+    EXPECT_TRUE(outcome.text.contains(QString("# MACRO $(Inner_WORKSPACE_NAME)_P %1\n").arg(test.written)))
+        << outcome.text.toStdString();
+  }
+}
+
+// --- nesting --------------------------------------------------------------------------------------
 
 // A custom transformer that has `inner` inside, `times` in a row; plain when that is empty.
 void addLevel(SmallWorkspace& workspace, const QString& name, const QString& inner, int times) {

@@ -17,8 +17,6 @@
 
 namespace {
 
-// The flag of parameters whose references become those of the instance's own macros.
-constexpr unsigned kInstanceMacros = 2048;
 const QLatin1String kSetterAttributeType("STRING_OR_ATTR_ENCODED");
 
 QString factoryName(const QString& id, const QString& tag, QLatin1String role) {
@@ -27,11 +25,12 @@ QString factoryName(const QString& id, const QString& tag, QLatin1String role) {
 }
 
 // References to parameters, "$(NAME)", become references to the instance's macros. Macros that every mapping
-// file has are no parameters.
+// file has, and the prefix macro of a custom transformer around, are no parameters.
 QString redirectReferences(const QString& value, const QString& prefixMacro) {
+  static const QString prefixMacroEnd = makePrefixMacro(QString());
   return replaceParameterReferences(value, [&](const QString& name, QString& replacement) {
     replacement = QLatin1String("$($(") + prefixMacro + QLatin1String(")_") + name + QLatin1Char(')');
-    return !isGlobalMacro(name);
+    return !isGlobalMacro(name) && !name.endsWith(prefixMacroEnd);
   });
 }
 
@@ -189,7 +188,7 @@ QString CompoundTransformerCfg::macroValue(const QString& parameter, const GUITy
   const QString value = stripBasicStringInfo(
       getParameterValueForMappingFile(getParameterValue(parameter), type.valueIsEncoded(), false));
   const TransformParamCfg* record = getParameterByMacroName(parameter);
-  return record && record->getFlag(kInstanceMacros) && !prefixMacro.isEmpty()
+  return record && record->getFlag(kGUITypeInstanceMacros) && !prefixMacro.isEmpty()
              ? redirectReferences(value, prefixMacro)
              : value;
 }

@@ -341,11 +341,10 @@ void CompoundTransformerCfg::turnOffMultiProcessing() {
 QString CompoundTransformerCfg::instantiationFault() const {
   if (!m_network)
     return TransformResString(custom_messages::kNoInstance, getName());
-  // The name is a field of the definition's opening line, and part of the prefix macro.
-  const bool isWritable =
-      isMacroName(makePrefixMacro(getVisualName())) && !getName().contains(QLatin1Char(','));
-  return isWritable ? findNestingFault(*m_network)
-                    : TransformResString(custom_messages::kNoMacroName, getVisualName());
+  QString fault = findNameFault(getName());
+  if (fault.isEmpty() && !isMacroName(makePrefixMacro(getVisualName())))
+    fault = findNameFault(getVisualName());
+  return fault.isEmpty() ? findNestingFault(*m_network) : fault;
 }
 
 // --- listening ---------------------------------------------------------------------------------------------

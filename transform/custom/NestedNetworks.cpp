@@ -1,3 +1,4 @@
+#include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
@@ -5,6 +6,7 @@
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
 
 #include <QHash>
 #include <QSet>
@@ -86,6 +88,13 @@ QString circle(const std::vector<OpenNetwork>& open, const CompoundTransformerNe
 }
 
 }  // namespace
+
+QString findNameFault(const QString& name) {
+  // It is part of the prefix macro, and a field of the definition's opening line.
+  return isMacroName(makePrefixMacro(name)) && !name.contains(QLatin1Char(','))
+             ? QString()
+             : TransformResString(custom_messages::kNoMacroName, name);
+}
 
 QString findNestingFault(CompoundTransformerNetwork& root) {
   constexpr int kOpen = 0;

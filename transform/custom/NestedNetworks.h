@@ -24,6 +24,8 @@ ORX_EXPORT std::vector<CompoundTransformerNetwork*> nestedNetworks(CompoundTrans
 ORX_EXPORT std::vector<CompoundTransformerNetwork*> nestedNetworks(
     const std::vector<CompoundTransformerNetwork*>& roots);
 
+// Why a custom transformer cannot be written under this name. A message for the user; empty when it can.
+ORX_EXPORT QString findNameFault(const QString& name);
 // Why instances of the network cannot be written: it stands inside itself, or custom transformers stand in
 // it deeper than 64 levels. A message for the user; empty when all is well.
 ORX_EXPORT QString findNestingFault(CompoundTransformerNetwork& root);

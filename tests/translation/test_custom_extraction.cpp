@@ -1,0 +1,250 @@
+// Embedded custom transformers as what a file of their own holds.
+#include <platform/qorxcore/qorxcore.h>
+#include <tests/support/QtPrinters.h>
+#include <tests/translation/TranslatedWorkspace.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/custom/NestedNetworks.h>
+#include <transform/custom/SubDocumentLibrary.h>
+#include <transform/workspace/VersionStore.h>
+#include <transform/workspace/XMLComponentReader.h>
+#include <translation/CustomExtraction.h>
+
+namespace {
+
+const QString kInstance = QStringLiteral("SubDocumentTransformer");
+
+// "Outer" with ports, a loop, parameters and settings; "Inner" twice inside it; "Other" is used by nobody.
+SmallWorkspace document() {
+  SmallWorkspace workspace;
+  workspace.header("MACRO HEADER_SET 1").parameter("GUI TEXT GLOBAL Global", "2");
+  workspace.transformer(3, kInstance, {"SUB_DOC_NAME", "Outer", "XFORMER_NAME", "O"});
+  workspace.beginCustom("Outer",
+                        {"VERSION", "3", "CATEGORY", "Mine", "GUID", "{A-B}", "BLOCKED_LOOPING", "yes",
+                         "PYTHON_COMPATIBILITY", "38", "PARALLELISM", "MODERATE", "DEPRECATED", "yes",
+                         "PARALLEL_GROUP_BY", "id", "DESCRIPTION", "Does <this> & \"that\""});
+  workspace.port(1, "IN", "true").port(2, "OUT", "false").port(5, "BACK", "loop");
+  workspace.parameter("GUI TEXT LIMIT The limit", "a & b").parameter("GUI OPTIONAL INTEGER N Count", "");
+  workspace.transformer(3, kInstance, {"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "First", "P", "$(LIMIT)"});
+  workspace.transformer(4, kInstance, {"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "Second"});
+  workspace.transformer(6, "Copy", {"XFORMER_NAME", "C", "VALUE", "$(N)"});
+  workspace.link(1, "fo 0", 3, "fi 0 X").link(5, "fo 0", 3, "fi 0 X").link(3, "fo 0 Y", 4, "fi 0 X");
+  workspace.link(4, "fo 0", 6, "fi 0").link(6, "fo 0", 2, "fi 0").link(6, "fo 1", 5, "fi 0").endCustom();
+  workspace.beginCustom("Other").port(1, "IN", "true").endCustom();
+  workspace.beginCustom("Inner").port(1, "X", "true").port(2, "Y", "false");
+  workspace.parameter("GUI TEXT P P", "1").transformer(3, "Add", {"XFORMER_NAME", "A", "NEW", "new"});
+  workspace.link(1, "fo 0", 3, "fi 0").link(3, "fo 0", 2, "fi 0").endCustom();
+  return workspace;
+}
+
+// What a network and those inside it are made of, without whose file they stand in.
+QStringList contentOf(CompoundTransformerNetwork& root) {
+  QStringList all;
+  for (CompoundTransformerNetwork* network : nestedNetworks(root)) {
+    const ParallelSettings parallel = network->getParallelSettings();
+    all << network->getName() << QString::number(network->getVersion()) << network->getCategory()
+        << network->getGUID() << network->getPythonVersion() << parallel.parallelism << parallel.groupBy
+        << QString("looping %1 deprecated %2").arg(network->blockedLooping()).arg(network->isDeprecated())
+        << "in" << network->getInputs() << "out" << network->getOutputs() << "loops" << network->getLoops()
+        << network->getDescriptionLines();
+    for (const QString& name : network->getParameters()) {
+      const CompoundTransformerParm& parameter = *network->getParameterInfo(name);
+      all << parameter.type.getAsString() << parameter.defaultValue;
+    }
+    for (const TransformerCfg* cfg : network->getTransformers()) {
+      for (const QString& name : cfg->getParameters())
+        all << name + "=" + cfg->getParameterValue(name);
+    }
+    network->setInputAttributes(QHash<QString, QStringList>{{network->getInputs().value(0), {"id"}}});
+    for (const QString& output : network->getOutputs()) {
+      QHash<QString, QString> origins;
+      all << network->getOutputAttributes(output, origins);
+    }
+  }
+  return all;
+}
+
+class Extraction : public testing::Test {
+ protected:
+  void read(const SmallWorkspace& workspace) {
+    headerLines.clear();
+    reader.ReadInput(workspace.save(folder), headerLines);
+  }
+  QStringList rulesOf(CustomExtraction& extraction, const QString& name, bool& isPrepared, int version = 0) {
+    Diagnostics diagnostics("test.orw");
+    isPrepared = extraction.prepare(name, version, diagnostics);
+    return describe(diagnostics);
+  }
+
+  QTemporaryDir folder;
+  SmallSource source;
+  XMLComponentReader reader;
+  QStringList headerLines;
+};
+
+TEST_F(Extraction, IsReadBackIdentical) {
+  read(document());
+  CustomExtraction extraction(reader, headerLines, source);
+  EXPECT_EQ(extraction.names(), QStringList({"Outer", "Other", "Inner"}));
+  for (const QString& name : {QString("Outer"), QString("Inner")}) {
+    bool isPrepared = false;
+    EXPECT_EQ(rulesOf(extraction, name, isPrepared), QStringList());
+    ASSERT_TRUE(isPrepared);
+    EXPECT_EQ(extraction.parts(), name == "Outer" ? QStringList({"Outer", "Inner"}) : QStringList("Inner"));
+    EXPECT_EQ(extraction.workspaceParameters(), QStringList());
+    const QString path = folder.filePath(name + ".ort");
+    QString error;
+    ASSERT_TRUE(
+        VersionStore(path).insert(extraction.fields(), extraction.definition(), extraction.document(), error))
+        << error.toStdString();
+
+    ExternalTransformerNetwork linked(path, -1, &source);
+    SubDocumentLibrary library(reader, &source);
+    EXPECT_EQ(contentOf(linked), contentOf(*library.network(name)));
+    EXPECT_TRUE(linked.problems().empty());
+    EXPECT_EQ(linked.definitionLines(), extraction.definition());
+    EXPECT_EQ(linked.getInsertMode(), 2);
+
+    // What was extracted gives itself once more, and under another number all but that.
+    XMLComponentReader again;
+    again.ReadBufferInput(extraction.document());
+    CustomExtraction second(again, {}, source);
+    EXPECT_EQ(rulesOf(second, name, isPrepared), QStringList());
+    EXPECT_EQ(second.fields(), extraction.fields());
+    EXPECT_EQ(second.definition(), extraction.definition());
+    EXPECT_EQ(second.document(), extraction.document());
+    EXPECT_EQ(rulesOf(second, name, isPrepared, 8), QStringList());
+    EXPECT_EQ(second.fields().value(1), QString("8"));
+    EXPECT_EQ(second.definition().filter("INCLUDE"), extraction.definition().filter("INCLUDE"));
+    ASSERT_TRUE(VersionStore(path).insert(second.fields(), second.definition(), second.document(), error));
+    EXPECT_EQ(ExternalTransformerNetwork(path, -1, &source).getVersion(), 8);
+    EXPECT_EQ(contentOf(linked), contentOf(*library.network(name))) << "the version that was there before";
+  }
+}
+
+TEST_F(Extraction, NestedDefinitionsStandInFrontAsBlocks) {
+  read(document());
+  CustomExtraction extraction(reader, headerLines, source);
+  bool isPrepared = false;
+  rulesOf(extraction, "Outer", isPrepared);
+  const QStringList lines = extraction.definition();
+  EXPECT_EQ(lines.value(0), QString("# TRANSFORMER_BEGIN Inner,1,,"));
+  const int end = lines.indexOf("# TRANSFORMER_END");
+  ASSERT_GT(end, 0);
+  for (int i = 0; i <= end; ++i)
+    EXPECT_TRUE(lines.at(i).startsWith('#')) << lines.at(i).toStdString();
+  EXPECT_EQ(lines.mid(end + 1).filter("INCLUDE_CUSTOM_TRANSFORMER_VER Inner:1").size(), 2);
+  EXPECT_EQ(lines.mid(end + 1).filter("TRANSFORMER_BEGIN").size(), 0);
+}
+
+TEST_F(Extraction, FindsWhatTheWorkspaceWouldHaveToGive) {
+  const QString script = QORXWwjdEncode("ORX_MacroValues['GLOBAL'] + 'x'");
+  const struct {
+    const char* promise;
+    std::function<void(SmallWorkspace&)> inside;
+    QStringList needed;
+  } cases[] = {
+      {"nothing", [](SmallWorkspace&) {}, {}},
+      {"a value",
+       [](auto& w) {
+         w.transformer(7, "Copy", {"VALUE", "x$(GLOBAL)"});
+       },
+       {"GLOBAL"}},
+      {"a deferred one",
+       [](auto& w) {
+         w.transformer(7, "Copy", {"VALUE", "$[GLOBAL]"});
+       },
+       {"GLOBAL"}},
+      {"an encoded one",
+       [](auto& w) {
+         w.transformer(7, "Copy", {"VALUE", QORXWwjdEncode("$[GLOBAL]")});
+       },
+       {"GLOBAL"}},
+      {"a macro of the header",
+       [](auto& w) {
+         w.transformer(7, "Copy", {"VALUE", "$(HEADER_SET)"});
+       },
+       {"HEADER_SET"}},
+      {"each once, in the workspace's order",
+       [](auto& w) {
+         w.transformer(7, "Copy", {"VALUE", "$(GLOBAL)$(HEADER_SET)$(GLOBAL)"});
+       },
+       {"HEADER_SET", "GLOBAL"}},
+      {"a default", [](auto& w) { w.parameter("GUI TEXT D D", "$(GLOBAL)"); }, {"GLOBAL"}},
+      {"a script", [&](auto& w) { w.parameter("GUI TEXT_EDIT_PYTHON_PARM S S", script); }, {"GLOBAL"}},
+      {"a parameter of its own", [](auto& w) { w.parameter("GUI TEXT GLOBAL G", "$(GLOBAL)"); }, {}},
+      {"in one that stands inside",
+       [](auto& w) {
+         w.transformer(7, kInstance, {"SUB_DOC_NAME", "In"}).endCustom();
+         w.beginCustom("In").transformer(3, "Copy", {"VALUE", "$(GLOBAL)"});
+       },
+       {"GLOBAL"}},
+      {"macros that are always there",
+       [](auto& w) {
+         w.transformer(7, "Copy", {"VALUE", "$(ORX_HOME)"});
+       },
+       {}},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.header("MACRO HEADER_SET 1").parameter("GUI TEXT GLOBAL Global", "2").beginCustom("Custom");
+    test.inside(workspace);
+    read(workspace.endCustom());
+    CustomExtraction extraction(reader, headerLines, source);
+    bool isPrepared = false;
+    EXPECT_EQ(rulesOf(extraction, "Custom", isPrepared), QStringList()) << test.promise;
+    EXPECT_EQ(extraction.workspaceParameters(), test.needed) << test.promise;
+  }
+}
+
+TEST_F(Extraction, RefusesWhatNoFileCanHold) {
+  const QString good = "Good";
+  const QString file = folder.filePath("there.ort");
+  const QString foreign = folder.filePath("foreign.ort");
+  QString error;
+  ASSERT_TRUE(
+      VersionStore(file).insert({good, "1", "Mine"}, {}, "<?xml version=\"1.0\"?>\n<TRANSFORMER/>\n", error));
+  QFile other(foreign);
+  ASSERT_TRUE(other.open(QIODevice::WriteOnly) && other.write("TRANSFORMER_NAME: Other\n") > 0);
+  other.close();
+  const struct {
+    QString name;
+    QString inner;   // type of the transformer inside
+    QString target;  // empty: not prepared
+    bool isRefused;  // else the file could not be written
+    QString inText;
+  } cases[] = {
+      {"Good", "Nothing", "", true, "custom-transformer-fault Good/T"},
+      {"Good", "Broken", "", true, "not-written Good/T"},
+      {"Good", "Good", "", true, "custom-transformer-fault Good/T"},
+      {"A,B", "Copy", "", true, "custom-transformer-fault A,B"},
+      {"A\nB", "Copy", "", true, "custom-transformer-fault A\nB"},
+      {"Good", "Copy", "there.ort", true, "version 1 is there already"},
+      {"Good", "Copy", "foreign.ort", true, "no file of custom transformers"},
+      {"Good", "Copy", "none/new.ort", false, "none/new.ort"},
+      {"Good", "Copy", ".", false, folder.path()},
+  };
+  for (const auto& test : cases) {
+    const QString path = folder.filePath(test.target);
+    const QString before = readAll(path);
+    SmallWorkspace workspace;
+    workspace.beginCustom(test.name).transformer(3, test.inner, {"XFORMER_NAME", "T"}).endCustom();
+    read(workspace);
+    CustomExtraction extraction(reader, headerLines, source);
+    bool isPrepared = false;
+    const QStringList rules = rulesOf(extraction, extraction.names().value(0), isPrepared);
+    EXPECT_EQ(isPrepared, !test.target.isEmpty()) << test.inner.toStdString();
+    if (!isPrepared) {
+      EXPECT_EQ(rules, QStringList(test.inText));
+      continue;
+    }
+    bool isRefused = false;
+    EXPECT_FALSE(VersionStore(path).insert(extraction.fields(), extraction.definition(),
+                                           extraction.document(), error, &isRefused));
+    EXPECT_EQ(isRefused, test.isRefused) << error.toStdString();
+    EXPECT_TRUE(error.contains(test.inText)) << error.toStdString();
+    EXPECT_EQ(readAll(path), before) << "what stood there is untouched";
+    EXPECT_FALSE(QFile::exists(folder.filePath("new.ort")));
+  }
+}
+
+}  // namespace
