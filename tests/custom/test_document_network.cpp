@@ -11,6 +11,8 @@
 #include <QTemporaryDir>
 #include <gtest/gtest.h>
 
+#include <functional>
+
 namespace {
 
 using Kind = NetworkProblem::Kind;
@@ -268,6 +270,53 @@ TEST_F(DocumentNetwork, PicksTheVersionAndLoadsItsBodyLate) {
   EXPECT_TRUE(copy->getIsDefinitionValid());
   QFile::remove(file);
   EXPECT_FALSE(copy->getIsDefinitionValid());
+}
+
+TEST_F(DocumentNetwork, QuestionsAboutTheInsideLoadTheBody) {
+  const QString file =
+      store("v.ort", names(QStringLiteral("Net,2,Cat,{G}")),
+            {{QStringLiteral("Net"), split("in A;out O;gui GUI TEXT P P | d;t T Adder;A -> O")}});
+  using Network = ExternalTransformerNetwork;
+  QHash<QString, QString> origins;
+  QStringList none;
+  const QString port = QStringLiteral("A");
+  const std::function<void(Network&)> inside[] = {
+      [](Network& n) { n.getInputs(); },
+      [](Network& n) { n.getOutputs(); },
+      [](Network& n) { n.getLoops(); },
+      [](Network& n) { n.getTransformers(); },
+      [](Network& n) { n.getParameters(); },
+      [](Network& n) { n.hasParameter(QStringLiteral("P")); },
+      [](Network& n) { n.getParameterInfo(QStringLiteral("P")); },
+      [&](Network& n) { n.getOutputAttributes(QStringLiteral("O"), origins); },
+      [](Network& n) { n.setInputAttributes(QHash<QString, QStringList>()); },
+      [&](Network& n) { n.setInputAttributes(port, none); },
+      [](Network& n) { n.hasTransformerNamed(QStringLiteral("T")); },
+      [](Network& n) { n.getUpstreamInputs(QStringLiteral("O")); },
+      [](Network& n) { n.getIncomingAttributePropogationMode(); },
+      [](Network& n) { n.getProperties(); },
+      [](Network& n) { n.getDescriptionLines(); },
+      [](Network& n) { n.getUsesTransformer(QStringLiteral("X"), nullptr); },
+      [&](Network& n) { n.getUsedComponents(none, none, none, true); },
+      [](Network& n) { n.containsPythonTransformer(); },
+      [](Network& n) { n.getIsAsynchronous(); },
+      [](Network& n) { n.getIsBlocking(); },
+      [](Network& n) { n.forceLoad(); },
+  };
+  for (std::size_t i = 0; i < std::size(inside); ++i) {
+    Network network(file, -1, &definitions);
+    ASSERT_FALSE(network.isBodyLoaded());
+    inside[i](network);
+    EXPECT_TRUE(network.isBodyLoaded()) << "question " << i;
+  }
+  Network network(file, -1, &definitions);
+  EXPECT_EQ(network.getName() + network.getCategory() + network.getGUID(), QStringLiteral("NetCatG"));
+  EXPECT_TRUE(network.getIsDefinitionValid() && network.getIsEmbeddable() && network.getInsertMode() == 1);
+  EXPECT_FALSE(network.isDeprecated() || network.blockedLooping() || network.getPythonVersion().isEmpty());
+  network.turnOffMultiProcessing();
+  network.setBlockedLooping(true);
+  EXPECT_TRUE(network.extractToFile(path("copy.ort")));
+  EXPECT_FALSE(network.isBodyLoaded()) << "the header answers these";
 }
 
 TEST_F(DocumentNetwork, KeepsHeadersWhenBodiesAreBad) {

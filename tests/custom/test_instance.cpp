@@ -196,36 +196,88 @@ TEST(Instance, WritesParameterMacros) {
   }
 }
 
-TEST(Instance, WritesScriptsThatComputeTheInstancesMacros) {
-  OpenNetwork network;
-  network.publish(QStringLiteral("GUI TEXT_EDIT_PYTHON_PARM PY Py"),
-                  QORXWwjdEncode(QStringLiteral("a = ORX_MacroValues['BASE']\na + '!'")));
-  network.publish(QStringLiteral("GUI TEXT_EDIT_TCL_PARM TC Tc"),
-                  QORXWwjdEncode(QStringLiteral("set a $ORX_MacroValues(BASE)\n[string toupper $a]")));
-  network.doneAdding(true);
-  CompoundTransformerCfg instance(&network);
-  EXPECT_TRUE(instance.findUnwritableParameters().isEmpty());
-  TextBuffer buffer;
-  instance.writeParametersToMappingFile(buffer, QStringLiteral("PRE"), false);
-  const QStringList physical = buffer.text().split(QLatin1Char('\n'));
-  const int python = physical.indexOf(QStringLiteral("INCLUDE PYTHON"));
-  const int tcl = physical.indexOf(QStringLiteral("INCLUDE TCL"));
-  ASSERT_GE(python, 0);
-  ASSERT_GT(tcl, python);
-  EXPECT_EQ(physical.at(python + 1), QString()) << "each line is a statement of its own";
-  const QMap<QString, QString> macros{{QStringLiteral("PRE"), QStringLiteral("CT")},
-                                      {QStringLiteral("CT_BASE"), QStringLiteral("inner")},
-                                      {QStringLiteral("BASE"), QStringLiteral("outer")}};
-  const auto results = runPythonBlocks({{physical.mid(python, tcl - python), macros}});
-  ASSERT_EQ(results.size(), 1);
-  EXPECT_EQ(results.first().value(QStringLiteral("CT_PY")), QStringLiteral("inner!"));
-  EXPECT_EQ(runTclBlock({physical.mid(tcl), macros}).value(QStringLiteral("CT_TC")), QStringLiteral("INNER"));
+struct ScriptCase {
+  const char* python;
+  const char* tcl;
+  const char* value;  // in the instance CT_1, whose BASE is inner_1
+};
 
+const ScriptCase kScripts[] = {
+    {"'x'", "x", "x"},
+    {"ORX_MacroValues['BASE'] + '!'", "$ORX_MacroValues(BASE)!", "%1!"},
+    {"a = ORX_MacroValues[\"BASE\"]\n# done\na * 2", "set a $ORX_MacroValues(BASE)\nreturn $a$a", "%1%1"},
+    {"if ORX_MacroValues['XFORMER_NAME'] == 'CT_2':\n  return 'two'\nreturn ORX_MacroValues['ORX_HOME']",
+     "if {$ORX_MacroValues(XFORMER_NAME) eq \"CT_2\"} {\n  return two\n}\nreturn $ORX_MacroValues(ORX_HOME)",
+     "%2"},
+    {"k = 'BA'\nORX_MacroValues[k + 'SE']", "set k BA\nreturn $ORX_MacroValues(${k}SE)", "%1"},
+};
+
+// Each script in two instances, run with the macros of both and those of the workspace.
+TEST(Instance, WritesScriptsThatComputeTheInstancesMacros) {
+  OpenNetwork network(QStringLiteral("My Net"));
+  network.publish(QStringLiteral("GUI TEXT BASE Base"), QString());
+  int count = 0;
+  for (const ScriptCase& row : kScripts) {
+    network.publish(QStringLiteral("GUI TEXT_EDIT_PYTHON_PARM PY%1 Py").arg(++count),
+                    QORXWwjdEncode(QLatin1String(row.python)));
+    network.publish(QStringLiteral("GUI TEXT_EDIT_TCL_PARM TC%1 Tcl").arg(count),
+                    QORXWwjdEncode(QLatin1String(row.tcl)));
+  }
+  network.doneAdding(true);
+  QMap<QString, QString> macros{{QStringLiteral("BASE"), QStringLiteral("outer")},
+                                {QStringLiteral("ORX_HOME"), QStringLiteral("home")}};
+  for (const QString& id : {QStringLiteral("CT_1"), QStringLiteral("CT_2")}) {
+    const QString base = QStringLiteral("inner") + id.right(2);
+    CompoundTransformerCfg instance(&network);
+    instance.setIdentifier(id);
+    instance.setParameterValue(QStringLiteral("BASE"), base, false);
+    EXPECT_TRUE(instance.findUnwritableParameters().isEmpty());
+    TextBuffer buffer;
+    ASSERT_TRUE(static_cast<TransformerCfg&>(instance).instantiate(buffer, QString(), true));
+    QStringList physical = buffer.text().split(QLatin1Char('\n'));
+    macros[makePrefixMacro(QStringLiteral("My Net"))] = id;
+    macros[id + QStringLiteral("_BASE")] = base;
+    macros[id + QStringLiteral("_XFORMER_NAME")] = id;
+    QVector<ScriptRun> pythons;
+    QMap<QString, QString> defined;
+    const auto take = [&](const QMap<QString, QString>& result) {
+      for (auto macro = result.cbegin(); macro != result.cend(); ++macro)
+        defined.insert(macro.key(), macro.value());
+    };
+    for (int at = 0; at < physical.size(); ++at) {
+      if (!physical.at(at).startsWith(QLatin1String("INCLUDE PYTHON")) &&
+          !physical.at(at).startsWith(QLatin1String("INCLUDE TCL")))
+        continue;
+      const int end = physical.indexOf(QStringLiteral("END_INCLUDE"), at);
+      ASSERT_GT(end, at);
+      EXPECT_EQ(physical.at(at + 1), QString()) << "each line is a statement of its own";
+      const ScriptRun run{physical.mid(at, end + 1 - at), macros};
+      if (physical.at(at).endsWith(QLatin1String("PYTHON")))
+        pythons.append(run);
+      else
+        take(runTclBlock(run));
+      at = end;
+    }
+    for (const QMap<QString, QString>& result : runPythonBlocks(pythons))
+      take(result);
+    EXPECT_EQ(defined.size(), 2 * count);
+    for (int number = 1; number <= count; ++number) {
+      QString value = QLatin1String(kScripts[number - 1].value);
+      value.replace(QLatin1String("%1"), base);
+      value.replace(QLatin1String("%2"),
+                    id == QLatin1String("CT_2") ? QLatin1String("two") : QLatin1String("home"));
+      EXPECT_EQ(defined.value(id + QStringLiteral("_PY%1").arg(number)), value)
+          << kScripts[number - 1].python;
+      EXPECT_EQ(defined.value(id + QStringLiteral("_TC%1").arg(number)), value) << kScripts[number - 1].tcl;
+    }
+  }
+
+  CompoundTransformerCfg instance(&network);
   QString message;
-  instance.setParameterValue(QStringLiteral("PY"), QORXWwjdEncode(QStringLiteral("END_INCLUDE")), false);
-  EXPECT_FALSE(instance.validateParameter(QStringLiteral("PY"), message));
+  instance.setParameterValue(QStringLiteral("PY1"), QORXWwjdEncode(QStringLiteral("END_INCLUDE")), false);
+  EXPECT_FALSE(instance.validateParameter(QStringLiteral("PY1"), message));
   EXPECT_FALSE(message.isEmpty());
-  EXPECT_EQ(instance.findUnwritableParameters().keys(), names(QStringLiteral("PY")));
+  EXPECT_EQ(instance.findUnwritableParameters().keys(), names(QStringLiteral("PY1")));
 }
 
 TEST(Instance, RefusesWhatWouldNeverEnd) {
