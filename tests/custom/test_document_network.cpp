@@ -1,5 +1,6 @@
 // Networks from documents: inside a workspace, and in files of their own.
 #include "CustomFixtures.h"
+#include <tests/support/QtPrinters.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/workspace/VersionStore.h>
@@ -160,6 +161,60 @@ TEST_F(DocumentNetwork, LibraryBuildsEachDefinitionOnce) {
   EXPECT_NE(library.makeTransformer(QStringLiteral("Adder"), 1), nullptr);
   EXPECT_EQ(library.makeTransformer(QStringLiteral("None"), 1), nullptr);
   EXPECT_EQ(library.refusalReason(), QString());
+}
+
+// What stands two levels deep answers for the instance.
+TEST_F(DocumentNetwork, InstancesAnswerForWhatStandsInside) {
+  TransformerDefinition creator = passing(QStringLiteral("Creator"));
+  creator.inputTags.clear();
+  definitions.add(creator);
+  definitions.add(passing(QStringLiteral("Inspector")));
+  TransformerDefinition caller = passing(QStringLiteral("Caller"));
+  caller.parameterNames = names(QStringLiteral("CODE"));
+  caller.parameterTypes = names(QStringLiteral("TEXT_EDIT_PYTHON"));
+  caller.parameterPrompts = caller.parameterDefaults = QStringList{QString()};
+  definitions.add(caller);
+  const struct {
+    const char* inside;
+    const char* outside;
+    const char* answers;  // source, visualizer, python, markdown, python version, change log
+  } rows[] = {
+      {"t T Adder", "", "0,0,0,0,,"},
+      {"t T Creator", "", "1,0,0,0,,"},
+      {"t T Inspector", "", "0,1,0,0,,"},
+      {"t T Caller;parm T CODE x", "", "0,0,1,0,,"},
+      {"t T Caller", "", "0,0,0,0,,"},
+      {"set USE_MARKDOWN yes", "", "0,0,0,1,,"},
+      {"set PYTHON_COMPATIBILITY 37", "", "0,0,0,0,37,"},
+      {"set PYTHON_COMPATIBILITY 37", "set PYTHON_COMPATIBILITY 39", "0,0,0,0,39,"},
+      {"set HISTORY inner", "set HISTORY made", "0,0,0,0,,made"},
+  };
+  for (const auto& row : rows) {
+    read({{QStringLiteral("Inner"), split(row.inside)},
+          {QStringLiteral("Middle"), split("use I Inner")},
+          {QStringLiteral("Outer"), split("use M Middle;in A") + split(row.outside)}});
+    auto library = std::make_unique<SubDocumentLibrary>(reader, &definitions);
+    const std::unique_ptr<TransformerCfg> cfg = library->makeTransformer(QStringLiteral("Outer"), 1);
+    auto& instance = static_cast<CompoundTransformerCfg&>(*cfg);
+    const auto answers = [&] {
+      return QStringList{QString::number(instance.getIsSource()),
+                         QString::number(instance.getRequiresVisualizerLauncher()),
+                         QString::number(instance.containsPython()),
+                         QString::number(instance.getUseMarkdown()),
+                         instance.pythonVersion(),
+                         instance.getChangeLog().join(QLatin1Char(' '))}
+          .join(QLatin1Char(','));
+    };
+    EXPECT_EQ(answers(), QLatin1String(row.answers)) << row.inside;
+    library.reset();
+    EXPECT_EQ(instance.getNetwork(), nullptr);
+    EXPECT_EQ(answers(), QStringLiteral("0,0,0,0,,")) << "the network is gone";
+    EXPECT_EQ(instance.getFileName() + instance.getTransformerFile() + instance.getGUID(), QString());
+    EXPECT_FALSE(instance.getIsDefinitionValid() || instance.isDefinitionDeletable() ||
+                 instance.getIsEmbeddable() || instance.getIsBlocking());
+    TextBuffer buffer;
+    EXPECT_FALSE(instance.doInstantiate(buffer, true));
+  }
 }
 
 TEST_F(DocumentNetwork, LibraryRefusesDeepNesting) {
