@@ -185,7 +185,11 @@ TEST(CustomTranslation, NestsUpTo64Deep) {
       EXPECT_GT(block, before) << "innermost first";
       before = block;
     }
-    EXPECT_TRUE(outcome.text.contains("# MACRO L1_WORKSPACE_NAME $(L2_WORKSPACE_NAME)_T3\n"));
+    for (const char* statement : {"# MACRO L1_WORKSPACE_NAME $(L2_WORKSPACE_NAME)_T3\n",
+                                  "INPUT FEATURE_TYPE \"$(L2_WORKSPACE_NAME)_IN\" OUTPUT FEATURE_TYPE "
+                                  "\"$(L2_WORKSPACE_NAME)_T3_IN\"\n",
+                                  "OUTPUT FEATURE_TYPE \"$(L2_WORKSPACE_NAME)_T3_OUT_OUT\"\n"})
+      EXPECT_TRUE(outcome.text.contains(statement)) << statement << outcome.text.left(9000).toStdString();
   }
 }
 

@@ -83,28 +83,17 @@ TEST(Translation, SourcesOfOneInputStandInTheirOrder) {
   }
 }
 
-TEST(Translation, PortsAreFoundByNameNumberAndAlias) {
-  const struct {
-    const char* promise;
-    const char* output;
-    const char* input;
-    const char* expected;
-  } cases[] = {
-      {"by name", "fo 9 REST", "fi 9 RIGHT", "C_REST RIGHT"},
-      {"by number through the record's ports", "fo 0", "fi 1", "C_REST RIGHT"},
-      {"by alias", "fo 0 OUTPUT", "fi 0 R", "C_OUTPUT RIGHT"},
-  };
-  for (const auto& test : cases) {
-    SmallWorkspace workspace;
-    workspace.transformer(1, "Copy", {"XFORMER_NAME", "C"}, {},
-                          "<OUTPUT_FEAT NAME=\"REST\"/>\n<OUTPUT_FEAT NAME=\"OUTPUT\"/>\n");
-    workspace.transformer(2, "Join", {"XFORMER_NAME", "J"}).link(1, test.output, 2, test.input);
-    const Outcome outcome = translate(workspace);
-    EXPECT_EQ(outcome.diagnostics, QStringList()) << test.promise;
-    const QStringList words = QString(test.expected).split(' ');
-    // The alias of RIGHT is what stands in the mapping file.
-    EXPECT_TRUE(outcome.text.contains("INPUT R FEATURE_TYPE " + words.at(0))) << outcome.text.toStdString();
-  }
+TEST(Translation, PortsAreThoseThatTheRecordMeans) {
+  SmallWorkspace workspace;
+  workspace.transformer(1, "Copy", {"XFORMER_NAME", "C"}, {},
+                        "<OUTPUT_FEAT NAME=\"REST\"/>\n<OUTPUT_FEAT NAME=\"OUTPUT\"/>\n");
+  workspace.transformer(2, "Join", {"XFORMER_NAME", "J"});
+  workspace.link(1, "fo 0", 2, "fi 1").link(1, "fo 0 OUTPUT", 2, "fi 0 LEFT");
+  const Outcome outcome = translate(workspace);
+  EXPECT_EQ(outcome.diagnostics, QStringList());
+  // The alias of RIGHT is what stands in the mapping file.
+  EXPECT_TRUE(outcome.text.contains("INPUT LEFT FEATURE_TYPE C_OUTPUT INPUT R FEATURE_TYPE C_REST"))
+      << outcome.text.toStdString();
 }
 
 TEST(Translation, DisabledNodesAndLinksAreLeftOut) {
@@ -184,27 +173,6 @@ TEST(Translation, AnEmbeddedCustomTransformerIsDefinedOnceAndIncludedByEachInsta
   EXPECT_LT(outcome.text.indexOf("# TRANSFORMER_END"), outcome.text.indexOf("MACRO Cleaner_WORKSPACE_NAME"));
 }
 
-TEST(Translation, NestedCustomTransformersAreDefinedInnermostFirst) {
-  SmallWorkspace workspace = withCustom([](SmallWorkspace& inner) {
-    inner.transformer(5, "SubDocumentTransformer", {"SUB_DOC_NAME", "Inside", "XFORMER_NAME", "I"});
-    inner.link(1, "fo 0", 5, "fi 0 A").link(5, "fo 0 B", 2, "fi 0");
-  });
-  workspace.beginCustom("Inside")
-      .port(1, "A", "true")
-      .port(2, "B", "false")
-      .link(1, "fo 0", 2, "fi 0")
-      .endCustom();
-  const Outcome outcome = translate(workspace);
-  EXPECT_EQ(outcome.diagnostics, QStringList());
-  const int inside = outcome.text.indexOf("# TRANSFORMER_BEGIN Inside,1,");
-  EXPECT_GT(inside, 0);
-  EXPECT_GT(outcome.text.indexOf("# TRANSFORMER_BEGIN Cleaner,1,"), inside);
-  for (const char* statement : {"# MACRO Inside_WORKSPACE_NAME $(Cleaner_WORKSPACE_NAME)_I\n",
-                                "# INCLUDE_CUSTOM_TRANSFORMER_VER Inside:1\n",
-                                "OUTPUT FEATURE_TYPE \"$(Cleaner_WORKSPACE_NAME)_I_B_OUT\"\n"})
-    EXPECT_TRUE(outcome.text.contains(statement)) << statement << "\n" << outcome.text.toStdString();
-}
-
 TEST(Translation, ReferencesInsideACustomTransformerReachTheParameterThatTheyMean) {
   const struct {
     const char* value;
@@ -270,10 +238,6 @@ TEST(Translation, RefusesFaultyCustomTransformers) {
        }),
        {"custom-transformer-fault Cleaner/N"}},
       {withCustom([](auto& w) { w.link(1, "fo 0", 77, "fi 0"); }), {"custom-transformer-fault Cleaner"}},
-      {withCustom([](auto& w) {
-         w.transformer(9, "SubDocumentTransformer", {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", "N"});
-       }),
-       {"custom-transformer-fault Cleaner/N"}},
       {withCustom([](auto& w) { w.link(3, "fo 0 OUTPUT", 3, "fi 0 INPUT"); }), {"cycle Cleaner"}},
       {withCustom([](auto& w) {
          w.transformer(9, "Copy", {"XFORMER_NAME", "N", "VALUE", "$[x"});
