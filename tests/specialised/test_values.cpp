@@ -1,6 +1,7 @@
 // What the classes say about values and make of them, as tables. The tables hold values decoded; what is said
 // of the last setting of a row is judged.
 #include "SpecialisedSetup.h"
+#include <platform/qorxcore/Language.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QRegularExpression>
@@ -35,7 +36,10 @@ void check(const ValueCase& c) {
   QString parameter;
   const auto cfg = makeShippedWith(c.transformer, c.settings, &parameter);
   const QString stored = cfg->getParameterValue(parameter);
-  EXPECT_EQ(refusalOf(*cfg, parameter), messageOf(c.refusal));
+  for (const char* language : {"de", "fr", "en"}) {
+    QORXSetLanguage(language);
+    EXPECT_EQ(refusalOf(*cfg, parameter), messageOf(c.refusal)) << language;
+  }
   EXPECT_EQ(cfg->getParameterValue(parameter), stored) << "validation changes nothing";
   if (c.written) {
     static const QRegularExpression wrapped("\\{(\\w+):(\\w+)\\}");
@@ -62,20 +66,16 @@ TEST(Values, Tests) {
            {name, "TESTS=@Value(nope);MISSING;x", "", "{LEFT:nope};MISSING;\"\""},
            {name, "TESTS=@Value(nope);EXISTS;;@Value(nope);EQUALS;1", "370607|'nope'"},
            {name, "TESTS=a;MATCHES;(b", "370611|(b"},
-           {name, "TESTS=a;MATCHES;b[0-9]", ""},
            {name, "TESTS=a;MATCHES;($(P)", ""},
            {name, "TESTS=a;$(P);", "", ""},
            {name, "COMBINATION=ALL | EXPRESSION=nonsense", ""},
-           {name, "COMBINATION=EXPRESSION | EXPRESSION=", "370608|Combination of the Tests"},
            {name, "COMBINATION=The tests as combined below | EXPRESSION=", "370608|Combination of the Tests"},
            {name, "TESTS=a;FILLED;;b;FILLED; | COMBINATION=EXPRESSION | EXPRESSION=1 and (2 or not 1)", "",
             ""},
            {name, "TESTS=a;FILLED;;b;FILLED; | COMBINATION=EXPRESSION | EXPRESSION=1 AND NOT(2)", ""},
            {name, "COMBINATION=EXPRESSION | EXPRESSION=1 and $(P)", ""},
            {name, "TESTS=a;FILLED; | COMBINATION=EXPRESSION | EXPRESSION=1 or 2", "370705|2|1"},
-           {name, "COMBINATION=EXPRESSION | EXPRESSION=0", "370705|0|0"},
            {name, "TESTS=a;FILLED; | COMBINATION=EXPRESSION | EXPRESSION=1+1", "370704|+"},
-           {name, "COMBINATION=EXPRESSION | EXPRESSION=-1", "370704|-"},
            {name, "COMBINATION=EXPRESSION | EXPRESSION=1.0", "370704|1.0"},
            {name, "COMBINATION=EXPRESSION | EXPRESSION=@Value(a)", "370704|@Value(a)"},
        }) {
@@ -101,7 +101,6 @@ TEST(Values, Expressions) {
            {"@Value(c)", "370607|'c'"},
            {"@Value(a", "370701|@Value(a"},
            {"1 +", "370702"},
-           {"max(1,", "370702"},
            {"max(1,)", "370701|)"},
            {"()", "370701|)"},
            {"1)", "370701|)"},
@@ -109,7 +108,6 @@ TEST(Values, Expressions) {
            {"(1,2)", "370701|,2)"},
            {"1 == 2", "370701|= 2"},
            {"2x", "370701|2x"},
-           {".", "370701|."},
            {"a + 1", "370701|a + 1"},
            {"and (1)", "370701|and (1)"},
            {"\"open", "370701|\"open"},
@@ -139,7 +137,6 @@ TEST(Values, ChartsAndReports) {
            {chart, "CHART_TYPE=LINE | SERIES=One;a;b;Two;a;\"\"", "370608|Series"},
            {chart, "CHART_TYPE=LINE | SERIES=One;a;b;Two;a", "370714|2|370608|Value"},
            {chart, "CHART_TYPE=HISTOGRAM | SERIES=One;nope;b;\"\";\"\";id", "", "One;\"\";b;id;\"\";id"},
-           {chart, "CHART_TYPE=PIE | SERIES=One;a;b", "", ""},
            {chart, "CHART_TYPE=PIE | SERIES=One;a;b;Two;a;id", "370716"},
            {chart, "CHART_TYPE=BAR | SERIES=One;a;b;One;a;id", "370714|2|370717"},
            {chart, "CHART_TYPE=$(KIND) | SERIES=One;a;b;Two;a;id", "", ""},
@@ -182,13 +179,10 @@ TEST(Values, TextsInXmlAndJson) {
            {"UPDATES=a;REPLACE;{\"c\": @Value(a)};JSON", "", ""},
            {"UPDATES=a;REPLACE;1, 2;JSON", "", "370714|1|370708|1"},
            {"UPDATES=a;REMOVE;;TEXT;b;REPLACE;;TEXT", "370714|2|370608|Value", "370714|2|370608|Value"},
-           {"UPDATES=@Value(a);REPLACE;@Value(b);JSON", "", ""},
            {"UPDATES=@Value(nope);REMOVE;;TEXT", "370607|'nope'", "370607|'nope'"},
            {"UPDATES=a b;REMOVE;;TEXT", "370714|1|370713|a b", "370714|1|370713|a b"},
            {"UPDATES=a[1;REMOVE;;TEXT", "370714|1|370713|a[1", "370714|1|370713|a[1"},
-           {"UPDATES=a];REMOVE;;TEXT", "370714|1|370713|a]", "370714|1|370713|a]"},
            {"UPDATES=['a b'].c;REMOVE;;TEXT", "370714|1|370713|['a b'].c", ""},
-           {"UPDATES=$.a[0];REMOVE;;TEXT", "", ""},
            {"UPDATES=a///b;REMOVE;;TEXT", "370714|1|370713|a///b", ""},
            {"UPDATES=a..b;REMOVE;;TEXT", "", "370714|1|370713|a..b"},
            {"UPDATES=a/;REMOVE;;TEXT;b.;REMOVE;;TEXT", "370714|1|370713|a/", "370714|2|370713|b."},
@@ -200,7 +194,6 @@ TEST(Values, TextsInXmlAndJson) {
            {"<a b=\"@Value(a)\">@Template(PART)<p:c/></a>", "", bad},
            {"<?xml version=\"1.0\"?>\n<a>$(P)</a>\n", "", bad},
            {"<a>\n<b>\n</a>", "370708|3", bad},
-           {"<a/><b/>", bad, bad},
            {"<!DOCTYPE a><a/>", bad, bad},
            {"<a>@Template(NONE)</a>", "370711|NONE", bad},
            {"{\"n\": @Value(a), \"s\": \"x@Value(a)\",\n\"l\": [@Template(PART)]}", bad, ""},
@@ -272,13 +265,10 @@ TEST(Values, EarlierFormsAreUpgraded) {
            {"ExpressionEvaluator", "EXPRESSION=@Value(a==b) == 1 && !(2 <> 3)",
             "@Value(a==b) = 1  and   not (2 != 3)"},
            {"ExpressionEvaluator", "EXPRESSION=\"!\" == \"a||b\" || 1 != 2", "\"!\" = \"a||b\"  or  1 != 2"},
-           {"ExpressionEvaluator", "EXPRESSION=1 = 2"},
            {"ExpressionEvaluator", "EXPRESSION=1 == "},
            {"ExpressionEvaluator", "EXPRESSION=\"!"},
            {"AttributeValueMapper", "MAPPING=a;&b;b&c;d", "a;@Value(b);b&c;d"},
-           {"AttributeValueMapper", "MAPPING=a;b&c"},
            {"ChartGenerator", "SERIES=R&D;&a;&b", "R&D;a;b"},
-           {"ChartGenerator", "SERIES=R&D;a;b"},
            {"ChartGenerator", "CHART_TYPE=COLUMN", "BAR"},
            {"HTMLReportGenerator", "PARTS=HEADER;&b;\"\";SEPARATOR;\"\";\"\";IMAGE;x;\"\"",
             "HEADING;@Value(b);\"\";LINE;\"\";\"\";PICTURE;x;\"\""},
