@@ -128,7 +128,7 @@ bool CustomDefinition::prepare(Diagnostics& diagnostics) {
     check(part, diagnostics);
   for (const SubDocNetworkObj* node : m_network.nodes()) {
     if (!lookup_checks::isOneLine(node->name()))
-      diagnostics.report(Rule::LineBreak, 0, m_network.getName(), {node->name().simplified()});
+      diagnostics.report(Rule::LineBreak, node->line(), m_network.getName(), {node->name().simplified()});
   }
   if (diagnostics.hasErrors())
     return false;
@@ -185,7 +185,8 @@ bool CustomDefinition::order(Diagnostics& diagnostics) {
     QStringList names;
     for (const int member : cycle)
       names.append(nodes[static_cast<std::size_t>(member)]->name());
-    diagnostics.report(Rule::Cycle, 0, m_network.getName(), {names.join(QLatin1String(", "))});
+    diagnostics.report(Rule::Cycle, nodes[static_cast<std::size_t>(cycle.front())]->line(),
+                       m_network.getName(), {names.join(QLatin1String(", "))});
   }
   for (const int node : flow.order)
     m_order.push_back(nodes[static_cast<std::size_t>(node)]);
@@ -251,7 +252,7 @@ void CustomDefinition::check(const Part& part, Diagnostics& diagnostics) const {
   for (const QString& parameter : part.cfg->getParameters()) {
     const auto fault = faults.constFind(parameter);
     if (fault != faults.constEnd())
-      diagnostics.report(Rule::UnwritableValue, 0, title(part), {parameter, fault.value()});
+      diagnostics.report(Rule::UnwritableValue, part.node->line(), title(part), {parameter, fault.value()});
   }
 }
 
@@ -263,7 +264,7 @@ QByteArray CustomDefinition::makeBody(Diagnostics& diagnostics) {
     MFDeviceBuffer buffer(device);
     for (Part& part : m_parts) {
       if (!part.cfg->instantiate(buffer, m_network.getName()))
-        diagnostics.report(Rule::NotWritten, 0, title(part), {part.cfg->getName()});
+        diagnostics.report(Rule::NotWritten, part.node->line(), title(part), {part.cfg->getName()});
     }
     // What reaches an output leaves under the port's inner name; what reaches a loop point leaves by the
     // loop's output.

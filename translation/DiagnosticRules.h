@@ -19,6 +19,7 @@ enum class Rule {
   UnknownParameter,
   DuplicateName,
   DuplicateNumber,
+  RepeatedDeclaration,
   DanglingLink,
   BadPort,
   UnknownInput,
@@ -48,6 +49,7 @@ enum class Rule {
   NewerVersion,
   NewerBuild,
   UnusedParameter,
+  UnusedCustomTransformer,
   UnknownReference,
   // Of mapping files.
   NotUtf8,

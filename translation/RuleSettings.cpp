@@ -1,8 +1,16 @@
+#include <transform/text/MessageStrings.h>
 #include <translation/RuleSettings.h>
 
 #include <QStringList>
 
 #include <algorithm>
+
+namespace {
+
+constexpr long kNoRule = 370873;
+constexpr long kNoSeverity = 370874;
+
+}  // namespace
 
 bool RuleSettings::set(const QString& setting, QString& reason) {
   const int equals = setting.indexOf(QLatin1Char('='));
@@ -12,8 +20,7 @@ bool RuleSettings::set(const QString& setting, QString& reason) {
     QStringList names;
     for (const DiagnosticRule& known : diagnosticRules())
       names.append(known.name);
-    reason = QStringLiteral("'%1' does not begin with a rule's name and '='; the rules are: %2")
-                 .arg(setting, names.join(QLatin1String(", ")));
+    reason = TransformResString(kNoRule, {setting, names.join(QLatin1String(", "))});
     return false;
   }
   const QString level = setting.mid(equals + 1);
@@ -27,7 +34,7 @@ bool RuleSettings::set(const QString& setting, QString& reason) {
       return true;
     }
   }
-  reason = QStringLiteral("'%1' is no severity; give %2=off, hint, warning or error").arg(level, name);
+  reason = TransformResString(kNoSeverity, {level, name});
   return false;
 }
 

@@ -6,12 +6,19 @@
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
 #include <translation/InstanceIdentity.h>
 #include <translation/NetworkDiagnostics.h>
 #include <translation/WorkspaceBuilder.h>
+
+namespace {
+
+constexpr long kRepeatedCustomTransformer = 370869;
+
+}  // namespace
 
 WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
                                    const QHash<QString, QString>& parameterValues)
@@ -40,6 +47,9 @@ std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& re
   }
   for (const LinkStruct& record : reader.GetAttributeLinkList(mainDocument))
     addAttributeLink(record);
+  reportRepeatedNames(reader);
+  if (m_includesUnused)
+    buildUnused(reader);
   reportCustomTransformers();
   m_workspace->library->forgetReader();
   return std::move(m_workspace);
@@ -60,18 +70,55 @@ void WorkspaceBuilder::addGlobalParameters(const IXMLComponentReader& reader) {
     statement.clear();
   }
   parameters.readHeaderLine(statement, lineNumber - 1);
+  QHash<QString, int> linesByName;
   for (const GlobalParameterStruct& record : reader.GetGlobalParameterList(QString())) {
     const QString name = GUIType::fromGuiLine(record.guiLine).getName();
-    if (name.isEmpty())
+    if (name.isEmpty()) {
       m_diagnostics.report(Rule::BadPromptLine, record.line, QString(), {record.guiLine});
-    else
-      parameters.declare(name, record.defaultValue, record.line);
+      continue;
+    }
+    const auto earlier = linesByName.constFind(name);
+    if (earlier != linesByName.constEnd())
+      m_diagnostics.report(Rule::RepeatedDeclaration, record.line, QString(),
+                           {name, QString::number(*earlier)});
+    linesByName.insert(name, record.line);
+    parameters.declare(name, record.defaultValue, record.line);
   }
   QStringList names = m_parameterValues.keys();
   names.sort();
   for (const QString& name : names) {
     if (!parameters.override(name, m_parameterValues.value(name)))
       m_diagnostics.report(Rule::UnknownGlobalParameter, 0, QString(), {name});
+  }
+}
+
+void WorkspaceBuilder::reportRepeatedNames(const IXMLComponentReader& reader) {
+  const QStringList names = reader.GetSubDocList();
+  QHash<QString, int> counts;
+  for (const QString& name : names)
+    ++counts[name];
+  for (const QString& name : names) {
+    const int count = counts.take(name);
+    if (count > 1) {
+      m_diagnostics.reportText(
+          Rule::RepeatedDeclaration, reader.GetDocumentLine(name), QString(),
+          TransformResString(kRepeatedCustomTransformer, {name, QString::number(count)}));
+    }
+  }
+}
+
+void WorkspaceBuilder::buildUnused(const IXMLComponentReader& reader) {
+  QSet<const ExternalDocNetwork*> used;
+  for (const ExternalDocNetwork* network : m_workspace->customTransformers())
+    used.insert(network);
+  QSet<QString> seen;
+  for (const QString& name : reader.GetSubDocList()) {
+    if (seen.contains(name))
+      continue;
+    seen.insert(name);
+    // Without a name it cannot be placed, and its document cannot be told from the workspace's own.
+    if (name.isEmpty() || !used.contains(m_workspace->library->network(name)))
+      m_diagnostics.report(Rule::UnusedCustomTransformer, reader.GetDocumentLine(name), QString(), {name});
   }
 }
 

@@ -25,6 +25,9 @@ class ORX_EXPORT WorkspaceBuilder {
   WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
                    const QHash<QString, QString>& parameterValues = {});
 
+  // Also builds the embedded custom transformers that the workspace does not use, and says so.
+  void includeUnused() { m_includesUnused = true; }
+
   std::unique_ptr<Workspace> build(const IXMLComponentReader& reader, const QString& fileName,
                                    const QStringList& headerLines);
 
@@ -36,6 +39,8 @@ class ORX_EXPORT WorkspaceBuilder {
   };
 
   void addGlobalParameters(const IXMLComponentReader& reader);
+  void reportRepeatedNames(const IXMLComponentReader& reader);
+  void buildUnused(const IXMLComponentReader& reader);
   void addFeatureType(const FeatureTypeStruct& record);
   void addTransformer(const TransformerStruct& record);
   std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& nodeName);
@@ -57,6 +62,7 @@ class ORX_EXPORT WorkspaceBuilder {
   TransformerSource& m_source;
   Diagnostics& m_diagnostics;
   const QHash<QString, QString> m_parameterValues;
+  bool m_includesUnused = false;
   std::unique_ptr<Workspace> m_workspace;
   QHash<int, Place> m_places;               // by identifier in the document
   QHash<QString, int> m_linesByName;        // of transformers

@@ -49,6 +49,7 @@ class Validation {
   TransformerSource& m_source;
   Diagnostics& m_diagnostics;
   ValueChecks m_values;
+  ORXTValSlist<TransformerStruct> m_transformers;  // of the main document
   QStringList m_parameterNames;
   bool m_includesOthers = false;       // the header takes in files that may set further parameters
   QHash<QString, int> m_newestByName;  // -1: not known outside the document
@@ -56,8 +57,9 @@ class Validation {
 
 void Validation::run() {
   checkBuild();
-  const std::unique_ptr<Workspace> workspace =
-      WorkspaceBuilder(m_source, m_diagnostics).build(m_reader, m_diagnostics.file(), m_headerLines);
+  WorkspaceBuilder builder(m_source, m_diagnostics);
+  builder.includeUnused();
+  const std::unique_ptr<Workspace> workspace = builder.build(m_reader, m_diagnostics.file(), m_headerLines);
   MappingFileWriter writer(*workspace, m_diagnostics);
   writer.prepare();
 
@@ -95,8 +97,8 @@ bool Validation::isKnown(const GlobalParameters& parameters, const QString& name
 void Validation::checkTransformers(const Workspace& workspace, bool isConnected) {
   const FlowChecks flow(workspace);
   flow.report(m_diagnostics);
-  const ORXTValSlist<TransformerStruct> list = m_reader.GetTransformerList(QString());
-  const Records records = byIdentifier(list);
+  m_transformers = m_reader.GetTransformerList(QString());
+  const Records records = byIdentifier(m_transformers);
   const auto knows = [&](const QString& name) { return isKnown(workspace.parameters, name); };
   for (std::size_t number = 0; number < workspace.nodes.size(); ++number) {
     const WorkspaceNode& node = workspace.nodes[number];
@@ -171,17 +173,22 @@ void Validation::collectReferences(ReferencedNames& names) const {
     for (const NonGuiDeflineParmStruct& parameter : type.nonGuiDeflineParms)
       names.add(parameter.value);
   }
+  const auto addTransformers = [&names](const ORXTValSlist<TransformerStruct>& list) {
+    for (const TransformerStruct& transformer : list) {
+      for (const XformParmStruct& parameter : transformer.parameters)
+        names.add(parameter.parmValue);
+      for (const XformAttrStruct& attribute : transformer.attributes)
+        names.add(attribute.attrValue);
+    }
+  };
+  addTransformers(m_transformers);
+  for (const QString& document : m_reader.GetSubDocList())
+    addTransformers(m_reader.GetTransformerList(document));
   // Also inside custom transformers, whose scripts see the global parameters.
   for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList()) {
     for (const GlobalParameterStruct& parameter : m_reader.GetGlobalParameterList(document)) {
       names.add(parameter.defaultValue);
       names.add(parameter.guiLine);
-    }
-    for (const TransformerStruct& transformer : m_reader.GetTransformerList(document)) {
-      for (const XformParmStruct& parameter : transformer.parameters)
-        names.add(parameter.parmValue);
-      for (const XformAttrStruct& attribute : transformer.attributes)
-        names.add(attribute.attrValue);
     }
     for (const ConstantStruct& constant : m_reader.GetConstantList(document))
       names.add(constant.constValue);
@@ -191,9 +198,14 @@ void Validation::collectReferences(ReferencedNames& names) const {
 void Validation::checkParameterUse(const Workspace& workspace) {
   ReferencedNames names;
   collectReferences(names);
+  // What the header sets may be read by the engine itself, and what belongs to the server by that.
+  QSet<QString> readElsewhere;
+  for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(QString())) {
+    if (record.isServer)
+      readElsewhere.insert(GUIType::fromGuiLine(record.guiLine).getName());
+  }
   for (const GlobalParameters::Parameter& parameter : workspace.parameters.all()) {
-    // What the header sets may be read by the engine itself.
-    if (!parameter.setInHeader && !names.contains(parameter.name))
+    if (!parameter.setInHeader && !names.contains(parameter.name) && !readElsewhere.contains(parameter.name))
       m_diagnostics.report(Rule::UnusedParameter, parameter.line, QString(), {parameter.name});
   }
 }

@@ -5,7 +5,7 @@
 // transformers, parameters and references that do not fit together. The transformers inside embedded custom
 // transformers are judged as well, those inside linked ones where the linked file is loaded. Which attributes
 // reach the inside differs by instance, so no attribute is called missing there. Embedded custom transformers
-// that nothing uses are not looked at.
+// that nothing uses are judged like those in use.
 #pragma once
 
 #include <platform/Export.h>

@@ -2,6 +2,7 @@
 #include <apps/orxt/SarifLog.h>
 #include <apps/orxt/ValidateCommand.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageStrings.h>
 
 #include <CLI/CLI.hpp>
 #include <QJsonArray>
@@ -10,6 +11,9 @@
 #include <algorithm>
 
 namespace {
+
+constexpr long kSummary = 370871;
+constexpr long kUnreadable = 370872;
 
 constexpr CommandFacts kFacts = {"validate", "Find everything that is wrong with workspaces",
                                  "orxt validate parcels.orw roads.orw\n"
@@ -33,10 +37,6 @@ QJsonObject toJson(const ValidationReport& report) {
           {QStringLiteral("warnings"), report.count(Severity::Warning)},
           {QStringLiteral("hints"), report.count(Severity::Hint)},
           {QStringLiteral("findings"), findings}};
-}
-
-QString counted(int count, const QString& noun) {
-  return QString::number(count) + QLatin1Char(' ') + noun + (count == 1 ? QString() : QStringLiteral("s"));
 }
 
 ExitStatus exitStatus(const std::vector<ValidationReport>& reports) {
@@ -70,6 +70,7 @@ void ValidateCommand::declare(CLI::App& app) {
 }
 
 ExitStatus ValidateCommand::run(Console& console) {
+  m_definitions.setLanguage();
   RuleSettings settings;
   for (const std::string& rule : m_rules) {
     QString reason;
@@ -127,11 +128,9 @@ void ValidateCommand::summarize(const std::vector<ValidationReport>& reports, Co
       counts[static_cast<int>(severity)] += report.count(severity);
     unreadable += report.isReadable() ? 0 : 1;
   }
-  QString line = counted(static_cast<int>(reports.size()), QStringLiteral("workspace")) +
-                 QLatin1String(": ") + counted(counts[0], QStringLiteral("error")) + QLatin1String(", ") +
-                 counted(counts[1], QStringLiteral("warning")) + QLatin1String(", ") +
-                 counted(counts[2], QStringLiteral("hint"));
+  QString line = TransformResString(kSummary, {QString::number(reports.size()), QString::number(counts[0]),
+                                               QString::number(counts[1]), QString::number(counts[2])});
   if (unreadable > 0)
-    line += QLatin1String(", ") + QString::number(unreadable) + QLatin1String(" unreadable");
+    line += QLatin1Char(' ') + TransformResString(kUnreadable, QString::number(unreadable));
   console.print(line + QLatin1Char('\n'));
 }

@@ -16,14 +16,11 @@ Outcome validateBroken(const QStringList& arguments) {
 }
 
 TEST(Validate, SaysWhatIsWrongWithBrokenWorkspaces) {
-  expectSaidOfBroken("validate", brokenFolder(), ".orw", 12);
+  expectSaidOfBroken("validate", brokenFolder(), ".orw", 15);
 }
 
 TEST(Validate, FindsNothingWrongWithTheSamples) {
-  // One sample keeps a deprecated transformer on purpose.
-  const Outcome run =
-      orxt(QStringList{"validate", "--json", "--rule", "deprecated=off", "--resources", sample("custom")} +
-           samples());
+  const Outcome run = orxt(QStringList{"validate", "--json", "--resources", sample("custom")} + samples());
   EXPECT_EQ(run.status, 0);
   const QJsonArray reports = QJsonDocument::fromJson(run.out.toUtf8()).array();
   ASSERT_EQ(reports.size(), samples().size());
@@ -41,21 +38,29 @@ TEST(Validate, EndsWithTheStatusThatFits) {
     int errors;  // lines on standard error
     const char* out;
   } cases[] = {
-      {{"loose-ends.orw"}, 0, 6, "1 workspace: 0 errors, 3 warnings, 3 hints\n"},
+      {{"loose-ends.orw"}, 0, 6, "Workspaces: 1. Errors: 0, warnings: 3, hints: 3.\n"},
       {{"loose-ends.orw", "--quiet"}, 0, 0, ""},
       {{"refused-values.orw", "--quiet"}, 1, 5, ""},
-      {{"refused-values.orw", "loose-ends.orw"}, 1, 11, "2 workspaces: 5 errors, 3 warnings, 3 hints\n"},
+      {{"refused-values.orw", "loose-ends.orw"}, 1, 11, "Workspaces: 2. Errors: 5, warnings: 3, hints: 3.\n"},
       {{"missing.orw", "refused-values.orw", "-q"}, 3, 6, ""},
       {{"loose-ends.orw", "--rule", "unfed-input=error", "-q"}, 1, 2, ""},
       {{"loose-ends.orw", "--rule", "unfed-input=off", "--rule", "dropped-output=off"},
        0,
        2,
-       "1 workspace: 0 errors, 1 warning, 1 hint\n"},
-      {{"cycle.orw", "--rule", "cycle=warning"}, 0, 1, "1 workspace: 0 errors, 1 warning, 0 hints\n"},
+       "Workspaces: 1. Errors: 0, warnings: 1, hints: 1.\n"},
+      {{"cycle.orw", "--rule", "cycle=warning"}, 0, 1, "Workspaces: 1. Errors: 0, warnings: 1, hints: 0.\n"},
       {{"cycle.orw", "--rule", "cycle=hint", "--rule", "cycle=error", "-q"}, 1, 1, ""},
       {{"cycle.orw", "--rule", "cycle=loud"}, 2, 1, ""},
       {{"cycle.orw", "--rule", "circle=off"}, 2, 1, ""},
       {{"cycle.orw", "--rule", "cycle"}, 2, 1, ""},
+      {{"missing.orw", "cycle.orw", "--rule", "cycle=off", "--lang", "de"},
+       3,
+       1,
+       "Arbeitsbereiche: 2. Fehler: 0, Warnungen: 0, Hinweise: 0. Nicht lesbar: 1.\n"},
+      {{"cycle.orw", "--rule", "cycle=off", "--lang", "fr"},
+       0,
+       0,
+       "Espaces de travail : 1. Erreurs : 0, avertissements : 0, conseils : 0.\n"},
   };
   for (const auto& test : cases) {
     const Outcome run = validateBroken(test.arguments);

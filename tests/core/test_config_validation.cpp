@@ -23,7 +23,10 @@ struct Connections : DefinitionDirectory {
   bool isConnectionKnown(const QString& encodedName) const override {
     return encodedName == qs("My<space>Base");
   }
-  std::vector<GUIType> memberDefinitions(const GUIType&) const override { return {}; }
+  const MemberList* memberDefinitions(const GUIType&) const override {
+    return members.members().empty() ? nullptr : &members;
+  }
+  MemberList members;
 };
 
 struct Accepting : TransformerCfgListener {
@@ -147,6 +150,65 @@ TEST_F(ConfigValidation, MissingNamesAreCutAtOneHundredCharacters) {
   EXPECT_FALSE(cfg.validateParameter(qs("P"), message));
   const QString quoted = qs("'") + names.join(qs("' '")) + qs("'");
   EXPECT_EQ(message, TransformResString(370607, quoted.left(100)));
+}
+
+TEST_F(ConfigValidation, RefusalsInEveryLanguage) {
+  TransformerCfg cfg;
+  cfg.configure(makeDefinition({{"VALUE", "TEXT", "Size", ""},
+                                {"REFERENCE", "ATTR", "A", "gone"},
+                                {"FILE", "FILEMUSTEXIST", "F", "no.txt"},
+                                {"CONNECTION", "TEXT", "C", "orx://x?connection=n"}}));
+  const struct {
+    const char* language;
+    QStringList messages;
+  } cases[] = {
+      {"en",
+       {"The parameter 'Size' needs a value.", "These attributes do not reach the transformer: 'gone'",
+        "The file 'no.txt' does not exist or is a folder.", "There is no connection named 'n'."}},
+      {"de",
+       {"Der Parameter 'Size' braucht einen Wert.", "Diese Attribute erreichen den Transformer nicht: 'gone'",
+        "Die Datei 'no.txt' existiert nicht oder ist ein Ordner.",
+        "Es gibt keine Verbindung mit dem Namen 'n'."}},
+      {"fr",
+       {"Le paramètre 'Size' exige une valeur.", "Ces attributs n’atteignent pas le transformateur : 'gone'",
+        "Le fichier 'no.txt' n’existe pas ou est un dossier.", "Il n’existe aucune connexion nommée 'n'."}},
+  };
+  for (const auto& test : cases) {
+    QORXSetLanguage(qs(test.language));
+    QStringList names = words("VALUE REFERENCE FILE CONNECTION");
+    QHash<QString, QString> messages;
+    EXPECT_FALSE(cfg.validateParameters(names, messages));
+    for (int i = 0; i < names.size(); ++i) {
+      EXPECT_EQ(messages.value(names.at(i)), test.messages.at(i)) << test.language;
+    }
+  }
+}
+
+// A registry may list other members than the type itself.
+TEST_F(ConfigValidation, AsksItsDirectory) {
+  TransformerCfg cfg;
+  cfg.configure(makeDefinition({{"PAIR", kPair, "Pair", "OTHER;;K;"},
+                                {"KNOWN", "TEXT", "C", "orx://x?connection=My%20Base"},
+                                {"NAMED", "NAMED_CONNECTION", "C", "My Base"}}));
+  Accepting listener;
+  cfg.setListener(&listener);
+  const auto refused = [&cfg] {
+    QStringList names = words("PAIR KNOWN NAMED");
+    QHash<QString, QString> messages;
+    cfg.validateParameters(names, messages);
+    QStringList found;
+    for (const QString& name : names) {
+      found << messages.value(name);
+    }
+    return found;
+  };
+  const QString none;
+  const QString unknown = TransformResString(370636, qs("My Base"));
+  EXPECT_EQ(refused(), (QStringList{TransformResString(370608, qs("Key")), unknown, unknown}));
+  m_connections.members = MemberList(GUIType::fromTransformerTypeString(
+      qs("MULTIPARAMETER ;,GUI<space>TEXT<space>OTHER<space>Other<space>One")));
+  cfg.setDefinitionDirectory(&m_connections);
+  EXPECT_EQ(refused(), (QStringList{TransformResString(370608, qs("Other One")), none, none}));
 }
 
 TEST_F(ConfigValidation, AllParameters) {

@@ -403,3 +403,43 @@ TEST(ShippedResources, DefineWhatTheFactoryNames) {
     EXPECT_TRUE(isServed) << rule.name.data() << " from version " << rule.firstVersion;
   }
 }
+
+// Asked about good and bad values alike, every shipped transformer stays as it was, and says the same again.
+TEST(ShippedResources, StayAsTheyAreWhenValidated) {
+  qputenv("ORX_HOME", kResources.toUtf8());
+  TransformerMgr& manager = TransformerMgr::getTransformerMgr();
+  ORXSession session;
+  manager.loadTransformers(&session);
+  const QStringList values = {QStringLiteral("1"),
+                              QString(),
+                              QStringLiteral("<Unused>"),
+                              QStringLiteral("@Value(gone)"),
+                              QStringLiteral("a b;\"c,{d"),
+                              QStringLiteral("no/such.file"),
+                              QStringLiteral("orx://x?connection=none"),
+                              QStringLiteral("$(NOWHERE)$[")};
+  int refusals = 0;
+  for (const QString& name : manager.transformerNames()) {
+    for (const int version : manager.transformerVersions(name)) {
+      SCOPED_TRACE(name.toStdString() + " version " + std::to_string(version));
+      const std::unique_ptr<TransformerCfg> cfg(manager.getTransformer(name, version));
+      QStringList names = cfg->getParameters();
+      for (int round = -1; round < values.size(); ++round) {
+        for (const QString& parameter : round < 0 ? QStringList() : names)
+          cfg->setParameterValue(parameter, values.at(round), true);
+        names = cfg->getParameters();
+        const auto before = cfg->serialize();
+        QString first;
+        QHash<QString, QString> messages;
+        const bool isValid = cfg->validateParameters(first);
+        EXPECT_EQ(cfg->validateParameters(names, messages), isValid);
+        EXPECT_EQ(names, cfg->getParameters());
+        EXPECT_EQ(messages.isEmpty(), isValid);
+        EXPECT_TRUE(isValid || messages.values().contains(first)) << first.toStdString();
+        EXPECT_EQ(cfg->serialize(), before) << round;
+        refusals += messages.size();
+      }
+    }
+  }
+  EXPECT_GT(refusals, 100);
+}

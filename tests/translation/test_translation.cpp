@@ -236,8 +236,8 @@ TEST(Translation, RefusesFaultyCustomTransformers) {
       {withCustom([](auto& w) {
          w.transformer(9, "Nothing", {"XFORMER_NAME", "N"});
        }),
-       {"custom-transformer-fault Cleaner/N"}},
-      {withCustom([](auto& w) { w.link(1, "fo 0", 77, "fi 0"); }), {"custom-transformer-fault Cleaner"}},
+       {"unknown-transformer Cleaner/N"}},
+      {withCustom([](auto& w) { w.link(1, "fo 0", 77, "fi 0"); }), {"dangling-link Cleaner"}},
       {withCustom([](auto& w) { w.link(3, "fo 0 OUTPUT", 3, "fi 0 INPUT"); }), {"cycle Cleaner"}},
       {withCustom([](auto& w) {
          w.transformer(9, "Copy", {"XFORMER_NAME", "N", "VALUE", "$[x"});
@@ -249,7 +249,7 @@ TEST(Translation, RefusesFaultyCustomTransformers) {
        {"not-written Cleaner/N"}},
       {withCustom([](auto& w) { w.port(9, "A\nB", "false").link(3, "fo 0", 9, "fi 0"); }),
        {"line-break Cleaner"}},
-      {withCustom([](auto& w) { w.port(9, "IN", "false"); }), {"custom-transformer-fault Cleaner/IN"}},
+      {withCustom([](auto& w) { w.port(9, "IN", "false"); }), {"duplicate-name Cleaner/IN"}},
   };
   for (const auto& test : cases) {
     const Outcome outcome = translate(test.workspace);

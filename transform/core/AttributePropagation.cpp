@@ -9,6 +9,7 @@
 #include <QSet>
 
 #include <algorithm>
+#include <iterator>
 
 namespace {
 
@@ -212,14 +213,26 @@ void TransformerCfg::getMissingAttributeReferences(const QString& parameter, QSt
   if (!hasReferences) {
     return;
   }
+  // A few names are found faster than the union is put together.
+  constexpr int kFewNames = 8;
+  const auto arrives = [this](const QString& name) {
+    return std::any_of(m_ports.inputAttributes.begin(), m_ports.inputAttributes.end(),
+                       [&name](const QStringList& attributes) { return attributes.contains(name); });
+  };
+  if (!m_attributeUnion && names.size() <= kFewNames && std::all_of(names.begin(), names.end(), arrives)) {
+    return;
+  }
+  const AttributeUnion& reaching = attributeUnion();
+  std::copy_if(names.begin(), names.end(), std::back_inserter(missing),
+               [&reaching](const QString& name) { return !reaching.contains(name); });
+  if (missing.isEmpty()) {
+    return;
+  }
   AttributeReferences references;
   collectReferences(parameter, references);
-  const AttributeUnion& reaching = attributeUnion();
-  for (const QString& name : names) {
-    if (!reaching.contains(name) && !references.mayBeNew(name)) {
-      missing.append(name);
-    }
-  }
+  missing.erase(std::remove_if(missing.begin(), missing.end(),
+                               [&references](const QString& name) { return references.mayBeNew(name); }),
+                missing.end());
 }
 
 void TransformerCfg::getAttributesByType(const QString& type, QStringList& attributes,

@@ -420,6 +420,10 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   QString displayString(const QString& name, const QString& value, bool withPrompt, bool isDecoded) const;
   QString tooltipValue(const QString& parameter) const;
   bool validateFile(const TransformParamCfg& record, const QString& parameter, QString& message) const;
+  bool isConnectionKnown(const QString& encodedName) const;
+  // `members` are those that the type itself lists; a registry may know better.
+  bool checkMembers(const QString& value, const GUIType& type, const MemberList& members,
+                    QString& missingPrompt) const;
   void addDefinedParameters(const TransformerDefinition& fields, QTextStream* log);
   void parseTagAliases(ConfiguredDefinition& definition);
   void initListActionDictionary(ConfiguredDefinition& definition, QTextStream* log);

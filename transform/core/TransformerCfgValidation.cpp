@@ -96,13 +96,14 @@ bool TransformerCfg::validateParameter(const QString& parameter, QString& messag
   if (value == kUnusedValue) {
     return true;
   }
-  const QString type = record->getTypeWithConfig();
-  if (type.startsWith(kAttributeType) && type.contains(kAllowNew)) {
+  const QString& type = record->getType();
+  if (type.startsWith(kAttributeType) &&
+      (type.contains(kAllowNew) || record->getConfigToken().contains(kAllowNew))) {
     return true;
   }
-  if (type.startsWith(kMultiParameterType)) {
+  if (record->isMultiParameter()) {
     QString missingPrompt;
-    if (!checkMultiParameterForMissingValues(value, type, missingPrompt)) {
+    if (!checkMembers(value, *record, record->members(), missingPrompt)) {
       message = TransformResString(kMissingValueMessage, missingPrompt);
       return false;
     }
@@ -114,18 +115,15 @@ bool TransformerCfg::validateParameter(const QString& parameter, QString& messag
     message = TransformResString(kMissingAttributesMessage, quotedNames(missing));
     return false;
   }
-  const bool isTable = type.startsWith(kTableType);
-  if (hasReferences && !isTable) {
+  if (hasReferences && !record->isTable()) {
     return true;
   }
   if (m_listener && m_listener->acceptsValue(*this, parameter, value)) {
     return true;
   }
-  // Without a directory nobody knows which connections there are.
-  if (m_definitionDirectory &&
-      (value.startsWith(kConnectionScheme) || value.startsWith(kConnectionSchemeEncoded))) {
+  if (value.startsWith(kConnectionScheme) || value.startsWith(kConnectionSchemeEncoded)) {
     const QString name = connectionName(value);
-    if (!m_definitionDirectory->isConnectionKnown(QORXWwjdEncode(name))) {
+    if (!isConnectionKnown(QORXWwjdEncode(name))) {
       message = TransformResString(kNoConnectionMessage, name);
       return false;
     }
@@ -134,22 +132,26 @@ bool TransformerCfg::validateParameter(const QString& parameter, QString& messag
   if (type.startsWith(kFilenameMustExist) || (type.startsWith(kFileMustExist) && !isConditional)) {
     return validateFile(*record, parameter, message);
   }
-  if (type == kTextEncodedType) {
+  if (record->getTypeWithConfig() == kTextEncodedType) {
     return QORXWwjdIsWellFormed(value);
   }
-  if (m_listener && m_definitionDirectory && !isConditional &&
+  if (m_listener && !isConditional &&
       (type.startsWith(kNamedConnection) || type.startsWith(kNamedDatabaseConnection))) {
     const QString resolved = getParameterValue(parameter, UnpackLevel::Resolved);
     const QString encoded = record->valueIsEncoded() ? resolved : QORXWwjdEncode(resolved);
-    if (m_definitionDirectory->isConnectionKnown(encoded)) {
+    if (isConnectionKnown(encoded)) {
       return true;
     }
     message = TransformResString(kNoConnectionMessage, QORXWwjdDecode(encoded));
     return false;
   }
-  return !isTable ||
+  return !record->isTable() ||
          validateTableValues(parameter, columnRecords(record->members()),
                              getParameterTableValuesAsParts(parameter, UnpackLevel::Stored), message);
+}
+
+bool TransformerCfg::isConnectionKnown(const QString& encodedName) const {
+  return m_definitionDirectory && m_definitionDirectory->isConnectionKnown(encodedName);
 }
 
 bool TransformerCfg::validateFile(const TransformParamCfg& record, const QString& parameter,
@@ -190,29 +192,22 @@ bool TransformerCfg::validateParameters(QStringList& names, QHash<QString, QStri
 
 bool TransformerCfg::checkMultiParameterForMissingValues(const QString& value, const QString& type,
                                                          QString& missingPrompt) const {
+  const GUIType parsed = GUIType::fromTransformerTypeString(type);
+  return checkMembers(value, parsed, MemberList(parsed), missingPrompt);
+}
+
+bool TransformerCfg::checkMembers(const QString& value, const GUIType& type, const MemberList& members,
+                                  QString& missingPrompt) const {
   if (value.isEmpty()) {
     return true;
   }
-  const GUIType parsed = GUIType::fromTransformerTypeString(type);
-  const MemberList own(parsed);
-  const QStringList parts = QORXSdfStringToList(value, own.separator());
-  if (parts.isEmpty()) {
-    return true;
-  }
-  std::vector<GUIType> definitions;
-  if (m_definitionDirectory) {
-    definitions = m_definitionDirectory->memberDefinitions(parsed);
-  }
-  if (definitions.empty()) {
-    definitions = own.members();
-  }
-  QHash<QString, const GUIType*> byName;
-  for (auto member = definitions.rbegin(); member != definitions.rend(); ++member) {
-    byName.insert(member->getName(), &*member);
-  }
+  const QStringList parts = QORXSdfStringToList(value, members.separator());
+  const MemberList* known =
+      m_definitionDirectory && !parts.isEmpty() ? m_definitionDirectory->memberDefinitions(type) : nullptr;
+  const MemberList& definitions = known ? *known : members;
   for (int i = 0; i < parts.size() - 1; i += 2) {
-    const GUIType* member = byName.value(parts[i]);
-    if (!member || parts[i] == kControllerQueryFile) {
+    const GUIType* member = parts[i] == kControllerQueryFile ? nullptr : definitions.find(parts[i]);
+    if (!member) {
       continue;
     }
     missingPrompt = member->getDescription();

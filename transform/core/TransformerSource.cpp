@@ -8,5 +8,9 @@ QString TransformerSource::refusalReason() const {
   return QString();
 }
 
+const DefinitionDirectory* TransformerSource::definitionDirectory() const {
+  return nullptr;
+}
+
 DefinitionDirectory::~DefinitionDirectory() = default;
 WorkspaceParameterDirectory::~WorkspaceParameterDirectory() = default;

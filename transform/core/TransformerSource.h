@@ -7,9 +7,10 @@
 #include <QString>
 
 #include <memory>
-#include <vector>
 
+class DefinitionDirectory;
 class GUIType;
+class MemberList;
 class TransformerCfg;
 
 class ORX_EXPORT TransformerSource {
@@ -23,6 +24,8 @@ class ORX_EXPORT TransformerSource {
   // Why the last makeTransformer() answered null although the transformer is known: a message for the user.
   // Empty by default.
   virtual QString refusalReason() const;
+  // What the transformers made here are judged by; null when there is nothing to ask. Not owned.
+  virtual const DefinitionDirectory* definitionDirectory() const;
 };
 
 class ORX_EXPORT DefinitionDirectory {
@@ -30,6 +33,7 @@ class ORX_EXPORT DefinitionDirectory {
   virtual ~DefinitionDirectory();
   // `encodedName` is word-encoded.
   virtual bool isConnectionKnown(const QString& encodedName) const = 0;
-  // The member definitions of a multi-parameter type, by the type's configuration; empty when unknown.
-  virtual std::vector<GUIType> memberDefinitions(const GUIType& type) const = 0;
+  // The member definitions of a multi-parameter type, by the type's configuration; null when unknown. They
+  // stay as long as the directory is not loaded anew.
+  virtual const MemberList* memberDefinitions(const GUIType& type) const = 0;
 };

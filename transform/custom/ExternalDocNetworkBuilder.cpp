@@ -120,6 +120,7 @@ void ExternalDocNetwork::Builder::addTransformer(const TransformerStruct& record
   if (!enter(record.identifier, place) || !cfg)
     return;
   SubDocNetworkObjXformer* node = m_network.addTransformer(cfg.release(), {}, record.identifier);
+  node->setLine(record.line);
   node->setExposedAttributes(place.ports.exposedAttributes(record));
   m_network.m_transformerNames.insert(place.title);
 }

@@ -38,6 +38,9 @@ class ORX_EXPORT SubDocNetworkObj {
   int number() const { return m_number; }
   // The port's or loop's name; the identifier of an inner transformer.
   QString name() const;
+  // Of the element in the file that the network was read from; 0 when there is none.
+  int line() const { return m_line; }
+  void setLine(int line) { m_line = line; }
   // The nodes that feed this one, by the port of this node.
   const Ports& feeders() const { return m_feeders; }
   // The nodes that this one feeds, by the port of this node.
@@ -123,6 +126,7 @@ class ORX_EXPORT SubDocNetworkObj {
   std::map<QString, PortOutlet> m_outlets;  // of transformers, and where copies are made
 
   QString m_name;
+  int m_line = 0;
   Ports m_feeders;
   Ports m_consumers;
   std::map<QString, std::vector<AttributeCopy>> m_copies;

@@ -52,6 +52,10 @@ SubDocumentLibrary::Entry* SubDocumentLibrary::find(const QString& name) {
   return entry.get();
 }
 
+const DefinitionDirectory* SubDocumentLibrary::definitionDirectory() const {
+  return m_others ? m_others->definitionDirectory() : nullptr;
+}
+
 ExternalDocNetwork* SubDocumentLibrary::network(const QString& name) {
   Entry* entry = find(name);
   m_refusal.clear();
@@ -83,5 +87,7 @@ std::unique_ptr<TransformerCfg> SubDocumentLibrary::makeTransformer(const QStrin
     Entry& outer = *m_entries.value(m_open.last());
     outer.depth = std::max(outer.depth, entry->depth + 1);
   }
-  return std::make_unique<CompoundTransformerCfg>(&entry->network);
+  auto instance = std::make_unique<CompoundTransformerCfg>(&entry->network);
+  instance->setDefinitionDirectory(definitionDirectory());
+  return instance;
 }

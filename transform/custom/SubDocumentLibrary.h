@@ -28,6 +28,7 @@ class ORX_EXPORT SubDocumentLibrary : public TransformerSource {
   // The document's own custom transformers answer to any version.
   std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override;
   QString refusalReason() const override { return m_refusal; }
+  const DefinitionDirectory* definitionDirectory() const override;
 
   bool holds(const QString& name) const { return m_entries.contains(name); }
   // Null for a name that the document does not have, or when it is being built. Owned by the library.

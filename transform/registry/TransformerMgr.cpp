@@ -68,6 +68,7 @@ void TransformerMgr::reset() {
   m_ignored.clear();
   *m_exceptions = ExceptionList();
   *m_connections = NamedConnections();
+  m_members.clear();
 }
 
 void TransformerMgr::loadTransformers(IORXSession* session) {
@@ -477,6 +478,10 @@ bool TransformerMgr::isConnectionKnown(const QString& encodedName) const {
   return m_connections->contains(encodedName);
 }
 
-std::vector<GUIType> TransformerMgr::memberDefinitions(const GUIType& type) const {
-  return MemberList(type).members();
+const MemberList* TransformerMgr::memberDefinitions(const GUIType& type) const {
+  std::shared_ptr<const MemberList>& members = m_members[type.getConfigToken()];
+  if (!members) {
+    members = std::make_shared<MemberList>(type);
+  }
+  return members.get();
 }

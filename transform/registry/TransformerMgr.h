@@ -118,7 +118,8 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   // not here.
   QString refusalReason() const override;
   bool isConnectionKnown(const QString& encodedName) const override;
-  std::vector<GUIType> memberDefinitions(const GUIType& type) const override;
+  const MemberList* memberDefinitions(const GUIType& type) const override;
+  const DefinitionDirectory* definitionDirectory() const override { return this; }
 
  private:
   TransformerMgr();
@@ -157,4 +158,5 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   QString m_refusal;
   std::unique_ptr<ExceptionList> m_exceptions;
   std::unique_ptr<NamedConnections> m_connections;
+  mutable QHash<QString, std::shared_ptr<const MemberList>> m_members;  // by configuration, as asked for
 };
