@@ -1,20 +1,25 @@
 // Validation against generation of the same workspaces, in which every tenth transformer refers to an
 // attribute that does not arrive, and the checks of the mapping files written: the time per transformer must
-// not grow with the workspace.
+// not grow with the workspace. It is the time of the processor, so that neither the disk nor other programs
+// take part.
 #include <platform/session/session.h>
 #include <transform/registry/TransformerMgr.h>
 #include <translation/MappingFileLint.h>
 #include <translation/WorkspaceTranslation.h>
 #include <translation/WorkspaceValidation.h>
 
-#include <QElapsedTimer>
 #include <QFile>
 #include <QTemporaryDir>
 
 #include <algorithm>
 #include <cstdio>
+#include <ctime>
 
 namespace {
+
+double microsecondsSince(std::clock_t start) {
+  return static_cast<double>(std::clock() - start) * 1e6 / CLOCKS_PER_SEC;
+}
 
 QString link(int number, int from, const QString& output, int to, const QString& input) {
   return QStringLiteral(
@@ -77,23 +82,26 @@ int main() {
     double generated = 0;
     double linted = 0;
     for (int run = 0; run < (count <= 1000 ? 5 : count <= 10000 ? 2 : 1); ++run) {
-      QElapsedTimer timer;
-      timer.start();
+      std::clock_t start = std::clock();
       const ValidationReport report = validateWorkspace(file, registry);
-      const double validation = static_cast<double>(timer.nsecsElapsed()) / 1000 / count;
-      if (report.count(Severity::Error) != count / 10) {
-        std::printf("%d findings instead of %d\n", report.count(Severity::Error), count / 10);
+      const double validation = microsecondsSince(start) / count;
+      if (report.count(Severity::Error) != count / 10 ||
+          !std::is_sorted(
+              report.findings.begin(), report.findings.end(),
+              [](const Diagnostic& left, const Diagnostic& right) { return left.line < right.line; })) {
+        std::printf("%d findings instead of %d, or not in their order\n", report.count(Severity::Error),
+                    count / 10);
         return 1;
       }
       Diagnostics diagnostics(file);
       QString error;
-      timer.restart();
+      start = std::clock();
       if (translateWorkspace({file, written, {}}, registry, diagnostics, error) != TranslationResult::Done)
         return 1;
-      const double generation = static_cast<double>(timer.nsecsElapsed()) / 1000 / count;
-      timer.restart();
+      const double generation = microsecondsSince(start) / count;
+      start = std::clock();
       const MappingFileFindings findings = lintMappingFile(written, written, {});
-      const double lint = static_cast<double>(timer.nsecsElapsed()) / 1000 / count;
+      const double lint = microsecondsSince(start) / count;
       if (!findings.readError.isEmpty() || !findings.findings.empty()) {
         std::printf("%zu findings in the mapping file\n", findings.findings.size());
         return 1;

@@ -33,6 +33,9 @@ struct Accepting : TransformerCfgListener {
   bool acceptsValue(const TransformerCfg&, const QString&, const QString& value) const override {
     return value == qs("accepted");
   }
+  QString resolveUserTypedMacro(const TransformerCfg&, const QString& value, UnpackLevel) const override {
+    return QString(value).replace(qs("$(F_USERTYPED)"), qs("Grüße.txt"));
+  }
 };
 
 constexpr long kNoMessage = 0;
@@ -118,6 +121,17 @@ TEST_F(ConfigValidation, WithoutListener) {
       {"FILEMUSTEXIST", "F", "ORX_CONDITIONAL:x", true},
       {"FILENAME_MUSTEXIST", "F", "ORX_CONDITIONAL:x", false, 370612, "ORX_CONDITIONAL:x"},
       {"FILENAME", "F", "no.txt", true},
+      // What is asked first decides.
+      {"FILENAME_MUSTEXIST", "F", "<Unused>", true},
+      {"FILENAME_MUSTEXIST", "F", "@Value(here)", true},
+      {"FILENAME_MUSTEXIST", "F", "@Value(gone).txt", false, 370607, "'gone'"},
+      {"FILENAME_MUSTEXIST", "F", "orx://x?connection=No", false, 370636, "No"},
+      {"FILENAME_MUSTEXIST", "F", "orx://x?connection=My%20Base", false, 370612,
+       "orx://x?connection=My%20Base"},
+      {"TEXT_ENCODED", "E", "orx://x?connection=My%20Base", false},
+      {kPair, "Pair", "K;;T;@Value(gone)", false, 370608, "Key"},
+      {kPair, "Pair", "K;1;T;@Value(gone)", false, 370607, "'gone'"},
+      {kTable, "Table", "a;@Value(gone);c;", false, 370607, "'gone'"},
   };
   for (const ValidationCase& c : cases) {
     check(c);
@@ -131,6 +145,10 @@ TEST_F(ConfigValidation, WithListener) {
       {"NAMED_DB_CONNECTION_ENCODED", "C", "My<space>Base", true},
       {"NAMED_DB_CONNECTION", "C", "None<Such", false, 370636, "None<Such"},
       {"NAMED_DB_CONNECTION", "C", "ORX_CONDITIONAL:x", true},
+      {"FILENAME_MUSTEXIST", "F", "$(F_USERTYPED)", true},
+      {"FILENAME_MUSTEXIST", "F", "$(F_USERTYPED)x", false, 370612, "Grüße.txtx"},
+      {"ATTR", "A", "accepted", false, 370607, "'accepted'"},
+      {kTable, "Table", "accepted", true},
   };
   Accepting listener;
   for (const ValidationCase& c : cases) {

@@ -2,6 +2,7 @@
 #include "CustomFixtures.h"
 #include <platform/qorxcore/qorxcore.h>
 #include <tests/text/ScriptRunners.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QRegularExpression>
@@ -278,6 +279,18 @@ TEST(Instance, WritesScriptsThatComputeTheInstancesMacros) {
   EXPECT_FALSE(instance.validateParameter(QStringLiteral("PY1"), message));
   EXPECT_FALSE(message.isEmpty());
   EXPECT_EQ(instance.findUnwritableParameters().keys(), names(QStringLiteral("PY1")));
+}
+
+TEST(Instance, ARequiredScriptMayNotBeEmpty) {
+  OpenNetwork network;
+  network.publish(QStringLiteral("GUI TEXT_EDIT_PYTHON_PARM PY Py"), QString());
+  network.doneAdding(true);
+  CompoundTransformerCfg instance(&network);
+  QString message;
+  EXPECT_FALSE(instance.validateParameter(QStringLiteral("PY"), message));
+  EXPECT_EQ(message, TransformResString(370608, QStringLiteral("Py")));
+  instance.setParameterValue(QStringLiteral("PY"), QStringLiteral("<Unused>"), false);
+  EXPECT_TRUE(instance.validateParameter(QStringLiteral("PY"), message));
 }
 
 TEST(Instance, RefusesWhatWouldNeverEnd) {

@@ -190,15 +190,17 @@ bool CompoundTransformerCfg::parmValueAffectsOutputAttrs(const QString& paramete
 
 bool CompoundTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
   const QString value = getParameterValue(parameter);
-  switch (scriptLanguage(getParameterGUIType(parameter))) {
-    case ScriptLanguage::None:
-      return TransformerCfg::validateParameter(parameter, message);
+  // Whether it may be empty, or is never asked for, is the same question for scripts as for all others.
+  const bool isScript = !isUnsetScript(value) && !getParameterPrompt(parameter).isEmpty();
+  switch (isScript ? scriptLanguage(getParameterGUIType(parameter)) : ScriptLanguage::None) {
     case ScriptLanguage::Python:
-      return isUnsetScript(value) || canWritePythonParameter(QString(), parameter, value, message);
+      return canWritePythonParameter(QString(), parameter, value, message);
     case ScriptLanguage::Tcl:
-      return isUnsetScript(value) || canWriteTclParameter(QString(), parameter, value, message);
+      return canWriteTclParameter(QString(), parameter, value, message);
+    case ScriptLanguage::None:
+      break;
   }
-  return true;
+  return TransformerCfg::validateParameter(parameter, message);
 }
 
 QSet<QString> CompoundTransformerCfg::attributeSetterDestinations() const {
