@@ -164,7 +164,7 @@ TEST(CustomTranslation, NestsUpTo64Deep) {
       {3, 1, {}},
       {64, 1, {}},
       {64, 2, {}},
-      {65, 1, {"custom-transformer-fault L1/T3"}},
+      {65, 1, {"nesting L1/T3"}},
   };
   for (const auto& test : cases) {
     QElapsedTimer timer;

@@ -139,7 +139,9 @@ std::unique_ptr<TransformerCfg> ExternalDocNetwork::Builder::makeTransformer(con
     return cfg;
   const QString refusal = m_source.refusalReason();
   if (!refusal.isEmpty()) {
-    m_network.addProblem(NetworkProblem::Kind::Nesting, record.line, title, refusal);
+    const bool isOfDocument = m_reader.GetSubDocList().contains(type);
+    m_network.addProblem(isOfDocument ? NetworkProblem::Kind::Nesting : NetworkProblem::Kind::NoBody,
+                         record.line, title, refusal);
     return nullptr;
   }
   const auto newest = m_source.makeTransformer(type, TransformerSource::kNewestVersion);
