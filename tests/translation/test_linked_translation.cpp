@@ -137,7 +137,7 @@ TEST_F(LinkedTranslation, TellsWhatDoesNotFit) {
       {"inside itself",
        [&] { store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Tidy\"")); },
        "1",
-       {"custom-transformer-fault Tidy/Tidy_3"},
+       {"nesting Tidy/Tidy_3"},
        {"Tidy > Tidy"}},
       {"by way of another file",
        [&] {
