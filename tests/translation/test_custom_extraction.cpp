@@ -213,9 +213,9 @@ TEST_F(Extraction, RefusesWhatNoFileCanHold) {
     bool isRefused;  // else the file could not be written
     QString inText;
   } cases[] = {
-      {"Good", "Nothing", "", true, "custom-transformer-fault Good/T"},
+      {"Good", "Nothing", "", true, "unknown-transformer Good/T"},
       {"Good", "Broken", "", true, "not-written Good/T"},
-      {"Good", "Good", "", true, "custom-transformer-fault Good/T"},
+      {"Good", "Good", "", true, "nesting Good/T"},
       {"A,B", "Copy", "", true, "custom-transformer-fault A,B"},
       {"A\nB", "Copy", "", true, "custom-transformer-fault A\nB"},
       {"Good", "Copy", "there.ort", true, "version 1 is there already"},
