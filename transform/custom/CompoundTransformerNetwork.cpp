@@ -36,6 +36,7 @@ Node* CompoundTransformerNetwork::enter(std::unique_ptr<Node> node) {
   Node* entered = node.get();
   m_nodes.push_back(entered);
   node.release();
+  entered->m_serial = m_nextSerial++;
   noteNumber(entered->number(), entered);
   forgetOrders();
   return entered;
@@ -244,6 +245,7 @@ bool CompoundTransformerNetwork::renameOutput(const QString& oldName, const QStr
 void CompoundTransformerNetwork::clearNodes() {
   const std::list<SubDocNetworkObj*> nodes = std::move(m_nodes);
   m_nodes.clear();
+  m_nextSerial = 0;
   m_nodesByNumber.clear();
   m_numbers.clear();
   m_inputNodes.clear();

@@ -21,6 +21,7 @@
 #include <QStringList>
 #include <QVector>
 
+#include <cstdint>
 #include <list>
 #include <map>
 #include <memory>
@@ -228,6 +229,7 @@ class ORX_EXPORT CompoundTransformerNetwork {
   std::list<TransformerCfg*> m_transformers;
   std::vector<TransformerCfg*> m_customTransformers;
   std::list<SubDocNetworkObj*> m_nodes;  // owned
+  std::uint32_t m_nextSerial = 0;
   QHash<QString, CompoundTransformerParm> m_parameters;
   QStringList m_parameterNames;
   NetworkListeners m_listeners;

@@ -6,12 +6,14 @@
 
 namespace {
 
+constexpr std::uint32_t kUnknown = std::numeric_limits<std::uint32_t>::max();
 constexpr std::uint32_t kPlaced = std::numeric_limits<std::uint32_t>::max();
 
 }  // namespace
 
 NetworkSorter::NetworkSorter(std::size_t nodes) {
   m_nodes.reserve(nodes);
+  m_numbers.resize(nodes, kUnknown);
   m_rows.reserve(nodes + 1);
   m_rows.push_back(0);
   m_feeders.reserve(2 * nodes);
@@ -21,20 +23,22 @@ NetworkSorter::NetworkSorter(std::size_t nodes) {
   m_finished.reserve(nodes);
 }
 
-std::uint32_t NetworkSorter::numberOf(SubDocNetworkObj& node) {
-  const auto known = static_cast<std::size_t>(node.m_place);
-  if (known >= m_nodes.size() || m_nodes[known] != &node) {
-    node.m_place = static_cast<int>(m_nodes.size());
+std::uint32_t NetworkSorter::numberOf(SubDocNetworkObj& node, std::uint32_t serial) {
+  if (serial >= m_numbers.size())
+    m_numbers.resize(std::max<std::size_t>(serial + 1, 2 * m_numbers.size()), kUnknown);
+  std::uint32_t& number = m_numbers[serial];
+  if (number == kUnknown) {
+    number = static_cast<std::uint32_t>(m_nodes.size());
     m_nodes.push_back(&node);
   }
-  return static_cast<std::uint32_t>(node.m_place);
+  return number;
 }
 
 std::uint32_t NetworkSorter::readUpstream(SubDocNetworkObj& node) {
-  const std::uint32_t number = numberOf(node);
+  const std::uint32_t number = numberOf(node, node.m_serial);
   while (m_rows.size() <= m_nodes.size()) {
     for (const SubDocNetworkObj::Source& source : m_nodes[m_rows.size() - 1]->sources())
-      m_feeders.push_back(numberOf(*source.node));
+      m_feeders.push_back(numberOf(*source.node, source.serial));
     m_rows.push_back(static_cast<std::uint32_t>(m_feeders.size()));
   }
   m_states.resize(m_nodes.size());

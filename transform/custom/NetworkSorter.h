@@ -29,7 +29,7 @@ class ORX_EXPORT NetworkSorter {
     bool feedsItself = false;
   };
 
-  std::uint32_t numberOf(SubDocNetworkObj& node);
+  std::uint32_t numberOf(SubDocNetworkObj& node, std::uint32_t serial);
   std::uint32_t readUpstream(SubDocNetworkObj& node);
   void discover(std::uint32_t node);
   void place(std::uint32_t first, bool feedsItself, NetworkOrder& order);
@@ -37,6 +37,7 @@ class ORX_EXPORT NetworkSorter {
   // The nodes met so far by number, and the numbers of their feeders: those of node n stand in m_feeders from
   // m_rows[n] to before m_rows[n + 1], ports in name order, links in the order of adding.
   std::vector<SubDocNetworkObj*> m_nodes;
+  std::vector<std::uint32_t> m_numbers;  // by the serial of the node, so that known nodes need not be read
   std::vector<std::uint32_t> m_rows;
   std::vector<std::uint32_t> m_feeders;
 

@@ -36,7 +36,7 @@ void SubDocNetworkObj::addLink(SubDocNetworkObj& from, const QString& fromPort, 
   if (std::next(port) != to.m_feeders.end())
     to.m_knowsSources = false;
   else if (to.m_knowsSources)
-    to.m_sources.append({&from, &from.outlet(fromPort)});
+    to.m_sources.append(from.sourceAt(fromPort));
 }
 
 void SubDocNetworkObj::removeLinks() {
@@ -74,7 +74,7 @@ const SubDocNetworkObj::Sources& SubDocNetworkObj::sources() {
     m_sources.clear();
     for (const auto& [port, links] : m_feeders) {
       for (const Link& link : links)
-        m_sources.append({link.node, &link.node->outlet(link.port)});
+        m_sources.append(link.node->sourceAt(link.port));
     }
   }
   return m_sources;

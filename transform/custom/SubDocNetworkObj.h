@@ -9,6 +9,7 @@
 #include <QStringList>
 #include <QVarLengthArray>
 
+#include <cstdint>
 #include <map>
 #include <vector>
 
@@ -76,6 +77,7 @@ class ORX_EXPORT SubDocNetworkObj {
   struct Source {
     SubDocNetworkObj* node;
     Outlet* outlet;
+    std::uint32_t serial;  // of the node
   };
   using Sources = QVarLengthArray<Source, 2>;
 
@@ -102,6 +104,7 @@ class ORX_EXPORT SubDocNetworkObj {
   bool isComputed() const { return m_isComputed; }
 
  private:
+  friend class CompoundTransformerNetwork;
   friend class NetworkSorter;
 
   // Of one port alone.
@@ -110,11 +113,12 @@ class ORX_EXPORT SubDocNetworkObj {
   };
 
   Outlet& outlet(const QString& port);
+  Source sourceAt(const QString& port) { return {this, &outlet(port), m_serial}; }
   void fill(Outlet& outlet, QHash<QString, QString>& origins);
   void forgetOutlets();
 
   // What a query works with stands together.
-  int m_place = -1;  // in the NetworkSorter that met the node last
+  std::uint32_t m_serial = 0;  // counts the nodes of the network; given before any link
   Kind m_kind;
   bool m_knowsSources = true;
   bool m_isComputed = false;
