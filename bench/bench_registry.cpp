@@ -1,6 +1,7 @@
 // The registry: loading a folder of generated definitions against reading the same files line by line,
-// measured in the same run; what a definition costs in memory; look-ups in small and large registries; and
-// the start-up of the command against that of a program that does nothing.
+// measured in the same run; what a definition costs in memory, unread and read; the first use of a
+// definition, which reads it, and further ones in small and large registries; and the start-up of the command
+// against that of a program that does nothing.
 #include <platform/session/session.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
@@ -135,6 +136,11 @@ class Home {
   std::vector<QString> m_files;
 };
 
+void useAll(TransformerMgr& registry) {
+  for (const QString& name : registry.transformerNames())
+    delete registry.getTransformer(name, ITransformerMgr::NEWEST_VERSION);
+}
+
 template <class Work>
 double seconds(const Work& work) {
   const auto start = std::chrono::steady_clock::now();
@@ -177,10 +183,30 @@ double processMemory(const char* key) {
   return 0;
 }
 
+// The first use of each definition, which makes its prototype, and of all of them the second.
+void BM_FirstUse(benchmark::State& state) {
+  const int definitions = static_cast<int>(state.range(0));
+  const Home& home = Home::of(definitions);
+  double first = 0;
+  double second = 0;
+  for (auto _ : state) {
+    TransformerMgr& registry = home.load();
+    const double once = seconds([&] { useAll(registry); });
+    second += seconds([&] { useAll(registry); });
+    first += once;
+    state.SetIterationTime(once);
+  }
+  const double uses = static_cast<double>(state.iterations()) * definitions;
+  state.counters["us_first"] = 1e6 * first / uses;
+  state.counters["us_second"] = 1e6 * second / uses;
+}
+
+// Above what the process held before loading.
 void BM_PeakMemory(benchmark::State& state) {
   const int definitions = static_cast<int>(state.range(0));
   const Home& home = Home::of(definitions);
-  double peak = 0;
+  double loaded = 0;
+  double used = 0;
   for (auto _ : state) {
     Home::of(0).load();
     malloc_trim(0);
@@ -189,10 +215,13 @@ void BM_PeakMemory(benchmark::State& state) {
       state.SkipWithError("the peak cannot be reset");
       break;
     }
-    home.load();
-    peak = processMemory("VmHWM") - before;
+    TransformerMgr& registry = home.load();
+    loaded = processMemory("VmHWM") - before;
+    useAll(registry);
+    used = processMemory("VmHWM") - before;
   }
-  state.counters["KiB_each"] = peak / definitions;
+  state.counters["KiB_each"] = loaded / definitions;
+  state.counters["KiB_each_used"] = used / definitions;
 }
 
 enum class By { Name, Key, Alias };
@@ -200,6 +229,7 @@ enum class By { Name, Key, Alias };
 void BM_LookUp(benchmark::State& state, By by) {
   const int definitions = static_cast<int>(state.range(0));
   TransformerMgr& registry = Home::of(definitions).load();
+  useAll(registry);
   QStringList asked;
   std::minstd_rand random;
   for (int i = 0; i < 100; ++i) {
@@ -247,6 +277,7 @@ void BM_StartUp(benchmark::State& state) {
 BENCHMARK(BM_StartUp)->UseManualTime()->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_PeakMemory)->Arg(1000)->Arg(10000)->Iterations(1);
 BENCHMARK(BM_Load)->Arg(1000)->Arg(10000)->UseManualTime()->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_FirstUse)->Arg(1000)->Arg(10000)->UseManualTime()->Unit(benchmark::kMillisecond);
 BENCHMARK_CAPTURE(BM_LookUp, name, By::Name)->RangeMultiplier(10)->Range(100, 10000);
 BENCHMARK_CAPTURE(BM_LookUp, key, By::Key)->RangeMultiplier(10)->Range(100, 10000);
 BENCHMARK_CAPTURE(BM_LookUp, alias, By::Alias)->RangeMultiplier(10)->Range(100, 10000);

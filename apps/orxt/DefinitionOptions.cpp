@@ -31,8 +31,7 @@ TransformerMgr& DefinitionOptions::load(Console& console) const {
   TransformerMgr& registry = TransformerMgr::getTransformerMgr();
   if (!registry.isLoaded()) {
     registry.loadTransformers(&session);
-    const QString error = registry.lastError();
-    if (!error.isEmpty())
+    for (const QString& error : registry.errors())
       console.fail(error);
   }
   return registry;

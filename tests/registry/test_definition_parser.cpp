@@ -1,5 +1,8 @@
+#include <tests/registry/AwkwardDefinitions.h>
+#include <tests/registry/DefinitionFields.h>
 #include <transform/registry/CompanionFileParser.h>
 #include <transform/registry/DefinitionFileParser.h>
+#include <transform/registry/DefinitionIndex.h>
 #include <transform/registry/DefinitionKeywords.h>
 
 #include <QBuffer>
@@ -158,16 +161,34 @@ TEST(DefinitionParser, BlocksAndTheirEnds) {
   EXPECT_EQ(parser.categories()[1].texts(), list({"second"}));
   EXPECT_EQ(parser.unfinished().header.size(), 1u);
   EXPECT_EQ(parser.openBlockLine(), 27);
-  // Each definition's bytes alone give the definition.
-  for (const DefinitionText& definition : parser.definitions()) {
-    const DefinitionFileParser again =
-        parse(text.mid(static_cast<int>(definition.offset), static_cast<int>(definition.size)));
-    ASSERT_EQ(again.definitions().size(), 1u);
-    const TransformerDefinition a = DefinitionFileParser::interpret(again.definitions()[0]);
-    const TransformerDefinition b = DefinitionFileParser::interpret(definition);
-    EXPECT_EQ(a.name, b.name);
-    EXPECT_EQ(a.templateLines, b.templateLines);
-    EXPECT_EQ(a.descriptionLines, b.descriptionLines);
+}
+
+// The index finds the same definitions, and their bytes alone give them whole.
+TEST(DefinitionIndex, AgreesWithTheParser) {
+  for (const QByteArray& text : awkwardDefinitions()) {
+    SCOPED_TRACE(text.toStdString());
+    const DefinitionFileParser parser = parse(text);
+    DefinitionIndex index;
+    index.read(text);
+    ASSERT_EQ(index.definitions().size(), parser.definitions().size());
+    for (std::size_t i = 0; i < parser.definitions().size(); ++i) {
+      const TransformerDefinition whole = DefinitionFileParser::interpret(parser.definitions()[i]);
+      const TransformerDefinition& facts = index.definitions()[i].facts;
+      const TransformerDefinition alone =
+          DefinitionFileParser::definitionAlone(index.definitions()[i].bytes, QStringLiteral("f.ort"));
+      EXPECT_EQ(facts.name, whole.name);
+      EXPECT_EQ(facts.version, whole.version);
+      EXPECT_EQ(facts.category, whole.category);
+      EXPECT_EQ(facts.aliases, whole.aliases);
+      EXPECT_EQ(facts.visible, whole.visible);
+      EXPECT_EQ(facts.dependencyScripts, whole.dependencyScripts);
+      EXPECT_TRUE(definitionFields(alone) == definitionFields(whole));
+    }
+    ASSERT_EQ(index.categories().size(), parser.categories().size());
+    for (std::size_t i = 0; i < parser.categories().size(); ++i) {
+      EXPECT_EQ(index.categories()[i].name, parser.categories()[i].name);
+      EXPECT_EQ(index.categories()[i].texts(), parser.categories()[i].texts());
+    }
   }
 }
 

@@ -28,3 +28,14 @@ TagList TagList::parse(const QStringList& tokens) {
   }
   return list;
 }
+
+QStringList ConfiguredDefinition::tagsOf(const QString& category) {
+  QStringList tags;
+  for (const QString& piece : category.split(QLatin1Char(','))) {
+    const QString tag = piece.trimmed();
+    if (!tag.isEmpty()) {
+      tags.append(tag);
+    }
+  }
+  return tags;
+}

@@ -28,6 +28,9 @@ struct TagList {
 
 class ORX_EXPORT ConfiguredDefinition {
  public:
+  // The tags that a definition's category names.
+  static QStringList tagsOf(const QString& category);
+
   TransformerDefinition fields;
   TagList inputTags;
   TagList dynamicInputTags;

@@ -33,7 +33,6 @@ const QLatin1String kProcessCountLookup(
     "\"Extreme\",EXTREME");
 const QLatin1String kProcessCountDefault("No Parallelism");
 
-const QLatin1Char kCategorySeparator(',');
 const QLatin1String kInputMapping("I:");
 const QLatin1String kOutputMapping("O:");
 
@@ -62,18 +61,6 @@ bool addTagMapping(ConfiguredDefinition& definition, const QString& token) {
          definition.renamedOutputTags.add(version + mapping.mid(kOutputMapping.size()));
 }
 
-QStringList categoryTags(const QString& category) {
-  QStringList tags;
-  const QStringList pieces = category.split(kCategorySeparator);
-  for (const QString& piece : pieces) {
-    const QString tag = piece.trimmed();
-    if (!tag.isEmpty()) {
-      tags.append(tag);
-    }
-  }
-  return tags;
-}
-
 TransformParamCfg makeParameter(const QString& typeText, const QString& name, const QString& prompt,
                                 const QString& defaultValue, const QStringList& lookupLines = QStringList()) {
   TransformParamCfg record(GUIType::fromTransformerTypeString(typeText, name, prompt), lookupLines);
@@ -88,7 +75,7 @@ void TransformerCfg::configure(const TransformerDefinition& definition, IORXSess
                                QTextStream* log) {
   const auto own = std::make_shared<ConfiguredDefinition>();
   own->fields = definition;
-  own->categoryTags = categoryTags(definition.category);
+  own->categoryTags = ConfiguredDefinition::tagsOf(definition.category);
   parseTagAliases(*own);
   initListActionDictionary(*own, log);
   setupPreservesAttributes(*own, log);

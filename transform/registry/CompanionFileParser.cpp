@@ -8,6 +8,18 @@ bool CompanionFileParser::parse(QIODevice& device) {
     m_error = lines.errorString();
     return false;
   }
+  read(lines);
+  return true;
+}
+
+void CompanionFileParser::parse(const QByteArray& file) {
+  *this = CompanionFileParser();
+  DefinitionLines lines;
+  lines.open(file, true);
+  read(lines);
+}
+
+void CompanionFileParser::read(DefinitionLines& lines) {
   while (lines.next()) {
     if (lines.isSkipped()) {
       continue;
@@ -15,11 +27,9 @@ bool CompanionFileParser::parse(QIODevice& device) {
     const QString line = lines.trimmed();
     const int number = lines.number();
     if (line.startsWith(kCategoryDescriptionStart)) {
-      CategoryText category{line.mid(kCategoryDescriptionStart.size()).trimmed(), {}, number};
-      if (!lines.readBlock(kCategoryDescriptionEnd, category.lines)) {
+      if (!readCategoryText(lines, m_categoryDescriptions)) {
         m_openBlockLine = number;
       }
-      m_categoryDescriptions.push_back(std::move(category));
       continue;
     }
     QStringList CompanionEntry::*block = line == kDescriptionStart ? &CompanionEntry::descriptionLines
@@ -36,7 +46,7 @@ bool CompanionFileParser::parse(QIODevice& device) {
     if (!lines.readBlock(line == kDescriptionStart ? kDescriptionEnd
                          : line == kTooltipStart   ? kTooltipEnd
                                                    : kChangeLogEnd,
-                         texts)) {
+                         &texts)) {
       m_openBlockLine = number;
     }
     if (m_entries.empty()) {
@@ -48,7 +58,6 @@ bool CompanionFileParser::parse(QIODevice& device) {
     }
   }
   m_isSoundUtf8 = lines.isSoundUtf8();
-  return true;
 }
 
 // False when the line means nothing.

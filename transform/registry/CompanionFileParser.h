@@ -6,9 +6,11 @@
 #include <platform/Export.h>
 #include <transform/registry/DefinitionText.h>
 
+#include <QByteArray>
 #include <QString>
 #include <QStringList>
 
+#include <utility>
 #include <vector>
 
 class QIODevice;
@@ -44,8 +46,11 @@ class ORX_EXPORT CompanionFileParser {
   // The device is open for reading. False, with nothing collected, when it cannot be read or holds too much.
   bool parse(QIODevice& device);
   QString errorString() const { return m_error; }
+  // The same of a whole file's bytes, which are always read.
+  void parse(const QByteArray& file);
 
   const std::vector<CompanionEntry>& entries() const { return m_entries; }
+  std::vector<CompanionEntry> takeEntries() { return std::move(m_entries); }
   const std::vector<CategoryText>& categoryDescriptions() const { return m_categoryDescriptions; }
   const std::vector<CategoryName>& categoryNames() const { return m_categoryNames; }
   // Lines that mean nothing where they stand.
@@ -55,6 +60,7 @@ class ORX_EXPORT CompanionFileParser {
   bool isSoundUtf8() const { return m_isSoundUtf8; }
 
  private:
+  void read(DefinitionLines& lines);
   bool takeLine(const QString& line, int number);
 
   std::vector<CompanionEntry> m_entries;

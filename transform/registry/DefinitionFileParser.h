@@ -6,6 +6,7 @@
 #include <transform/core/TransformerDefinition.h>
 #include <transform/registry/DefinitionText.h>
 
+#include <QByteArray>
 #include <QString>
 
 #include <vector>
@@ -30,8 +31,13 @@ class ORX_EXPORT DefinitionFileParser {
 
   // Takes the fields from the collected lines.
   static TransformerDefinition interpret(const DefinitionText& text);
+  // The definition that stands in these bytes of a file, from its first line to the end of its template.
+  static TransformerDefinition definitionAlone(const QByteArray& bytes, const QString& path);
 
  private:
+  void read(DefinitionLines& lines, const QString& path);
+
+  bool m_keepsUnknownLines = true;
   std::vector<DefinitionText> m_definitions;
   std::vector<CategoryText> m_categories;
   DefinitionText m_unfinished;

@@ -9,6 +9,8 @@
 
 #include <vector>
 
+class DefinitionLines;
+
 // How the value behind a keyword is taken.
 enum class KeywordKind {
   Text,            // as it stands; a later line replaces an earlier one
@@ -25,7 +27,11 @@ enum class KeywordKind {
 };
 
 struct DefinitionKeyword {
-  enum Place : unsigned { kDefinition = 1, kCompanion = 2 };
+  enum Place : unsigned {
+    kDefinition = 1,
+    kCompanion = 2,
+    kRegistration = 4,  // in a definition, and needed before anyone asks for it
+  };
 
   QLatin1String word;  // as it stands at the beginning of the line, its colon included where it has one
   KeywordKind kind;
@@ -41,6 +47,10 @@ struct DefinitionKeyword {
 ORX_EXPORT const std::vector<DefinitionKeyword>& definitionKeywords();
 // The keyword that the line begins with and that means something in that kind of file; null without one.
 ORX_EXPORT const DefinitionKeyword* findDefinitionKeyword(const QString& line, unsigned place);
+const DefinitionKeyword* findDefinitionKeyword(const DefinitionLines& line, unsigned place);
+// Puts a definition's value where the keyword says.
+void takeDefinitionValue(const DefinitionKeyword& keyword, const QString& value,
+                         TransformerDefinition& definition);
 // What stands behind the keyword, trimmed.
 ORX_EXPORT QString keywordValue(const DefinitionKeyword& keyword, const QString& line);
 

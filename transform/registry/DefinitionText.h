@@ -16,10 +16,6 @@ struct DefinitionText {
   std::vector<DefinitionLine> description;
   std::vector<DefinitionLine> tooltip;
   std::vector<DefinitionLine> changeLog;
-  // Where it stands in the file, in bytes: from its first line up to and with the end of its template. These
-  // bytes alone, read again, give the definition.
-  qint64 offset = 0;
-  qint64 size = 0;
 
   bool isEmpty() const {
     return header.empty() && templateLines.empty() && description.empty() && tooltip.empty() &&
@@ -38,3 +34,6 @@ struct CategoryText {
 
   QStringList texts() const { return textsOf(lines); }
 };
+
+// Reads the block whose first line is the current one. False when the file ends first.
+bool readCategoryText(DefinitionLines& lines, std::vector<CategoryText>& categories);

@@ -1,66 +1,97 @@
-#include <transform/core/TransformerCfg.h>
+#include <transform/registry/CompanionFileParser.h>
 #include <transform/registry/PrototypeTable.h>
 
-PrototypeTable::PrototypeTable() = default;
-PrototypeTable::~PrototypeTable() = default;
-PrototypeTable::PrototypeTable(PrototypeTable&&) noexcept = default;
-PrototypeTable& PrototypeTable::operator=(PrototypeTable&&) noexcept = default;
+#include <utility>
 
-bool PrototypeTable::add(std::unique_ptr<TransformerCfg> prototype) {
-  const QString name = prototype->getName();
-  const int version = prototype->getVersion();
-  std::shared_ptr<Versions>& versions = m_versions[name];
-  if (!versions) {
-    versions = std::make_shared<Versions>();
-    m_names.append(name);
-    if (prototype->isVisible()) {
-      m_visibleNames.append(name);
-      m_visibleNameSet.insert(name);
+CatalogueEntry& PrototypeTable::add(const Place& place, CatalogueEntry entry, bool* isNewest) {
+  Versions& versions = m_versions[place.name];
+  if (versions.empty()) {
+    m_names.append(place.name);
+    if (place.isVisible) {
+      m_visibleNames.append(place.name);
+      m_visibleNameSet.insert(place.name);
     }
   }
-  const bool isNewest = versions->empty() || version >= versions->rbegin()->first;
+  const bool becomesNewest = versions.empty() || place.version >= versions.rbegin()->first;
+  if (becomesNewest) {
+    list(place.name, place.tags);
+  }
   if (isNewest) {
-    const QStringList tags = prototype->tags();
-    for (const QString& tag : tags) {
-      const auto known = m_categoryIndex.find(tag);
-      if (known == m_categoryIndex.end()) {
-        m_categories.append(tag);
-      }
-      Category& category = known == m_categoryIndex.end() ? m_categoryIndex[tag] : *known;
-      if (!category.nameSet.contains(name)) {
-        category.nameSet.insert(name);
-        category.names.append(name);
-      }
+    *isNewest = becomesNewest;
+  }
+  for (const QString& alias : place.aliases) {
+    if (!m_aliases.contains(alias)) {
+      m_aliases.insert(alias, place.name);
     }
   }
-  (*versions)[version] = std::move(prototype);
-  return isNewest;
+  return versions.insert_or_assign(place.version, std::move(entry)).first->second;
 }
 
-TransformerCfg* PrototypeTable::newest(const QString& name) const {
+void PrototypeTable::list(const QString& name, const QStringList& tags) {
+  for (const QString& tag : tags) {
+    const auto known = m_categoryIndex.find(tag);
+    if (known == m_categoryIndex.end()) {
+      m_categories.append(tag);
+    }
+    Category& category = known == m_categoryIndex.end() ? m_categoryIndex[tag] : *known;
+    if (!category.nameSet.contains(name)) {
+      category.nameSet.insert(name);
+      category.names.append(name);
+    }
+  }
+}
+
+void PrototypeTable::localize(const std::shared_ptr<const CompanionEntry>& companion) {
+  const auto versions = m_versions.find(companion->name);
+  if (versions == m_versions.end()) {
+    return;
+  }
+  for (auto& [version, entry] : versions->second) {
+    if (!companion->hasVersion || companion->version == version) {
+      entry.localize(companion);
+    }
+  }
+}
+
+const CatalogueEntry* PrototypeTable::newest(const QString& name) const {
   const Versions* all = versions(name);
-  return all ? all->rbegin()->second.get() : nullptr;
+  return all ? &all->rbegin()->second : nullptr;
 }
 
-TransformerCfg* PrototypeTable::oldest(const QString& name) const {
+const CatalogueEntry* PrototypeTable::oldest(const QString& name) const {
   const Versions* all = versions(name);
   if (!all) {
     return nullptr;
   }
   const auto lowest = all->lower_bound(0);
-  return lowest == all->end() ? nullptr : lowest->second.get();
+  return lowest == all->end() ? nullptr : &lowest->second;
 }
 
-TransformerCfg* PrototypeTable::find(const QString& name, int version) const {
+const CatalogueEntry* PrototypeTable::find(const QString& name, int version) const {
   const Versions* all = versions(name);
   if (!all) {
     return nullptr;
   }
   const auto found = all->find(version);
-  return found == all->end() ? nullptr : found->second.get();
+  return found == all->end() ? nullptr : &found->second;
 }
 
 const PrototypeTable::Versions* PrototypeTable::versions(const QString& name) const {
-  const auto found = m_versions.constFind(name);
-  return found == m_versions.constEnd() ? nullptr : found->get();
+  const auto found = m_versions.find(name);
+  return found == m_versions.end() ? nullptr : &found->second;
+}
+
+bool PrototypeTable::isVisibleAlias(const QString& alias) const {
+  return !isVisible(alias) && isAlias(alias) && isVisible(nameOfAlias(alias));
+}
+
+QStringList PrototypeTable::aliasesOfVisible() const {
+  QStringList result;
+  for (auto alias = m_aliases.cbegin(); alias != m_aliases.cend(); ++alias) {
+    if (isVisible(alias.value())) {
+      result.append(alias.key());
+    }
+  }
+  result.sort();
+  return result;
 }

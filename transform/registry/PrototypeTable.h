@@ -1,6 +1,8 @@
-// The prototypes of the registry: one per name and version, the names in the order in which they came, the
-// newest of each, and the categories that they are listed under.
+// The transformers of the registry: one per name and version, the names in the order in which they came, the
+// newest of each, the categories that they are listed under, and their other names.
 #pragma once
+
+#include <transform/registry/CatalogueEntry.h>
 
 #include <QHash>
 #include <QSet>
@@ -9,33 +11,39 @@
 
 #include <map>
 #include <memory>
-
-class TransformerCfg;
+#include <unordered_map>
 
 class PrototypeTable {
  public:
-  using Versions = std::map<int, std::unique_ptr<TransformerCfg>>;
+  using Versions = std::map<int, CatalogueEntry>;
 
-  PrototypeTable();
-  ~PrototypeTable();
-  PrototypeTable(PrototypeTable&&) noexcept;
-  PrototypeTable& operator=(PrototypeTable&&) noexcept;
+  // What decides where a transformer stands in the table.
+  struct Place {
+    QString name;
+    int version = 0;
+    QStringList tags;
+    bool isVisible = true;
+    QStringList aliases;
+  };
 
-  // Takes the prototype over; one that is there under its name and version is destroyed. True when it is the
-  // newest of its name.
-  bool add(std::unique_ptr<TransformerCfg> prototype);
+  // One that is there under the name and version is destroyed; an alias keeps its first owner. `isNewest`,
+  // when given, tells whether it is the newest of its name. The entry stays where it is.
+  CatalogueEntry& add(const Place& place, CatalogueEntry entry, bool* isNewest = nullptr);
+
+  // Puts a companion's texts in the place of those of the transformers that it speaks of.
+  void localize(const std::shared_ptr<const CompanionEntry>& companion);
 
   // Null when there is none. Owned by the table.
-  TransformerCfg* newest(const QString& name) const;
+  const CatalogueEntry* newest(const QString& name) const;
   // The lowest version from 0 up.
-  TransformerCfg* oldest(const QString& name) const;
-  TransformerCfg* find(const QString& name, int version) const;
+  const CatalogueEntry* oldest(const QString& name) const;
+  const CatalogueEntry* find(const QString& name, int version) const;
   // From the lowest version up; null for an unknown name.
   const Versions* versions(const QString& name) const;
-  bool contains(const QString& name) const { return m_versions.contains(name); }
+  bool contains(const QString& name) const { return versions(name) != nullptr; }
 
   const QStringList& names() const { return m_names; }
-  // Those whose first prototype is visible.
+  // Those that were visible when they first came.
   const QStringList& visibleNames() const { return m_visibleNames; }
   bool isVisible(const QString& name) const { return m_visibleNameSet.contains(name); }
 
@@ -44,17 +52,27 @@ class PrototypeTable {
   // The names listed under the category; each once.
   QStringList namesOf(const QString& category) const { return m_categoryIndex.value(category).names; }
 
+  bool isAlias(const QString& alias) const { return m_aliases.contains(alias); }
+  // Empty when it is none.
+  QString nameOfAlias(const QString& alias) const { return m_aliases.value(alias); }
+  // Of an alias that is no visible transformer's own name, whether its transformer is visible.
+  bool isVisibleAlias(const QString& alias) const;
+  // Those of visible transformers, sorted.
+  QStringList aliasesOfVisible() const;
+
  private:
   struct Category {
     QStringList names;
     QSet<QString> nameSet;
   };
 
-  // A hash copies its values, which these cannot be: they are shared, never copied.
-  QHash<QString, std::shared_ptr<Versions>> m_versions;
+  void list(const QString& name, const QStringList& tags);
+
+  std::unordered_map<QString, Versions> m_versions;
   QStringList m_names;
   QStringList m_visibleNames;
   QSet<QString> m_visibleNameSet;
   QStringList m_categories;
   QHash<QString, Category> m_categoryIndex;
+  QHash<QString, QString> m_aliases;
 };

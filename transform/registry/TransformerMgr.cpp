@@ -5,19 +5,15 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
-#include <transform/files/FolderListing.h>
-#include <transform/registry/CompanionFileParser.h>
+#include <transform/registry/CategoryTexts.h>
 #include <transform/registry/CustomTransformerFiles.h>
-#include <transform/registry/DefinitionFileParser.h>
+#include <transform/registry/DefinitionLoader.h>
 #include <transform/registry/ExceptionList.h>
 #include <transform/registry/NamedConnections.h>
 #include <transform/registry/TransformerMgr.h>
-#include <transform/specialised/TransformerCfgFactory.h>
 #include <transform/text/MessageStrings.h>
-#include <transform/workspace/XMLComponentReader.h>
 
-#include <QFile>
-#include <QRegularExpression>
+#include <QHash>
 #include <QSet>
 
 #include <algorithm>
@@ -27,7 +23,6 @@ namespace {
 
 const QString kResourceKind = QStringLiteral("transformer");
 
-constexpr long kNamelessDefinition = 370742;
 constexpr long kNewerBuild = 370745;
 
 }  // namespace
@@ -49,6 +44,7 @@ TransformerMgr& TransformerMgr::getTransformerMgr() {
 
 TransformerMgr::TransformerMgr()
     : m_customFiles(std::make_unique<CustomTransformerFiles>()),
+      m_categories(std::make_unique<CategoryTexts>()),
       m_exceptions(std::make_unique<ExceptionList>()),
       m_connections(std::make_unique<NamedConnections>()) {}
 
@@ -59,12 +55,8 @@ void TransformerMgr::reset() {
   m_prototypes = PrototypeTable();
   m_customFiles->reset();
   m_iteration = 0;
-  m_aliases.clear();
-  m_categoryDescriptions.clear();
-  m_lastError.clear();
-  m_localizedCategories.clear();
-  m_categoriesByLocalizedName.clear();
-  m_session = nullptr;
+  *m_categories = CategoryTexts();
+  m_errors.clear();
   m_ignored.clear();
   *m_exceptions = ExceptionList();
   *m_connections = NamedConnections();
@@ -74,22 +66,28 @@ void TransformerMgr::reset() {
 void TransformerMgr::loadTransformers(IORXSession* session) {
   reset();
   if (session) {
-    m_session = session;
     m_exceptions->readFromHome();
   }
   if (!m_connections->readAll()) {
-    m_lastError = m_connections->errorString();
+    m_errors.append(m_connections->errorString());
   }
-  for (const QString& folder : ORX_resourceDirectories(kResourceKind)) {
-    loadFolder(folder, false);
-  }
+  loadFolders(
+      std::make_shared<const CatalogueEntry::Load>(CatalogueEntry::Load{session, this, QORXLanguage()}));
   m_loaded = true;
 }
 
 void TransformerMgr::reloadCustomTransformers() {
+  loadFolders(nullptr);
+}
+
+void TransformerMgr::loadFolders(const std::shared_ptr<const CatalogueEntry::Load>& load) {
+  DefinitionLoader loader(m_prototypes, *m_categories, *m_exceptions, load, [this](const QString& path) {
+    loadCustomTransformer(path, NEWEST_VERSION, false);
+  });
   for (const QString& folder : ORX_resourceDirectories(kResourceKind)) {
-    loadFolder(folder, true);
+    loader.loadFolder(folder);
   }
+  m_errors += loader.errors();
 }
 
 void TransformerMgr::loadRemoteTransformer(const QString& path, int version) {
@@ -100,82 +98,16 @@ void TransformerMgr::loadRemoteTransformer(const QString& path, int version) {
   }
 }
 
-void TransformerMgr::loadFolder(const QString& folder, bool onlyCustomTransformers) {
-  static const QRegularExpression anyCompanion(QStringLiteral("^[^/\\\\.].*-localized\\.[a-zA-Z][a-zA-Z]$"));
-  const FolderListing listing = FolderListing::files(folder);
-  if (listing.failed()) {
-    m_lastError = QLatin1String("Error getting file list for folder ") + folder;
-    return;
-  }
-  if (listing.names().isEmpty()) {
-    m_lastError = QLatin1String("No transformers found in folder ") + folder;
-    return;
-  }
-  const QString companionEnd = QLatin1String("-localized.") + QORXLanguage();
-  QStringList companions;
-  for (const QString& name : listing.names()) {
-    const QString path = folder + QLatin1Char('/') + name;
-    if (anyCompanion.match(name).hasMatch()) {
-      if (name.endsWith(companionEnd)) {
-        companions.append(path);
-      }
-    } else if (name.endsWith(QLatin1String(".ort")) ||
-               name.startsWith(QLatin1String("CategoryDefinitions"))) {
-      loadDefinitionFile(path, onlyCustomTransformers);
-    }
-  }
-  if (!onlyCustomTransformers) {
-    for (const QString& path : std::as_const(companions)) {
-      loadCompanionFile(path);
-    }
-  }
-}
-
-void TransformerMgr::noteUnreadable(const QString& path, const QString& reason) {
-  m_lastError = QLatin1String("Could not open file ") + path;
-  if (!reason.isEmpty()) {
-    m_lastError += QLatin1String(": ") + reason;
-  }
-}
-
-void TransformerMgr::loadDefinitionFile(const QString& path, bool onlyCustomTransformers) {
-  QFile file(path);
-  const bool isOpen = file.open(QIODevice::ReadOnly);
-  if (isOpen && XMLComponentReader::isXMLWorkspace(file)) {
-    file.close();
-    loadCustomTransformer(path, NEWEST_VERSION, false);
-    return;
-  }
-  if (onlyCustomTransformers) {
-    return;
-  }
-  if (!isOpen) {
-    noteUnreadable(path, QString());
-    return;
-  }
-  DefinitionFileParser parser;
-  if (!parser.parse(file, path)) {
-    noteUnreadable(path, parser.errorString());
-    return;
-  }
-  for (const CategoryText& category : parser.categories()) {
-    m_categoryDescriptions.insert(category.name, category.texts());
-  }
-  for (const DefinitionText& text : parser.definitions()) {
-    define(DefinitionFileParser::interpret(text));
-  }
-}
-
 void TransformerMgr::loadCustomTransformer(const QString& path, int version, bool replaces) {
   CustomTransformerFiles::Opened opened = CustomTransformerFiles::open(path, version, this);
   if (opened.needsNewerBuild)
     noteIgnored({path, opened.name, opened.version, QString(), false});
   if (!opened.network)
     return;
-  const TransformerCfg* kept = m_prototypes.find(opened.name, opened.version);
+  const CatalogueEntry* kept = m_prototypes.find(opened.name, opened.version);
   if (kept && !replaces) {
-    if (kept->getFileName() != path)
-      noteIgnored({path, opened.name, opened.version, kept->getFileName(), true});
+    if (kept->fileName() != path)
+      noteIgnored({path, opened.name, opened.version, kept->fileName(), true});
     return;
   }
   auto prototype = std::make_unique<CompoundTransformerCfg>(m_customFiles->keep(std::move(opened.network)),
@@ -183,7 +115,10 @@ void TransformerMgr::loadCustomTransformer(const QString& path, int version, boo
   prototype->setDefinitionDirectory(this);
   if (QORXPrettyUpFileName(path).startsWith(QORXOrxHome() + QLatin1Char('/')))
     prototype->setTransformerType(TransformerCfg::kBuiltIn);
-  const bool isNewest = m_prototypes.add(std::move(prototype));
+  const PrototypeTable::Place place{prototype->getName(), prototype->getVersion(), prototype->tags(),
+                                    prototype->isVisible(), QStringList()};
+  bool isNewest = false;
+  m_prototypes.add(place, CatalogueEntry(std::move(prototype)), &isNewest);
   if (isNewest || m_customFiles->fileOf(opened.name).isEmpty())
     m_customFiles->noteFile(opened.name, path);
 }
@@ -207,11 +142,11 @@ void TransformerMgr::loadOnDemand(const QString& name, int version) {
       loadCustomTransformer(path, 1, false);
     return;
   }
-  const TransformerCfg* oldest = m_prototypes.oldest(name);
+  const CatalogueEntry* oldest = m_prototypes.oldest(name);
   for (const int older : CustomTransformerFiles::versions(path)) {
     if (older < 0)
       continue;
-    if (oldest && older >= oldest->getVersion())
+    if (oldest && older >= oldest->version())
       return;
     loadCustomTransformer(path, older, false);
     if (m_prototypes.find(name, older))
@@ -219,109 +154,28 @@ void TransformerMgr::loadOnDemand(const QString& name, int version) {
   }
 }
 
-void TransformerMgr::loadCompanionFile(const QString& path) {
-  QFile file(path);
-  if (!file.open(QIODevice::ReadOnly)) {
-    noteUnreadable(path, QString());
-    return;
-  }
-  CompanionFileParser parser;
-  if (!parser.parse(file)) {
-    noteUnreadable(path, parser.errorString());
-    return;
-  }
-  for (const CompanionEntry& entry : parser.entries()) {
-    localize(entry);
-  }
-  for (const CategoryText& category : parser.categoryDescriptions()) {
-    m_categoryDescriptions.insert(category.name, category.texts());
-  }
-  for (const CategoryName& category : parser.categoryNames()) {
-    localizeCategory(category.name, category.localizedName);
-  }
-}
-
-void TransformerMgr::define(const TransformerDefinition& definition) {
-  if (definition.name.isEmpty()) {
-    m_lastError = TransformResString(kNamelessDefinition, definition.filePath);
-    return;
-  }
-  TransformerDefinition fields = definition;
-  fields.allowed = m_exceptions->isAllowed(definition.name);
-  std::unique_ptr<TransformerCfg> prototype(createTransformerCfg(fields.name, fields.version));
-  prototype->configure(fields, m_session);
-  prototype->setDefinitionDirectory(this);
-  m_prototypes.add(std::move(prototype));
-  for (const QString& alias : std::as_const(fields.aliases)) {
-    if (!m_aliases.contains(alias)) {
-      m_aliases.insert(alias, fields.name);
-    }
-  }
-}
-
-void TransformerMgr::localize(const CompanionEntry& entry) {
-  const PrototypeTable::Versions* versions = m_prototypes.versions(entry.name);
-  if (!versions) {
-    return;
-  }
-  for (const auto& [version, prototype] : *versions) {
-    if (entry.hasVersion && entry.version != version) {
-      continue;
-    }
-    if (!entry.localizedName.isEmpty()) {
-      prototype->setLocalizedName(entry.localizedName);
-    }
-    for (const CompanionEntry::Text& prompt : entry.prompts) {
-      if (!prompt.text.isEmpty() && prototype->hasParameter(prompt.name)) {
-        prototype->setParameterPrompt(prompt.name, prompt.text);
-      }
-    }
-    for (const CompanionEntry::Text& tag : entry.tagDescriptions) {
-      prototype->setTagDescription(tag.name, tag.text);
-    }
-    if (!entry.descriptionLines.isEmpty()) {
-      prototype->setDescriptionLines(entry.descriptionLines);
-    }
-    if (!entry.tooltipLines.isEmpty()) {
-      prototype->setTooltipLines(entry.tooltipLines);
-    }
-    if (!entry.changeLog.isEmpty()) {
-      prototype->setChangeLog(entry.changeLog);
-    }
-  }
-}
-
-void TransformerMgr::localizeCategory(const QString& category, const QString& localizedName) {
-  const QString before = m_localizedCategories.value(category);
-  if (m_categoriesByLocalizedName.value(before) == category) {
-    m_categoriesByLocalizedName.remove(before);
-  }
-  m_localizedCategories.insert(category, localizedName);
-  m_categoriesByLocalizedName.insert(localizedName, category);
-}
-
 void TransformerMgr::getDefinitionFileName(const IORXString& name, IORXString& fileName) const {
-  const TransformerCfg* newest = m_prototypes.newest(ORXToQString(name));
-  ORXAssign(fileName, newest ? newest->getFileName() : QString());
+  const CatalogueEntry* newest = m_prototypes.newest(ORXToQString(name));
+  ORXAssign(fileName, newest ? newest->fileName() : QString());
 }
 
 ITransformerCfg* TransformerMgr::getTransformer(const IORXString& name, int version) {
   return getTransformer(ORXToQString(name), version);
 }
 
-const TransformerCfg* TransformerMgr::findPrototype(const QString& name, int version) const {
+const CatalogueEntry* TransformerMgr::findEntry(const QString& name, int version) const {
   return version == NEWEST_VERSION   ? m_prototypes.newest(name)
          : version == OLDEST_VERSION ? m_prototypes.oldest(name)
                                      : m_prototypes.find(name, version);
 }
 
 std::unique_ptr<TransformerCfg> TransformerMgr::copyOf(const QString& name, int version) const {
-  const TransformerCfg* prototype = findPrototype(name, version);
-  if (!prototype && version == 0 && !m_customFiles->fileOf(name).isEmpty())
-    prototype = m_prototypes.find(name, 1);  // the first version of a custom transformer is called either way
-  if (!prototype)
+  const CatalogueEntry* entry = findEntry(name, version);
+  if (!entry && version == 0 && !m_customFiles->fileOf(name).isEmpty())
+    entry = m_prototypes.find(name, 1);  // the first version of a custom transformer is called either way
+  if (!entry)
     return nullptr;
-  std::unique_ptr<TransformerCfg> copy(prototype->getCopy());
+  std::unique_ptr<TransformerCfg> copy(entry->prototype().getCopy());
   copy->setIdentifier(copy->getLocalizedName());
   return copy;
 }
@@ -332,15 +186,15 @@ QString TransformerMgr::refusalReason() const {
 
 std::unique_ptr<TransformerCfg> TransformerMgr::makeTransformer(const QString& name, int version) {
   m_refusal.clear();
-  if (version == OLDEST_VERSION || !findPrototype(name, version))
+  if (version == OLDEST_VERSION || !findEntry(name, version))
     loadOnDemand(name, version);
   std::unique_ptr<TransformerCfg> copy = copyOf(name, version);
   // An alias may lead to another alias; a circle of them leads nowhere.
   QSet<QString> followed;
-  for (QString alias = name; !copy && m_aliases.contains(alias) && !followed.contains(alias);) {
+  for (QString alias = name; !copy && m_prototypes.isAlias(alias) && !followed.contains(alias);) {
     followed.insert(alias);
-    alias = m_aliases.value(alias);
-    if (version == OLDEST_VERSION || !findPrototype(alias, version))
+    alias = m_prototypes.nameOfAlias(alias);
+    if (version == OLDEST_VERSION || !findEntry(alias, version))
       loadOnDemand(alias, version);
     copy = copyOf(alias, version);
     if (copy)
@@ -363,11 +217,11 @@ TransformerCfg* TransformerMgr::getTransformer(const QString& name, int version)
 bool TransformerMgr::transformerExists(const QString& name, int version) const {
   const bool anyVersion = version == NEWEST_VERSION || version == OLDEST_VERSION;
   QSet<QString> followed;
-  for (QString asked = name;; asked = m_aliases.value(asked)) {
+  for (QString asked = name;; asked = m_prototypes.nameOfAlias(asked)) {
     if (anyVersion ? m_prototypes.contains(asked) : m_prototypes.find(asked, version) != nullptr) {
       return true;
     }
-    if (followed.contains(asked) || !m_aliases.contains(asked)) {
+    if (followed.contains(asked) || !m_prototypes.isAlias(asked)) {
       return false;
     }
     followed.insert(asked);
@@ -375,14 +229,14 @@ bool TransformerMgr::transformerExists(const QString& name, int version) const {
 }
 
 int TransformerMgr::currentTransformerVersion(const QString& name) const {
-  const TransformerCfg* newest = m_prototypes.newest(name);
-  return newest ? newest->getVersion() : -1;
+  const CatalogueEntry* newest = m_prototypes.newest(name);
+  return newest ? newest->version() : -1;
 }
 
 QList<int> TransformerMgr::transformerVersions(const QString& name) const {
   QList<int> result;
   if (const PrototypeTable::Versions* versions = m_prototypes.versions(name)) {
-    for (const auto& [version, prototype] : *versions) {
+    for (const auto& [version, entry] : *versions) {
       result.append(version);
     }
   }
@@ -392,9 +246,9 @@ QList<int> TransformerMgr::transformerVersions(const QString& name) const {
 TransformerCfg* TransformerMgr::getTransformerWithGUID(const QString& guid) const {
   // By name and version, so that the answer does not depend on a hash.
   for (const QString& name : m_prototypes.names()) {
-    for (const auto& [version, prototype] : *m_prototypes.versions(name)) {
-      if (prototype->getGUID() == guid) {
-        return prototype->getCopy();
+    for (const auto& [version, entry] : *m_prototypes.versions(name)) {
+      if (entry.prototype().getGUID() == guid) {
+        return entry.prototype().getCopy();
       }
     }
   }
@@ -419,20 +273,11 @@ TransformerCfg* TransformerMgr::getNextTransformer() {
 }
 
 bool TransformerMgr::isVisibleAlias(const QString& alias) const {
-  if (m_prototypes.isVisible(alias))
-    return false;
-  const auto target = m_aliases.constFind(alias);
-  return target != m_aliases.constEnd() && m_prototypes.isVisible(target.value());
+  return m_prototypes.isVisibleAlias(alias);
 }
 
 QStringList TransformerMgr::getVisibleTransformerAliases() const {
-  QStringList result;
-  for (auto alias = m_aliases.cbegin(); alias != m_aliases.cend(); ++alias) {
-    if (m_prototypes.isVisible(alias.value()))
-      result.append(alias.key());
-  }
-  result.sort();
-  return result;
+  return m_prototypes.aliasesOfVisible();
 }
 
 void TransformerMgr::getCategories(IORXStringArray& categories) const {
@@ -444,19 +289,15 @@ QStringList TransformerMgr::getCategoryTransformers(const QString& category) con
 }
 
 bool TransformerMgr::getCategoryDesc(const QString& category, QStringList& lines) const {
-  const auto description = m_categoryDescriptions.constFind(category);
-  if (description == m_categoryDescriptions.constEnd())
-    return false;
-  lines = description.value();
-  return true;
+  return m_categories->description(category, lines);
 }
 
 QString TransformerMgr::getLocalizedCategoryName(const QString& category) const {
-  return m_localizedCategories.value(category, category);
+  return m_categories->localizedName(category);
 }
 
 QString TransformerMgr::getCategoryNameFromLocalizedCategoryName(const QString& localizedName) const {
-  return m_categoriesByLocalizedName.value(localizedName, localizedName);
+  return m_categories->nameOf(localizedName);
 }
 
 bool TransformerMgr::isTransformerIgnored(const IORXString& name, int version) const {

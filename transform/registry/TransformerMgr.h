@@ -1,6 +1,12 @@
 // The process-wide registry of transformer definitions: one prototype per name and version, read from the
 // definition files of the resource folders. Hands out copies.
 //
+// Loading reads every file once and keeps each definition as the bytes that it is; its prototype is made from
+// them when somebody first asks for something of the definition itself. Nobody can tell this from making all
+// of them while loading: a file that is changed or removed afterwards, another language and another home
+// change nothing before the next load, and definitions with dependency checks, which ask about the system,
+// are read while loading.
+//
 // Loading never fails as a whole: a file or folder that cannot be read is recorded in lastError() and passed
 // over. Lookups answer null, false, -1 or an empty value. Used by one thread at a time.
 //
@@ -13,7 +19,6 @@
 #include <transform/registry/ITransformerMgr.h>
 #include <transform/registry/PrototypeTable.h>
 
-#include <QHash>
 #include <QList>
 #include <QString>
 #include <QStringList>
@@ -22,13 +27,12 @@
 #include <memory>
 #include <vector>
 
+class CategoryTexts;
 class CustomTransformerFiles;
 class ExceptionList;
 class IORXStringArray;
 class NamedConnections;
 class TransformerCfg;
-struct CompanionEntry;
-struct TransformerDefinition;
 
 class ORX_EXPORT TransformerMgr : public ITransformerMgr,
                                   public TransformerSource,
@@ -78,7 +82,7 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   // By order of first registration, newest version each; null after the last. Owned by the caller.
   TransformerCfg* getNextTransformer();
 
-  QString getTransformerNameFromAlias(const QString& alias) const { return m_aliases.value(alias); }
+  QString getTransformerNameFromAlias(const QString& alias) const { return m_prototypes.nameOfAlias(alias); }
   bool isVisibleAlias(const QString& alias) const;
   QStringList getVisibleTransformerAliases() const;
   // In order of first appearance.
@@ -97,8 +101,10 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   // From the lowest up; empty for an unknown name. Aliases are not followed.
   QList<int> transformerVersions(const QString& name) const;
   bool isTransformerIgnored(const QString& name, int version) const;
-  // The last failure since the load began; empty when there was none.
-  const QString& lastError() const { return m_lastError; }
+  // The failures since the load began, in the order in which they were met, each with the file or folder that
+  // it is about; the last of them, empty when there was none.
+  const QStringList& errors() const { return m_errors; }
+  QString lastError() const { return m_errors.isEmpty() ? QString() : m_errors.last(); }
   // A whole HTML page that leads from the configuration to the newest version of the transformer, or of the
   // one that replaces it; empty when neither is known.
   QString changeLog(TransformerCfg* configuration) const;
@@ -126,33 +132,23 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   ~TransformerMgr() override;
 
   void reset();
-  void loadFolder(const QString& folder, bool onlyCustomTransformers);
-  void loadDefinitionFile(const QString& path, bool onlyCustomTransformers);
+  void loadFolders(const std::shared_ptr<const CatalogueEntry::Load>& load);
   // `replaces` lets it take the place of a definition of the same name and version.
   void loadCustomTransformer(const QString& path, int version, bool replaces);
   // Each refusal is listed once, however often it is met.
   void noteIgnored(const IgnoredTransformer& ignored);
   // Reads a further version of a custom transformer whose file is known.
   void loadOnDemand(const QString& name, int version);
-  void loadCompanionFile(const QString& path);
-  void define(const TransformerDefinition& definition);
-  void localize(const CompanionEntry& entry);
-  void localizeCategory(const QString& category, const QString& localizedName);
-  void noteUnreadable(const QString& path, const QString& reason);
   // Null when there is none; aliases are not followed.
-  const TransformerCfg* findPrototype(const QString& name, int version) const;
+  const CatalogueEntry* findEntry(const QString& name, int version) const;
   std::unique_ptr<TransformerCfg> copyOf(const QString& name, int version) const;
   void addChanges(std::vector<VersionChanges>& changes, const QString& name, qint64 first, int last) const;
 
   std::unique_ptr<CustomTransformerFiles> m_customFiles;  // outlives the prototypes, which listen to networks
   PrototypeTable m_prototypes;
   int m_iteration = 0;
-  QHash<QString, QString> m_aliases;
-  QHash<QString, QStringList> m_categoryDescriptions;
-  QString m_lastError;
-  QHash<QString, QString> m_localizedCategories;
-  QHash<QString, QString> m_categoriesByLocalizedName;
-  IORXSession* m_session = nullptr;
+  std::unique_ptr<CategoryTexts> m_categories;
+  QStringList m_errors;
   bool m_loaded = false;
   std::list<IgnoredTransformer> m_ignored;
   QString m_refusal;

@@ -26,13 +26,12 @@ QString TransformerMgr::changeLog(TransformerCfg* configuration) const {
     return QString();
   }
   const bool isReplaced = !configuration->isVisible() && !configuration->replacedBy().isEmpty();
-  const TransformerCfg* target =
-      m_prototypes.newest(isReplaced ? configuration->replacedBy() : configuration->getName());
-  if (!target) {
+  const QString target = isReplaced ? configuration->replacedBy() : configuration->getName();
+  const CatalogueEntry* newest = m_prototypes.newest(target);
+  if (!newest) {
     return QString();
   }
-  return changeLog(configuration->getName(), configuration->getVersion(), target->getName(),
-                   target->getVersion())
+  return changeLog(configuration->getName(), configuration->getVersion(), target, newest->version())
       .join(QLatin1Char('\n'));
 }
 
@@ -43,16 +42,17 @@ void TransformerMgr::addChanges(std::vector<VersionChanges>& changes, const QStr
     return;
   }
   for (auto entry = versions->rbegin(); entry != versions->rend(); ++entry) {
-    const auto& [version, prototype] = *entry;
+    const int version = entry->first;
     if (version < first || version > last) {
       continue;
     }
-    QStringList entries = prototype->getChangeLog();
+    const TransformerCfg& prototype = entry->second.prototype();
+    QStringList entries = prototype.getChangeLog();
     entries.erase(std::remove_if(entries.begin(), entries.end(),
                                  [](const QString& line) { return line.trimmed().isEmpty(); }),
                   entries.end());
     if (!entries.isEmpty()) {
-      changes.push_back({name, prototype->getLocalizedName(), version, entries});
+      changes.push_back({name, prototype.getLocalizedName(), version, entries});
     }
   }
 }
@@ -75,8 +75,8 @@ std::vector<TransformerMgr::VersionChanges> TransformerMgr::changes(const QStrin
 QStringList TransformerMgr::changeLog(const QString& name, int fromVersion, const QString& newName,
                                       int toVersion) const {
   const auto shownName = [this](const QString& asked) {
-    const TransformerCfg* newest = m_prototypes.newest(asked);
-    return newest ? newest->getLocalizedName() : asked;
+    const CatalogueEntry* newest = m_prototypes.newest(asked);
+    return newest ? newest->prototype().getLocalizedName() : asked;
   };
   const QString lastText =
       QString::number(toVersion == NEWEST_VERSION ? currentTransformerVersion(newName) : toVersion);

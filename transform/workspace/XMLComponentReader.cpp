@@ -9,6 +9,8 @@
 #include <QBuffer>
 #include <QFile>
 
+#include <algorithm>
+
 namespace {
 
 const QString kTemporaryName = QStringLiteral("kx-in-XXXXXX");
@@ -33,12 +35,17 @@ bool XMLComponentReader::IsFileXMLWorkspace(const QString& fileName) {
   QFile file(fileName);
   if (!file.open(QIODevice::ReadOnly | QIODevice::Unbuffered))
     return false;
-  return isXMLWorkspace(file);
+  return isXMLWorkspace(file.read(kRecognisedBytes));
 }
 
-bool XMLComponentReader::isXMLWorkspace(QIODevice& device) {
-  const QByteArray start = device.peek(kRecognisedBytes);
-  for (const char* const tag : {"<WORKSPACE", "<DATASOURCE", "<ETL_TOOL", "<TRANSFORMER", "ORW"}) {
+bool XMLComponentReader::isXMLWorkspace(const QByteArray& bytes) {
+  const QByteArray start =
+      QByteArray::fromRawData(bytes.constData(), std::min(bytes.size(), kRecognisedBytes));
+  if (start.contains("ORW"))
+    return true;
+  if (!start.contains('<'))  // most definition files
+    return false;
+  for (const char* const tag : {"<WORKSPACE", "<DATASOURCE", "<ETL_TOOL", "<TRANSFORMER"}) {
     if (start.contains(tag))
       return true;
   }

@@ -15,8 +15,8 @@ class ORX_EXPORT XMLComponentReader : public XMLComponentParser, public IXMLComp
   // Whether the first 100 bytes hold a root tag of a workspace, or "ORW". False for a file that cannot be
   // read.
   static bool IsFileXMLWorkspace(const QString& fileName);
-  // The same of what stands next in an open device, which stays where it is.
-  static bool isXMLWorkspace(QIODevice& device);
+  // The same of the first bytes of a file.
+  static bool isXMLWorkspace(const QByteArray& bytes);
   // Splits a workspace file and answers the name of a new temporary file with its XML, which the caller
   // deletes. Header lines are appended; prompt lines (by parameter name) and macros (by name) are collected
   // when wanted.
