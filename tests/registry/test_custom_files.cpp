@@ -102,6 +102,7 @@ TEST(CustomTransformerFiles, RefusedOnesAreListed) {
   const QString second = customFile(folders, "B.ort", {{2, 1}});
   const QString newer = customFile(folders, "C.ort", {{9, 99999}});
   TransformerMgr& registry = folders.load();
+  EXPECT_EQ(registry.transformerNames(), (QStringList{"Cleaner", "Other"}));
   // Whoever asks again is refused again, for the same reason.
   registry.reloadCustomTransformers();
   EXPECT_EQ(versionOf(registry, 9), -1);

@@ -7,8 +7,9 @@
 // change nothing before the next load, and definitions with dependency checks, which ask about the system,
 // are read while loading.
 //
-// Loading never fails as a whole: a file or folder that cannot be read is recorded in lastError() and passed
-// over. Lookups answer null, false, -1 or an empty value. Used by one thread at a time.
+// Loading never fails as a whole: a file or folder that cannot be read, and a definition that a file loses,
+// is recorded in errors() and passed over. Lookups answer null, false, -1 or an empty value. Used by one
+// thread at a time.
 //
 // Copies handed out keep the session and ask this object about connections and member types, so that both
 // must outlive them.
