@@ -4,6 +4,7 @@
 #include <transform/core/TransformerDefinition.h>
 #include <transform/registry/CompanionFileParser.h>
 #include <transform/registry/DefinitionFileParser.h>
+#include <transform/registry/DefinitionIndex.h>
 #include <translation/MFDeviceBuffer.h>
 
 #include <QBuffer>
@@ -94,6 +95,19 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     tryDefinition(DefinitionFileParser::interpret(definitions.definitions()[i]));
   }
   tryDefinition(DefinitionFileParser::interpret(definitions.unfinished()));
+
+  DefinitionIndex index;
+  index.read(bytes);
+  require(index.definitions().size() == definitions.definitions().size(), "the index finds what is there");
+  for (std::size_t i = 0; i < definitions.definitions().size() && i < 8; ++i) {
+    const TransformerDefinition whole = DefinitionFileParser::interpret(definitions.definitions()[i]);
+    const TransformerDefinition alone =
+        DefinitionFileParser::definitionAlone(index.definitions()[i].bytes, whole.filePath);
+    require(alone.name == whole.name && alone.name == index.definitions()[i].facts.name &&
+                alone.version == whole.version && alone.aliases == index.definitions()[i].facts.aliases &&
+                alone.parameterNames == whole.parameterNames && alone.templateLines == whole.templateLines,
+            "what the index gives is the whole definition");
+  }
 
   device.seek(0);
   CompanionFileParser companions;
