@@ -91,6 +91,10 @@ TEST(Templaters, SubTemplatesAreInputs) {
     one->getInputTags(tags);
     EXPECT_EQ(tags.join(' '), "ROOT P Q_2");
   }
+  applySettings(*copy, "SUB_TEMPLATES=P;1;New;2");
+  QStringList tags;
+  copy->getInputTags(tags);
+  EXPECT_EQ(tags.join(' '), "ROOT P New");
   cfg->addInputFeatureType("ROOT", "Parcels");
   cfg->addInputFeatureType("P", "Parts");
   EXPECT_TRUE(

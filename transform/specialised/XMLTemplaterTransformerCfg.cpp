@@ -89,15 +89,25 @@ TransformerCfg* XMLTemplaterTransformerCfg::getCopy() const {
   return copyAs(*this, m_isJson);
 }
 
-void XMLTemplaterTransformerCfg::getInputTags(QStringList& tags, QHash<QString, QString>* shownNames) const {
-  TransformerCfg::getInputTags(tags, shownNames);
-  const ParameterTable templates(*this, kSubTemplates, kColumns, UnpackLevel::Resolved);
-  for (int row = 0; row < templates.rowCount(); ++row) {
-    const QString name = templates.cell(row, kName);
-    if (isTag(name)) {
-      tags.append(name);
+const QStringList& XMLTemplaterTransformerCfg::subTemplateTags() const {
+  const QString value = getParameterValue(kSubTemplates, UnpackLevel::Resolved);
+  if (value != m_tagsOf) {
+    m_tagsOf = value;
+    m_tags.clear();
+    const ParameterTable templates(getParameterByMacroName(kSubTemplates), value, kColumns);
+    for (int row = 0; row < templates.rowCount(); ++row) {
+      const QString name = templates.cell(row, kName);
+      if (isTag(name)) {
+        m_tags.append(name);
+      }
     }
   }
+  return m_tags;
+}
+
+void XMLTemplaterTransformerCfg::getInputTags(QStringList& tags, QHash<QString, QString>* shownNames) const {
+  TransformerCfg::getInputTags(tags, shownNames);
+  tags += subTemplateTags();
   tags.removeDuplicates();
 }
 

@@ -23,5 +23,10 @@ class ORX_EXPORT XMLTemplaterTransformerCfg : public TransformerCfg {
   bool validateRoot(QString& message) const;
   bool validateSubTemplates(QString& message) const;
 
+  const QStringList& subTemplateTags() const;
+
   const bool m_isJson;
+  // Every link asks for the inputs: the names that this value gives.
+  mutable QString m_tagsOf;
+  mutable QStringList m_tags;
 };
