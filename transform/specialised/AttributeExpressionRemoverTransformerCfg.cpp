@@ -1,5 +1,4 @@
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/core/Keywords.h>
 #include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
 #include <transform/specialised/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>

@@ -1,5 +1,3 @@
-#include <transform/core/ExpressionWriter.h>
-#include <transform/core/Keywords.h>
 #include <transform/specialised/ChartGeneratorTransformerCfg.h>
 #include <transform/specialised/ParameterTable.h>
 #include <transform/specialised/SpecialisedValues.h>

@@ -1,6 +1,5 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/ExpressionWriter.h>
-#include <transform/core/Keywords.h>
 #include <transform/specialised/FactoryOption.h>
 #include <transform/specialised/ParameterTable.h>
 #include <transform/specialised/SpecialisedValues.h>
