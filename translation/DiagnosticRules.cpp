@@ -82,6 +82,7 @@ const std::vector<DiagnosticRule>& diagnosticRules() {
       {Rule::PythonSyntax, QLatin1String("python-syntax"), Severity::Error, 370834},
       {Rule::UncheckedPython, QLatin1String("unchecked-python"), Severity::Hint, 370835},
       {Rule::TooManyFindings, QLatin1String("too-many-findings"), Severity::Warning, 370836},
+      {Rule::TooManyNames, QLatin1String("too-many-names"), Severity::Error, 370838},
   };
   return rules;
 }

@@ -89,6 +89,7 @@ enum class Rule {
   PythonSyntax,
   UncheckedPython,
   TooManyFindings,
+  TooManyNames,
 };
 
 struct DiagnosticRule {

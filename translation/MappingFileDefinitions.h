@@ -25,6 +25,8 @@ class MappingFileDefinitions {
   // in such a one.
   QSet<int> open() const;
 
+  // How much is remembered.
+  std::size_t size() const { return m_definitions.size() + m_includes.size(); }
   // `isLibrary` tells that the file is there for others to include.
   void finish(bool isLibrary, const std::function<bool(const QString&, int)>& isInstalled,
               MappingFileReport& report) const;

@@ -27,6 +27,11 @@ class MappingFileFlow {
   void write(const QString& type, int line);
   void give(const QString& type, int line, Role role);
 
+  // How much is remembered.
+  std::size_t size() const {
+    return static_cast<std::size_t>(m_factories.size() + m_workers.size()) + m_types.size() +
+           m_takenEarly.size() + m_lostOptions.size() + m_runs.size();
+  }
   // Reports what does not fit together.
   void finish(MappingFileReport& report) const;
 

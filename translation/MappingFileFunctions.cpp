@@ -20,7 +20,6 @@ const QLatin1String kExpressionTypes[] = {QLatin1String("STRING"), QLatin1String
 
 const char* const kExpressionForm = "@EvaluateExpression([FDIV,]STRING|STRING_ENCODED|INT|FLOAT,NAME,BODY)";
 
-// The sorts of calls with the form that the messages show.
 const QStringList& functionNames() {
   static const QStringList names = {kCopyAttribute, kEvaluate, kTcl, kValue};
   return names;
@@ -109,7 +108,7 @@ void MappingFileFunctions::checkCall(const QStringRef& name, int begin, int end)
     if (m_text.midRef(inside, end - 1 - inside).trimmed().isEmpty())
       reportCall(begin, end, "@Value(ATTRIBUTE)");
   } else if (name == kCopyAttribute) {
-    if (checkArguments(inside, end - 1, 2, 2))
+    if (hasTwoArguments(inside, end - 1))
       checkEncodedList(inside, end - 1);
     else
       reportCall(begin, end, "@CopyAttribute(NEW,OLD)");
@@ -118,19 +117,10 @@ void MappingFileFunctions::checkCall(const QStringRef& name, int begin, int end)
   }
 }
 
-// Whether so many arguments stand there, none of them empty.
-bool MappingFileFunctions::checkArguments(int begin, int end, int least, int most) {
-  int count = 0;
-  int from = begin;
-  while (from <= end) {
-    const int comma = find(QLatin1Char(','), from, end);
-    const int to = comma < 0 ? end : comma;
-    if (to == from)
-      return false;
-    ++count;
-    from = to + 1;
-  }
-  return count >= least && count <= most;
+// Whether two arguments stand there, none of them empty.
+bool MappingFileFunctions::hasTwoArguments(int begin, int end) const {
+  const int comma = find(QLatin1Char(','), begin, end);
+  return comma > begin && comma + 1 < end && find(QLatin1Char(','), comma + 1, end) < 0;
 }
 
 // [FDIV,]TYPE,NAME,BODY

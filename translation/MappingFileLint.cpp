@@ -13,8 +13,8 @@ MappingFileFindings lintMappingFile(const QString& path, const QString& shownNam
   if (!reader.open())
     return {reader.errorString(), {}};
   MappingFileStatements statements(report);
-  for (MappingFileReader::Item item = reader.next(); item != MappingFileReader::Item::End;
-       item = reader.next()) {
+  MappingFileReader::Item item = reader.next();
+  for (; item != MappingFileReader::Item::End && !statements.isFull(); item = reader.next()) {
     switch (item) {
       case MappingFileReader::Item::Statement:
         statements.check(reader.statement());
@@ -32,6 +32,8 @@ MappingFileFindings lintMappingFile(const QString& path, const QString& shownNam
         break;
     }
   }
+  if (item != MappingFileReader::Item::End)
+    report.add(Rule::TooManyNames, reader.lineNumber());
   statements.finish(isInstalled);
   std::vector<Diagnostic> findings = diagnostics.all();
   std::stable_sort(findings.begin(), findings.end(),

@@ -10,8 +10,9 @@
 
 namespace {
 
-// Longer values are not remembered: they are no parts of names.
+// What is longer is not remembered: it is no part of a name. So values inside values cannot grow without end.
 constexpr int kLongestValue = 256;
+constexpr int kLongestName = 1024;
 
 bool endsScriptWord(QChar c) {
   return c.isSpace() ||
@@ -43,6 +44,8 @@ QString MappingFileMacros::expanded(const QString& name) const {
       result += name.midRef(done, reference.begin - done);
       result += value.value();
       done = reference.end;
+      if (result.size() > kLongestName)
+        return name;
     }
   }
   return done == 0 ? name : result + name.midRef(done);
@@ -59,8 +62,9 @@ void MappingFileMacros::set(const QString& name, const QString& value, int line)
   const QString full = expanded(name);
   if (full != name)
     note(full);
-  if (value.size() <= kLongestValue)
-    m_values.insert(full, expanded(value));
+  const QString known = value.size() <= kLongestValue ? expanded(value) : QString();
+  if (known.size() <= kLongestValue)
+    m_values.insert(full, known);
 }
 
 void MappingFileMacros::mention(const QString& script) {

@@ -36,6 +36,10 @@ class MappingFileMacros {
   // That the statement at `line` needs the macro.
   void need(const QString& name, int line, Use use, int block);
 
+  // How much is remembered.
+  std::size_t size() const {
+    return static_cast<std::size_t>(m_lines.size() + m_mentioned.size()) + m_pending.size();
+  }
   // Reports what leads nowhere. Of the blocks in `openBlocks` only the users know the macros.
   void finish(const QSet<int>& openBlocks, MappingFileReport& report) const;
 

@@ -39,6 +39,7 @@ class MappingFileReader {
   Item next();
   // Of a BlockBegin the fields behind the keyword.
   const MappingFileStatement& statement() const { return m_statement; }
+  // Of the line read last.
   int lineNumber() const { return m_number; }
   const QString& errorString() const { return m_error; }
 

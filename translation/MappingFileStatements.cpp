@@ -15,6 +15,8 @@ namespace {
 using Use = MappingFileMacros::Use;
 
 const QLatin1String kPromptLine("GUI");
+// Macros, factories, feature types and definitions that are held in memory.
+constexpr std::size_t kMostNames = 4 * 1000 * 1000;
 
 const QStringList& keywords() {
   static const QStringList list = {
@@ -260,6 +262,13 @@ void MappingFileStatements::endBlock() {
   flow().finish(m_report);
   m_scopes.pop_back();
   m_macros.setPrefix(m_scopes.back().prefix);
+}
+
+bool MappingFileStatements::isFull() const {
+  std::size_t size = m_macros.size() + m_definitions.size();
+  for (const Scope& scope : m_scopes)
+    size += scope.flow.size();
+  return size > kMostNames;
 }
 
 void MappingFileStatements::finish(const std::function<bool(const QString&, int)>& isInstalled) {

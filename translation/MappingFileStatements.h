@@ -25,7 +25,9 @@ class MappingFileStatements {
   void addScriptLine(const MappingFileStatement& line);
   void beginBlock(const MappingFileStatement& opening);
   void endBlock();
-  // Reports what does not fit together in the whole file.
+  // That no more can be remembered: the rest of the file is to be left alone.
+  bool isFull() const;
+  // Reports what does not fit together in what was read.
   void finish(const std::function<bool(const QString&, int)>& isInstalled);
 
  private:

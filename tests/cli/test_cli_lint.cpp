@@ -28,7 +28,8 @@ TEST(Lint, SaysWhatIsWrongWithBrokenMappingFiles) {
 
 TEST(Lint, HasABrokenFileForEveryRuleInEveryLanguage) {
   // These need large files, or a system without Python.
-  const QSet<QString> elsewhere = {"long-statement", "deep-block", "unchecked-python", "too-many-findings"};
+  const QSet<QString> elsewhere = {"long-statement", "deep-block", "unchecked-python", "too-many-findings",
+                                   "too-many-names"};
   QMap<QString, QSet<QString>> texts;
   for (const char* language : {"en", "de", "fr"}) {
     QSet<QString> found;

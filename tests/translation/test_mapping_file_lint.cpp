@@ -44,6 +44,10 @@ TEST(MappingFileLint, EndsWithAFindingWhateverTheFileHolds) {
   QByteArray deep;
   for (int depth = 0; depth < 70; ++depth)
     deep += times(depth, "# ") + "# TRANSFORMER_BEGIN A" + QByteArray::number(depth) + ",1,T\n";
+  QByteArray growing = "MACRO A0 " + times(200, "x") + "\n";
+  for (int i = 1; i < 40; ++i)
+    growing += "MACRO A" + QByteArray::number(i) + ' ' +
+               ("$(A" + QByteArray::number(i - 1) + ')').repeated(36) + "\n";
   const struct {
     const char* name;
     QByteArray text;
@@ -69,6 +73,7 @@ TEST(MappingFileLint, EndsWithAFindingWhateverTheFileHolds) {
        "MACRO A " + times(kMany, "$(") + "A" + times(kMany, ")"),
        {"open-reference:1", "unknown-reference:1*"}},
       {"deferred references", "MACRO A " + times(kMany, "$["), {}},
+      {"values inside values", growing, {}},
       {"deep blocks", deep, {"open-block:1*", "unused-definition:2*", "deep-block:65"}},
       {"null characters",
        QByteArray("\0\0\n", 3).repeated(kMany),

@@ -180,8 +180,7 @@ void getPythonParameterLines(const QString& prefix, const QString& parameterName
                              : QStringLiteral("macroName = ORX_MacroValues['") + prefix +
                                    QStringLiteral("'] + '_") + parameterName + QLatin1Char('\''));
   lines << QStringLiteral("if value == None:") << QStringLiteral("  return { macroName : '' }")
-        << QStringLiteral("else:") << QStringLiteral("  return { macroName : str(value) }")
-        << kIncludeEnd;
+        << QStringLiteral("else:") << QStringLiteral("  return { macroName : str(value) }") << kIncludeEnd;
 }
 
 void getTclParameterLines(const QString& prefix, const QString& parameterName, const QString& encodedCode,
