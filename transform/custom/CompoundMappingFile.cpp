@@ -20,8 +20,7 @@ namespace {
 const QLatin1String kSetterAttributeType("STRING_OR_ATTR_ENCODED");
 
 QString factoryName(const QString& id, const QString& tag, QLatin1String role) {
-  return QLatin1String("  FACTORY_NAME \"") + id + QLatin1Char(' ') + tag + role +
-         QLatin1Char('"');
+  return QLatin1String("  FACTORY_NAME \"") + id + QLatin1Char(' ') + tag + role + QLatin1Char('"');
 }
 
 // References to parameters, "$(NAME)", become references to the instance's macros. Macros that every mapping
