@@ -1,5 +1,6 @@
 // Workspaces with custom transformers that live in files of their own.
 #include <platform/orxutil/Decipher.h>
+#include <platform/qorxcore/qorxcore.h>
 #include <tests/registry/RegistryFolders.h>
 #include <tests/support/QtPrinters.h>
 #include <tests/translation/TranslatedWorkspace.h>
@@ -169,6 +170,25 @@ TEST_F(LinkedTranslation, TellsWhatDoesNotFit) {
             << test.promise << isInside << outcome.texts.value(0).toStdString();
       EXPECT_EQ(outcome.text.count("INCLUDE_CUSTOM_TRANSFORMER_VER Tidy:1\n"), expected.isEmpty() ? 1 : 0);
     }
+  }
+}
+
+TEST_F(LinkedTranslation, StatementsAreTheSameInEveryLanguage) {
+  store(tidyDocument());
+  folders.write("extra/Tidy-localized.de", "TRANSFORMER_NAME: Tidy\nLOCALIZED_NAME: Ordner\n");
+  for (const bool isInside : {false, true}) {
+    QStringList texts;
+    for (const char* language : {"en", "de"}) {
+      QORXSetLanguage(language);
+      TransformerMgr& registry = folders.load();
+      const std::unique_ptr<TransformerCfg> shown(registry.getTransformer("Tidy", 1));
+      ASSERT_TRUE(shown);
+      EXPECT_EQ(shown->getLocalizedName(), QString(texts.isEmpty() ? "Tidy" : "Ordner"));
+      texts << translate(workspace(isInside), registry).text;
+    }
+    QORXSetLanguage("en");
+    EXPECT_TRUE(texts.first().contains("MACRO Tidy_WORKSPACE_NAME ")) << texts.first().toStdString();
+    EXPECT_EQ(texts.first(), texts.last());
   }
 }
 

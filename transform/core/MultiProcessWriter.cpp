@@ -15,7 +15,7 @@ void write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, 
   const bool hasStatements = !cfg.getTemplateLines().isEmpty();
   QStringList lines;
   lines << QLatin1String("FACTORY_DEF * TransformFact:") + QString::number(cfg.getVersion()) +
-               QLatin1Char(':') + quotifyStringForMF(cfg.getVisualName())
+               QLatin1Char(':') + quotifyStringForMF(cfg.getName())
         << QLatin1String("   FACTORY_NAME ") + quotifyStringForMF(identifier)
         << QStringLiteral("   FACTORY_META_PARAMS")
         << QLatin1String("   TRANSFORMER_NAME:") + quotifyStringForMF(identifier)

@@ -69,6 +69,9 @@ std::unique_ptr<TransformerCfg> SubDocumentLibrary::makeTransformer(const QStrin
       return nullptr;
     std::unique_ptr<TransformerCfg> cfg = m_others->makeTransformer(name, version);
     const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(cfg.get()));
+    // Statements bear the name that the definition's file has, whatever language the name is shown in.
+    if (linked && cfg->getLocalizedName() != cfg->getName())
+      cfg->setLocalizedName(QString());
     m_refusal = linked ? linked->bodyFault() : cfg ? QString() : m_others->refusalReason();
     return m_refusal.isEmpty() ? std::move(cfg) : nullptr;
   }
