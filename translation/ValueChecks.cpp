@@ -31,6 +31,13 @@ Rule ValueChecks::ruleOf(const QString& message) const {
   return Rule::InvalidValue;
 }
 
+QString ValueChecks::nearestName(const QString& name, const QStringList& candidates) {
+  Suggestion& known = m_suggestions[name];
+  if (known.candidates != candidates)
+    known = {candidates, m_spelling.find(name, candidates)};
+  return known.nearest;
+}
+
 QString ValueChecks::missingText(const TransformerCfg& cfg, const QString& parameter) {
   QStringList missing;
   bool hasReferences = false;
@@ -44,7 +51,7 @@ QString ValueChecks::missingText(const TransformerCfg& cfg, const QString& param
       break;
     }
     quoted.append(QLatin1Char('\'') + name + QLatin1Char('\''));
-    const QString nearest = m_spelling.find(name, arriving);
+    const QString nearest = nearestName(name, arriving);
     if (!nearest.isEmpty())
       suggestions += QLatin1String(suggestions.isEmpty() ? ". " : " ") +
                      TransformResString(kSuggestion, {nearest, name});
@@ -90,7 +97,7 @@ void ValueChecks::checkReferences(const TransformerCfg& cfg, const TransformerSt
       if (knows(name) || name.startsWith(kInstanceNames) || cfg.getParameterByMacroName(name))
         continue;
       QString text = TransformResString(diagnosticRule(Rule::UnknownReference).message, name);
-      const QString nearest = m_spelling.find(name, names);
+      const QString nearest = nearestName(name, names);
       if (!nearest.isEmpty())
         text += QLatin1Char(' ') + TransformResString(kSuggestion, {nearest, name});
       const QString prompt = cfg.getParameterPrompt(given.parmName);

@@ -39,10 +39,18 @@ class ValueChecks {
     QString behind;
   };
 
+  // A misspelt name is often met again among the same candidates.
+  struct Suggestion {
+    QStringList candidates;
+    QString nearest;
+  };
+
   Rule ruleOf(const QString& message) const;
+  QString nearestName(const QString& name, const QStringList& candidates);
   QString missingText(const TransformerCfg& cfg, const QString& parameter);
 
   Diagnostics& m_diagnostics;
   NearestSpelling m_spelling;
+  QHash<QString, Suggestion> m_suggestions;  // by the name that was used
   std::vector<Form> m_forms;
 };
