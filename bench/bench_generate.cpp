@@ -1,6 +1,7 @@
 // Whole workspaces into mapping files: the time per transformer must not grow with the workspace. Loading the
 // definitions is left out.
 #include <platform/session/session.h>
+#include <tests/translation/SmallWorkspace.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
 #include <translation/MFDeviceBuffer.h>
@@ -14,18 +15,6 @@
 #include <cstdio>
 
 namespace {
-
-QString transformer(int id, const QString& type, int version, const QStringList& parameters) {
-  QString text = QStringLiteral("#! <TRANSFORMER IDENTIFIER=\"%1\" TYPE=\"%2\" VERSION=\"%3\">\n")
-                     .arg(id)
-                     .arg(type)
-                     .arg(version);
-  for (int i = 0; i + 1 < parameters.size(); i += 2) {
-    text += QStringLiteral("#!     <XFORM_PARM PARM_NAME=\"%1\" PARM_VALUE=\"%2\"/>\n")
-                .arg(parameters.at(i), parameters.at(i + 1));
-  }
-  return text + QStringLiteral("#! </TRANSFORMER>\n");
-}
 
 // Chains of ten transformers each, from one reader to one writer.
 QByteArray makeWorkspace(int count, TransformerMgr& registry) {
@@ -51,38 +40,22 @@ QByteArray makeWorkspace(int count, TransformerMgr& registry) {
     kinds.push_back({type, cfg->getVersion(), inputs.first(), outputs.first()});
   }
 
-  QString text = QStringLiteral(
-      "#! <?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n#! <WORKSPACE>\n#! <FEATURE_TYPES>\n"
-      "#! <FEATURE_TYPE IS_SOURCE=\"true\" FEATURE_TYPE_NAME=\"Parcels\" IDENTIFIER=\"1\" KEYWORD=\"IN\">\n"
-      "#! <FEAT_ATTRIBUTE ATTR_NAME=\"id\"/>\n#! <FEAT_ATTRIBUTE ATTR_NAME=\"zone\"/>\n#! </FEATURE_TYPE>\n"
-      "#! <FEATURE_TYPE IS_SOURCE=\"false\" FEATURE_TYPE_NAME=\"Result\" IDENTIFIER=\"2\" KEYWORD=\"OUT\"/>\n"
-      "#! </FEATURE_TYPES>\n#! <TRANSFORMERS>\n");
-  QString links;
-  int linkCount = 0;
-  const auto link = [&](int from, const QString& output, int to, const QString& input) {
-    links += QStringLiteral(
-                 "#! <FEAT_LINK IDENTIFIER=\"%1\" SOURCE_NODE=\"%2\" TARGET_NODE=\"%3\" "
-                 "SOURCE_PORT_DESC=\"fo 0 %4\" TARGET_PORT_DESC=\"fi 0 %5\"/>\n")
-                 .arg(++linkCount)
-                 .arg(from)
-                 .arg(to)
-                 .arg(output, input);
-  };
+  SmallWorkspace workspace;
+  workspace.reader(1, "Parcels", {"id", "zone"}).writer(2, "Result");
   for (int i = 0; i < count; ++i) {
     const Kind& kind = kinds[static_cast<std::size_t>(i) % kinds.size()];
     const int id = i + 3;
-    text += transformer(id, kind.type, kind.version,
-                        {QStringLiteral("XFORMER_NAME"), QStringLiteral("%1_%2").arg(kind.type).arg(i)});
+    workspace.transformer(id, kind.type, {"XFORMER_NAME", QStringLiteral("%1_%2").arg(kind.type).arg(i)},
+                          {"VERSION", QString::number(kind.version)});
     if (i % 10 == 0)
-      link(1, QString(), id, kind.input);
+      workspace.link(1, "fo 0", id, "fi 0 " + kind.input);
     else
-      link(id - 1, kinds[static_cast<std::size_t>(i - 1) % kinds.size()].output, id, kind.input);
+      workspace.link(id - 1, "fo 0 " + kinds[static_cast<std::size_t>(i - 1) % kinds.size()].output, id,
+                     "fi 0 " + kind.input);
     if (i % 10 == 9 || i == count - 1)
-      link(id, kind.output, 2, QString());
+      workspace.link(id, "fo 0 " + kind.output, 2, "fi 0");
   }
-  text += QStringLiteral("#! </TRANSFORMERS>\n#! <FEAT_LINKS>\n") + links +
-          QStringLiteral("#! </FEAT_LINKS>\n#! </WORKSPACE>\n");
-  return text.toUtf8();
+  return workspace.text().toUtf8();
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 // not grow with the workspace. It is the time of the processor, so that neither the disk nor other programs
 // take part.
 #include <platform/session/session.h>
+#include <tests/translation/SmallWorkspace.h>
 #include <transform/registry/TransformerMgr.h>
 #include <translation/MappingFileLint.h>
 #include <translation/WorkspaceTranslation.h>
@@ -21,46 +22,26 @@ double microsecondsSince(std::clock_t start) {
   return static_cast<double>(std::clock() - start) * 1e6 / CLOCKS_PER_SEC;
 }
 
-QString link(int number, int from, const QString& output, int to, const QString& input) {
-  return QStringLiteral(
-             "#! <FEAT_LINK IDENTIFIER=\"%1\" SOURCE_NODE=\"%2\" TARGET_NODE=\"%3\" SOURCE_PORT_DESC=\"fo "
-             "0%4\" "
-             "TARGET_PORT_DESC=\"fi 0%5\"/>\n")
-      .arg(number)
-      .arg(from)
-      .arg(to)
-      .arg(output, input);
-}
-
 // Chains of ten transformers each, from one reader to one writer; the last of each chain is at fault.
 QByteArray makeWorkspace(int count) {
-  QString text = QStringLiteral(
-      "#! <?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n#! <WORKSPACE>\n#! <FEATURE_TYPES>\n"
-      "#! <FEATURE_TYPE IS_SOURCE=\"false\" FEATURE_TYPE_NAME=\"Result\" IDENTIFIER=\"2\" KEYWORD=\"OUT\"/>\n"
-      "#! <FEATURE_TYPE IS_SOURCE=\"true\" FEATURE_TYPE_NAME=\"Parcels\" IDENTIFIER=\"1\" KEYWORD=\"IN\">\n");
+  QStringList attributes;
   for (int i = 0; i < 50; ++i)
-    text += QStringLiteral("#! <FEAT_ATTRIBUTE ATTR_NAME=\"measure_%1\"/>\n").arg(i);
-  text += QStringLiteral("#! </FEATURE_TYPE>\n#! </FEATURE_TYPES>\n#! <TRANSFORMERS>\n");
-  QString links;
-  int linkCount = 0;
+    attributes << QStringLiteral("measure_%1").arg(i);
+  SmallWorkspace workspace;
+  workspace.writer(2, "Result").reader(1, "Parcels", attributes);
   for (int i = 0; i < count; ++i) {
     const bool isLast = i % 10 == 9;
-    text += QStringLiteral(
-                "#! <TRANSFORMER IDENTIFIER=\"%1\" TYPE=\"GeometryBufferer\" VERSION=\"1\">\n"
-                "#! <XFORM_PARM PARM_NAME=\"XFORMER_NAME\" PARM_VALUE=\"Zone_%1\"/>\n"
-                "#! <XFORM_PARM PARM_NAME=\"EXTENT\" "
-                "PARM_VALUE=\"DISTANCE;@Value(%2);DISTANCE_UNIT;GROUND\"/>\n#! </TRANSFORMER>\n")
-                .arg(i + 3)
-                .arg(isLast ? QStringLiteral("measrue_49") : QStringLiteral("measure_7"));
-    links += i % 10 == 0
-                 ? link(++linkCount, 1, QString(), i + 3, QStringLiteral(" INPUT"))
-                 : link(++linkCount, i + 2, QStringLiteral(" OUTPUT"), i + 3, QStringLiteral(" INPUT"));
+    const int id = i + 3;
+    workspace.transformer(id, "GeometryBufferer",
+                          {"XFORMER_NAME", QStringLiteral("Zone_%1").arg(id), "EXTENT",
+                           QStringLiteral("DISTANCE;@Value(%1);DISTANCE_UNIT;GROUND")
+                               .arg(QLatin1String(isLast ? "measrue_49" : "measure_7"))},
+                          {"VERSION", "1"});
+    workspace.link(i % 10 == 0 ? 1 : id - 1, i % 10 == 0 ? "fo 0" : "fo 0 OUTPUT", id, "fi 0 INPUT");
     if (isLast)
-      links += link(++linkCount, i + 3, QStringLiteral(" OUTPUT"), 2, QString());
+      workspace.link(id, "fo 0 OUTPUT", 2, "fi 0");
   }
-  text += QStringLiteral("#! </TRANSFORMERS>\n#! <FEAT_LINKS>\n") + links +
-          QStringLiteral("#! </FEAT_LINKS>\n#! </WORKSPACE>\n");
-  return text.toUtf8();
+  return workspace.text().toUtf8();
 }
 
 }  // namespace
