@@ -99,7 +99,8 @@ class ORXTValSlist {
     }
     return *this;
   }
-  ORXTValSlist& operator=(ORXTValSlist&& other) {
+  ORXTValSlist& operator=(ORXTValSlist&& other) noexcept(
+      NodeTraits::propagate_on_container_move_assignment::value || NodeTraits::is_always_equal::value) {
     constexpr bool propagates = NodeTraits::propagate_on_container_move_assignment::value;
     if (this == &other) {
       return *this;

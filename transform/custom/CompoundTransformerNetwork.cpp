@@ -33,9 +33,8 @@ void CompoundTransformerNetwork::noteNumber(int number, SubDocNetworkObj* node) 
 
 template <class Node>
 Node* CompoundTransformerNetwork::enter(std::unique_ptr<Node> node) {
-  Node* entered = node.get();
-  m_nodes.push_back(entered);
-  node.release();
+  m_nodes.push_back(node.get());
+  Node* entered = node.release();
   entered->m_serial = m_nextSerial++;
   noteNumber(entered->number(), entered);
   forgetOrders();
