@@ -33,7 +33,8 @@ class ORX_EXPORT CustomDefinition {
 
   const ExternalDocNetwork& network() const { return m_network; }
 
-  // Orders and connects the copies. False when they feed each other in a circle, or the name cannot be written.
+  // Orders and connects the copies. False when they feed each other in a circle, or the name cannot be
+  // written.
   bool arrange(Diagnostics& diagnostics);
   // The four below: call after arrange() answered true. Whether a statement names the attributes that reach
   // it.
