@@ -1,4 +1,4 @@
-// Header, answers and lazy loading; what changes files stands in CustomTransformerFiles.cpp.
+// Header, answers and lazy loading; what writes files stands in ExternalTransformerNetworkFiles.cpp.
 #include <platform/orxutil/Decipher.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>

@@ -1,4 +1,4 @@
-// What a linked custom transformer writes: copies of its definition, and files without it.
+// The part of ExternalTransformerNetwork that writes files: copies of its definition, and files without it.
 #include <platform/qorxcore/Local8Bit.h>
 #include <platform/qorxcore/OrxHome.h>
 #include <transform/custom/CustomMessages.h>
