@@ -38,7 +38,7 @@ QStringList candidates(const QString& kind, SubFolders subFoldersOfHome) {
   const QStringList subFolders =
       subFoldersOfHome == SubFolders::LeftOut
           ? QStringList()
-          : QDir(homeFolder).entryList(QDir::Dirs | QDir::NoDotAndDotDot | QDir::Readable, QDir::Name);
+          : QDir(homeFolder).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name);
   for (const QString& subFolder : subFolders) {
     places.append(homeFolder + QLatin1Char('/') + subFolder);
   }
@@ -49,15 +49,17 @@ QStringList candidates(const QString& kind, SubFolders subFoldersOfHome) {
   return places;
 }
 
-bool holdsReadableFile(const QString& folder) {
+enum class FolderState { Missing, Unreadable, WithoutFiles, WithFiles };
+
+FolderState stateOf(const QString& folder) {
   const QFileInfo info(folder);
-  return info.isDir() && info.isReadable() && info.isExecutable() &&
-         QDirIterator(folder, QDir::Files).hasNext();
+  return !info.isDir()                                 ? FolderState::Missing
+         : !(info.isReadable() && info.isExecutable()) ? FolderState::Unreadable
+         : QDirIterator(folder, QDir::Files).hasNext() ? FolderState::WithFiles
+                                                       : FolderState::WithoutFiles;
 }
 
-}  // namespace
-
-QStringList ORX_resourceDirectories(const QString& kind) {
+QStringList foldersInState(FolderState state, const QString& kind) {
   QStringList folders;
   if (!isPlainWord(kind)) {
     return folders;
@@ -65,7 +67,7 @@ QStringList ORX_resourceDirectories(const QString& kind) {
   QSet<QString> seen;
   const QStringList places = candidates(kind, SubFolders::Included);
   for (const QString& place : places) {
-    if (!holdsReadableFile(place)) {
+    if (stateOf(place) != state) {
       continue;
     }
     const QString canonical = QFileInfo(place).canonicalFilePath();
@@ -75,6 +77,16 @@ QStringList ORX_resourceDirectories(const QString& kind) {
     }
   }
   return folders;
+}
+
+}  // namespace
+
+QStringList ORX_resourceDirectories(const QString& kind) {
+  return foldersInState(FolderState::WithFiles, kind);
+}
+
+QStringList ORX_unreadableResourceDirectories(const QString& kind) {
+  return foldersInState(FolderState::Unreadable, kind);
 }
 
 QStringList ORX_resourcePlaces(const QString& kind) {

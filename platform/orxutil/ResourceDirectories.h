@@ -14,6 +14,9 @@
 // for "format"). A kind is a word of ASCII letters, digits and underscores; any other has no folders.
 ORX_EXPORT QStringList ORX_resourceDirectories(const QString& kind);
 
+// The folders of those places that are there but may not be read, each once.
+ORX_EXPORT QStringList ORX_unreadableResourceDirectories(const QString& kind);
+
 // Where folders of a kind are looked for, for a message to people: the same places, whether they exist or
 // not, without the sub-folders of the home.
 ORX_EXPORT QStringList ORX_resourcePlaces(const QString& kind);

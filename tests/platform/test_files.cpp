@@ -265,6 +265,8 @@ TEST_F(FolderListings, SortsByCodeAndTellsFailureFromEmpty) {
   EXPECT_EQ(
       FolderListing::files(m_folder.path(), text(".ort")).names(),
       (QStringList{text("B.ort"), text("a.ort"), text("b.ort"), text("link.ort"), text("\xc3\xa4.ort")}));
+  EXPECT_EQ(FolderListing::files(m_folder.path(), text(".ort")).unusableNames(),
+            QStringList{text("dangling.ort")});
   EXPECT_EQ(FolderListing::folders(m_folder.path()).names(), QStringList{text("sub.ort")});
   const FolderListing empty = FolderListing::files(path("sub.ort"));
   EXPECT_TRUE(empty.names().isEmpty());

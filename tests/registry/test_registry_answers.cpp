@@ -107,6 +107,10 @@ TEST(RegistryAnswers, AnUnreadableListOfConnectionsIsTold) {
   EXPECT_TRUE(registry.lastError().contains(list)) << registry.lastError().toStdString();
   EXPECT_TRUE(registry.isConnectionKnown("Store"));
   EXPECT_TRUE(registry.isLoaded() && registry.transformerExists("T", 1));
+  const QString userList = folders.path("user/orx/connections.list");
+  ASSERT_TRUE(QFile::remove(userList) && QDir().mkdir(userList));
+  ASSERT_EQ(folders.load().errors().size(), 2);
+  EXPECT_TRUE(registry.errors().first().contains(list) && registry.lastError().contains(userList));
 }
 
 // What HTML forbids in a text is not on the page, wherever it comes from.

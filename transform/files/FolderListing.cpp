@@ -47,16 +47,23 @@ FolderListing FolderListing::list(const QString& folder, const QString& suffix, 
       break;
     }
     const QString name = QORXFromLocal8Bit(entry->d_name);
-    if (!name.startsWith(QLatin1Char('.')) && name.endsWith(suffix) &&
-        typeOf(stream.get(), *entry) == wantedType) {
+    if (name.startsWith(QLatin1Char('.')) || !name.endsWith(suffix)) {
+      continue;
+    }
+    const unsigned type = typeOf(stream.get(), *entry);
+    if (type == wantedType) {
       listing.m_names.append(name);
+    } else if (type != S_IFREG && type != S_IFDIR) {
+      listing.m_unusableNames.append(name);
     }
   }
   if (errno != 0) {
     listing.m_error = folder + QLatin1String(": ") + qt_error_string(errno);
     listing.m_names.clear();
+    listing.m_unusableNames.clear();
     return listing;
   }
   std::sort(listing.m_names.begin(), listing.m_names.end());
+  std::sort(listing.m_unusableNames.begin(), listing.m_unusableNames.end());
   return listing;
 }

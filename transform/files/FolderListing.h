@@ -16,6 +16,8 @@ class ORX_EXPORT FolderListing {
 
   // Sorted by character code, whatever the locale; without the folder's own name.
   const QStringList& names() const { return m_names; }
+  // With such a suffix, what is neither a file nor a folder: links that lead nowhere, pipes, devices. Sorted.
+  const QStringList& unusableNames() const { return m_unusableNames; }
   // Whether the folder could not be read; errorString() then names it and the reason.
   bool failed() const { return !m_error.isEmpty(); }
   const QString& errorString() const { return m_error; }
@@ -24,5 +26,6 @@ class ORX_EXPORT FolderListing {
   static FolderListing list(const QString& folder, const QString& suffix, unsigned wantedType);
 
   QStringList m_names;
+  QStringList m_unusableNames;
   QString m_error;
 };

@@ -1,6 +1,7 @@
 #include <platform/qorxcore/OrxHome.h>
 #include <transform/files/FolderListing.h>
 #include <transform/registry/CompanionLint.h>
+#include <transform/registry/DefinitionFileNames.h>
 #include <transform/registry/DefinitionFileParser.h>
 #include <transform/registry/DefinitionLint.h>
 #include <transform/registry/HeaderLint.h>
@@ -13,7 +14,6 @@
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
-#include <QRegularExpression>
 
 using namespace lint_rules;
 
@@ -21,15 +21,6 @@ namespace {
 
 const QLatin1String kShippedLanguages[] = {QLatin1String("de")};
 constexpr int kDeepestFolder = 32;
-
-bool isCompanionName(const QString& name) {
-  static const QRegularExpression companion(QStringLiteral("^[^/\\\\.].*-localized\\.[a-zA-Z][a-zA-Z]$"));
-  return companion.match(name).hasMatch();
-}
-
-bool isDefinitionName(const QString& name) {
-  return name.endsWith(QLatin1String(".ort")) || name.startsWith(QLatin1String("CategoryDefinitions"));
-}
 
 bool isShipped(const QString& path) {
   return path.startsWith(QDir(QORXOrxHome()).absolutePath() + QLatin1Char('/'));
@@ -72,8 +63,14 @@ void DefinitionLint::addFolder(const QString& folder) {
     m_report.add(kUnreadable, folder, 0, listing.errorString());
   }
   for (const QString& name : listing.names()) {
-    if (isCompanionName(name) || isDefinitionName(name)) {
+    if (isDefinitionFileName(name) || isCompanionFileName(name)) {
       addFile(folder + QLatin1Char('/') + name);
+    }
+  }
+  for (const QString& name : listing.unusableNames()) {
+    if (isDefinitionFileName(name) || isCompanionFileName(name)) {
+      m_report.add(kUnreadable, folder + QLatin1Char('/') + name, 0,
+                   QStringLiteral("This is no file that can be read"));
     }
   }
 }
@@ -84,7 +81,7 @@ void DefinitionLint::addFile(const QString& path) {
     return;
   }
   m_given.insert(real);
-  if (isCompanionName(QFileInfo(path).fileName())) {
+  if (isCompanionFileName(QFileInfo(path).fileName())) {
     m_companions.append(path);
   } else {
     readDefinitions(path, true);
@@ -151,7 +148,7 @@ void DefinitionLint::readFolderOf(const QString& companion) {
   const QString folder = QFileInfo(companion).path();
   const FolderListing listing = FolderListing::files(folder);
   for (const QString& name : listing.names()) {
-    if (!isCompanionName(name) && isDefinitionName(name)) {
+    if (isDefinitionFileName(name)) {
       readDefinitions(folder + QLatin1Char('/') + name, false);
     }
   }
@@ -197,7 +194,7 @@ void DefinitionLint::readTranslations() {
     for (const QString& name : listing.names()) {
       const QString path = folder + QLatin1Char('/') + name;
       QFile file(path);
-      if (isCompanionName(name) && !m_given.contains(QFileInfo(path).canonicalFilePath()) &&
+      if (isCompanionFileName(name) && !m_given.contains(QFileInfo(path).canonicalFilePath()) &&
           file.open(QIODevice::ReadOnly)) {
         CompanionLint lint(path, *m_catalogue, ignored);
         lint.check(file, false);

@@ -3,13 +3,13 @@
 #include <transform/files/FolderListing.h>
 #include <transform/registry/CategoryTexts.h>
 #include <transform/registry/CompanionFileParser.h>
+#include <transform/registry/DefinitionFileNames.h>
 #include <transform/registry/DefinitionLoader.h>
 #include <transform/registry/ExceptionList.h>
 #include <transform/registry/PrototypeTable.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/XMLComponentReader.h>
 
-#include <QRegularExpression>
 #include <QStringList>
 
 #include <map>
@@ -21,11 +21,6 @@ constexpr long kUnfinishedDefinition = 370741;
 constexpr long kNamelessDefinition = 370742;
 constexpr long kUnfinishedLines = 370746;
 constexpr long kDefinedTwice = 370747;
-
-bool isCompanion(const QString& name) {
-  static const QRegularExpression form(QStringLiteral("^[^/\\\\.].*-localized\\.[a-zA-Z][a-zA-Z]$"));
-  return !name.endsWith(QLatin1String(".ort")) && form.match(name).hasMatch();
-}
 
 }  // namespace
 
@@ -53,15 +48,21 @@ void DefinitionLoader::loadFolder(const QString& folder) {
   const QString start = folder + QLatin1Char('/');
   const bool isBuiltIn = start.startsWith(QORXOrxHome() + QLatin1Char('/'));
   const QString companionEnd = m_load ? QLatin1String("-localized.") + m_load->language : QString();
+  const auto isWantedCompanion = [&](const QString& name) {
+    return m_load && name.endsWith(companionEnd) && isCompanionFileName(name);
+  };
   QStringList companions;
   for (const QString& name : listing.names()) {
-    if (isCompanion(name)) {
-      if (m_load && name.endsWith(companionEnd)) {
-        companions.append(start + name);
-      }
-    } else if (name.endsWith(QLatin1String(".ort")) ||
-               name.startsWith(QLatin1String("CategoryDefinitions"))) {
+    if (isDefinitionFileName(name)) {
       loadFile(start + name, isBuiltIn);
+    } else if (isWantedCompanion(name)) {
+      companions.append(start + name);
+    }
+  }
+  // None of these is opened: a pipe would keep the reader waiting.
+  for (const QString& name : listing.unusableNames()) {
+    if (isWantedCompanion(name) || (m_load && isDefinitionFileName(name))) {
+      noteUnreadable(start + name, QString());
     }
   }
   for (const QString& path : std::as_const(companions)) {

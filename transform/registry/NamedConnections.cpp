@@ -18,8 +18,8 @@ QString canonical(const QString& name) {
 
 }  // namespace
 
-bool NamedConnections::readAll() {
-  bool isRead = true;
+QStringList NamedConnections::readAll() {
+  QStringList errors;
   const QString userFolder =
       QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation) + kUserFolder;
   for (const QString& folder : {QORXOrxHome(), userFolder}) {
@@ -27,21 +27,23 @@ bool NamedConnections::readAll() {
     if (!file.exists()) {
       continue;
     }
+    QString error;
     if (!file.open(QIODevice::ReadOnly)) {
-      m_error = file.fileName() + QLatin1String(": ") + file.errorString();
-      isRead = false;
-    } else if (!read(file)) {
-      m_error = file.fileName() + QLatin1String(": ") + m_error;
-      isRead = false;
+      error = file.errorString();
+    } else {
+      read(file, error);
+    }
+    if (!error.isEmpty()) {
+      errors.append(file.fileName() + QLatin1String(": ") + error);
     }
   }
-  return isRead;
+  return errors;
 }
 
-bool NamedConnections::read(QIODevice& device) {
+bool NamedConnections::read(QIODevice& device, QString& error) {
   DefinitionLines lines;
   if (!lines.open(device)) {
-    m_error = lines.errorString();
+    error = lines.errorString();
     return false;
   }
   while (lines.next()) {

@@ -7,20 +7,20 @@
 
 #include <QSet>
 #include <QString>
+#include <QStringList>
 
 class QIODevice;
 
 class ORX_EXPORT NamedConnections {
  public:
-  // Adds the names of both files; a file that is not there adds nothing. False when one could not be read:
-  // errorString() then tells why, and the others count.
-  bool readAll();
-  bool read(QIODevice& device);
-  QString errorString() const { return m_error; }
-
+  // Adds the names of both files; a file that is not there adds nothing. Tells of each that could not be read
+  // its path and the reason.
+  QStringList readAll();
   bool contains(const QString& encodedName) const;
 
  private:
+  // False, with the reason, when the device cannot be read or holds too much.
+  bool read(QIODevice& device, QString& error);
+
   QSet<QString> m_names;  // encoded
-  QString m_error;
 };

@@ -24,8 +24,22 @@ namespace {
 const QString kResourceKind = QStringLiteral("transformer");
 
 constexpr long kNewerBuild = 370745;
+constexpr long kLoadedAlready = 370748;
+
+bool isAnyVersion(int version) {
+  return version == ITransformerMgr::NEWEST_VERSION || version == ITransformerMgr::OLDEST_VERSION;
+}
+
+bool concerns(const TransformerMgr::IgnoredTransformer& ignored, const QString& name, int version) {
+  return ignored.name == name && (isAnyVersion(version) || ignored.version == version);
+}
 
 }  // namespace
+
+QString TransformerMgr::IgnoredTransformer::reason() const {
+  return isDuplicate ? TransformResString(kLoadedAlready, {name, QString::number(version), path, keptPath})
+                     : TransformResString(kNewerBuild, {name, QString::number(version), path});
+}
 
 ITransformerMgr::~ITransformerMgr() = default;
 
@@ -68,9 +82,7 @@ void TransformerMgr::loadTransformers(IORXSession* session) {
   if (session) {
     m_exceptions->readFromHome();
   }
-  if (!m_connections->readAll()) {
-    m_errors.append(m_connections->errorString());
-  }
+  m_errors += m_connections->readAll();
   loadFolders(
       std::make_shared<const CatalogueEntry::Load>(CatalogueEntry::Load{session, this, QORXLanguage()}));
   m_loaded = true;
@@ -84,7 +96,8 @@ void TransformerMgr::loadFolders(const std::shared_ptr<const CatalogueEntry::Loa
   DefinitionLoader loader(m_prototypes, *m_categories, *m_exceptions, load, [this](const QString& path) {
     loadCustomTransformer(path, NEWEST_VERSION, false);
   });
-  for (const QString& folder : ORX_resourceDirectories(kResourceKind)) {
+  for (const QString& folder :
+       ORX_resourceDirectories(kResourceKind) + ORX_unreadableResourceDirectories(kResourceKind)) {
     loader.loadFolder(folder);
   }
   m_errors += loader.errors();
@@ -200,12 +213,13 @@ std::unique_ptr<TransformerCfg> TransformerMgr::makeTransformer(const QString& n
     if (copy)
       copy->setRequestedAlias(name);
   }
-  if (!copy && isTransformerIgnored(name, version)) {
-    const auto refused = std::find_if(
-        m_ignored.begin(), m_ignored.end(),
-        [&](const IgnoredTransformer& ignored) { return ignored.name == name && !ignored.isDuplicate; });
+  if (!copy) {
+    const auto refused =
+        std::find_if(m_ignored.begin(), m_ignored.end(), [&](const IgnoredTransformer& ignored) {
+          return !ignored.isDuplicate && concerns(ignored, name, version);
+        });
     if (refused != m_ignored.end())
-      m_refusal = TransformResString(kNewerBuild, {name, QString::number(refused->version), refused->path});
+      m_refusal = refused->reason();
   }
   return copy;
 }
@@ -215,10 +229,9 @@ TransformerCfg* TransformerMgr::getTransformer(const QString& name, int version)
 }
 
 bool TransformerMgr::transformerExists(const QString& name, int version) const {
-  const bool anyVersion = version == NEWEST_VERSION || version == OLDEST_VERSION;
   QSet<QString> followed;
   for (QString asked = name;; asked = m_prototypes.nameOfAlias(asked)) {
-    if (anyVersion ? m_prototypes.contains(asked) : m_prototypes.find(asked, version) != nullptr) {
+    if (isAnyVersion(version) ? m_prototypes.contains(asked) : m_prototypes.find(asked, version) != nullptr) {
       return true;
     }
     if (followed.contains(asked) || !m_prototypes.isAlias(asked)) {
@@ -305,10 +318,8 @@ bool TransformerMgr::isTransformerIgnored(const IORXString& name, int version) c
 }
 
 bool TransformerMgr::isTransformerIgnored(const QString& name, int version) const {
-  const bool anyVersion = version == NEWEST_VERSION || version == OLDEST_VERSION;
-  return std::any_of(m_ignored.begin(), m_ignored.end(), [&](const IgnoredTransformer& ignored) {
-    return ignored.name == name && (anyVersion || ignored.version == version);
-  });
+  return std::any_of(m_ignored.begin(), m_ignored.end(),
+                     [&](const IgnoredTransformer& ignored) { return concerns(ignored, name, version); });
 }
 
 QString TransformerMgr::parameterNotSetDisplayString() const {

@@ -45,6 +45,9 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
     int version = 0;
     QString keptPath;          // of the file whose definition was kept; empty unless this is a duplicate
     bool isDuplicate = false;  // clear: the file needs a newer build
+
+    // For people, in the current language.
+    QString reason() const;
   };
 
   // What one version changed.
