@@ -11,6 +11,7 @@ void DefinitionOptions::declare(CLI::App& app) {
   app.add_option("--resources", m_resources,
                  "Folder with further definitions, behind all others (repeatable)")
       ->type_name("DIR")
+      ->check(CLI::ExistingDirectory)
       ->expected(1)
       ->allow_extra_args(false)
       ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
@@ -33,6 +34,17 @@ TransformerMgr& DefinitionOptions::load(Console& console) const {
     registry.loadTransformers(&session);
     for (const QString& error : registry.errors())
       console.fail(error);
+  }
+  return registry;
+}
+
+TransformerMgr& DefinitionOptions::loadCatalogue(Console& console) const {
+  TransformerMgr& registry = load(console);
+  for (const TransformerMgr::IgnoredTransformer& ignored : registry.ignoredTransformers())
+    console.fail(ignored.reason());
+  if (registry.transformerNames().isEmpty()) {
+    console.fail(QStringLiteral("no transformers were found in any of: %1")
+                     .arg(ORX_resourcePlaces(QStringLiteral("transformer")).join(QLatin1String(", "))));
   }
   return registry;
 }

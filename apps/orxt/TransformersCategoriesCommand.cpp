@@ -26,7 +26,7 @@ void TransformersCategoriesCommand::declare(CLI::App& app) {
 }
 
 ExitStatus TransformersCategoriesCommand::run(Console& console) {
-  const TransformerMgr& registry = m_definitions.load(console);
+  const TransformerMgr& registry = m_definitions.loadCatalogue(console);
   QStringList categories = registry.getCategories();
   std::sort(categories.begin(), categories.end(), [&](const QString& left, const QString& right) {
     return SearchText::folded(registry.getLocalizedCategoryName(left)) <

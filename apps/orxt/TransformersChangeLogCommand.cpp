@@ -53,7 +53,7 @@ void TransformersChangeLogCommand::declare(CLI::App& app) {
 }
 
 ExitStatus TransformersChangeLogCommand::run(Console& console) {
-  TransformerMgr& registry = m_definitions.load(console);
+  TransformerMgr& registry = m_definitions.loadCatalogue(console);
   const QString asked = QString::fromStdString(m_name);
   QString error;
   const std::unique_ptr<TransformerCfg> newest =

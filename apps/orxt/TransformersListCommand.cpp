@@ -28,7 +28,7 @@ void TransformersListCommand::declare(CLI::App& app) {
 }
 
 ExitStatus TransformersListCommand::run(Console& console) {
-  TransformerMgr& registry = m_definitions.load(console);
+  TransformerMgr& registry = m_definitions.loadCatalogue(console);
   const QString category = QString::fromStdString(m_category);
   QStringList wanted;
   if (!category.isEmpty()) {

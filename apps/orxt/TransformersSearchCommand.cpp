@@ -54,7 +54,7 @@ ExitStatus TransformersSearchCommand::run(Console& console) {
     console.fail(QStringLiteral("give at least one word to search for"));
     return kExitUsage;
   }
-  const std::vector<CatalogueSearch::Hit> hits = search.find(m_definitions.load(console), m_all);
+  const std::vector<CatalogueSearch::Hit> hits = search.find(m_definitions.loadCatalogue(console), m_all);
   if (!search.unknownWords().isEmpty()) {
     console.fail(QStringLiteral("no transformer has '%1'; `orxt transformers categories` shows where to look")
                      .arg(search.unknownWords().join(QLatin1String("' or '"))));

@@ -15,6 +15,7 @@
 #include <QJsonObject>
 
 #include <memory>
+#include <optional>
 
 namespace {
 
@@ -39,6 +40,22 @@ constexpr long kOneOf = 370889;
 constexpr long kMadeOf = 370890;
 constexpr long kOptional = 370891;
 constexpr long kDefault = 370892;
+
+// The version that the words of the command line ask for; nothing when they ask for none.
+std::optional<int> wantedVersion(const std::string& text) {
+  if (text == "newest")
+    return ITransformerMgr::NEWEST_VERSION;
+  if (text == "oldest")
+    return ITransformerMgr::OLDEST_VERSION;
+  bool isNumber = false;
+  const int number = QString::fromStdString(text).toInt(&isNumber);
+  return isNumber && number >= 0 ? std::optional<int>(number) : std::nullopt;
+}
+
+std::string checkVersion(const std::string& text) {
+  return wantedVersion(text) ? std::string()
+                             : "'" + text + "' is neither a version number nor newest or oldest";
+}
 
 QJsonArray portsAsJson(const TransformerCfg& cfg, const QStringList& tags) {
   QJsonArray ports;
@@ -73,7 +90,7 @@ void TransformersShowCommand::declare(CLI::App& app) {
       ->required();
   app.add_option("--version", m_version, "Version number, newest or oldest")
       ->type_name("VERSION")
-      ->check(CLI::IsMember({"newest", "oldest"}) | CLI::NonNegativeNumber)
+      ->check(checkVersion)
       ->capture_default_str();
   CLI::Option* json = app.add_flag("--json", m_json, "As JSON");
   app.add_flag("--schema", m_schema, "A JSON Schema of the parameters instead")->excludes(json);
@@ -81,14 +98,11 @@ void TransformersShowCommand::declare(CLI::App& app) {
 }
 
 ExitStatus TransformersShowCommand::run(Console& console) {
-  TransformerMgr& registry = m_definitions.load(console);
+  TransformerMgr& registry = m_definitions.loadCatalogue(console);
   const QString name = QString::fromStdString(m_name);
-  const QString version = QString::fromStdString(m_version);
-  const int number = version == QLatin1String("newest")   ? ITransformerMgr::NEWEST_VERSION
-                     : version == QLatin1String("oldest") ? ITransformerMgr::OLDEST_VERSION
-                                                          : version.toInt();
   QString error;
-  const std::unique_ptr<TransformerCfg> cfg = findTransformer(registry, name, number, error);
+  const std::unique_ptr<TransformerCfg> cfg =
+      findTransformer(registry, name, *wantedVersion(m_version), error);
   if (!cfg) {
     console.fail(error);
     return kExitRefused;

@@ -101,6 +101,7 @@ TEST_F(Catalogue, SearchPutsTheBestHitsFirst) {
 }
 
 TEST_F(Catalogue, SaysWhereItDoesNotAnswerAsAsked) {
+  ASSERT_TRUE(QFile::copy(sample("custom/site_placer.ort"), m_folder.filePath("placer.ort")));
   const struct {
     QStringList arguments;
     int status;
@@ -125,6 +126,10 @@ TEST_F(Catalogue, SaysWhereItDoesNotAnswerAsAsked) {
       {{"changelog", "Quokka", "--from", "-1"}, 2, "--from"},
       {{"changelog", "Quokka", "-o", "no/such/page.html"}, 3, "no/such/page.html"},
       {{"show", "Quokka", "--schema", "--json"}, 2, "excludes"},
+      {{"show", "Quokka", "--version", "1.5"}, 2, "'1.5' is neither"},
+      {{"show", "Quokka", "--version", "4294967297"}, 2, "'4294967297' is neither"},
+      {{"list", "--resources", "no/such/folder"}, 2, "no/such/folder"},
+      {{"list", "--resources", sample("custom")}, 0, "placer.ort is passed over"},
   };
   for (const auto& test : cases) {
     const Outcome run = transformers(test.arguments);
@@ -133,6 +138,12 @@ TEST_F(Catalogue, SaysWhereItDoesNotAnswerAsAsked) {
     EXPECT_TRUE(*test.err ? run.err.contains(test.err) : run.err.isEmpty()) << line << "\n"
                                                                             << run.err.toStdString();
   }
+  const QByteArray home = qgetenv("ORX_HOME");
+  qputenv("ORX_HOME", m_folder.filePath("none").toUtf8());
+  qputenv("XDG_DATA_HOME", m_folder.path().toUtf8());
+  EXPECT_TRUE(orxt({"transformers", "list"}).err.contains("none/transformers"));
+  home.isNull() ? qunsetenv("ORX_HOME") : qputenv("ORX_HOME", home);
+  qunsetenv("XDG_DATA_HOME");
 }
 
 TEST_F(Catalogue, CategoriesInTheLanguageAskedFor) {
