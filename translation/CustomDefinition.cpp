@@ -19,6 +19,7 @@
 #include <translation/CustomDefinition.h>
 #include <translation/FlowNames.h>
 #include <translation/FlowOrder.h>
+#include <translation/InnerNames.h>
 #include <translation/InstanceIdentity.h>
 #include <translation/MFDeviceBuffer.h>
 #include <translation/RouteStatement.h>
@@ -87,6 +88,7 @@ bool CustomDefinition::arrange(Diagnostics& diagnostics) {
   m_isArranged = nameFault.isEmpty() && order(diagnostics);
   if (!m_isArranged)
     return false;
+  nameFlows(diagnostics);
   for (const SubDocNetworkObjXformer* node : m_order)
     makePart(*node);
   for (Part& part : m_parts)
@@ -193,6 +195,38 @@ bool CustomDefinition::order(Diagnostics& diagnostics) {
   return flow.cycles.empty();
 }
 
+// Ports and what stands in custom transformers further in have fixed names; the others keep clear of them.
+void CustomDefinition::nameFlows(Diagnostics& diagnostics) {
+  FlowNames names;
+  QSet<QString> ports;
+  for (const SubDocNetworkObj* node : m_network.nodes()) {
+    if (node->kind() != SubDocNetworkObj::Kind::Transformer)
+      ports.insert(node->name());
+    if (node->kind() == SubDocNetworkObj::Kind::Loop)
+      ports.insert(m_network.getLoopOutput());
+  }
+  for (const QString& port : qAsConst(ports))
+    names.claim(port);
+  const QString scope = m_network.getName() + QLatin1Char('/');
+  InnerNames inner;
+  for (const SubDocNetworkObjXformer* node : m_order) {
+    inner.add(node->name(), node->line(), *node->getTransformer());
+    for (const QString& taken : names.reserve(*node->getTransformer(), node->name()))
+      diagnostics.report(Rule::TakenName, node->line(), scope + node->name(), {taken});
+  }
+  for (const SubDocNetworkObjXformer* node : m_order) {
+    const auto [holder, line] = inner.findHolder(node->name());
+    if (!holder.isEmpty())
+      diagnostics.report(Rule::TakenName, line, scope + holder, {node->name()});
+  }
+  for (const SubDocNetworkObjXformer* node : m_order) {
+    for (const auto& [port, links] : node->consumers()) {
+      if (!links.empty())
+        m_flows[node].insert(port, names.claim(outputFlowName(*node->getTransformer(), node->name(), port)));
+    }
+  }
+}
+
 void CustomDefinition::makePart(const SubDocNetworkObjXformer& node) {
   Part part;
   part.node = &node;
@@ -214,7 +248,7 @@ QString CustomDefinition::flowFrom(const SubDocNetworkObj& node, const QString& 
   // What enters by an input, and what a loop point sends back, arrives under the port's inner name.
   if (!transformer)
     return innerName(node.name());
-  return outputFlowName(*transformer->getTransformer(), innerName(node.name()), port);
+  return innerName(m_flows.value(&node).value(port));
 }
 
 void CustomDefinition::connect(Part& part) const {

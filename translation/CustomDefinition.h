@@ -33,7 +33,7 @@ class ORX_EXPORT CustomDefinition {
 
   const ExternalDocNetwork& network() const { return m_network; }
 
-  // Orders and connects the copies. False when they feed each other in a circle, or the name cannot be
+  // Orders and connects the copies. False when they feed each other in a circle, or a name cannot be
   // written.
   bool arrange(Diagnostics& diagnostics);
   // The four below: call after arrange() answered true. Whether a statement names the attributes that reach
@@ -63,6 +63,7 @@ class ORX_EXPORT CustomDefinition {
   };
 
   bool order(Diagnostics& diagnostics);
+  void nameFlows(Diagnostics& diagnostics);
   void makePart(const SubDocNetworkObjXformer& node);
   void connect(Part& part) const;
   void check(const Part& part, Diagnostics& diagnostics) const;
@@ -80,6 +81,7 @@ class ORX_EXPORT CustomDefinition {
   std::unique_ptr<Listener> m_listener;
   std::vector<const SubDocNetworkObjXformer*> m_order;
   std::vector<Part> m_parts;
+  QHash<const SubDocNetworkObj*, QHash<QString, QString>> m_flows;  // of outputs that are connected, by port
   bool m_isArranged = false;
   QByteArray m_body;
 };

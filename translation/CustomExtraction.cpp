@@ -2,6 +2,7 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/workspace/DocumentCopy.h>
 #include <transform/workspace/TransformerRecords.h>
@@ -53,9 +54,14 @@ bool CustomExtraction::prepare(const QString& name, int version, Diagnostics& di
   findParts(name);
   findWorkspaceParameters();
   SubDocumentLibrary library(m_reader, &m_source);
-  const ExternalDocNetwork* network = library.network(name);
+  ExternalDocNetwork* network = library.network(name);
   if (!network || !makeDefinition(library, diagnostics))
     return false;
+  const QString fault = findPrefixFault(*network);
+  if (!fault.isEmpty()) {
+    diagnostics.reportText(Rule::Nesting, m_reader.GetDocumentLine(name), name, fault);
+    return false;
+  }
   const int stored = version > 0 ? version : network->getVersion();
   addFields(*network, stored);
   return makeDocument(name, stored, diagnostics);

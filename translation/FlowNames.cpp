@@ -7,6 +7,22 @@ QString outputFlowName(const TransformerCfg& cfg, const QString& identifier, con
   return isCustomTransformer(&cfg) ? name + QLatin1String("_OUT") : name;
 }
 
+QStringList FlowNames::reserve(const TransformerCfg& cfg, const QString& identifier) {
+  QStringList taken;
+  if (!isCustomTransformer(&cfg))
+    return taken;
+  QStringList inputs;
+  QStringList outputs;
+  cfg.getInputTags(inputs);
+  cfg.getOutputTags(outputs);
+  for (const QString& tag : inputs + outputs) {
+    const QString wanted = identifier + QLatin1Char('_') + tag;
+    if (claim(wanted) != wanted)
+      taken.append(wanted);
+  }
+  return taken;
+}
+
 QString FlowNames::claim(const QString& wanted) {
   auto taken = m_lastSuffix.find(wanted);
   if (taken == m_lastSuffix.end()) {

@@ -6,6 +6,7 @@
 
 #include <QHash>
 #include <QString>
+#include <QStringList>
 
 class TransformerCfg;
 
@@ -17,6 +18,9 @@ class ORX_EXPORT FlowNames {
  public:
   // `wanted` itself, or with "_2", "_3" and so on behind when it is taken.
   QString claim(const QString& wanted);
+  // Claims the names that the ports of a custom transformer have inside; they cannot be others. Those that
+  // were taken already are the answer. Does nothing for other transformers.
+  QStringList reserve(const TransformerCfg& cfg, const QString& identifier);
 
  private:
   QHash<QString, int> m_lastSuffix;  // every name given out, with the last suffix tried behind it

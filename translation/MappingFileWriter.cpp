@@ -10,6 +10,7 @@
 #include <transform/text/TextHelpers.h>
 #include <translation/FlowNames.h>
 #include <translation/FlowOrder.h>
+#include <translation/InnerNames.h>
 #include <translation/MappingFileWriter.h>
 #include <translation/ProgramVersion.h>
 #include <translation/RouteStatement.h>
@@ -102,10 +103,7 @@ void MappingFileWriter::nameFlows() {
   // What a writer takes keeps the writer's own name, and the inner names of custom transformers are fixed, so
   // those come first.
   claimTypes(WorkspaceNode::Kind::Writer);
-  for (int node = 0; node < count; ++node) {
-    if (isCustomTransformer(m_workspace.nodes[at(node)].cfg.get()))
-      reserveInnerNames(m_workspace.nodes[at(node)], names);
-  }
+  reserveInnerNames(names);
   claimTypes(WorkspaceNode::Kind::Reader);
   for (int node = 0; node < count; ++node) {
     const WorkspaceNode& place = m_workspace.nodes[at(node)];
@@ -122,15 +120,19 @@ void MappingFileWriter::nameFlows() {
   }
 }
 
-void MappingFileWriter::reserveInnerNames(const WorkspaceNode& node, FlowNames& names) {
-  QStringList inputs;
-  QStringList outputs;
-  node.cfg->getInputTags(inputs);
-  node.cfg->getOutputTags(outputs);
-  for (const QString& tag : inputs + outputs) {
-    const QString wanted = node.name + QLatin1Char('_') + tag;
-    if (names.claim(wanted) != wanted)
-      m_diagnostics.report(Rule::TakenName, node.line, node.name, {wanted});
+void MappingFileWriter::reserveInnerNames(FlowNames& names) {
+  InnerNames inner;
+  for (const WorkspaceNode& node : m_workspace.nodes) {
+    if (!node.isTransformer())
+      continue;
+    inner.add(node.name, node.line, *node.cfg);
+    for (const QString& taken : names.reserve(*node.cfg, node.name))
+      m_diagnostics.report(Rule::TakenName, node.line, node.name, {taken});
+  }
+  for (const WorkspaceNode& node : m_workspace.nodes) {
+    const auto holder = node.isTransformer() ? inner.findHolder(node.name) : std::pair<QString, int>();
+    if (!holder.first.isEmpty())
+      m_diagnostics.report(Rule::TakenName, holder.second, holder.first, {node.name});
   }
 }
 
@@ -230,6 +232,7 @@ void MappingFileWriter::check() {
     if (parameter.isOverridden)
       checkParameter(parameter, parameter.overridingValue);
   }
+  QSet<const CompoundTransformerNetwork*> checked;
   QSet<const ConfiguredDefinition*> sound;  // whose template needs no second look
   for (const WorkspaceNode& node : m_workspace.nodes) {
     checkText(node.name, node.name, node.line, node.name);
@@ -247,8 +250,13 @@ void MappingFileWriter::check() {
     const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(node.cfg.get());
     const QHash<QString, QString> faults =
         custom ? custom->findUnwritableParameters() : node.cfg->findUnwritableValues();
-    if (custom && !custom->instantiationFault().isEmpty())
-      m_diagnostics.reportText(Rule::Nesting, node.line, node.name, custom->instantiationFault());
+    QString nestingFault = custom ? custom->instantiationFault() : QString();
+    if (custom && nestingFault.isEmpty() && !checked.contains(custom->getNetwork())) {
+      checked.insert(custom->getNetwork());
+      nestingFault = findPrefixFault(*custom->getNetwork());
+    }
+    if (!nestingFault.isEmpty())
+      m_diagnostics.reportText(Rule::Nesting, node.line, node.name, nestingFault);
     for (const QString& parameter : node.cfg->getParameters()) {
       const auto fault = faults.constFind(parameter);
       if (fault != faults.constEnd())

@@ -30,7 +30,7 @@ class ORX_EXPORT MappingFileWriter {
 
  private:
   bool order();
-  void reserveInnerNames(const WorkspaceNode& node, FlowNames& names);
+  void reserveInnerNames(FlowNames& names);
   void nameFlows();
   void connect();
   void pushAttributes();

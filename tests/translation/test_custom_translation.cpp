@@ -193,24 +193,63 @@ TEST(CustomTranslation, NestsUpTo64Deep) {
   }
 }
 
-TEST(CustomTranslation, NothingStandsInsideItself) {
+TEST(CustomTranslation, NothingStandsInsideItselfOrUnderItsOwnMacro) {
   const struct {
-    QStringList inside;  // what stands in A, B and C
+    QStringList names;
+    QStringList inside;  // what stands in each
     const char* way;
   } cases[] = {
-      {{"A", "", ""}, "A > A"},
-      {{"B", "A", ""}, "A > B > A"},
-      {{"B", "C", "B"}, "B > C > B"},
+      {{"A", "B", "C"}, {"A", "", ""}, "A > A"},
+      {{"A", "B", "C"}, {"B", "A", ""}, "A > B > A"},
+      {{"A", "B", "C"}, {"B", "C", "B"}, "B > C > B"},
+      {{"A B", "B", "A_B"}, {"B", "A_B", ""}, "A_B_WORKSPACE_NAME"},
   };
   for (const auto& test : cases) {
     SmallWorkspace workspace;
-    workspace.transformer(3, kInstance, {"SUB_DOC_NAME", "A", "XFORMER_NAME", "Outer"});
+    workspace.transformer(3, kInstance, {"SUB_DOC_NAME", test.names.first(), "XFORMER_NAME", "Outer"});
     for (int i = 0; i < 3; ++i)
-      addLevel(workspace, QString("ABC").mid(i, 1), test.inside.at(i), 1);
+      addLevel(workspace, test.names.at(i), test.inside.at(i), 1);
     const Outcome outcome = translate(workspace);
     EXPECT_EQ(outcome.result, TranslationResult::Refused) << test.way;
     ASSERT_EQ(outcome.texts.size(), 1) << test.way;
     EXPECT_TRUE(outcome.texts.first().contains(test.way)) << outcome.texts.first().toStdString();
+  }
+}
+
+// --- names ----------------------------------------------------------------------------------------
+
+TEST(CustomTranslation, FlowsAndNodesInsideKeepApart) {
+  const struct {
+    const char* promise;
+    QString input;   // of Outer, in which stand V and the instance I of Inner, which has X inside
+    QString second;  // a node beside V
+    QString beside;  // a node beside O, the instance of Outer
+    QStringList diagnostics;
+    QString flow;  // from V
+  } cases[] = {
+      {"nothing in the way", "IN", "W", "O2_V", {}, "V_OUTPUT"},
+      {"a port is called like an output", "V_OUTPUT", "W", "P", {}, "V_OUTPUT_2"},
+      {"a port is called like that of an instance", "I_IN", "W", "P", {"taken-name Outer/I"}, ""},
+      {"a node is called like one further in", "IN", "I_X", "P", {"taken-name Outer/I"}, ""},
+      {"in the main document too", "IN", "W", "O_V", {"taken-name O"}, ""},
+      {"at any depth", "IN", "W", "O_I_X", {"taken-name O"}, ""},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.reader(1, "A").transformer(3, kInstance, {"SUB_DOC_NAME", "Outer", "XFORMER_NAME", "O"});
+    workspace.transformer(4, "Copy", {"XFORMER_NAME", test.beside}).link(1, "fo 0", 3, "fi 0");
+    workspace.beginCustom("Outer").port(1, test.input, "true").port(2, "OUT", "false");
+    workspace.transformer(3, "Copy", {"XFORMER_NAME", "V"}).link(1, "fo 0", 3, "fi 0");
+    workspace.transformer(4, "Copy", {"XFORMER_NAME", test.second}).link(3, "fo 0", 4, "fi 0");
+    workspace.transformer(5, kInstance, {"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "I"}).endCustom();
+    workspace.beginCustom("Inner").port(1, "IN", "true").transformer(3, "Copy", {"XFORMER_NAME", "X"});
+    const Outcome outcome = translate(workspace.endCustom());
+    EXPECT_EQ(outcome.diagnostics, test.diagnostics) << test.promise;
+    if (!test.diagnostics.isEmpty())
+      continue;
+    const QString flow = QString("FEATURE_TYPE \"$(Outer_WORKSPACE_NAME)_%1\" ").arg(test.flow);
+    EXPECT_EQ(outcome.text.count("OUTPUT " + flow), 1) << test.promise << outcome.text.toStdString();
+    EXPECT_EQ(outcome.text.count("INPUT INPUT " + flow), 1) << test.promise << outcome.text.toStdString();
   }
 }
 

@@ -19,6 +19,7 @@ constexpr long kBadPromptLine = 370796;
 constexpr long kUnmetDependency = 370797;
 constexpr long kUpgraded = 370798;
 
+constexpr long kSamePrefix = 370839;
 constexpr long kContainsItself = 370840;
 constexpr long kNestedTooDeep = 370841;
 constexpr long kNoFileOfItsOwn = 370842;

@@ -184,7 +184,7 @@ void ExternalTransformerNetwork::loadBody() {
                               before, behind);
   }
   m_library = std::make_unique<SubDocumentLibrary>(reader, m_manager);
-  build(reader, bodyName(reader, getName()), *m_library);
+  m_library->build(*this, bodyName(reader, getName()));
   m_library->forgetReader();
   for (const ExternalDocNetwork* inner : m_library->networks()) {
     for (const NetworkProblem& problem : inner->problems())

@@ -126,3 +126,25 @@ QString findNestingFault(CompoundTransformerNetwork& root) {
   }
   return QString();
 }
+
+// An instance sets the prefix macro for everything behind it: what the outer one still has to say would be
+// said in the name of the inner one.
+QString findPrefixFault(CompoundTransformerNetwork& root) {
+  const std::vector<CompoundTransformerNetwork*> networks = nestedNetworks(root);
+  QHash<QString, int> users;
+  for (const CompoundTransformerNetwork* network : networks)
+    ++users[makePrefixMacro(network->getName())];
+  if (users.size() == static_cast<int>(networks.size()))
+    return QString();
+  for (CompoundTransformerNetwork* outer : networks) {
+    const QString prefix = makePrefixMacro(outer->getName());
+    if (users.value(prefix) == 1)
+      continue;
+    for (const CompoundTransformerNetwork* inner : nestedNetworks(*outer)) {
+      if (inner != outer && makePrefixMacro(inner->getName()) == prefix) {
+        return TransformResString(custom_messages::kSamePrefix, {outer->getName(), inner->getName(), prefix});
+      }
+    }
+  }
+  return QString();
+}

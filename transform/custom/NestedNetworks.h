@@ -29,3 +29,6 @@ ORX_EXPORT QString findNameFault(const QString& name);
 // Why instances of the network cannot be written: it stands inside itself, or custom transformers stand in
 // it deeper than 64 levels. A message for the user; empty when all is well.
 ORX_EXPORT QString findNestingFault(CompoundTransformerNetwork& root);
+// Why the inside of one cannot be told from that of another inside it: the names of both give the same prefix
+// macro. A message for the user; empty when all is well.
+ORX_EXPORT QString findPrefixFault(CompoundTransformerNetwork& root);

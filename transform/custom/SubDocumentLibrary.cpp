@@ -52,6 +52,15 @@ SubDocumentLibrary::Entry* SubDocumentLibrary::find(const QString& name) {
   return entry.get();
 }
 
+void SubDocumentLibrary::build(ExternalDocNetwork& network, const QString& name) {
+  const bool isSubDocument = holds(name);
+  if (isSubDocument)
+    m_open.append(name);
+  network.build(*m_reader, name, *this);
+  if (isSubDocument)
+    m_open.removeLast();
+}
+
 const DefinitionDirectory* SubDocumentLibrary::definitionDirectory() const {
   return m_others ? m_others->definitionDirectory() : nullptr;
 }

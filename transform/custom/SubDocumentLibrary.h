@@ -33,6 +33,9 @@ class ORX_EXPORT SubDocumentLibrary : public TransformerSource {
   bool holds(const QString& name) const { return m_entries.contains(name); }
   // Null for a name that the document does not have, or when it is being built. Owned by the library.
   ExternalDocNetwork* network(const QString& name);
+  // Builds a network of another owner from the document called `name`, so that whatever stands inside knows
+  // that it stands in there.
+  void build(ExternalDocNetwork& network, const QString& name);
   // Those that were asked for, each behind the ones that stand inside it.
   const std::vector<ExternalDocNetwork*>& networks() const { return m_inOrder; }
   // The reader is not used any more: only what was built so far is known.

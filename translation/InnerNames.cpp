@@ -1,0 +1,73 @@
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/NestedNetworks.h>
+#include <translation/InnerNames.h>
+
+#include <vector>
+
+namespace {
+
+// Calls for each of the custom transformers that `name` begins with, "_" behind, and for what is left.
+template <class Call>
+void eachBeginning(const QString& name, const std::set<int>& lengths,
+                   const QHash<QString, InnerNames::Holder>& customTransformers, const Call& call) {
+  for (const int length : lengths) {
+    if (length + 1 >= name.size())
+      return;
+    if (name.at(length) != QLatin1Char('_'))
+      continue;
+    const auto found = customTransformers.constFind(name.left(length));
+    if (found != customTransformers.constEnd())
+      call(*found, name.left(length), name.mid(length + 1));
+  }
+}
+
+}  // namespace
+
+void InnerNames::add(const QString& name, int line, const TransformerCfg& cfg) {
+  m_names.insert(name);
+  const CompoundTransformerNetwork* network = networkOf(&cfg);
+  if (!network)
+    return;
+  m_customTransformers.insert(name, {network, line});
+  m_lengths.insert(name.size());
+}
+
+std::pair<QString, int> InnerNames::findHolder(const QString& name) const {
+  std::pair<QString, int> holder;
+  eachBeginning(name, m_lengths, m_customTransformers,
+                [&](const Holder& custom, const QString& outer, const QString& rest) {
+                  if (holder.first.isEmpty() && holds(custom.network, rest))
+                    holder = {outer, custom.line};
+                });
+  return holder;
+}
+
+bool InnerNames::holds(const CompoundTransformerNetwork* network, const QString& rest) {
+  using Place = QPair<const CompoundTransformerNetwork*, QString>;
+  QHash<const CompoundTransformerNetwork*, InnerNames> known;
+  std::vector<Place> open{{network, rest}};
+  QSet<Place> seen{open.front()};
+  while (!open.empty()) {
+    const Place place = open.back();
+    open.pop_back();
+    if (!known.contains(place.first)) {
+      InnerNames names;
+      for (const TransformerCfg* cfg : place.first->getTransformers())
+        names.add(cfg->getIdentifier(), 0, *cfg);
+      known.insert(place.first, names);
+    }
+    const InnerNames& names = known[place.first];
+    if (names.m_names.contains(place.second))
+      return true;
+    eachBeginning(place.second, names.m_lengths, names.m_customTransformers,
+                  [&](const Holder& inner, const QString&, const QString& further) {
+                    const Place next(inner.network, further);
+                    if (seen.contains(next))
+                      return;
+                    seen.insert(next);
+                    open.push_back(next);
+                  });
+  }
+  return false;
+}

@@ -1,0 +1,33 @@
+// The names of transformers that stand side by side, and those that their insides are written under: what
+// stands as "V" inside the custom transformer "O" is written as "O_V".
+#pragma once
+
+#include <QHash>
+#include <QSet>
+#include <QString>
+
+#include <set>
+#include <utility>
+
+class CompoundTransformerNetwork;
+class TransformerCfg;
+
+class InnerNames {
+ public:
+  struct Holder {
+    const CompoundTransformerNetwork* network = nullptr;
+    int line = 0;
+  };
+
+  void add(const QString& name, int line, const TransformerCfg& cfg);
+  // The name of the custom transformer with something inside that is written as `name`, and its line; empty
+  // when there is none.
+  std::pair<QString, int> findHolder(const QString& name) const;
+
+ private:
+  static bool holds(const CompoundTransformerNetwork* network, const QString& rest);
+
+  QSet<QString> m_names;
+  QHash<QString, Holder> m_customTransformers;
+  std::set<int> m_lengths;  // of their names
+};
