@@ -52,8 +52,7 @@ void FlowChecks::report(Diagnostics& diagnostics) const {
   }
 }
 
-void FlowChecks::reportInputs(const WorkspaceNode& node, const QSet<QString>& fed,
-                              Diagnostics& diagnostics) const {
+void FlowChecks::reportInputs(const WorkspaceNode& node, const QSet<QString>& fed, Diagnostics& diagnostics) {
   if (!node.isTransformer()) {
     if (fed.isEmpty())
       diagnostics.report(Rule::UnfedWriter, node.line, node.name);
@@ -68,7 +67,7 @@ void FlowChecks::reportInputs(const WorkspaceNode& node, const QSet<QString>& fe
 }
 
 void FlowChecks::reportOutputs(const WorkspaceNode& node, const QSet<QString>& taken,
-                               Diagnostics& diagnostics) const {
+                               Diagnostics& diagnostics) {
   if (!node.isTransformer()) {
     if (taken.isEmpty())
       diagnostics.report(Rule::UnusedReader, node.line, node.name);

@@ -23,8 +23,8 @@ class FlowChecks {
 
  private:
   void findUnknownFlows();
-  void reportInputs(const WorkspaceNode& node, const QSet<QString>& fed, Diagnostics& diagnostics) const;
-  void reportOutputs(const WorkspaceNode& node, const QSet<QString>& taken, Diagnostics& diagnostics) const;
+  static void reportInputs(const WorkspaceNode& node, const QSet<QString>& fed, Diagnostics& diagnostics);
+  static void reportOutputs(const WorkspaceNode& node, const QSet<QString>& taken, Diagnostics& diagnostics);
 
   const Workspace& m_workspace;
   std::vector<QSet<QString>> m_fed;    // per node: inputs that a link leads to

@@ -43,11 +43,8 @@ const QStringList& characterNames() {
 
 MappingFileFunctions::MappingFileFunctions(const MappingFileStatement& statement,
                                            const std::vector<MappingFileReference>& references,
-                                           MappingFileScripts& scripts, MappingFileReport& report)
-    : m_statement(statement),
-      m_text(blankReferences(statement.text, references)),
-      m_scripts(scripts),
-      m_report(report) {}
+                                           MappingFileReport& report)
+    : m_statement(statement), m_text(blankReferences(statement.text, references)), m_report(report) {}
 
 int MappingFileFunctions::find(QChar c, int begin, int end) const {
   for (int i = begin; i < end; ++i) {
@@ -103,7 +100,7 @@ void MappingFileFunctions::check(const MappingFileWord& word) {
 void MappingFileFunctions::checkCall(const QStringRef& name, int begin, int end) {
   const int inside = begin + name.size() + 2;
   if (name == kTcl) {
-    m_scripts.checkTcl(m_statement, inside, end - 1, m_report);
+    MappingFileScripts::checkTcl(m_statement, inside, end - 1, m_report);
   } else if (name == kValue) {
     if (m_text.midRef(inside, end - 1 - inside).trimmed().isEmpty())
       reportCall(begin, end, "@Value(ATTRIBUTE)");

@@ -6,7 +6,6 @@
 #include <vector>
 
 class MappingFileReport;
-class MappingFileScripts;
 struct MappingFileReference;
 struct MappingFileStatement;
 struct MappingFileWord;
@@ -15,8 +14,7 @@ class MappingFileFunctions {
  public:
   // None is owned. `references` are those of the statement; they stand for any text.
   MappingFileFunctions(const MappingFileStatement& statement,
-                       const std::vector<MappingFileReference>& references, MappingFileScripts& scripts,
-                       MappingFileReport& report);
+                       const std::vector<MappingFileReference>& references, MappingFileReport& report);
 
   // Whatever stands in the word.
   void check(const MappingFileWord& word);
@@ -37,6 +35,5 @@ class MappingFileFunctions {
 
   const MappingFileStatement& m_statement;
   const QString m_text;  // with letters in the place of references
-  MappingFileScripts& m_scripts;
   MappingFileReport& m_report;
 };

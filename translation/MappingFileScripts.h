@@ -13,7 +13,7 @@ struct MappingFileStatement;
 class MappingFileScripts {
  public:
   // The part of a statement; references to macros count as words.
-  void checkTcl(const MappingFileStatement& statement, int begin, int end, MappingFileReport& report);
+  static void checkTcl(const MappingFileStatement& statement, int begin, int end, MappingFileReport& report);
 
   // The lines of a block, one after the other.
   void beginBlock(bool isPython);

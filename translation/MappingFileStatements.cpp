@@ -63,7 +63,7 @@ void MappingFileStatements::check(const MappingFileStatement& statement) {
   endScript();
   m_hasStatements = m_hasStatements || block() < 0;
   const std::vector<MappingFileReference> references = mappingFileReferences(statement.text);
-  MappingFileFunctions functions(statement, references, m_scripts, m_report);
+  MappingFileFunctions functions(statement, references, m_report);
   MappingFileWords words(statement.text);
   MappingFileWord keyword;
   if (!words.next(keyword))
@@ -233,7 +233,7 @@ void MappingFileStatements::checkScript(Part& part, int begin, int end) {
       m_macros.need(reference.name(part.statement.text), part.statement.lineAt(reference.begin),
                     useOf(Use::Now), block());
   }
-  m_scripts.checkTcl(part.statement, begin, end, m_report);
+  MappingFileScripts::checkTcl(part.statement, begin, end, m_report);
 }
 
 void MappingFileStatements::addScriptLine(const MappingFileStatement& line) {

@@ -100,7 +100,7 @@ void ValueChecks::checkReferences(const TransformerCfg& cfg, const TransformerSt
       const QString nearest = nearestName(name, names);
       if (!nearest.isEmpty())
         text += QLatin1Char(' ') + TransformResString(kSuggestion, {nearest, name});
-      const QString prompt = cfg.getParameterPrompt(given.parmName);
+      const QString& prompt = cfg.getParameterPrompt(given.parmName);
       m_diagnostics.reportParameter(
           Rule::UnknownReference, given.line, title, given.parmName,
           (prompt.isEmpty() ? given.parmName : prompt) + QLatin1String(": ") + text);

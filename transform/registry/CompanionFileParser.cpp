@@ -53,8 +53,8 @@ void CompanionFileParser::read(DefinitionLines& lines) {
       m_strayLines.push_back({line, number});
       continue;
     }
-    for (DefinitionLine& text : texts) {
-      (m_entries.back().*block).append(std::move(text.text));
+    for (const DefinitionLine& text : texts) {
+      (m_entries.back().*block).append(text.text);
     }
   }
   m_isSoundUtf8 = lines.isSoundUtf8();

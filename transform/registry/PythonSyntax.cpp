@@ -53,7 +53,7 @@ bool PythonSyntax::check(const QStringList& scripts) {
               QString::fromUtf8(python.readAllStandardError()).trimmed().section(QLatin1Char('\n'), -1);
     return false;
   }
-  for (const QJsonValue& value : answer.array()) {
+  for (const auto& value : answer.array()) {
     const QJsonArray fault = value.toArray();
     m_faults.push_back({fault.at(0).toInt(), fault.at(1).toInt(), fault.at(2).toString()});
   }
