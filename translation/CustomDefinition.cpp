@@ -283,7 +283,13 @@ void CustomDefinition::check(const Part& part, Diagnostics& diagnostics) const {
   const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(part.cfg.get());
   const QHash<QString, QString> faults =
       custom ? custom->findUnwritableParameters() : part.cfg->findUnwritableValues();
+  const QHash<QString, QString> replaced = InnerNames::findReplacedParameters(
+      part.node->name(), *part.node->getTransformer(),
+      [this](const QString& name) { return m_network.hasParameter(name); });
   for (const QString& parameter : part.cfg->getParameters()) {
+    if (replaced.contains(parameter))
+      diagnostics.report(Rule::UnwritableValue, part.node->line(), title(part),
+                         {parameter, replaced.value(parameter)});
     const auto fault = faults.constFind(parameter);
     if (fault != faults.constEnd())
       diagnostics.report(Rule::UnwritableValue, part.node->line(), title(part), {parameter, fault.value()});

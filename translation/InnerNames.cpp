@@ -1,6 +1,9 @@
+#include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/text/MFBuffer.h>
+#include <transform/text/MessageStrings.h>
 #include <translation/InnerNames.h>
 
 #include <vector>
@@ -22,7 +25,25 @@ void eachBeginning(const QString& name, const std::set<int>& lengths,
   }
 }
 
+constexpr long kReplacesParameter = 370875;
+
 }  // namespace
+
+QHash<QString, QString> InnerNames::findReplacedParameters(
+    const QString& name, const TransformerCfg& cfg, const std::function<bool(const QString&)>& isAround) {
+  QHash<QString, QString> messages;
+  const CompoundTransformerNetwork* network = networkOf(&cfg);
+  // A loop hands the values over without macros.
+  if (!network || network->blockedLooping())
+    return messages;
+  for (const QString& parameter : cfg.getParameters()) {
+    const QString around = name + QLatin1Char('_') + parameter;
+    if (isAround(around) && MFBuffer::withOrdinaryMacros(cfg.getParameterValue(parameter)) !=
+                                kMacroOpen + around + QLatin1Char(')'))
+      messages.insert(parameter, TransformResString(kReplacesParameter, around));
+  }
+  return messages;
+}
 
 void InnerNames::add(const QString& name, int line, const TransformerCfg& cfg) {
   m_names.insert(name);

@@ -6,6 +6,7 @@
 #include <QSet>
 #include <QString>
 
+#include <functional>
 #include <set>
 #include <utility>
 
@@ -14,6 +15,12 @@ class TransformerCfg;
 
 class InnerNames {
  public:
+  // Why parameters of an instance called `name` cannot be written: what stands as "P" in "O" has the macro
+  // "O_P", which may belong to a parameter around the instance. One message per parameter; none where the
+  // instance takes that one's value over.
+  static QHash<QString, QString> findReplacedParameters(const QString& name, const TransformerCfg& cfg,
+                                                        const std::function<bool(const QString&)>& isAround);
+
   struct Holder {
     const CompoundTransformerNetwork* network = nullptr;
     int line = 0;

@@ -257,7 +257,12 @@ void MappingFileWriter::check() {
     }
     if (!nestingFault.isEmpty())
       m_diagnostics.reportText(Rule::Nesting, node.line, node.name, nestingFault);
+    const QHash<QString, QString> replaced = InnerNames::findReplacedParameters(
+        node.name, *node.cfg, [this](const QString& name) { return m_workspace.parameters.find(name); });
     for (const QString& parameter : node.cfg->getParameters()) {
+      if (replaced.contains(parameter))
+        m_diagnostics.report(Rule::UnwritableValue, node.line, node.name,
+                             {parameter, replaced.value(parameter)});
       const auto fault = faults.constFind(parameter);
       if (fault != faults.constEnd())
         m_diagnostics.report(Rule::UnwritableValue, node.line, node.name, {parameter, fault.value()});

@@ -253,4 +253,27 @@ TEST(CustomTranslation, FlowsAndNodesInsideKeepApart) {
   }
 }
 
+TEST(CustomTranslation, InstancesLeaveTheParametersAroundThemAsTheyAre) {
+  const struct {
+    const char* around;  // a parameter of the workspace and of Outer, in which stands I
+    const char* value;   // of P in the instance O and in I
+    QStringList diagnostics;
+  } cases[] = {
+      {"P", "1", {}},        {"O_P", "1", {"unwritable-value O"}},
+      {"O_P", "$(O_P)", {}}, {"I_P", "$(I_P)0", {"unwritable-value Outer/I"}},
+      {"I_P", "$[I_P]", {}},
+  };
+  for (const auto& test : cases) {
+    const QString line = QString("GUI TEXT %1 Around").arg(test.around);
+    SmallWorkspace workspace;
+    workspace.parameter(line, "2").transformer(
+        3, kInstance, {"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "O", "P", test.value});
+    workspace.transformer(4, kInstance, {"SUB_DOC_NAME", "Outer", "XFORMER_NAME", "Other"});
+    workspace.beginCustom("Outer").parameter(line, "3");
+    workspace.transformer(5, kInstance, {"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "I", "P", test.value});
+    workspace.endCustom().beginCustom("Inner").parameter("GUI TEXT P P", "4").endCustom();
+    EXPECT_EQ(translate(workspace).diagnostics, test.diagnostics) << test.around << test.value;
+  }
+}
+
 }  // namespace
