@@ -72,6 +72,8 @@ void TransformerMgr::reset() {
   *m_categories = CategoryTexts();
   m_errors.clear();
   m_ignored.clear();
+  m_notedRefusals.clear();
+  m_refusal.clear();
   *m_exceptions = ExceptionList();
   *m_connections = NamedConnections();
   m_members.clear();
@@ -137,12 +139,11 @@ void TransformerMgr::loadCustomTransformer(const QString& path, int version, boo
 }
 
 void TransformerMgr::noteIgnored(const IgnoredTransformer& ignored) {
-  const bool isNoted = std::any_of(m_ignored.begin(), m_ignored.end(), [&](const IgnoredTransformer& other) {
-    return other.path == ignored.path && other.name == ignored.name && other.version == ignored.version &&
-           other.isDuplicate == ignored.isDuplicate;
-  });
-  if (!isNoted)
+  const QStringList key{ignored.path, ignored.name, QString::number(ignored.version), ignored.keptPath};
+  if (!m_notedRefusals.contains(key)) {
+    m_notedRefusals.insert(key);
     m_ignored.push_back(ignored);
+  }
 }
 
 void TransformerMgr::loadOnDemand(const QString& name, int version) {

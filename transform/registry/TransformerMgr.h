@@ -21,6 +21,7 @@
 #include <transform/registry/PrototypeTable.h>
 
 #include <QList>
+#include <QSet>
 #include <QString>
 #include <QStringList>
 
@@ -155,6 +156,7 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   QStringList m_errors;
   bool m_loaded = false;
   std::list<IgnoredTransformer> m_ignored;
+  QSet<QStringList> m_notedRefusals;
   QString m_refusal;
   std::unique_ptr<ExceptionList> m_exceptions;
   std::unique_ptr<NamedConnections> m_connections;
