@@ -1,8 +1,15 @@
 #include <apps/orxt/Console.h>
+#include <apps/orxt/PrintableText.h>
 
 #include <cstdio>
 #include <cstdlib>
 #include <unistd.h>
+
+namespace {
+
+constexpr int kLongestMessage = 12000;  // two long paths have room
+
+}  // namespace
 
 Console::Console()
     : m_colours(isatty(STDERR_FILENO) != 0 && std::getenv("NO_COLOR") == nullptr),
@@ -25,7 +32,7 @@ void Console::writeError(const QString& text) {
 }
 
 void Console::fail(const QString& text) {
-  writeError(QLatin1String("orxt: ") + text);
+  writeError(QLatin1String("orxt: ") + withoutControls(text, kLongestMessage));
 }
 
 void Console::failFile(const QString& file, const QString& reason) {

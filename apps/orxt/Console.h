@@ -13,7 +13,7 @@ class Console {
   // Results; false when standard output takes no more.
   bool print(const QString& text);
   bool flush();
-  // "orxt: text" on standard error.
+  // "orxt: text" on standard error, whatever a stranger's name in it holds.
   void fail(const QString& text);
   // A file that could not be read or written: "FILE: error: reason".
   void failFile(const QString& file, const QString& reason);

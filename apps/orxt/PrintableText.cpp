@@ -1,5 +1,25 @@
 #include <apps/orxt/PrintableText.h>
 
+#include <algorithm>
+
+namespace {
+
+bool isControl(QChar character) {
+  return character.category() == QChar::Other_Control || character.category() == QChar::Other_Format;
+}
+
+}  // namespace
+
+QString withoutControls(const QString& text, int limit) {
+  QString result = text.left(limit);
+  if (text.size() > limit) {
+    result.chop(1 + (text.at(limit - 2).isHighSurrogate() ? 1 : 0));
+    result += QChar(0x2026);
+  }
+  std::replace_if(result.begin(), result.end(), isControl, QChar(QChar::ReplacementCharacter));
+  return result;
+}
+
 QString onOneLine(const QString& text, int limit) {
   QString line;
   bool blankWaits = false;
@@ -8,7 +28,7 @@ QString onOneLine(const QString& text, int limit) {
       blankWaits = !line.isEmpty();
       continue;
     }
-    if (character.category() == QChar::Other_Control || character.category() == QChar::Other_Format)
+    if (isControl(character))
       continue;
     if (line.size() + (blankWaits ? 2 : 1) > limit) {
       line.truncate(limit - 1);

@@ -113,6 +113,8 @@ TEST_F(Catalogue, SaysWhereItDoesNotAnswerAsAsked) {
       {{"search", "smiles", "quokka"}, 0, ""},
       {{"search", " "}, 2, "word"},
       {{"list", "--category", "Rodent"}, 1, "did you mean 'Rodents'?"},
+      {{"show", "a\x1b[31mb"}, 1, "a\xef\xbf\xbd[31mb"},
+      {{"show", QString(50000, 'y')}, 1, "yyy\xe2\x80\xa6"},
       {{"show", "QuokaFeder"}, 1, "did you mean 'QuokkaFeeder'?"},
       {{"show", "Geometriepufer", "--lang", "de"}, 1, "did you mean 'Geometriepuffer'?"},
       {{"show", "Geometriepuffer", "--lang", "de"}, 0, ""},
@@ -135,6 +137,7 @@ TEST_F(Catalogue, SaysWhereItDoesNotAnswerAsAsked) {
     const Outcome run = transformers(test.arguments);
     const std::string line = test.arguments.join(' ').toStdString();
     EXPECT_EQ(run.status, test.status) << line;
+    EXPECT_LT(run.err.size(), 20000) << line;
     EXPECT_TRUE(*test.err ? run.err.contains(test.err) : run.err.isEmpty()) << line << "\n"
                                                                             << run.err.toStdString();
   }
