@@ -118,6 +118,7 @@ const Parallel kParallels[] = {
     {"off", "", "NO_PARALLELISM", "", nullptr, false},
     {"a level", "", "MODERATE", "", "", true},
     {"reference that says no", "", "$(PAR)", "NO_PARALLELISM", "", false},
+    {"reference that shows no", "", "$(PAR)", "None", "", false},
     {"reference that says yes", "", "$(PAR)", "EXTREME", "", true},
     {"reference without a value", "", "$(PAR)", "<Unused>", "", false},
     {"group-by alone", "id", "NO_PARALLELISM", "", "id", true},
@@ -134,7 +135,9 @@ TEST(Instance, ResolvesParallelSettings) {
     settings.groupBy = QLatin1String(row.groupBy);
     settings.parallelism = QLatin1String(row.parallelism);
     network.setParallelSettings(settings);
-    network.publish(QStringLiteral("GUI OPTIONAL TEXT PAR Level"), QLatin1String(row.value));
+    network.publish(
+        QStringLiteral("GUI OPTIONAL LOOKUP_CHOICE PAR None,NO_PARALLELISM%Extreme,EXTREME Level"),
+        QLatin1String(row.value));
     network.doneAdding(true);
     CompoundTransformerCfg instance(&network);
     const QString groups = QStringLiteral("ORX_PROCESS_GROUP_BY");

@@ -9,14 +9,16 @@
 
 namespace {
 
-// A reference to a parameter of the instance gives its value; a parameter without a value is no setting.
+// A reference to a parameter of the instance gives its value, the stored side of a choice; a parameter
+// without a value is no setting.
 QString resolve(const QString& setting, const TransformerCfg& instance) {
   if (!isParameterReference(setting))
     return setting;
   const QString name = setting.mid(kMacroOpen.size(), setting.size() - kMacroOpen.size() - 1);
-  if (!instance.hasParameter(name))
+  const TransformParamCfg* record = instance.getParameterByMacroName(name);
+  if (!record)
     return setting;
-  const QString value = instance.getParameterValue(name);
+  const QString value = record->choices().toStored(instance.getParameterValue(name));
   return value == kUnusedValue ? QString() : value;
 }
 

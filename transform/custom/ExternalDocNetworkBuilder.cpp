@@ -212,6 +212,10 @@ bool ExternalDocNetwork::Builder::findPort(const LinkStruct& record, const Place
   tag = isOutput ? place.ports.output(number, name) : place.ports.input(number, name);
   if (!tag.isNull())
     return true;
+  // Left where it is, with its ports, because it stands too deep: the nesting is what will be refused.
+  const CompoundTransformerNetwork* inner = networkOf(place.cfg);
+  if (inner && !inner->isBodyLoaded())
+    return false;
   QStringList tags;
   if (isOutput)
     place.cfg->getOutputTags(tags);
