@@ -1,10 +1,6 @@
 #include <transform/text/MessageStrings.h>
 #include <translation/RuleSettings.h>
 
-#include <QStringList>
-
-#include <algorithm>
-
 namespace {
 
 constexpr long kNoRule = 370873;
@@ -12,25 +8,26 @@ constexpr long kNoSeverity = 370874;
 
 }  // namespace
 
-bool RuleSettings::set(const QString& setting, QString& reason) {
+bool RuleSettings::set(const QString& setting, QString& reason, const QStringList& furtherRules) {
   const int equals = setting.indexOf(QLatin1Char('='));
   const QString name = setting.left(equals);
-  const DiagnosticRule* rule = equals < 0 ? nullptr : findDiagnosticRule(name);
-  if (!rule) {
+  if (equals < 0 || !(findDiagnosticRule(name) || furtherRules.contains(name))) {
     QStringList names;
     for (const DiagnosticRule& known : diagnosticRules())
       names.append(known.name);
+    names += furtherRules;
+    names.removeDuplicates();
     reason = TransformResString(kNoRule, {setting, names.join(QLatin1String(", "))});
     return false;
   }
   const QString level = setting.mid(equals + 1);
   if (level == QLatin1String("off")) {
-    m_severities.insert(static_cast<int>(rule->rule), std::nullopt);
+    m_severities.insert(name, std::nullopt);
     return true;
   }
   for (const Severity severity : {Severity::Error, Severity::Warning, Severity::Hint}) {
     if (level == severityName(severity)) {
-      m_severities.insert(static_cast<int>(rule->rule), severity);
+      m_severities.insert(name, severity);
       return true;
     }
   }
@@ -38,18 +35,18 @@ bool RuleSettings::set(const QString& setting, QString& reason) {
   return false;
 }
 
-std::vector<Diagnostic> RuleSettings::apply(std::vector<Diagnostic> findings) const {
-  if (m_severities.isEmpty())
-    return findings;
-  const auto isOff = [this](const Diagnostic& finding) {
-    const auto setting = m_severities.constFind(static_cast<int>(finding.rule));
-    return setting != m_severities.constEnd() && !setting->has_value();
-  };
-  findings.erase(std::remove_if(findings.begin(), findings.end(), isOff), findings.end());
-  for (Diagnostic& finding : findings) {
-    const auto setting = m_severities.constFind(static_cast<int>(finding.rule));
-    if (setting != m_severities.constEnd())
-      finding.severity = **setting;
+std::optional<Severity> RuleSettings::severity(const QString& rule, Severity severity) const {
+  return m_severities.value(rule, severity);
+}
+
+std::vector<Diagnostic> RuleSettings::apply(const std::vector<Diagnostic>& findings) const {
+  std::vector<Diagnostic> left;
+  for (const Diagnostic& finding : findings) {
+    const std::optional<Severity> counted = severity(diagnosticRule(finding.rule).name, finding.severity);
+    if (!counted)
+      continue;
+    left.push_back(finding);
+    left.back().severity = *counted;
   }
-  return findings;
+  return left;
 }

@@ -1,5 +1,6 @@
 #include <apps/orxt/Console.h>
 #include <apps/orxt/LintCommand.h>
+#include <apps/orxt/SarifLog.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/files/InputFile.h>
@@ -25,6 +26,7 @@ constexpr CommandFacts kFacts = {"lint",
                                  "Check definition files and mapping files: grammar, references, scripts",
                                  "orxt lint resources/transformers samples\n"
                                  "orxt lint --json MyTransformer.ort\n"
+                                 "orxt lint --rule dropped-type=off --sarif samples >samples.sarif\n"
                                  "orxt generate parcels.orw | orxt lint -"};
 
 const QString kMappingFileSuffix = QStringLiteral(".mf");
@@ -54,6 +56,10 @@ bool isMappingFile(const QString& path, const QString& shownName) {
          !name.startsWith(QLatin1String("CategoryDefinitions")) && !isDefinitionFile(beginning);
 }
 
+Severity severityOf(bool isError) {
+  return isError ? Severity::Error : Severity::Warning;
+}
+
 }  // namespace
 
 LintCommand::LintCommand() : Command(kFacts) {}
@@ -64,12 +70,18 @@ void LintCommand::declare(CLI::App& app) {
   app.add_option("path", m_paths, "Definition files, mapping files, or folders of them; - is standard input")
       ->type_name("PATH")
       ->required();
-  app.add_flag("--json", m_json, "As JSON");
+  m_options.declare(app, "As JSON");
   m_definitionOptions.declare(app);
 }
 
 ExitStatus LintCommand::run(Console& console) {
   m_definitionOptions.setLanguage();
+  QStringList definitionRules;
+  for (const LintRule& rule : lintRules())
+    definitionRules.append(rule.name);
+  RuleSettings settings;
+  if (!m_options.readRules(settings, console, definitionRules))
+    return kExitUsage;
   m_definitions = std::make_unique<DefinitionLint>();
   bool isReadable = true;
   for (const std::string& text : m_paths) {
@@ -78,6 +90,7 @@ ExitStatus LintCommand::run(Console& console) {
     isReadable = isRead && isReadable;
   }
   takeDefinitionFindings();
+  applySettings(settings);
   show(console);
   if (!isReadable)
     return kExitFile;
@@ -108,8 +121,7 @@ bool LintCommand::checkFile(const QString& path, Console& console) {
   auto input = std::make_unique<InputFile>(path);
   const QString shownName = InputFile::shownName(path);
   if (!input->open()) {
-    console.failFile(shownName, input->errorString());
-    return false;
+    return failFile(shownName, input->errorString(), console);
   }
   const QString readable = input->path();
   if (isMappingFile(readable, shownName))
@@ -135,24 +147,52 @@ bool LintCommand::checkMappingFile(const QString& path, const QString& shownName
                           QString(diagnosticRule(finding.rule).name), finding.text});
   }
   if (!result.readError.isEmpty())
-    console.failFile(shownName, result.readError);
-  return result.readError.isEmpty();
+    return failFile(shownName, result.readError, console);
+  return true;
+}
+
+bool LintCommand::failFile(const QString& shownName, const QString& reason, Console& console) {
+  console.failFile(shownName, reason);
+  m_unreadable.emplace_back(shownName, reason);
+  return false;
 }
 
 void LintCommand::takeDefinitionFindings() {
   for (const LintFinding& finding : m_definitions->findings()) {
     m_findings.push_back({m_shownNames.value(finding.file, finding.file), finding.line,
-                          finding.isError ? Severity::Error : Severity::Warning, finding.rule, finding.text});
+                          severityOf(finding.isError), finding.rule, finding.text});
   }
   std::stable_sort(m_findings.begin(), m_findings.end(), [](const Finding& a, const Finding& b) {
     return std::tie(a.file, a.line) < std::tie(b.file, b.line);
   });
 }
 
+void LintCommand::applySettings(const RuleSettings& settings) {
+  std::vector<Finding> left;
+  for (Finding& finding : m_findings) {
+    if (const std::optional<Severity> counted = settings.severity(finding.rule, finding.severity)) {
+      finding.severity = *counted;
+      left.push_back(std::move(finding));
+    }
+  }
+  m_findings = std::move(left);
+}
+
 void LintCommand::show(Console& console) const {
+  if (m_options.isSarif()) {
+    SarifLog log;
+    for (const LintRule& rule : lintRules())
+      log.addRule(rule.name, severityOf(rule.isError));
+    for (const Finding& finding : m_findings)
+      log.addFinding(finding.file, finding.line, finding.severity, finding.rule, QString(), finding.text);
+    for (const auto& [file, reason] : m_unreadable)
+      log.addUnreadable(file, reason);
+    console.print(log.text());
+    return;
+  }
   QJsonArray list;
   for (const Finding& finding : m_findings) {
-    if (m_json) {
+    if (m_options.isJson()) {
       list.append(QJsonObject{{QStringLiteral("file"), finding.file},
                               {QStringLiteral("line"), finding.line},
                               {QStringLiteral("severity"), severityName(finding.severity)},
@@ -163,6 +203,6 @@ void LintCommand::show(Console& console) const {
                           finding.text + QLatin1String(" [") + finding.rule + QLatin1Char(']'));
     }
   }
-  if (m_json)
+  if (m_options.isJson())
     console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
 }

@@ -2,6 +2,7 @@
 
 #include <apps/orxt/Command.h>
 #include <apps/orxt/DefinitionOptions.h>
+#include <apps/orxt/FindingOptions.h>
 #include <translation/Diagnostics.h>
 
 #include <QHash>
@@ -10,6 +11,7 @@
 
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 class DefinitionLint;
@@ -35,15 +37,18 @@ class LintCommand : public Command {
   bool checkFolder(const QString& folder, Console& console);
   bool checkFile(const QString& path, Console& console);
   bool checkMappingFile(const QString& path, const QString& shownName, Console& console);
+  bool failFile(const QString& shownName, const QString& reason, Console& console);
   void takeDefinitionFindings();
+  void applySettings(const RuleSettings& settings);
   void show(Console& console) const;
 
   std::vector<std::string> m_paths;
-  bool m_json = false;
+  FindingOptions m_options;
   DefinitionOptions m_definitionOptions;
   std::unique_ptr<DefinitionLint> m_definitions;
   std::vector<std::unique_ptr<InputFile>> m_copies;  // of streams that hold definitions
   QHash<QString, QString> m_shownNames;              // of those copies
   QSet<QString> m_checked;                           // mapping files, by their canonical paths
   std::vector<Finding> m_findings;
+  std::vector<std::pair<QString, QString>> m_unreadable;  // files, and why
 };

@@ -3,7 +3,7 @@
 #include <translation/ProgramVersion.h>
 
 #include <QFileInfo>
-#include <QJsonArray>
+#include <QJsonDocument>
 #include <QUrl>
 
 namespace {
@@ -23,22 +23,6 @@ QString fileUri(const QString& file) {
   return QString::fromLatin1(QUrl::toPercentEncoding(file, "/"));
 }
 
-QJsonArray ruleList() {
-  QJsonArray rules;
-  for (const DiagnosticRule& rule : diagnosticRules()) {
-    QJsonObject entry{{QStringLiteral("id"), QString(rule.name)},
-                      {QStringLiteral("shortDescription"),
-                       message(QString(rule.name).replace(QLatin1Char('-'), QLatin1Char(' ')))},
-                      {QStringLiteral("defaultConfiguration"),
-                       QJsonObject{{QStringLiteral("level"), level(rule.severity)}}}};
-    const QString text = rule.message == 0 ? QString() : TransformResString(rule.message);
-    if (!text.isEmpty())
-      entry.insert(QStringLiteral("fullDescription"), message(text));
-    rules.append(entry);
-  }
-  return rules;
-}
-
 QJsonObject physicalLocation(const QString& file, int line) {
   QJsonObject physical{
       {QStringLiteral("artifactLocation"), QJsonObject{{QStringLiteral("uri"), fileUri(file)}}}};
@@ -47,45 +31,62 @@ QJsonObject physicalLocation(const QString& file, int line) {
   return physical;
 }
 
-QJsonObject result(const Diagnostic& finding) {
-  QJsonObject location{{QStringLiteral("physicalLocation"), physicalLocation(finding.file, finding.line)}};
-  if (!finding.node.isEmpty())
-    location.insert(QStringLiteral("logicalLocations"),
-                    QJsonArray{QJsonObject{{QStringLiteral("name"), finding.node}}});
-  return {{QStringLiteral("ruleId"), QString(diagnosticRule(finding.rule).name)},
-          {QStringLiteral("ruleIndex"), static_cast<int>(finding.rule)},
-          {QStringLiteral("level"), level(finding.severity)},
-          {QStringLiteral("message"), message(textWithNode(finding))},
-          {QStringLiteral("locations"), QJsonArray{location}}};
-}
-
 }  // namespace
 
-QJsonObject sarifLog(const std::vector<ValidationReport>& reports) {
-  QJsonArray results;
-  QJsonArray notifications;
-  for (const ValidationReport& report : reports) {
-    for (const Diagnostic& finding : report.findings)
-      results.append(result(finding));
-    if (!report.isReadable()) {
-      notifications.append(QJsonObject{
-          {QStringLiteral("level"), QStringLiteral("error")},
-          {QStringLiteral("message"), message(report.readError)},
-          {QStringLiteral("locations"),
-           QJsonArray{QJsonObject{{QStringLiteral("physicalLocation"), physicalLocation(report.file, 0)}}}}});
-    }
-  }
+SarifLog::SarifLog() {
+  for (const DiagnosticRule& rule : diagnosticRules())
+    addRule(rule.name, rule.severity, rule.message == 0 ? QString() : TransformResString(rule.message));
+}
+
+void SarifLog::addRule(const QString& name, Severity severity, const QString& description) {
+  if (m_rulePlaces.contains(name))
+    return;
+  QJsonObject entry{
+      {QStringLiteral("id"), name},
+      {QStringLiteral("shortDescription"),
+       message(QString(name).replace(QLatin1Char('-'), QLatin1Char(' ')))},
+      {QStringLiteral("defaultConfiguration"), QJsonObject{{QStringLiteral("level"), level(severity)}}}};
+  if (!description.isEmpty())
+    entry.insert(QStringLiteral("fullDescription"), message(description));
+  m_rulePlaces.insert(name, m_rules.size());
+  m_rules.append(entry);
+}
+
+void SarifLog::addFinding(const QString& file, int line, Severity severity, const QString& rule,
+                          const QString& node, const QString& text) {
+  QJsonObject location{{QStringLiteral("physicalLocation"), physicalLocation(file, line)}};
+  if (!node.isEmpty())
+    location.insert(QStringLiteral("logicalLocations"),
+                    QJsonArray{QJsonObject{{QStringLiteral("name"), node}}});
+  m_results.append(QJsonObject{{QStringLiteral("ruleId"), rule},
+                               {QStringLiteral("ruleIndex"), m_rulePlaces.value(rule, -1)},
+                               {QStringLiteral("level"), level(severity)},
+                               {QStringLiteral("message"), message(text)},
+                               {QStringLiteral("locations"), QJsonArray{location}}});
+}
+
+void SarifLog::addUnreadable(const QString& file, const QString& reason) {
+  m_notifications.append(QJsonObject{
+      {QStringLiteral("level"), QStringLiteral("error")},
+      {QStringLiteral("message"), message(reason)},
+      {QStringLiteral("locations"),
+       QJsonArray{QJsonObject{{QStringLiteral("physicalLocation"), physicalLocation(file, 0)}}}}});
+}
+
+QString SarifLog::text() const {
   const QJsonObject driver{{QStringLiteral("name"), QStringLiteral("orxt")},
                            {QStringLiteral("version"), programVersion().section(QLatin1Char(' '), -1)},
-                           {QStringLiteral("rules"), ruleList()}};
+                           {QStringLiteral("rules"), m_rules}};
   const QJsonObject run{
       {QStringLiteral("tool"), QJsonObject{{QStringLiteral("driver"), driver}}},
       {QStringLiteral("columnKind"), QStringLiteral("utf16CodeUnits")},
       {QStringLiteral("invocations"),
-       QJsonArray{QJsonObject{{QStringLiteral("executionSuccessful"), notifications.isEmpty()},
-                              {QStringLiteral("toolExecutionNotifications"), notifications}}}},
-      {QStringLiteral("results"), results}};
-  return {{QStringLiteral("$schema"), QStringLiteral("https://json.schemastore.org/sarif-2.1.0.json")},
-          {QStringLiteral("version"), QStringLiteral("2.1.0")},
-          {QStringLiteral("runs"), QJsonArray{run}}};
+       QJsonArray{QJsonObject{{QStringLiteral("executionSuccessful"), m_notifications.isEmpty()},
+                              {QStringLiteral("toolExecutionNotifications"), m_notifications}}}},
+      {QStringLiteral("results"), m_results}};
+  const QJsonObject log{
+      {QStringLiteral("$schema"), QStringLiteral("https://json.schemastore.org/sarif-2.1.0.json")},
+      {QStringLiteral("version"), QStringLiteral("2.1.0")},
+      {QStringLiteral("runs"), QJsonArray{run}}};
+  return QString::fromUtf8(QJsonDocument(log).toJson());
 }

@@ -39,6 +39,18 @@ QJsonObject toJson(const ValidationReport& report) {
           {QStringLiteral("findings"), findings}};
 }
 
+QString sarif(const std::vector<ValidationReport>& reports) {
+  SarifLog log;
+  for (const ValidationReport& report : reports) {
+    for (const Diagnostic& finding : report.findings)
+      log.addFinding(finding.file, finding.line, finding.severity, diagnosticRule(finding.rule).name,
+                     finding.node, textWithNode(finding));
+    if (!report.isReadable())
+      log.addUnreadable(report.file, report.readError);
+  }
+  return log.text();
+}
+
 ExitStatus exitStatus(const std::vector<ValidationReport>& reports) {
   ExitStatus status = kExitDone;
   for (const ValidationReport& report : reports) {
@@ -58,27 +70,16 @@ void ValidateCommand::declare(CLI::App& app) {
   app.add_option("workspace", m_workspaces, "Workspace files; - is standard input")
       ->type_name("WORKSPACE")
       ->required();
-  CLI::Option* json = app.add_flag("--json", m_json, "As JSON: a list with one object per workspace");
-  app.add_flag("--sarif", m_sarif, "As a SARIF 2.1.0 log")->excludes(json);
+  m_options.declare(app, "As JSON: a list with one object per workspace");
   app.add_flag("-q,--quiet", m_quiet, "Errors only, and no summary");
-  app.add_option("--rule", m_rules, "Turns a rule off, or gives it another severity (repeatable)")
-      ->type_name("NAME=off|warning|error|hint")
-      ->expected(1)
-      ->allow_extra_args(false)
-      ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
   m_definitions.declare(app);
 }
 
 ExitStatus ValidateCommand::run(Console& console) {
   m_definitions.setLanguage();
   RuleSettings settings;
-  for (const std::string& rule : m_rules) {
-    QString reason;
-    if (!settings.set(QString::fromStdString(rule), reason)) {
-      console.fail(QLatin1String("--rule: ") + reason);
-      return kExitUsage;
-    }
-  }
+  if (!m_options.readRules(settings, console))
+    return kExitUsage;
   TransformerMgr& registry = m_definitions.load(console);
   std::vector<ValidationReport> reports;
   for (const std::string& workspace : m_workspaces) {
@@ -97,7 +98,7 @@ ExitStatus ValidateCommand::run(Console& console) {
 }
 
 void ValidateCommand::show(const ValidationReport& report, Console& console) const {
-  if (!m_json && !m_sarif) {
+  if (!m_options.isJson() && !m_options.isSarif()) {
     for (const Diagnostic& finding : report.findings)
       console.showFinding(
           finding.file, finding.line, finding.severity,
@@ -108,11 +109,11 @@ void ValidateCommand::show(const ValidationReport& report, Console& console) con
 }
 
 void ValidateCommand::summarize(const std::vector<ValidationReport>& reports, Console& console) const {
-  if (m_sarif) {
-    console.print(QString::fromUtf8(QJsonDocument(sarifLog(reports)).toJson()));
+  if (m_options.isSarif()) {
+    console.print(sarif(reports));
     return;
   }
-  if (m_json) {
+  if (m_options.isJson()) {
     QJsonArray list;
     for (const ValidationReport& report : reports)
       list.append(toJson(report));

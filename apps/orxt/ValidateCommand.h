@@ -2,6 +2,7 @@
 
 #include <apps/orxt/Command.h>
 #include <apps/orxt/DefinitionOptions.h>
+#include <apps/orxt/FindingOptions.h>
 #include <translation/WorkspaceValidation.h>
 
 #include <string>
@@ -18,9 +19,7 @@ class ValidateCommand : public Command {
   void summarize(const std::vector<ValidationReport>& reports, Console& console) const;
 
   std::vector<std::string> m_workspaces;
-  std::vector<std::string> m_rules;
-  bool m_json = false;
-  bool m_sarif = false;
+  FindingOptions m_options;
   bool m_quiet = false;
   DefinitionOptions m_definitions;
 };

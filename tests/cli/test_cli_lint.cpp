@@ -122,6 +122,13 @@ TEST(Lint, TellsTheKindOfAFileByNameAndContent) {
       {{"lint", "--lang", "de", "d.txt"}, 1, "", "Erwartet: MACRO NAME"},
       {{"lint", "d.txt", "missing.mf"}, 3, "", "missing.mf: error: "},
       {{"lint"}, 2, "", "path is required"},
+      {{"lint", "--rule", "bad-statement=off", "d.txt"}, 0, "", ""},
+      {{"lint", "--rule", "unknown-keyword=off", "e.txt"}, 0, "", "e.txt:1: warning: "},
+      {{"lint", "--rule", "unknown-keyword=hint", "--rule", "missing-text=off", "e.txt"},
+       0,
+       "",
+       "e.txt:2: hint: "},
+      {{"lint", "--rule", "unknown-word=off", "e.txt"}, 2, "", "unknown-word=off"},
   };
   for (const CommandCase& test : cases)
     expectOutcome(test, folder.path());
@@ -130,6 +137,28 @@ TEST(Lint, TellsTheKindOfAFileByNameAndContent) {
     EXPECT_EQ(run.status, 1);
     EXPECT_TRUE(run.err.startsWith("standard input:")) << run.err.toStdString();
   }
+}
+
+TEST(Lint, WritesSarif) {
+  const Outcome run = orxt({"lint", "--sarif", "--rule", "unfed-type=error", "flow.mf", "missing.mf",
+                            brokenFolder() + "/definitions/Dependent.ort"},
+                           brokenMappingFiles());
+  EXPECT_EQ(run.status, 3);
+  const QJsonValue log = QJsonDocument::fromJson(run.out.toUtf8()).object()["runs"].toArray().at(0);
+  QSet<QString> said;
+  for (const QJsonValue& result : log["results"].toArray()) {
+    EXPECT_EQ(log["tool"]["driver"]["rules"].toArray().at(result["ruleIndex"].toInt(-1))["id"],
+              result["ruleId"]);
+    const QJsonValue place = result["locations"].toArray().at(0)["physicalLocation"];
+    said.insert(QString("%1:%2 %3 %4")
+                    .arg(place["artifactLocation"]["uri"].toString().section('/', -1))
+                    .arg(place["region"]["startLine"].toInt())
+                    .arg(result["level"].toString(), result["ruleId"].toString()));
+  }
+  for (const char* expected : {"flow.mf:9 error unknown-factory", "flow.mf:13 error unfed-type",
+                               "flow.mf:14 note dropped-type", "Dependent.ort:2 warning missing-text"})
+    EXPECT_TRUE(said.contains(expected)) << expected;
+  EXPECT_FALSE(log["invocations"].toArray().at(0)["executionSuccessful"].toBool(true));
 }
 
 }  // namespace

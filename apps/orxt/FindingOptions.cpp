@@ -1,0 +1,26 @@
+#include <apps/orxt/Console.h>
+#include <apps/orxt/FindingOptions.h>
+
+#include <CLI/CLI.hpp>
+
+void FindingOptions::declare(CLI::App& app, const char* jsonHelp) {
+  CLI::Option* json = app.add_flag("--json", m_json, jsonHelp);
+  app.add_flag("--sarif", m_sarif, "As a SARIF 2.1.0 log")->excludes(json);
+  app.add_option("--rule", m_rules, "Turns a rule off, or gives it another severity (repeatable)")
+      ->type_name("NAME=off|warning|error|hint")
+      ->expected(1)
+      ->allow_extra_args(false)
+      ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+}
+
+bool FindingOptions::readRules(RuleSettings& settings, Console& console,
+                               const QStringList& furtherRules) const {
+  for (const std::string& rule : m_rules) {
+    QString reason;
+    if (!settings.set(QString::fromStdString(rule), reason, furtherRules)) {
+      console.fail(QLatin1String("--rule: ") + reason);
+      return false;
+    }
+  }
+  return true;
+}
