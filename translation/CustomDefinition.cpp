@@ -292,7 +292,8 @@ void CustomDefinition::check(const Part& part, Diagnostics& diagnostics) const {
                          {parameter, replaced.value(parameter)});
     const auto fault = faults.constFind(parameter);
     if (fault != faults.constEnd())
-      diagnostics.report(Rule::UnwritableValue, part.node->line(), title(part), {parameter, fault.value()});
+      diagnostics.reportUnwritable(part.node->parameterLines().of(parameter), title(part), parameter,
+                                   fault.value());
   }
 }
 

@@ -19,6 +19,12 @@ void Diagnostics::reportParameter(Rule rule, int line, const QString& node, cons
   m_all.back().parameter = parameter;
 }
 
+void Diagnostics::reportUnwritable(int line, const QString& node, const QString& parameter,
+                                   const QString& reason) {
+  report(Rule::UnwritableValue, line, node, {parameter, reason});
+  m_all.back().parameter = parameter;
+}
+
 void Diagnostics::reportIn(const QString& file, Rule rule, int line, const QString& node,
                            const QString& text) {
   const Severity severity = diagnosticRule(rule).severity;

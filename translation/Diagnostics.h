@@ -32,6 +32,8 @@ class ORX_EXPORT Diagnostics {
   // About one parameter of the node.
   void reportParameter(Rule rule, int line, const QString& node, const QString& parameter,
                        const QString& text);
+  // The parameter's value cannot be written, for the reason given.
+  void reportUnwritable(int line, const QString& node, const QString& parameter, const QString& reason);
   // About another file than the document itself.
   void reportIn(const QString& file, Rule rule, int line, const QString& node, const QString& text);
 

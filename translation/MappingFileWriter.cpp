@@ -221,8 +221,7 @@ void MappingFileWriter::checkParameter(const GlobalParameters::Parameter& parame
   else if (value.endsWith(QLatin1Char('\\')))
     reason = lookup_checks::kEndsInBackslash;
   if (reason != 0)
-    m_diagnostics.report(Rule::UnwritableValue, parameter.line, QString(),
-                         {parameter.name, TransformResString(reason)});
+    m_diagnostics.reportUnwritable(parameter.line, QString(), parameter.name, TransformResString(reason));
 }
 
 void MappingFileWriter::check() {
@@ -265,7 +264,8 @@ void MappingFileWriter::check() {
                              {parameter, replaced.value(parameter)});
       const auto fault = faults.constFind(parameter);
       if (fault != faults.constEnd())
-        m_diagnostics.report(Rule::UnwritableValue, node.line, node.name, {parameter, fault.value()});
+        m_diagnostics.reportUnwritable(node.parameterLines.of(parameter), node.name, parameter,
+                                       fault.value());
     }
   }
 }

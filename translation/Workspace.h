@@ -5,6 +5,7 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/workspace/ParameterLines.h>
 #include <translation/GlobalParameters.h>
 #include <translation/WorkspaceListener.h>
 
@@ -34,7 +35,8 @@ struct WorkspaceNode {
   // Transformers.
   std::unique_ptr<TransformerCfg> cfg;
   QHash<QString, QStringList> inputOrder;  // input tag to the flows that enter there, in order
-  QHash<QString, QStringList> exposed;     // output tag to the attributes that a user added there
+  ParameterLines parameterLines;
+  QHash<QString, QStringList> exposed;  // output tag to the attributes that a user added there
 
   // Whether a link at this end was left out: it, or the node at its other end, is disabled or at fault.
   bool lacksInputLink = false;

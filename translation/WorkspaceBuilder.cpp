@@ -235,6 +235,7 @@ TransformerPorts WorkspaceBuilder::applyRecord(const TransformerStruct& record, 
                            {nameWithFile(cfg), parameter.parmName});
     }
   }
+  node.parameterLines = ParameterLines(record);
   if (record.name.isEmpty())
     cfg.setIdentifier(node.name);
 

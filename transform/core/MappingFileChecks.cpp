@@ -15,6 +15,7 @@
 #include <transform/text/TextHelpers.h>
 
 #include <algorithm>
+#include <typeinfo>
 
 namespace {
 
@@ -93,9 +94,16 @@ bool MappingFileChecks::isMultiProcessSetting(const QString& name) const {
           name == kGroupsOrderedParameter);
 }
 
+// A class of its own writes the tables that the template leaves out, in statements behind it.
+bool MappingFileChecks::isWrittenByRows(const TransformParamCfg& record,
+                                        const CompiledTemplate* compiled) const {
+  return record.isTable() && compiled && typeid(m_cfg) != typeid(TransformerCfg) &&
+         compiled->slotOf(record.getName()) == CompiledTemplate::kNoSlot;
+}
+
 bool MappingFileChecks::isReached(const TransformParamCfg& record, const CompiledTemplate* compiled) const {
   // Without a template the values are written as macros.
-  return !compiled || m_bringsTokens || record.isMultiParameter() ||
+  return !compiled || m_bringsTokens || record.isMultiParameter() || isWrittenByRows(record, compiled) ||
          isMultiProcessSetting(record.getName()) ||
          compiled->slotOf(record.getName()) != CompiledTemplate::kNoSlot ||
          (record.getName() == kIdentifierParameter &&
@@ -117,8 +125,8 @@ long MappingFileChecks::refuse(const TransformParamCfg& record, const CompiledTe
   }
   NullBuffer buffer;
   const QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
-  // Each member stands in a place of its own.
-  const QStringList parts = record.isMultiParameter()
+  // Each member and each cell stands in a place of its own.
+  const QStringList parts = record.isMultiParameter() || isWrittenByRows(record, compiled)
                                 ? QORXSdfStringToList(value, record.members().separator())
                                 : QStringList(value);
   if (!std::all_of(parts.cbegin(), parts.cend(), isOneLine)) {

@@ -36,6 +36,7 @@ class MappingFileChecks {
   bool expandMacros(QString& text) const;
   long refuseChoices(const ChoiceList& choices) const;
   bool isMultiProcessSetting(const QString& name) const;
+  bool isWrittenByRows(const TransformParamCfg& record, const CompiledTemplate* compiled) const;
   bool isReached(const TransformParamCfg& record, const CompiledTemplate* compiled) const;
   bool growsWithoutEnd() const;
 

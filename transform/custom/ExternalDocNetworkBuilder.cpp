@@ -121,6 +121,7 @@ void ExternalDocNetwork::Builder::addTransformer(const TransformerStruct& record
     return;
   SubDocNetworkObjXformer* node = m_network.addTransformer(cfg.release(), {}, record.identifier);
   node->setLine(record.line);
+  node->setParameterLines(ParameterLines(record));
   node->setExposedAttributes(place.ports.exposedAttributes(record));
   m_network.m_transformerNames.insert(place.title);
 }

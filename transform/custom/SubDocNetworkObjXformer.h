@@ -2,6 +2,7 @@
 #pragma once
 
 #include <transform/custom/SubDocNetworkObj.h>
+#include <transform/workspace/ParameterLines.h>
 
 #include <memory>
 
@@ -22,6 +23,9 @@ class ORX_EXPORT SubDocNetworkObjXformer : public SubDocNetworkObj {
   // Attributes that a user added to what leaves an output, by output tag.
   const QHash<QString, QStringList>& exposedAttributes() const { return m_exposed; }
   void setExposedAttributes(const QHash<QString, QStringList>& attributes) { m_exposed = attributes; }
+  // In the file that the network was read from.
+  const ParameterLines& parameterLines() const { return m_parameterLines; }
+  void setParameterLines(ParameterLines lines) { m_parameterLines = std::move(lines); }
 
  private:
   // What reached a port at the last compute().
@@ -35,6 +39,7 @@ class ORX_EXPORT SubDocNetworkObjXformer : public SubDocNetworkObj {
   std::unique_ptr<TransformerCfg> m_cfg;
   QHash<QString, QStringList> m_inputAttributes;
   QHash<QString, QStringList> m_exposed;
+  ParameterLines m_parameterLines;
   std::vector<Inlet> m_inlets;
   QHash<QString, QStringList> m_arrivedByTag;  // what the configuration is given
 };
