@@ -1,5 +1,6 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/text/MessageStrings.h>
+#include <transform/workspace/ParameterLines.h>
 #include <transform/workspace/WorkspaceRecords.h>
 #include <translation/ReferencedNames.h>
 #include <translation/ValueChecks.h>
@@ -38,6 +39,16 @@ QString ValueChecks::nearestName(const QString& name, const QStringList& candida
   return known.nearest;
 }
 
+QString ValueChecks::suggestion(const QString& name, const QStringList& candidates) {
+  const QString nearest = nearestName(name, candidates);
+  return nearest.isEmpty() ? QString() : TransformResString(kSuggestion, {nearest, name});
+}
+
+QString ValueChecks::referenceText(const QString& name, const QStringList& names) {
+  const QString text = TransformResString(diagnosticRule(Rule::UnknownReference).message, name);
+  return (text + QLatin1Char(' ') + suggestion(name, names)).trimmed();
+}
+
 QString ValueChecks::missingText(const TransformerCfg& cfg, const QString& parameter) {
   QStringList missing;
   bool hasReferences = false;
@@ -51,59 +62,72 @@ QString ValueChecks::missingText(const TransformerCfg& cfg, const QString& param
       break;
     }
     quoted.append(QLatin1Char('\'') + name + QLatin1Char('\''));
-    const QString nearest = nearestName(name, arriving);
-    if (!nearest.isEmpty())
-      suggestions += QLatin1String(suggestions.isEmpty() ? ". " : " ") +
-                     TransformResString(kSuggestion, {nearest, name});
+    const QString suggested = suggestion(name, arriving);
+    if (!suggested.isEmpty())
+      suggestions += QLatin1String(suggestions.isEmpty() ? ". " : " ") + suggested;
   }
   return TransformResString(diagnosticRule(Rule::MissingAttribute).message, quoted.join(QLatin1Char(' '))) +
          suggestions;
 }
 
-void ValueChecks::checkValues(const TransformerCfg& cfg, const TransformerStruct& record,
-                              const QString& title, bool knowsWhatArrives) {
-  QHash<QString, int> lines;
-  for (const QString& parameter : cfg.getParameters()) {
-    QString text;
-    if (cfg.validateParameter(parameter, text))
+void ValueChecks::check(const Node& node, const Knows& knows, const QStringList& names) {
+  LooseReferences loose = looseReferences(node, knows);
+  reportRefusals(node, loose, names);
+  reportReferences(node, loose, names);
+}
+
+ValueChecks::LooseReferences ValueChecks::looseReferences(const Node& node, const Knows& knows) {
+  LooseReferences loose;
+  for (const XformParmStruct& given : node.record.parameters) {
+    if (!given.parmValue.contains(QLatin1Char('$')))
       continue;
-    if (lines.isEmpty()) {
-      for (const XformParmStruct& given : record.parameters)
-        lines.insert(given.parmName, given.line);
+    QStringList unknown;
+    for (const QString& name : ReferencedNames::inValue(given.parmValue)) {
+      if (!knows(name) && !name.startsWith(kInstanceNames) && !node.cfg.getParameterByMacroName(name))
+        unknown.append(name);
     }
+    loose.insert(given.parmName, unknown);
+  }
+  return loose;
+}
+
+void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names) {
+  for (const QString& parameter : node.cfg.getParameters()) {
+    QString text;
+    if (node.cfg.validateParameter(parameter, text))
+      continue;
     const Rule rule = ruleOf(text);
     if (rule == Rule::MissingAttribute) {
-      if (!knowsWhatArrives)
+      if (!node.knowsWhatArrives)
         continue;
-      text = missingText(cfg, parameter);
+      text = missingText(node.cfg, parameter);
     } else if (text.isEmpty()) {
       text = TransformResString(diagnosticRule(Rule::InvalidValue).message);
     }
-    QString prompt = cfg.getParameterPrompt(parameter);
+    for (const QString& name : loose.isEmpty() ? QStringList() : ReferencedNames::inValue(text)) {
+      // What the transformer itself says about the value need not be said again.
+      if (loose[parameter].removeOne(name))
+        text += QLatin1Char(' ') +
+                (rule == Rule::InvalidValue ? suggestion(name, names) : referenceText(name, names));
+    }
+    QString prompt = node.cfg.getParameterPrompt(parameter);
     if (prompt.isEmpty())
       prompt = parameter;
     if (!text.contains(QLatin1Char('\'') + prompt + QLatin1Char('\'')))
       text = prompt + QLatin1String(": ") + text;
-    m_diagnostics.reportParameter(rule, lines.value(parameter, record.line), title, parameter, text);
+    m_diagnostics.reportParameter(rule, node.lines.of(parameter), node.title, parameter, text.trimmed());
   }
 }
 
-void ValueChecks::checkReferences(const TransformerCfg& cfg, const TransformerStruct& record,
-                                  const QString& title, const Knows& knows, const QStringList& names) {
-  for (const XformParmStruct& given : record.parameters) {
-    if (!given.parmValue.contains(QLatin1Char('$')))
-      continue;
-    for (const QString& name : ReferencedNames::inValue(given.parmValue)) {
-      if (knows(name) || name.startsWith(kInstanceNames) || cfg.getParameterByMacroName(name))
-        continue;
-      QString text = TransformResString(diagnosticRule(Rule::UnknownReference).message, name);
-      const QString nearest = nearestName(name, names);
-      if (!nearest.isEmpty())
-        text += QLatin1Char(' ') + TransformResString(kSuggestion, {nearest, name});
-      const QString& prompt = cfg.getParameterPrompt(given.parmName);
+void ValueChecks::reportReferences(const Node& node, LooseReferences& loose, const QStringList& names) {
+  if (loose.isEmpty())
+    return;
+  for (const XformParmStruct& given : node.record.parameters) {
+    const QString& prompt = node.cfg.getParameterPrompt(given.parmName);
+    for (const QString& name : loose.take(given.parmName)) {
       m_diagnostics.reportParameter(
-          Rule::UnknownReference, given.line, title, given.parmName,
-          (prompt.isEmpty() ? given.parmName : prompt) + QLatin1String(": ") + text);
+          Rule::UnknownReference, node.lines.of(given.parmName), node.title, given.parmName,
+          (prompt.isEmpty() ? given.parmName : prompt) + QLatin1String(": ") + referenceText(name, names));
     }
   }
 }

@@ -12,6 +12,7 @@
 #include <functional>
 #include <vector>
 
+class ParameterLines;
 class TransformerCfg;
 struct TransformerStruct;
 
@@ -23,13 +24,16 @@ class ValueChecks {
   // Not owned.
   explicit ValueChecks(Diagnostics& diagnostics);
 
-  // `title` is how findings name the node; `record` is what the document says about it.
-  // `knowsWhatArrives`: whether attributes can be said to be missing.
-  void checkValues(const TransformerCfg& cfg, const TransformerStruct& record, const QString& title,
-                   bool knowsWhatArrives);
-  // References of the record's values to parameters that there are not. `names` are those to suggest.
-  void checkReferences(const TransformerCfg& cfg, const TransformerStruct& record, const QString& title,
-                       const Knows& knows, const QStringList& names);
+  struct Node {
+    const TransformerCfg& cfg;
+    const TransformerStruct& record;  // what the document says about it
+    const QString& title;             // how findings name it
+    const ParameterLines& lines;
+    bool knowsWhatArrives;  // whether attributes can be said to be missing
+  };
+
+  // `names` are those that references may be told to mean.
+  void check(const Node& node, const Knows& knows, const QStringList& names);
 
  private:
   // The fixed text around the argument of a message, by which a refusal's rule is told.
@@ -45,6 +49,16 @@ class ValueChecks {
     QString nearest;
   };
 
+  // By parameter: the names that its value refers to without there being any.
+  using LooseReferences = QHash<QString, QStringList>;
+
+  static LooseReferences looseReferences(const Node& node, const Knows& knows);
+  // A reference that a refusal shows is told with it, and taken out of `loose`.
+  void reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names);
+  void reportReferences(const Node& node, LooseReferences& loose, const QStringList& names);
+  QString referenceText(const QString& name, const QStringList& names);
+  // Empty when no name comes near.
+  QString suggestion(const QString& name, const QStringList& candidates);
   Rule ruleOf(const QString& message) const;
   QString nearestName(const QString& name, const QStringList& candidates);
   QString missingText(const TransformerCfg& cfg, const QString& parameter);

@@ -105,9 +105,9 @@ void Validation::checkTransformers(const Workspace& workspace, bool isConnected)
     const TransformerStruct* record = node.isTransformer() ? records.value(node.identifier) : nullptr;
     if (!record)
       continue;
-    m_values.checkValues(*node.cfg, *record, node.name,
-                         isConnected && flow.knowsWhatArrives(static_cast<int>(number)));
-    m_values.checkReferences(*node.cfg, *record, node.name, knows, m_parameterNames);
+    m_values.check({*node.cfg, *record, node.name, node.parameterLines,
+                    isConnected && flow.knowsWhatArrives(static_cast<int>(number))},
+                   knows, m_parameterNames);
     checkAge(*node.cfg, node.line, node.name);
   }
 }
@@ -126,8 +126,7 @@ void Validation::checkInside(const ExternalDocNetwork& network, const Workspace&
       continue;
     const TransformerCfg& cfg = *node->getTransformer();
     const QString title = network.getName() + QLatin1Char('/') + node->name();
-    m_values.checkValues(cfg, *record, title, /*knowsWhatArrives=*/false);
-    m_values.checkReferences(cfg, *record, title, knows, names);
+    m_values.check({cfg, *record, title, node->parameterLines(), /*knowsWhatArrives=*/false}, knows, names);
     checkAge(cfg, record->line, title);
   }
 }
