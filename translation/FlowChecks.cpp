@@ -1,10 +1,53 @@
 #include <transform/core/TransformerCfg.h>
+#include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/SubDocNetworkObjXformer.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/workspace/IXMLComponentReader.h>
 #include <translation/FlowChecks.h>
 
 namespace {
 
+constexpr long kUnfedOutputPort = 370876;
+constexpr long kUnusedInputPort = 370877;
+
 std::size_t at(int number) {
   return static_cast<std::size_t>(number);
+}
+
+void reportUnfed(const TransformerCfg& cfg, const QSet<QString>& fed, int line, const QString& title,
+                 Diagnostics& diagnostics) {
+  QStringList tags;
+  cfg.getInputTags(tags);
+  for (const QString& tag : tags) {
+    if (!fed.contains(tag) && tag != cfg.getHiddenInputTag())
+      diagnostics.report(Rule::UnfedInput, line, title, {tag});
+  }
+}
+
+void reportDropped(const TransformerCfg& cfg, const QSet<QString>& taken, int line, const QString& title,
+                   Diagnostics& diagnostics) {
+  QStringList tags;
+  cfg.getOutputTags(tags);
+  tags.removeAll(cfg.getHiddenOutputTag());
+  // Further outputs are often left alone on purpose (the rejected, the members of a group); the first is what
+  // the node is for.
+  if (tags.isEmpty() || taken.contains(tags.first()))
+    return;
+  QStringList dropped;
+  for (const QString& tag : tags) {
+    if (!taken.contains(tag))
+      dropped.append(tag);
+  }
+  diagnostics.report(Rule::DroppedOutput, line, title, {dropped.join(QLatin1String(", "))});
+}
+
+QSet<QString> connectedPorts(const SubDocNetworkObj::Ports& ports) {
+  QSet<QString> names;
+  for (const auto& [port, links] : ports) {
+    if (!links.empty())
+      names.insert(port);
+  }
+  return names;
 }
 
 }  // namespace
@@ -53,37 +96,54 @@ void FlowChecks::report(Diagnostics& diagnostics) const {
 }
 
 void FlowChecks::reportInputs(const WorkspaceNode& node, const QSet<QString>& fed, Diagnostics& diagnostics) {
-  if (!node.isTransformer()) {
-    if (fed.isEmpty())
-      diagnostics.report(Rule::UnfedWriter, node.line, node.name);
-    return;
-  }
-  QStringList tags;
-  node.cfg->getInputTags(tags);
-  for (const QString& tag : tags) {
-    if (!fed.contains(tag) && tag != node.cfg->getHiddenInputTag())
-      diagnostics.report(Rule::UnfedInput, node.line, node.name, {tag});
-  }
+  if (node.isTransformer())
+    reportUnfed(*node.cfg, fed, node.line, node.name, diagnostics);
+  else if (fed.isEmpty())
+    diagnostics.report(Rule::UnfedWriter, node.line, node.name);
 }
 
 void FlowChecks::reportOutputs(const WorkspaceNode& node, const QSet<QString>& taken,
                                Diagnostics& diagnostics) {
-  if (!node.isTransformer()) {
-    if (taken.isEmpty())
-      diagnostics.report(Rule::UnusedReader, node.line, node.name);
-    return;
+  if (node.isTransformer())
+    reportDropped(*node.cfg, taken, node.line, node.name, diagnostics);
+  else if (taken.isEmpty())
+    diagnostics.report(Rule::UnusedReader, node.line, node.name);
+}
+
+void reportFlowsInside(const ExternalDocNetwork& network, const IXMLComponentReader& reader,
+                       Diagnostics& diagnostics) {
+  QSet<int> faultyLines;
+  for (const NetworkProblem& problem : network.problems())
+    faultyLines.insert(problem.line);
+  QSet<const SubDocNetworkObj*> lacksInput;
+  QSet<const SubDocNetworkObj*> lacksOutput;
+  for (const LinkStruct& link : reader.GetFeatureTypeLinkList(network.getName())) {
+    const SubDocNetworkObj* source = network.nodeByNumber(link.sourceNode);
+    const SubDocNetworkObj* target = network.nodeByNumber(link.targetNode);
+    if (link.enabled && source && target && !faultyLines.contains(link.line))
+      continue;
+    lacksOutput.insert(source);
+    lacksInput.insert(target);
   }
-  QStringList tags;
-  node.cfg->getOutputTags(tags);
-  tags.removeAll(node.cfg->getHiddenOutputTag());
-  // Further outputs are often left alone on purpose (the rejected, the members of a group); the first is what
-  // the node is for.
-  if (tags.isEmpty() || taken.contains(tags.first()))
-    return;
-  QStringList dropped;
-  for (const QString& tag : tags) {
-    if (!taken.contains(tag))
-      dropped.append(tag);
+  QHash<int, int> portLines;
+  for (const SubDocumentIOStruct& port : reader.GetSubDocumentIOList(network.getName()))
+    portLines.insert(port.identifier, port.line);
+
+  for (const SubDocNetworkObj* node : network.nodes()) {
+    const QString title = network.getName() + QLatin1Char('/') + node->name();
+    const auto* inner = dynamic_cast<const SubDocNetworkObjXformer*>(node);
+    const int line = inner ? node->line() : portLines.value(node->number());
+    if (!lacksInput.contains(node)) {
+      if (inner)
+        reportUnfed(*inner->getTransformer(), connectedPorts(node->feeders()), line, title, diagnostics);
+      else if (node->kind() == SubDocNetworkObj::Kind::Output && node->feeders().empty())
+        diagnostics.reportText(Rule::UnfedWriter, line, title, TransformResString(kUnfedOutputPort));
+    }
+    if (!lacksOutput.contains(node)) {
+      if (inner)
+        reportDropped(*inner->getTransformer(), connectedPorts(node->consumers()), line, title, diagnostics);
+      else if (node->kind() == SubDocNetworkObj::Kind::Input && node->consumers().empty())
+        diagnostics.reportText(Rule::UnusedReader, line, title, TransformResString(kUnusedInputPort));
+    }
   }
-  diagnostics.report(Rule::DroppedOutput, node.line, node.name, {dropped.join(QLatin1String(", "))});
 }

@@ -10,6 +10,9 @@
 
 #include <vector>
 
+class ExternalDocNetwork;
+class IXMLComponentReader;
+
 class FlowChecks {
  public:
   // Not owned. Looks at the links once.
@@ -31,3 +34,7 @@ class FlowChecks {
   std::vector<QSet<QString>> m_taken;  // per node: outputs that a link leaves by
   std::vector<bool> m_isKnown;
 };
+
+// The same for the inside of a custom transformer that the document embeds.
+void reportFlowsInside(const ExternalDocNetwork& network, const IXMLComponentReader& reader,
+                       Diagnostics& diagnostics);

@@ -113,6 +113,7 @@ void Validation::checkTransformers(const Workspace& workspace, bool isConnected)
 }
 
 void Validation::checkInside(const ExternalDocNetwork& network, const Workspace& workspace) {
+  reportFlowsInside(network, m_reader, m_diagnostics);
   const ORXTValSlist<TransformerStruct> list = m_reader.GetTransformerList(network.getName());
   const Records records = byIdentifier(list);
   const QStringList names = network.getParameters();
