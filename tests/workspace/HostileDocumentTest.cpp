@@ -1,4 +1,5 @@
 #include "DocumentContent.h"
+#include <platform/qorxcore/Language.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 
 #include <QDir>
@@ -42,6 +43,7 @@ constexpr int kLargest = 16 * 1024 * 1024;
 }  // namespace
 
 TEST(HostileDocument, EachIsRefusedWithItsMessage) {
+  QORXSetLanguage("en");
   const QByteArray bomb =
       "<!DOCTYPE w [<!ENTITY a 'xxxxxxxxxx'><!ENTITY b '&a;&a;&a;&a;&a;&a;&a;&a;'>"
       "<!ENTITY c '&b;&b;&b;&b;&b;&b;&b;&b;'>]><WORKSPACE A='&c;'/>";
@@ -101,6 +103,19 @@ TEST(HostileDocument, EachIsRefusedWithItsMessage) {
       EXPECT_NE(message.find("\n\nPlease contact"), std::string::npos) << item.name;
     }
   }
+  const struct {
+    const char* language;
+    const char* message;
+  } translations[] = {
+      {"de", "Error message is: Elemente sind mehr als 256 Ebenen tief verschachtelt\n\nBitte"},
+      {"fr", "Error message is: Des éléments sont imbriqués sur plus de 256 niveaux\n\nVeuillez"},
+  };
+  for (const auto& translation : translations) {
+    QORXSetLanguage(translation.language);
+    const QString message = readingError(nested(257));
+    EXPECT_TRUE(message.contains(translation.message)) << message.toStdString();
+  }
+  QORXSetLanguage("en");
 }
 
 TEST(HostileDocument, MessagesNameLineAndColumn) {

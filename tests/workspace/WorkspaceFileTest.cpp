@@ -1,4 +1,5 @@
 #include "DocumentContent.h"
+#include <platform/qorxcore/Language.h>
 #include <transform/workspace/DocumentCopy.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceFile.h>
@@ -219,6 +220,7 @@ TEST(VersionStore, OpeningLinesAndPlacesThatAreOff) {
 }
 
 TEST(LossReport, NamesEachLossWithItsLine) {
+  QORXSetLanguage("en");
   const ScratchFile file(
       "#! <OTHER A='kept'>\n"
       "#! <CONSTANTS><CONSTANT CONST_VALUE='1'/>\n"
@@ -259,4 +261,16 @@ TEST(LossReport, NamesEachLossWithItsLine) {
             "12 the element DATASETS is not known here\n"
             "13 there is an earlier sub-document of the name s\n"
             "13 the element T is not known here");
+  const struct {
+    const char* language;
+    const char* first;
+  } translations[] = {
+      {"de", "aus dem Wurzelelement OTHER würde WORKSPACE"},
+      {"fr", "l’élément racine OTHER deviendrait WORKSPACE"},
+  };
+  for (const auto& translation : translations) {
+    QORXSetLanguage(translation.language);
+    EXPECT_EQ(report.losses().front().describe().toStdString(), translation.first);
+  }
+  QORXSetLanguage("en");
 }

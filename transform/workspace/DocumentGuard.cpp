@@ -1,5 +1,6 @@
 #include <transform/workspace/DocumentGuard.h>
 #include <transform/workspace/DocumentLimits.h>
+#include <transform/workspace/DocumentMessages.h>
 
 #include <algorithm>
 
@@ -63,12 +64,12 @@ int DocumentGuard::check(const ushort* units, int size) {
       break;
     const ushort unit = units[i];
     if (unit == 0 || (m_replacement != 0 && unit == m_replacement)) {
-      refuse(QStringLiteral("A null character, or bytes that are not valid in the document's encoding"));
+      refuse(documentText(document_messages::kUndecodable));
       return i;
     }
     // What ends a value is counted with it.
     if (++m_runLength > limits::kValueLength + 1) {
-      refuse(QStringLiteral("A single value is longer than %1 characters").arg(limits::kValueLength));
+      refuse(documentText(document_messages::kValueTooLong, {QString::number(limits::kValueLength)}));
       return i;
     }
     if (!take(unit))
@@ -139,15 +140,15 @@ bool DocumentGuard::takeOpen(ushort unit) {
   m_elementLines.push_back(m_line);
   m_attributes = 0;
   if (++m_depth > limits::kNesting)
-    return refuse(QStringLiteral("Elements are nested more than %1 deep").arg(limits::kNesting));
+    return refuse(documentText(document_messages::kNestedTooDeep, {QString::number(limits::kNesting)}));
   return enter(State::Tag) && takeTag(unit);
 }
 
 bool DocumentGuard::takeTag(ushort unit) {
   if (unit == '"' || unit == '\'') {
     if (++m_attributes > limits::kAttributesPerElement)
-      return refuse(
-          QStringLiteral("An element has more than %1 attributes").arg(limits::kAttributesPerElement));
+      return refuse(documentText(document_messages::kTooManyAttributes,
+                                 {QString::number(limits::kAttributesPerElement)}));
     return enter(unit == '"' ? State::DoubleQuoted : State::SingleQuoted);
   }
   if (unit == '>') {
@@ -166,6 +167,6 @@ bool DocumentGuard::takeBang(ushort unit) {
   if (m_bang == QLatin1String("[CDATA["))
     return enter(State::CharacterData);
   if (m_bang.size() >= 7)
-    return refuse(QStringLiteral("A document type declaration is not allowed"));
+    return refuse(documentText(document_messages::kDocumentType));
   return true;
 }

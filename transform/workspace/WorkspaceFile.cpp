@@ -2,6 +2,7 @@
 #include <transform/files/AtomicFile.h>
 #include <transform/workspace/CommentLineDevice.h>
 #include <transform/workspace/DecodedInputSource.h>
+#include <transform/workspace/DocumentMessages.h>
 #include <transform/workspace/FileLines.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
@@ -62,6 +63,11 @@ const QTextCodec* fileCodec(const QByteArray& name) {
   return codec->fromUnicode(ascii.constData(), ascii.size(), &state) == ascii.toLatin1() ? codec : nullptr;
 }
 
+WorkspaceLoaderException noWorkspaceFile(const QString& fileName) {
+  return WorkspaceLoaderException(QLatin1String("File Error!\n") +
+                                  documentText(document_messages::kNoWorkspaceFile, {fileName}));
+}
+
 }  // namespace
 
 WorkspaceFile::Form WorkspaceFile::recognise(const QString& fileName) {
@@ -96,7 +102,7 @@ void WorkspaceFile::read(IXMLComponentReader& reader, const QString& fileName, Q
     case Form::Unknown:
       break;
   }
-  throw WorkspaceLoaderException(QStringLiteral("File Error!\nThis is no workspace file: %1").arg(fileName));
+  throw noWorkspaceFile(fileName);
 }
 
 WorkspaceFile::WorkspaceFile(const QString& fileName) {
@@ -104,8 +110,7 @@ WorkspaceFile::WorkspaceFile(const QString& fileName) {
   const QByteArray firstBytes = plain.device().peek(kFirstBytes);
   m_form = formOf(firstBytes);
   if (m_form != Form::Workspace && m_form != Form::PlainXml)
-    throw WorkspaceLoaderException(
-        QStringLiteral("File Error!\nThis is no workspace file: %1").arg(fileName));
+    throw noWorkspaceFile(fileName);
   QByteArray declaration;
   FileLines lines(plain.device());
   bool hasXml = m_form == Form::PlainXml;

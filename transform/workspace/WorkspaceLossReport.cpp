@@ -1,3 +1,4 @@
+#include <transform/workspace/DocumentMessages.h>
 #include <transform/workspace/LossCollector.h>
 #include <transform/workspace/WorkspaceLossReport.h>
 
@@ -27,33 +28,31 @@ WorkspaceLossReport::WorkspaceLossReport(const XMLComponentReader& reader) {
 }
 
 QString WorkspaceLossReport::Loss::describe() const {
+  using namespace document_messages;
   switch (kind) {
     case Kind::Root:
-      return QStringLiteral("the root element %1 would become %2")
-          .arg(element, words::kWorkspace.toQString());
+      return documentText(kLostRoot, {element, words::kWorkspace.toQString()});
     case Kind::Constant:
-      return QStringLiteral("the constant %1 is not written").arg(element);
+      return documentText(kLostConstant, {element});
     case Kind::ReadOnlyAttribute:
-      return QStringLiteral("the attribute %1 of %2 is only read").arg(attribute, element);
+      return documentText(kReadOnlyAttribute, {attribute, element});
     case Kind::UnknownAttribute:
-      return QStringLiteral("the attribute %1 of %2 is not known").arg(attribute, element);
+      return documentText(kUnknownAttribute, {attribute, element});
     case Kind::MalformedValue:
-      return QStringLiteral("the attribute %1 of %2 has a malformed value: %3")
-          .arg(attribute, element, value);
+      return documentText(kMalformedValue, {attribute, element, value});
     case Kind::UnknownElement:
-      return QStringLiteral("the element %1 is not known here").arg(element);
+      return documentText(kUnknownElement, {element});
     case Kind::RepeatedElement:
-      return QStringLiteral("the element %1 is repeated").arg(element);
+      return documentText(kRepeatedElement, {element});
     case Kind::SubDocument:
-      return attribute.isEmpty()
-                 ? QStringLiteral("a sub-document has no name")
-                 : QStringLiteral("there is an earlier sub-document of the name %1").arg(attribute);
+      return attribute.isEmpty() ? documentText(kNamelessSubDocument)
+                                 : documentText(kRepeatedSubDocument, {attribute});
     case Kind::Text:
-      return QStringLiteral("text is not kept");
+      return documentText(kLostText);
     case Kind::Comment:
-      return QStringLiteral("a comment is not kept");
+      return documentText(kLostComment);
     case Kind::Instruction:
-      return QStringLiteral("a processing instruction is not kept");
+      return documentText(kLostInstruction);
   }
   return QString();
 }

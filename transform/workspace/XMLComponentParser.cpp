@@ -1,6 +1,7 @@
 #include <platform/qorxcore/Local8Bit.h>
 #include <transform/files/TemporaryFile.h>
 #include <transform/workspace/DecodedInputSource.h>
+#include <transform/workspace/DocumentMessages.h>
 #include <transform/workspace/FileLines.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/ValueText.h>
@@ -32,7 +33,7 @@ constexpr int kFirstBytes = 1024;
 const char* const kEmbeddedDocument = "#! <?xml version";
 
 QString withSupportSentence(const QString& message) {
-  return message + QStringLiteral("\n\nPlease contact the product's support if the problem persists.");
+  return message + QLatin1String("\n\n") + documentText(document_messages::kContactSupport);
 }
 
 WorkspaceLoaderException placedError(const QString& message, int line, int column) {
@@ -228,8 +229,7 @@ void XMLComponentParser::parseGuarded(QIODevice& device, const LineMap& map) {
     int markLength = 0;
     const QTextCodec* const codec = documentCodec(firstBytes, encoding, markLength);
     if (!codec) {
-      throw generalError(QStringLiteral("The encoding %1 is not known, or the document is not written in it")
-                             .arg(QString::fromLatin1(encoding)));
+      throw generalError(documentText(document_messages::kUnknownEncoding, {QString::fromLatin1(encoding)}));
     }
     device.read(markLength);
     m_parser->parse(DecodedInputSource(device, *codec, guard));
