@@ -328,7 +328,11 @@ TEST(DefinitionLint, FoldersAndOddFiles) {
   EXPECT_EQ(rulesOf(lint), QStringList("duplicate-definition"));
   DefinitionLint missing;
   missing.checkPath(folders.path("nothing.ort"));
-  EXPECT_EQ(rulesOf(missing), QStringList("unreadable-file"));
+  folders.write("links/readme", "no definition");
+  for (const char* name : {"links/a.ort", "links/a-localized.de", "links/a.txt"})
+    ASSERT_TRUE(QFile::link(QStringLiteral("nowhere"), folders.path(name)));
+  missing.checkPath(folders.path("links"));
+  EXPECT_EQ(rulesOf(missing), (QStringList{"unreadable-file", "unreadable-file", "unreadable-file"}));
 }
 
 TEST(DefinitionLint, ScriptsFromStrangers) {
