@@ -54,7 +54,7 @@ void InnerNames::add(const QString& name, int line, const TransformerCfg& cfg) {
   m_lengths.insert(name.size());
 }
 
-std::pair<QString, int> InnerNames::findHolder(const QString& name) const {
+std::pair<QString, int> InnerNames::findHolder(const QString& name) {
   std::pair<QString, int> holder;
   eachBeginning(name, m_lengths, m_customTransformers,
                 [&](const Holder& custom, const QString& outer, const QString& rest) {
@@ -64,21 +64,24 @@ std::pair<QString, int> InnerNames::findHolder(const QString& name) const {
   return holder;
 }
 
+const InnerNames& InnerNames::inside(const CompoundTransformerNetwork* network) {
+  std::shared_ptr<InnerNames>& names = m_insides[network];
+  if (!names) {
+    names = std::make_shared<InnerNames>();
+    for (const TransformerCfg* cfg : network->getTransformers())
+      names->add(cfg->getIdentifier(), 0, *cfg);
+  }
+  return *names;
+}
+
 bool InnerNames::holds(const CompoundTransformerNetwork* network, const QString& rest) {
   using Place = QPair<const CompoundTransformerNetwork*, QString>;
-  QHash<const CompoundTransformerNetwork*, InnerNames> known;
   std::vector<Place> open{{network, rest}};
   QSet<Place> seen{open.front()};
   while (!open.empty()) {
     const Place place = open.back();
     open.pop_back();
-    if (!known.contains(place.first)) {
-      InnerNames names;
-      for (const TransformerCfg* cfg : place.first->getTransformers())
-        names.add(cfg->getIdentifier(), 0, *cfg);
-      known.insert(place.first, names);
-    }
-    const InnerNames& names = known[place.first];
+    const InnerNames& names = inside(place.first);
     if (names.m_names.contains(place.second))
       return true;
     eachBeginning(place.second, names.m_lengths, names.m_customTransformers,

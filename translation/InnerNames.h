@@ -7,6 +7,7 @@
 #include <QString>
 
 #include <functional>
+#include <memory>
 #include <set>
 #include <utility>
 
@@ -29,12 +30,14 @@ class InnerNames {
   void add(const QString& name, int line, const TransformerCfg& cfg);
   // The name of the custom transformer with something inside that is written as `name`, and its line; empty
   // when there is none.
-  std::pair<QString, int> findHolder(const QString& name) const;
+  std::pair<QString, int> findHolder(const QString& name);
 
  private:
-  static bool holds(const CompoundTransformerNetwork* network, const QString& rest);
+  bool holds(const CompoundTransformerNetwork* network, const QString& rest);
+  const InnerNames& inside(const CompoundTransformerNetwork* network);
 
   QSet<QString> m_names;
   QHash<QString, Holder> m_customTransformers;
-  std::set<int> m_lengths;  // of their names
+  std::set<int> m_lengths;                                                          // of their names
+  QHash<const CompoundTransformerNetwork*, std::shared_ptr<InnerNames>> m_insides;  // read once
 };
