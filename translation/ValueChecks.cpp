@@ -13,7 +13,8 @@ const QLatin1String kInstanceNames("XFORMER_NAME");
 
 }  // namespace
 
-ValueChecks::ValueChecks(Diagnostics& diagnostics) : m_diagnostics(diagnostics) {
+ValueChecks::ValueChecks(Diagnostics& diagnostics, const RuleSettings& settings)
+    : m_diagnostics(diagnostics), m_settings(settings) {
   const QChar mark(0xfffc);
   for (const Rule rule :
        {Rule::MissingAttribute, Rule::MissingValue, Rule::MissingFile, Rule::UnknownConnection}) {
@@ -104,7 +105,9 @@ void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const
     } else if (text.isEmpty()) {
       text = TransformResString(diagnosticRule(Rule::InvalidValue).message);
     }
-    for (const QString& name : loose.isEmpty() ? QStringList() : ReferencedNames::inValue(text)) {
+    const bool tellsReferences = !loose.isEmpty() && m_settings.severity(diagnosticRule(rule).name,
+                                                                         Severity::Error) == Severity::Error;
+    for (const QString& name : tellsReferences ? ReferencedNames::inValue(text) : QStringList()) {
       // What the transformer itself says about the value need not be said again.
       if (loose[parameter].removeOne(name))
         text += QLatin1Char(' ') +

@@ -4,6 +4,7 @@
 
 #include <translation/Diagnostics.h>
 #include <translation/NearestSpelling.h>
+#include <translation/RuleSettings.h>
 
 #include <QHash>
 #include <QString>
@@ -21,8 +22,8 @@ class ValueChecks {
   // Whether a parameter of that name can be referred to; the transformer's own need not be told.
   using Knows = std::function<bool(const QString& name)>;
 
-  // Not owned.
-  explicit ValueChecks(Diagnostics& diagnostics);
+  // Neither is owned.
+  ValueChecks(Diagnostics& diagnostics, const RuleSettings& settings);
 
   struct Node {
     const TransformerCfg& cfg;
@@ -53,7 +54,8 @@ class ValueChecks {
   using LooseReferences = QHash<QString, QStringList>;
 
   static LooseReferences looseReferences(const Node& node, const Knows& knows);
-  // A reference that a refusal shows is told with it, and taken out of `loose`.
+  // A reference that a refusal shows is told with it, and taken out of `loose`; but not where such refusals
+  // are turned down, which must not silence the reference.
   void reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names);
   void reportReferences(const Node& node, LooseReferences& loose, const QStringList& names);
   QString referenceText(const QString& name, const QStringList& names);
@@ -64,6 +66,7 @@ class ValueChecks {
   QString missingText(const TransformerCfg& cfg, const QString& parameter);
 
   Diagnostics& m_diagnostics;
+  const RuleSettings& m_settings;
   NearestSpelling m_spelling;
   QHash<QString, Suggestion> m_suggestions;  // by the name that was used
   std::vector<Form> m_forms;

@@ -23,12 +23,13 @@ constexpr long kOnlyCustomTransformers = 370867;
 
 class Validation {
  public:
-  Validation(const WorkspaceDocument& document, TransformerSource& source, Diagnostics& diagnostics)
+  Validation(const WorkspaceDocument& document, TransformerSource& source, const RuleSettings& settings,
+             Diagnostics& diagnostics)
       : m_reader(document.reader()),
         m_headerLines(document.headerLines()),
         m_source(source),
         m_diagnostics(diagnostics),
-        m_values(diagnostics) {}
+        m_values(diagnostics, settings) {}
 
   void run();
 
@@ -247,7 +248,7 @@ ValidationReport validateWorkspace(const QString& fileName, TransformerSource& s
       if (document.form() == WorkspaceFile::Form::Versioned)
         diagnostics.reportText(Rule::NoDocument, 0, QString(), TransformResString(kOnlyCustomTransformers));
       else
-        Validation(document, source, diagnostics).run();
+        Validation(document, source, settings, diagnostics).run();
       break;
   }
   report.findings = settings.apply(inDocumentOrder(diagnostics));
