@@ -39,11 +39,16 @@ int lastSaveBuild(const QString& path, const VersionInfo& version) {
 CustomTransformerFiles::CustomTransformerFiles() = default;
 CustomTransformerFiles::~CustomTransformerFiles() = default;
 
-QList<int> CustomTransformerFiles::versions(const QString& path) {
-  QString error;
+QList<int> CustomTransformerFiles::versionsOf(const QString& name) const {
+  const QString path = fileOf(name);
   QList<int> result;
-  for (const VersionInfo& version : VersionStore(path).versions(error))
-    result.append(version.version);
+  if (path.isEmpty())
+    return result;
+  QString error;
+  for (const VersionInfo& version : VersionStore(path).versions(error)) {
+    if (version.name == name)
+      result.append(version.version);
+  }
   std::sort(result.begin(), result.end());
   return result;
 }

@@ -28,13 +28,12 @@ class CustomTransformerFiles {
   // Reads the wanted version of a file; the first for ITransformerMgr::NEWEST_VERSION, or the next lower one
   // that this build can load. `source` makes the transformers inside and is not owned.
   static Opened open(const QString& path, int version, TransformerSource* source);
-  // The versions that the file holds, from the lowest up.
-  static QList<int> versions(const QString& path);
-
   // Takes a network over.
   ExternalTransformerNetwork* keep(std::unique_ptr<ExternalTransformerNetwork> network);
   // Empty for a name that no file serves.
   QString fileOf(const QString& name) const { return m_files.value(name); }
+  // The versions of the name that its file holds, from the lowest up.
+  QList<int> versionsOf(const QString& name) const;
   void noteFile(const QString& name, const QString& path) { m_files.insert(name, path); }
   // Forgets the files, and the networks that nobody listens to any more.
   void reset();

@@ -157,7 +157,7 @@ void TransformerMgr::loadOnDemand(const QString& name, int version) {
     return;
   }
   const CatalogueEntry* oldest = m_prototypes.oldest(name);
-  for (const int older : CustomTransformerFiles::versions(path)) {
+  for (const int older : m_customFiles->versionsOf(name)) {
     if (older < 0)
       continue;
     if (oldest && older >= oldest->version())
@@ -248,12 +248,14 @@ int TransformerMgr::currentTransformerVersion(const QString& name) const {
 }
 
 QList<int> TransformerMgr::transformerVersions(const QString& name) const {
-  QList<int> result;
+  QList<int> result = m_customFiles->versionsOf(name);
   if (const PrototypeTable::Versions* versions = m_prototypes.versions(name)) {
     for (const auto& [version, entry] : *versions) {
       result.append(version);
     }
   }
+  std::sort(result.begin(), result.end());
+  result.erase(std::unique(result.begin(), result.end()), result.end());
   return result;
 }
 

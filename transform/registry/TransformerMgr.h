@@ -103,7 +103,8 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   // In order of first registration.
   const QStringList& transformerNames() const { return m_prototypes.names(); }
   const QStringList& visibleTransformerNames() const { return m_prototypes.visibleNames(); }
-  // From the lowest up; empty for an unknown name. Aliases are not followed.
+  // From the lowest up; empty for an unknown name. Aliases are not followed. Those that stand in a custom
+  // transformer's file and are loaded on demand count, also when they need a newer build.
   QList<int> transformerVersions(const QString& name) const;
   bool isTransformerIgnored(const QString& name, int version) const;
   // The failures since the load began, in the order in which they were met, each with the file or folder that
