@@ -59,6 +59,7 @@ ExitStatus TransformersListCommand::run(Console& console) {
     return kExitDone;
   }
   std::vector<const TransformerCfg*> transformers;
+  transformers.reserve(found.size());
   for (const auto& cfg : found)
     transformers.push_back(cfg.get());
   // By the names that are shown, letters with and without accents alike.
