@@ -32,6 +32,7 @@ Rule ruleOf(NetworkProblem::Kind kind) {
     case NetworkProblem::Kind::Nesting:
       return Rule::Nesting;
     case NetworkProblem::Kind::NoBody:
+    case NetworkProblem::Kind::NoLoop:
       break;
   }
   return Rule::CustomTransformerFault;

@@ -125,6 +125,7 @@ const Fault kFaults[] = {
     {"in A;out A", Kind::DuplicateName, "A", "A"},
     {"gui NONSENSE | 1", Kind::BadPromptLine, "", "NONSENSE"},
     {"use T Net", Kind::Nesting, "T", "Net > Net"},
+    {"set BLOCKED_LOOPING yes", Kind::NoLoop, "", "BLOCKED_LOOPING"},
 };
 
 TEST_F(DocumentNetwork, TellsWhatIsWrongAndBuildsTheRest) {

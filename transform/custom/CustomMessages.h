@@ -34,5 +34,6 @@ constexpr long kPromptGroupBy = 370850;
 constexpr long kNoInstance = 370851;
 constexpr long kNoMacroName = 370852;
 constexpr long kEncipheredBody = 370854;
+constexpr long kNoLoop = 370878;
 
 }  // namespace custom_messages

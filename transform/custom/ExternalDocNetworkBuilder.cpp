@@ -86,6 +86,9 @@ void ExternalDocNetwork::Builder::addPorts() {
         break;
     }
   }
+  if (m_network.blockedLooping() && m_network.getLoops().isEmpty())
+    report(NetworkProblem::Kind::NoLoop, m_reader.GetDocumentLine(m_document), QString(),
+           custom_messages::kNoLoop, {});
   const QStringList inputNames = m_network.getInputs();
   const QSet<QString> taken(inputNames.begin(), inputNames.end());
   for (const QString& output : m_network.getOutputs()) {

@@ -19,6 +19,7 @@ struct NetworkProblem {
     Upgraded,  // a hint: parameters were brought to their newest form
     Nesting,   // stands inside itself, or too deep
     NoBody,    // the document or the file could not be read
+    NoLoop,    // the whole is to be repeated, and nothing leads back
   };
 
   Kind kind;
