@@ -100,10 +100,7 @@ MappingFileReader::Item MappingFileReader::next() {
       m_hasLine = true;
       if (closeLevel(innermost(), item))
         return item;
-      m_report.add(Rule::OpenBlock, innermost().beginLine,
-                   {kBlockLine + kBlockBegin.trimmed(), kBlockLine + kBlockEnd});
-      m_levels.pop_back();
-      return Item::BlockEnd;
+      return leaveOpenBlock();
     }
     const Taken taken = takeLine(m_line.midRef(offset), item);
     m_hasLine = taken == Taken::ItemAgain;
@@ -114,6 +111,10 @@ MappingFileReader::Item MappingFileReader::next() {
     return item;
   if (m_levels.size() == 1)
     return Item::End;
+  return leaveOpenBlock();
+}
+
+MappingFileReader::Item MappingFileReader::leaveOpenBlock() {
   m_report.add(Rule::OpenBlock, innermost().beginLine,
                {kBlockLine + kBlockBegin.trimmed(), kBlockLine + kBlockEnd});
   m_levels.pop_back();

@@ -66,6 +66,8 @@ class MappingFileReader {
   bool finishStatement(Level& level, Item& item);
   // What a level leaves open. True when that gave a last statement.
   bool closeLevel(Level& level, Item& item);
+  // Of a block whose end is missing.
+  Item leaveOpenBlock();
   Level& innermost() { return m_levels.back(); }
 
   LineReader m_lines;

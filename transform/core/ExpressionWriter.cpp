@@ -1,6 +1,7 @@
 #include <platform/qorxcore/Lists.h>
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/ExpressionWriter.h>
+#include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/MacroText.h>
 
@@ -8,7 +9,6 @@
 
 namespace {
 
-const QLatin1String kEvaluate("@EvaluateExpression(");
 const QLatin1String kFractionsMark("FDIV,");
 const QLatin1String kChoose("@Choose(");
 const QLatin1String kExpressionType("EXPRESSION");
@@ -176,7 +176,7 @@ QString ExpressionWriter::withStoredResults(const QString& value, const ChoiceLi
 
 QString ExpressionWriter::wrap(const QString& value, const QString& name, const QString& type,
                                bool encoded) const {
-  QString result = kEvaluate;
+  QString result = kEvaluateCall;
   if (m_fractions) {
     result += kFractionsMark;
   }

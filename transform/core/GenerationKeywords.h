@@ -17,4 +17,7 @@ inline const QLatin1String kEncodedNameToken("XFORMER_NAME_ENCODED");
 inline const QLatin1String kSchemaToken("XFORMER_SCHEMA");
 inline const QLatin1String kValueListToken("ORX_PARM_VAL_LIST");
 
+// The call that works a value out for each feature.
+inline const QLatin1String kEvaluateCall("@EvaluateExpression(");
+
 inline const QLatin1String kBracketValueMark(" {*} ");

@@ -2,6 +2,7 @@
 #include <transform/core/MultiProcessWriter.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
 
 #include <algorithm>
@@ -14,8 +15,8 @@ void write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, 
   // A transformer without a template of its own is a custom one, whose definition stands elsewhere.
   const bool hasStatements = !cfg.getTemplateLines().isEmpty();
   QStringList lines;
-  lines << QLatin1String("FACTORY_DEF * TransformFact:") + QString::number(cfg.getVersion()) +
-               QLatin1Char(':') + quotifyStringForMF(cfg.getName())
+  lines << kTransformFactoryStatement + QString::number(cfg.getVersion()) + QLatin1Char(':') +
+               quotifyStringForMF(cfg.getName())
         << QLatin1String("   FACTORY_NAME ") + quotifyStringForMF(identifier)
         << QStringLiteral("   FACTORY_META_PARAMS")
         << QLatin1String("   TRANSFORMER_NAME:") + quotifyStringForMF(identifier)

@@ -43,8 +43,8 @@ void writeLoopFactory(MFBuffer& buffer, const CompoundTransformerNetwork& networ
     if (input != loopTo)
       recurring.append(QORXWwjdEncode(input));
   }
-  buffer.add(QLatin1String("FACTORY_DEF * TransformFact:") + QString::number(network.getVersion()) +
-             QLatin1Char(':') + quotifyStringForMF(instance.getVisualName()));
+  buffer.add(kTransformFactoryStatement + QString::number(network.getVersion()) + QLatin1Char(':') +
+             quotifyStringForMF(instance.getVisualName()));
   buffer.add(QLatin1String("   FACTORY_NAME ") + quotedId);
   buffer.add(QStringLiteral("   FACTORY_META_PARAMS"));
   buffer.add(QLatin1String("   TRANSFORMER_NAME:") + quotedId);

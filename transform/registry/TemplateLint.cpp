@@ -4,6 +4,7 @@
 #include <transform/core/TokenScanner.h>
 #include <transform/registry/TemplateLint.h>
 #include <transform/text/GlobalMacros.h>
+#include <transform/text/MappingFileKeywords.h>
 
 #include <QRegularExpression>
 
@@ -11,8 +12,7 @@ using namespace lint_rules;
 
 namespace {
 
-const QLatin1String kFactory("FACTORY_DEF");
-const QLatin1String kOption("FACTORY_OPTION ");
+const QString kOption = kFactoryOptionStatement + QLatin1Char(' ');
 
 // The tag of a port token, or an empty text.
 QString tagOf(const QString& token, QLatin1String start, QLatin1String end) {
@@ -87,7 +87,8 @@ void TemplateLint::checkStatement(const DefinitionLine& line) {
     add(kBadStatement, line.number,
         QStringLiteral("Each line is a whole statement and begins with its keyword"));
   } else if (secondFactory.match(line.text).hasMatch()) {
-    add(kBadStatement, line.number, QStringLiteral("A second %1 needs a line of its own").arg(kFactory));
+    add(kBadStatement, line.number,
+        QStringLiteral("A second %1 needs a line of its own").arg(kFactoryStatement));
   }
 }
 

@@ -8,8 +8,6 @@
 
 namespace {
 
-constexpr long kMissingValueMessage = 370608;
-constexpr long kInRowMessage = 370714;
 constexpr long kOutOfRangeMessage = 370715;
 constexpr long kOneSeriesMessage = 370716;
 constexpr long kLabelTwiceMessage = 370717;
@@ -78,12 +76,12 @@ bool ChartGeneratorTransformerCfg::validateSeries(QString& message) const {
   QSet<QString> labels;
   for (int row = 0; row < series.rowCount(); ++row) {
     const auto refuse = [&](const QString& reason) {
-      message = TransformResString(kInRowMessage, {QString::number(row + 1), reason});
+      message = ParameterTable::rowMessage(row, reason);
       return false;
     };
     for (const int column : {kPosition, kValue}) {
       if (series.cell(row, column).isEmpty() && (column == kValue || needsPositions)) {
-        return refuse(TransformResString(kMissingValueMessage, series.prompt(column)));
+        return refuse(series.missingValueMessage(column));
       }
     }
     const QString label = series.cell(row, kLabel);

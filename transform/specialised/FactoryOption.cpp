@@ -4,19 +4,15 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/FactoryOption.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
-
-namespace {
-
-const QLatin1String kFactoryOption("FACTORY_OPTION ");
-
-}  // namespace
 
 bool writeFactoryOption(const TransformerCfg& cfg, const QString& key, const QString& value,
                         MFBuffer& buffer) {
   const QString name =
       encodeAroundReferences(stripBasicStringInfo(cfg.getParameterValue(kIdentifierParameter)));
-  const QString statement = kFactoryOption + name + QLatin1Char(' ') + key + QLatin1Char(' ') + value;
+  const QString statement =
+      kFactoryOptionStatement + QLatin1Char(' ') + name + QLatin1Char(' ') + key + QLatin1Char(' ') + value;
   if (!MFBuffer::closesDeferredMacros(statement) || !lookup_checks::isOneLine(statement) ||
       statement.endsWith(QLatin1Char('\\'))) {
     return false;

@@ -5,6 +5,14 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/specialised/ParameterTable.h>
 #include <transform/specialised/SpecialisedValues.h>
+#include <transform/text/MessageStrings.h>
+
+namespace {
+
+constexpr long kMissingValueMessage = 370608;
+constexpr long kInRowMessage = 370714;
+
+}  // namespace
 
 ParameterTable::ParameterTable(const TransformerCfg& cfg, const QString& parameter, int columns,
                                UnpackLevel level)
@@ -41,6 +49,14 @@ const GUIType& ParameterTable::column(int index) const {
 
 QString ParameterTable::prompt(int index) const {
   return column(index).getDescription();
+}
+
+QString ParameterTable::missingValueMessage(int column) const {
+  return TransformResString(kMissingValueMessage, prompt(column));
+}
+
+QString ParameterTable::rowMessage(int row, const QString& reason) {
+  return TransformResString(kInRowMessage, QStringList{QString::number(row + 1), reason});
 }
 
 QStringList ParameterTable::attributeNames(const IsUsed& isUsed) const {

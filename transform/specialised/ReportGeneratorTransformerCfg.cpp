@@ -11,8 +11,6 @@
 
 namespace {
 
-constexpr long kMissingValueMessage = 370608;
-constexpr long kInRowMessage = 370714;
 constexpr long kUnknownKindMessage = 370718;
 constexpr long kNoAddressMessage = 370719;
 
@@ -74,9 +72,8 @@ bool ReportGeneratorTransformerCfg::validateParameter(const QString& parameter, 
 bool ReportGeneratorTransformerCfg::validateParts(QString& message) const {
   const ParameterTable parts(*this, kParts, kColumns, UnpackLevel::Resolved);
   for (int row = 0; row < parts.rowCount(); ++row) {
-    const auto refuse = [&](long number, const QString& argument) {
-      message = TransformResString(
-          kInRowMessage, QStringList{QString::number(row + 1), TransformResString(number, argument)});
+    const auto refuse = [&](const QString& reason) {
+      message = ParameterTable::rowMessage(row, reason);
       return false;
     };
     const QString kind = parts.cell(row, kKind);
@@ -85,18 +82,18 @@ bool ReportGeneratorTransformerCfg::validateParts(QString& message) const {
     }
     const Part* part = findPart(kind);
     if (!part) {
-      return refuse(kUnknownKindMessage, kind);
+      return refuse(TransformResString(kUnknownKindMessage, kind));
     }
     const QString content = parts.cell(row, kContent);
     for (const auto& [column, use] :
          {std::make_pair(kContent, part->content), std::make_pair(kAttributes, part->attributes)}) {
       if (use == Use::Required && parts.cell(row, column).isEmpty()) {
-        return refuse(kMissingValueMessage, parts.prompt(column));
+        return refuse(parts.missingValueMessage(column));
       }
     }
     const QString address = QORXWwjdDecode(content);
     if (part->isAddress && !isOpenValue(content) && !QUrl(address, QUrl::StrictMode).isValid()) {
-      return refuse(kNoAddressMessage, address);
+      return refuse(TransformResString(kNoAddressMessage, address));
     }
   }
   return true;

@@ -113,7 +113,7 @@ bool TesterTransformerCfg::validateTests(QString& message) const {
       return false;
     }
     if (comparison->takesRight && right.isEmpty()) {
-      message = TransformResString(kMissingValueMessage, tests.prompt(kRight));
+      message = tests.missingValueMessage(kRight);
       return false;
     }
     const QString pattern = QORXWwjdDecode(right);

@@ -1,5 +1,6 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/ExpressionWriter.h>
+#include <transform/core/GenerationKeywords.h>
 #include <transform/specialised/FactoryOption.h>
 #include <transform/specialised/ParameterTable.h>
 #include <transform/specialised/SpecialisedValues.h>
@@ -18,14 +19,13 @@ const QLatin1String kMapping("MAPPING");
 const QLatin1String kDirection("DIRECTION");
 const QLatin1String kBackward("BACKWARD");
 const QLatin1String kMapKey("MAP");
-const QLatin1String kCall("@EvaluateExpression(");
 
 enum Column { kLeft, kRight, kColumns };
 
 // As a word of a statement. Cells are encoded, or calls of functions, unless they were not stored as they
 // should be.
 QString word(const QString& cell) {
-  return cell.startsWith(kCall) ? cell : quotifyStringForMF(cell);
+  return cell.startsWith(kEvaluateCall) ? cell : quotifyStringForMF(cell);
 }
 
 }  // namespace

@@ -10,10 +10,13 @@
 
 #include <QRegularExpression>
 #include <QSet>
+#include <boost/graph/adjacency_list.hpp>
+#include <boost/graph/strong_components.hpp>
+
+#include <vector>
 
 namespace {
 
-constexpr long kMissingValueMessage = 370608;
 constexpr long kNotWellFormedMessage = 370708;
 constexpr long kBadNameMessage = 370709;
 constexpr long kNameTwiceMessage = 370710;
@@ -39,46 +42,26 @@ bool refuse(QString& message, long number, const QString& argument) {
 
 // The name of a template that asks for itself, by way of others or not; empty when there is none.
 QString findCircle(const QHash<QString, QStringList>& inserted, const QStringList& names) {
-  // What asks for nothing, or only for what has been taken away, is taken away.
-  QHash<QString, QStringList> askers;
-  QHash<QString, int> open;
+  QHash<QString, std::size_t> numbers;
+  for (const QString& name : names) {
+    numbers.insert(name, static_cast<std::size_t>(numbers.size()));
+  }
+  boost::adjacency_list<boost::vecS, boost::vecS, boost::directedS> graph(
+      static_cast<std::size_t>(names.size()));
   for (const QString& name : names) {
     for (const QString& other : inserted.value(name)) {
-      askers[other].append(name);
-      ++open[name];
+      boost::add_edge(numbers.value(name), numbers.value(other), graph);
     }
   }
-  QStringList done;
+  std::vector<std::size_t> circles(boost::num_vertices(graph));
+  boost::strong_components(
+      graph, boost::make_iterator_property_map(circles.begin(), boost::get(boost::vertex_index, graph)));
   for (const QString& name : names) {
-    if (open.value(name) == 0) {
-      done.append(name);
-    }
-  }
-  for (int i = 0; i < done.size(); ++i) {
-    for (const QString& asker : askers.value(done[i])) {
-      if (--open[asker] == 0) {
-        done.append(asker);
+    for (const QString& other : inserted.value(name)) {
+      if (circles[numbers.value(name)] == circles[numbers.value(other)]) {
+        return name;
       }
     }
-  }
-  // From one that is left on, every step leads to another that is left, until one comes again.
-  for (const QString& name : names) {
-    if (open.value(name) == 0) {
-      continue;
-    }
-    QSet<QString> seen;
-    QString current = name;
-    while (!seen.contains(current)) {
-      seen.insert(current);
-      const QStringList next = inserted.value(current);
-      const auto left =
-          std::find_if(next.begin(), next.end(), [&](const QString& other) { return open.value(other) > 0; });
-      if (left == next.end()) {
-        return QString();
-      }
-      current = *left;
-    }
-    return current;
   }
   return QString();
 }
@@ -156,7 +139,8 @@ bool XMLTemplaterTransformerCfg::validateSubTemplates(QString& message) const {
       return refuse(message, kNameTwiceMessage, name);
     }
     if (templates.cell(row, kTemplate).isEmpty()) {
-      return refuse(message, kMissingValueMessage, templates.prompt(kTemplate));
+      message = templates.missingValueMessage(kTemplate);
+      return false;
     }
     known.insert(name);
     names.append(name);

@@ -9,10 +9,8 @@
 
 namespace {
 
-constexpr long kMissingValueMessage = 370608;
 constexpr long kNotWellFormedMessage = 370708;
 constexpr long kBadPathMessage = 370713;
-constexpr long kInRowMessage = 370714;
 
 const QLatin1String kDocument("DOCUMENT");
 const QLatin1String kUpdates("UPDATES");
@@ -95,27 +93,26 @@ bool XMLUpdaterTransformerCfg::validateDocument(QString& message) const {
 bool XMLUpdaterTransformerCfg::validateUpdates(QString& message) const {
   const ParameterTable updates(*this, kUpdates, kColumns, UnpackLevel::Resolved);
   for (int row = 0; row < updates.rowCount(); ++row) {
-    const auto refuse = [&](long number, const QString& argument) {
-      message = TransformResString(
-          kInRowMessage, QStringList{QString::number(row + 1), TransformResString(number, argument)});
+    const auto refuse = [&](const QString& reason) {
+      message = ParameterTable::rowMessage(row, reason);
       return false;
     };
     const QString path = updates.cell(row, kPath);
     if (!isOpenValue(path) && !isPath(fromRoot(path, m_isJson), m_isJson)) {
-      return refuse(kBadPathMessage, QORXWwjdDecode(path));
+      return refuse(TransformResString(kBadPathMessage, QORXWwjdDecode(path)));
     }
     if (updates.cell(row, kAction) == kRemove) {
       continue;
     }
     const QString value = updates.cell(row, kValue);
     if (value.isEmpty()) {
-      return refuse(kMissingValueMessage, updates.prompt(kValue));
+      return refuse(updates.missingValueMessage(kValue));
     }
     int line = 0;
     if (updates.cell(row, kKind) != kTextKind && !value.startsWith(kConditionalPrefix) &&
         !TemplateText(value, TemplateText::languageOf(m_isJson))
              .isWellFormed(TemplateText::Extent::Fragment, line)) {
-      return refuse(kNotWellFormedMessage, QString::number(line));
+      return refuse(TransformResString(kNotWellFormedMessage, QString::number(line)));
     }
   }
   return true;

@@ -8,6 +8,8 @@ inline const QLatin1String kMacroStatement("MACRO ");
 inline const QLatin1String kDefaultMacroStatement("DEFAULT_MACRO ");
 // Only leads features on.
 inline const QLatin1String kTeeFactoryStatement("FACTORY_DEF * TeeFactory");
+// Runs a transformer as a whole; its version and name follow.
+inline const QLatin1String kTransformFactoryStatement("FACTORY_DEF * TransformFact:");
 
 inline const QLatin1String kFactoryStatement("FACTORY_DEF");
 inline const QLatin1String kFactoryOptionStatement("FACTORY_OPTION");
