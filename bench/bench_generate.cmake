@@ -1,1 +1,1 @@
-orx_bench(bench_generate orxtranslation)
+orx_bench(bench_generate orx_translation)

@@ -4,9 +4,9 @@
 #include <tests/translation/SmallWorkspace.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
-#include <translation/MFDeviceBuffer.h>
-#include <translation/MappingFileWriter.h>
 #include <translation/WorkspaceTranslation.h>
+#include <translation/generation/MFDeviceBuffer.h>
+#include <translation/generation/MappingFileWriter.h>
 
 #include <QElapsedTimer>
 #include <QFile>

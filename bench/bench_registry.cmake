@@ -1,2 +1,2 @@
-orx_bench(bench_registry orxtransform Qt5::Core)
+orx_bench(bench_registry orx_registry Qt5::Core)
 add_dependencies(bench_registry orxt)

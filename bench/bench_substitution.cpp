@@ -2,10 +2,10 @@
 // hand and text out, against a general template library and against replacing token by token; beside it the
 // whole of instantiate() into a buffer. All of them in one run, in turns; the ratios are those of the fastest
 // turns.
-#include <transform/core/CompiledTemplate.h>
-#include <transform/core/TemplateExpansion.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerDefinition.h>
+#include <transform/core/definition/CompiledTemplate.h>
+#include <transform/core/generation/TemplateExpansion.h>
 #include <transform/text/MFBuffer.h>
 
 #include <QBuffer>

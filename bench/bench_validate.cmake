@@ -1,1 +1,1 @@
-orx_bench(bench_validate orxtranslation)
+orx_bench(bench_validate orx_translation)

@@ -1,5 +1,5 @@
 # Every build checks the shipped definitions and the samples' mapping files with the command itself.
-if(TARGET orxt AND EXISTS ${PROJECT_SOURCE_DIR}/apps/orxt/LintCommand.cpp)
+if(TARGET orxt)
   file(GLOB_RECURSE shipped CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/transformers/*
     ${PROJECT_SOURCE_DIR}/samples/*.mf ${PROJECT_SOURCE_DIR}/samples/*.ort)
   set(lint_stamp ${CMAKE_BINARY_DIR}/resources.linted)

@@ -24,7 +24,7 @@ function(_orx_setup target)
 endfunction()
 
 function(_orx_sources out)
-  file(GLOB sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp ${CMAKE_CURRENT_SOURCE_DIR}/*.h)
+  file(GLOB_RECURSE sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp ${CMAKE_CURRENT_SOURCE_DIR}/*.h)
   set(${out} ${sources} PARENT_SCOPE)
 endfunction()
 
@@ -50,7 +50,7 @@ function(orx_platform_library name)
   target_link_libraries(${name} PUBLIC Qt5::Core ${ARGN})
 endfunction()
 
-# One floor of the library: the sources of one folder, made into an archive that knows only the floors below.
+# One floor of the library: the sources of a folder and its rooms, made into an archive that knows only the floors below.
 function(orx_floor name)
   _orx_sources(sources)
   add_library(${name} STATIC ${sources})

@@ -2,10 +2,10 @@
 // and kept.
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerDefinition.h>
-#include <transform/registry/CompanionFileParser.h>
-#include <transform/registry/DefinitionFileParser.h>
-#include <transform/registry/DefinitionIndex.h>
-#include <translation/MFDeviceBuffer.h>
+#include <transform/registry/loading/CompanionFileParser.h>
+#include <transform/registry/loading/DefinitionFileParser.h>
+#include <transform/registry/loading/DefinitionIndex.h>
+#include <translation/generation/MFDeviceBuffer.h>
 
 #include <QBuffer>
 #include <QTextStream>

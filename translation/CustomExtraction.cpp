@@ -6,11 +6,11 @@
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/workspace/DocumentCopy.h>
 #include <transform/workspace/TransformerRecords.h>
-#include <translation/CustomDefinitions.h>
 #include <translation/CustomExtraction.h>
-#include <translation/NetworkDiagnostics.h>
-#include <translation/ReferencedNames.h>
-#include <translation/WorkspaceListener.h>
+#include <translation/generation/CustomDefinitions.h>
+#include <translation/graph/NetworkDiagnostics.h>
+#include <translation/graph/ReferencedNames.h>
+#include <translation/graph/WorkspaceListener.h>
 
 #include <QBuffer>
 #include <QSet>

@@ -1,7 +1,7 @@
 #include <translation/MappingFileLint.h>
-#include <translation/MappingFileReader.h>
-#include <translation/MappingFileReport.h>
-#include <translation/MappingFileStatements.h>
+#include <translation/mappingfile/MappingFileReader.h>
+#include <translation/mappingfile/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileStatements.h>
 
 #include <algorithm>
 

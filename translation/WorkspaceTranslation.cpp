@@ -3,10 +3,10 @@
 #include <transform/files/InputFile.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
-#include <translation/MFDeviceBuffer.h>
-#include <translation/MappingFileWriter.h>
-#include <translation/WorkspaceBuilder.h>
 #include <translation/WorkspaceTranslation.h>
+#include <translation/generation/MFDeviceBuffer.h>
+#include <translation/generation/MappingFileWriter.h>
+#include <translation/graph/WorkspaceBuilder.h>
 
 std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, TransformerSource& source,
                                          Diagnostics& diagnostics, QString& error) {

@@ -6,13 +6,13 @@
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MessageStrings.h>
-#include <translation/FlowChecks.h>
-#include <translation/MappingFileWriter.h>
-#include <translation/ReferencedNames.h>
-#include <translation/ValueChecks.h>
-#include <translation/WorkspaceBuilder.h>
 #include <translation/WorkspaceDocument.h>
 #include <translation/WorkspaceValidation.h>
+#include <translation/generation/MappingFileWriter.h>
+#include <translation/graph/ReferencedNames.h>
+#include <translation/graph/WorkspaceBuilder.h>
+#include <translation/validation/FlowChecks.h>
+#include <translation/validation/ValueChecks.h>
 
 #include <algorithm>
 

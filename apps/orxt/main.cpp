@@ -1,12 +1,12 @@
 // orxt: the library from the command line.
-#include <apps/orxt/Console.h>
-#include <apps/orxt/ExtractCommand.h>
-#include <apps/orxt/FormatCommand.h>
-#include <apps/orxt/GenerateCommand.h>
-#include <apps/orxt/InfoCommand.h>
-#include <apps/orxt/LintCommand.h>
-#include <apps/orxt/TransformersCommand.h>
-#include <apps/orxt/ValidateCommand.h>
+#include <apps/orxt/commands/ExtractCommand.h>
+#include <apps/orxt/commands/FormatCommand.h>
+#include <apps/orxt/commands/GenerateCommand.h>
+#include <apps/orxt/commands/InfoCommand.h>
+#include <apps/orxt/commands/LintCommand.h>
+#include <apps/orxt/commands/TransformersCommand.h>
+#include <apps/orxt/commands/ValidateCommand.h>
+#include <apps/orxt/console/Console.h>
 #include <translation/ProgramVersion.h>
 
 #include <CLI/CLI.hpp>

@@ -1,5 +1,5 @@
 #include <tests/core/ConfigHelpers.h>
-#include <transform/core/DependencyChecker.h>
+#include <transform/core/definition/DependencyChecker.h>
 
 #include <QElapsedTimer>
 #include <QTextStream>

@@ -4,7 +4,7 @@
 #include <platform/qorxcore/Lists.h>
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/LookupChecks.h>
-#include <transform/core/LookupWriters.h>
+#include <transform/core/generation/LookupWriters.h>
 #include <transform/text/MessageStrings.h>
 
 #include <gtest/gtest.h>

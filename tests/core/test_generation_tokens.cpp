@@ -1,7 +1,7 @@
 #include "GenerationSetup.h"
-#include <transform/core/CompiledTemplate.h>
 #include <transform/core/ConfiguredDefinition.h>
-#include <transform/core/OrderedSubstitution.h>
+#include <transform/core/definition/CompiledTemplate.h>
+#include <transform/core/generation/OrderedSubstitution.h>
 
 #include <gtest/gtest.h>
 

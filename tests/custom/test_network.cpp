@@ -1,6 +1,6 @@
 #include "CustomFixtures.h"
-#include <transform/custom/NetworkSorter.h>
 #include <transform/custom/SubDocNetworkObj.h>
+#include <transform/custom/network/NetworkSorter.h>
 
 #include <gtest/gtest.h>
 

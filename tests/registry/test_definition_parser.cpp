@@ -1,9 +1,9 @@
 #include <tests/registry/AwkwardDefinitions.h>
 #include <tests/registry/DefinitionFields.h>
-#include <transform/registry/CompanionFileParser.h>
-#include <transform/registry/DefinitionFileParser.h>
-#include <transform/registry/DefinitionIndex.h>
-#include <transform/registry/DefinitionKeywords.h>
+#include <transform/registry/loading/CompanionFileParser.h>
+#include <transform/registry/loading/DefinitionFileParser.h>
+#include <transform/registry/loading/DefinitionIndex.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
 
 #include <QBuffer>
 #include <gtest/gtest.h>

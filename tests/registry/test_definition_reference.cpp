@@ -1,8 +1,8 @@
 // The reference for whoever writes definitions says all there is to say, and nothing else.
 #include <platform/orxparameter/GUITypeTable.h>
 #include <tests/registry/RegistryFolders.h>
-#include <transform/registry/DefinitionKeywords.h>
 #include <transform/registry/DefinitionLint.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
 
 #include <QFile>
 #include <QStringList>

@@ -7,8 +7,8 @@
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/files/FolderListing.h>
-#include <transform/registry/CompanionFileParser.h>
-#include <transform/registry/DefinitionFileParser.h>
+#include <transform/registry/loading/CompanionFileParser.h>
+#include <transform/registry/loading/DefinitionFileParser.h>
 
 #include <QDir>
 #include <QFile>

@@ -1,5 +1,6 @@
 #include "ScriptRunners.h"
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 

@@ -4,7 +4,7 @@
 #include <translation/DiagnosticRules.h>
 #include <translation/Diagnostics.h>
 #include <translation/NearestSpelling.h>
-#include <translation/ReferencedNames.h>
+#include <translation/graph/ReferencedNames.h>
 
 #include <QDir>
 #include <QFile>

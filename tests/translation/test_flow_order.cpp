@@ -1,6 +1,6 @@
 #include <tests/support/QtPrinters.h>
-#include <translation/FlowNames.h>
-#include <translation/FlowOrder.h>
+#include <translation/generation/FlowNames.h>
+#include <translation/graph/FlowOrder.h>
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // Records with random values in every field that a document can hold.
 #pragma once
 
-#include <transform/workspace/RecordTables.h>
+#include <transform/workspace/records/RecordTables.h>
 
 #include <random>
 

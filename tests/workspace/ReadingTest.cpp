@@ -6,7 +6,7 @@
 #include <transform/workspace/XMLDatasetElement.h>
 #include <transform/workspace/XMLFeatureTypeElement.h>
 #include <transform/workspace/XMLGlobalParamElement.h>
-#include <transform/workspace/XmlText.h>
+#include <transform/workspace/writing/XmlText.h>
 
 #include <QDir>
 #include <QFile>

@@ -1,7 +1,8 @@
 #include <platform/qorxcore/Lists.h>
 #include <transform/core/LookupChecks.h>
 #include <transform/core/MacroText.h>
-#include <transform/core/TclText.h>
+#include <transform/core/definition/TclText.h>
+#include <transform/core/generation/LookupWriters.h>
 
 #include <QSet>
 

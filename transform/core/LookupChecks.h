@@ -5,7 +5,11 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/LookupWriters.h>
+
+#include <QString>
+
+class ChoiceList;
+struct BoxLookup;
 
 namespace lookup_checks {
 

@@ -1,26 +1,29 @@
 // Building, editing and listeners; the answers stand in NetworkAnswers.cpp and NetworkAttributes.cpp.
 #include <transform/core/TransformerCfg.h>
-#include <transform/custom/AttributeMemo.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CompoundTransformerNetworkListener.h>
-#include <transform/custom/InnerTransformerListener.h>
 #include <transform/custom/NestedNetworks.h>
-#include <transform/custom/NetworkSorter.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjLoop.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
+#include <transform/custom/instance/InnerTransformerListener.h>
+#include <transform/custom/network/AttributeMemo.h>
+#include <transform/custom/network/NetworkListeners.h>
+#include <transform/custom/network/NetworkSorter.h>
 
 #include <algorithm>
 
 const QString CompoundTransformerNetwork::kLoopOutput = QStringLiteral("INCOMPLETE");
 
 CompoundTransformerNetwork::CompoundTransformerNetwork()
-    : m_innerListener(std::make_unique<InnerTransformerListener>(*this)) {}
+    : m_listeners(std::make_unique<NetworkListeners>()),
+      m_orders(std::make_unique<std::map<QString, NetworkOrder>>()),
+      m_innerListener(std::make_unique<InnerTransformerListener>(*this)) {}
 
 CompoundTransformerNetwork::~CompoundTransformerNetwork() {
-  m_listeners.tellAll([](CompoundTransformerNetworkListener& listener) { listener.networkDeleted(); });
-  m_listeners.clear();
+  m_listeners->tellAll([](CompoundTransformerNetworkListener& listener) { listener.networkDeleted(); });
+  m_listeners->clear();
   clearNodes();
 }
 
@@ -147,11 +150,15 @@ void CompoundTransformerNetwork::doneAdding(bool parametersChanged) {
 void CompoundTransformerNetwork::ensureOrders() const {
   if (m_ordersValid)
     return;
-  m_orders.clear();
+  m_orders->clear();
   NetworkSorter sorter(m_nodes.size());
   for (const auto& [name, output] : m_outputNodes)
-    m_orders.emplace_hint(m_orders.end(), name, sorter.sort(*output));
+    m_orders->emplace_hint(m_orders->end(), name, sorter.sort(*output));
   m_ordersValid = true;
+}
+
+bool CompoundTransformerNetwork::getIsInUse() const {
+  return !m_listeners->isEmpty();
 }
 
 void CompoundTransformerNetwork::forgetOrders() {
@@ -166,7 +173,7 @@ bool CompoundTransformerNetwork::removeNode(SubDocNetworkObj* node) {
     m_nodesByNumber.erase(number);
   m_numbers.remove(node);
   m_nodes.remove(node);
-  m_orders.clear();
+  m_orders->clear();
   forgetOrders();
   delete node;
   onNetworkChanged(false);
@@ -225,7 +232,7 @@ bool rename(std::map<QString, Node*>& nodes, QStringList& names, const QString& 
 bool CompoundTransformerNetwork::renameInput(const QString& oldName, const QString& newName) {
   if (!rename(m_inputNodes, m_inputs, oldName, newName))
     return false;
-  m_listeners.tellAll(
+  m_listeners->tellAll(
       [&](CompoundTransformerNetworkListener& listener) { listener.renameIONode(true, oldName, newName); });
   onNetworkChanged(false);
   return true;
@@ -235,7 +242,7 @@ bool CompoundTransformerNetwork::renameOutput(const QString& oldName, const QStr
   if (!rename(m_outputNodes, m_outputs, oldName, newName))
     return false;
   forgetOrders();
-  m_listeners.tellAll(
+  m_listeners->tellAll(
       [&](CompoundTransformerNetworkListener& listener) { listener.renameIONode(false, oldName, newName); });
   onNetworkChanged(false);
   return true;
@@ -257,7 +264,7 @@ void CompoundTransformerNetwork::clearNodes() {
   m_customTransformers.clear();
   m_parameters.clear();
   m_parameterNames.clear();
-  m_orders.clear();
+  m_orders->clear();
   m_attributeOwner = nullptr;
   m_prototype.reset();
   forgetOrders();
@@ -273,18 +280,18 @@ void CompoundTransformerNetwork::clear() {
 // --- listeners ---------------------------------------------------------------------------------------------
 
 void CompoundTransformerNetwork::addListener(CompoundTransformerNetworkListener* listener) {
-  m_listeners.add(listener);
+  m_listeners->add(listener);
 }
 
 void CompoundTransformerNetwork::removeListener(CompoundTransformerNetworkListener* listener) {
-  m_listeners.remove(listener);
+  m_listeners->remove(listener);
 }
 
 void CompoundTransformerNetwork::onNetworkChanged(bool parametersChanged) {
   m_attributeOwner = nullptr;
   if (parametersChanged)
     m_prototype.reset();
-  m_listeners.tellAll([parametersChanged](CompoundTransformerNetworkListener& listener) {
+  m_listeners->tellAll([parametersChanged](CompoundTransformerNetworkListener& listener) {
     listener.networkChanged(parametersChanged);
   });
 }

@@ -11,8 +11,6 @@
 #include <platform/Export.h>
 #include <transform/custom/AttributePropogationMode.h>
 #include <transform/custom/CompoundTransformerParm.h>
-#include <transform/custom/NetworkListeners.h>
-#include <transform/custom/NetworkOrder.h>
 #include <transform/custom/ParallelSettings.h>
 
 #include <QHash>
@@ -28,6 +26,8 @@
 #include <vector>
 
 class CompoundTransformerNetworkListener;
+class NetworkListeners;
+struct NetworkOrder;
 class InnerTransformerListener;
 class MFBuffer;
 class SubDocNetworkObj;
@@ -135,7 +135,7 @@ class ORX_EXPORT CompoundTransformerNetwork {
 
   void addListener(CompoundTransformerNetworkListener* listener);
   void removeListener(CompoundTransformerNetworkListener* listener);
-  bool getIsInUse() const { return !m_listeners.isEmpty(); }
+  bool getIsInUse() const;
 
   // --- queries ---------------------------------------------------------------------------------------------
 
@@ -232,10 +232,10 @@ class ORX_EXPORT CompoundTransformerNetwork {
   std::uint32_t m_nextSerial = 0;
   QHash<QString, CompoundTransformerParm> m_parameters;
   QStringList m_parameterNames;
-  NetworkListeners m_listeners;
+  std::unique_ptr<NetworkListeners> m_listeners;
 
   mutable bool m_ordersValid = false;
-  mutable std::map<QString, NetworkOrder> m_orders;  // by output
+  std::unique_ptr<std::map<QString, NetworkOrder>> m_orders;  // by output
   const TransformerCfg* m_attributeOwner = nullptr;
   std::unique_ptr<InnerTransformerListener> m_innerListener;
   mutable std::unique_ptr<AttributeMemo> m_memo;  // of the nested query under way

@@ -1,7 +1,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/custom/CustomTransformerStatement.h>
 #include <transform/custom/ExternalDocNetwork.h>
+#include <transform/custom/instance/CustomTransformerStatement.h>
 
 namespace {
 

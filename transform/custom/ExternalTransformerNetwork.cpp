@@ -2,9 +2,9 @@
 #include <platform/orxutil/Decipher.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/custom/CustomMessages.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/SubDocumentLibrary.h>
+#include <transform/custom/linked/CustomMessages.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/TransformerRecords.h>

@@ -2,9 +2,9 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/custom/CustomMessages.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/linked/CustomMessages.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 

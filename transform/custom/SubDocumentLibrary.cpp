@@ -1,10 +1,10 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
-#include <transform/custom/CustomMessages.h>
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
+#include <transform/custom/linked/CustomMessages.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/IXMLComponentReader.h>
 

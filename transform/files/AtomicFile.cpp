@@ -1,6 +1,6 @@
 #include <platform/qorxcore/Local8Bit.h>
 #include <transform/files/AtomicFile.h>
-#include <transform/files/OutputPlace.h>
+#include <transform/files/output/OutputPlace.h>
 
 #include <QRandomGenerator>
 

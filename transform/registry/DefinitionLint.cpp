@@ -1,14 +1,14 @@
 #include <platform/qorxcore/OrxHome.h>
 #include <transform/files/FolderListing.h>
-#include <transform/registry/CompanionLint.h>
-#include <transform/registry/DefinitionFileNames.h>
-#include <transform/registry/DefinitionFileParser.h>
 #include <transform/registry/DefinitionLint.h>
-#include <transform/registry/HeaderLint.h>
-#include <transform/registry/LintedDefinition.h>
-#include <transform/registry/ParameterLint.h>
-#include <transform/registry/ScriptLint.h>
-#include <transform/registry/TemplateLint.h>
+#include <transform/registry/lint/CompanionLint.h>
+#include <transform/registry/lint/HeaderLint.h>
+#include <transform/registry/lint/LintedDefinition.h>
+#include <transform/registry/lint/ParameterLint.h>
+#include <transform/registry/lint/ScriptLint.h>
+#include <transform/registry/lint/TemplateLint.h>
+#include <transform/registry/loading/DefinitionFileNames.h>
+#include <transform/registry/loading/DefinitionFileParser.h>
 #include <transform/workspace/XMLComponentReader.h>
 
 #include <QDir>

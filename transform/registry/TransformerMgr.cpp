@@ -5,12 +5,13 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
-#include <transform/registry/CategoryTexts.h>
-#include <transform/registry/CustomTransformerFiles.h>
-#include <transform/registry/DefinitionLoader.h>
-#include <transform/registry/ExceptionList.h>
-#include <transform/registry/NamedConnections.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/registry/catalogue/CategoryTexts.h>
+#include <transform/registry/catalogue/PrototypeTable.h>
+#include <transform/registry/loading/CustomTransformerFiles.h>
+#include <transform/registry/loading/DefinitionLoader.h>
+#include <transform/registry/loading/ExceptionList.h>
+#include <transform/registry/loading/NamedConnections.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QHash>
@@ -58,6 +59,7 @@ TransformerMgr& TransformerMgr::getTransformerMgr() {
 
 TransformerMgr::TransformerMgr()
     : m_customFiles(std::make_unique<CustomTransformerFiles>()),
+      m_prototypes(std::make_unique<PrototypeTable>()),
       m_categories(std::make_unique<CategoryTexts>()),
       m_exceptions(std::make_unique<ExceptionList>()),
       m_connections(std::make_unique<NamedConnections>()) {}
@@ -66,7 +68,7 @@ TransformerMgr::~TransformerMgr() = default;
 
 void TransformerMgr::reset() {
   m_loaded = false;
-  m_prototypes = PrototypeTable();
+  *m_prototypes = PrototypeTable();
   m_customFiles->reset();
   m_iteration = 0;
   *m_categories = CategoryTexts();
@@ -85,8 +87,7 @@ void TransformerMgr::loadTransformers(IORXSession* session) {
     m_exceptions->readFromHome();
   }
   m_errors += m_connections->readAll();
-  loadFolders(
-      std::make_shared<const CatalogueEntry::Load>(CatalogueEntry::Load{session, this, QORXLanguage()}));
+  loadFolders(std::make_shared<const DefinitionLoad>(DefinitionLoad{session, this, QORXLanguage()}));
   m_loaded = true;
 }
 
@@ -94,8 +95,8 @@ void TransformerMgr::reloadCustomTransformers() {
   loadFolders(nullptr);
 }
 
-void TransformerMgr::loadFolders(const std::shared_ptr<const CatalogueEntry::Load>& load) {
-  DefinitionLoader loader(m_prototypes, *m_categories, *m_exceptions, load, [this](const QString& path) {
+void TransformerMgr::loadFolders(const std::shared_ptr<const DefinitionLoad>& load) {
+  DefinitionLoader loader(*m_prototypes, *m_categories, *m_exceptions, load, [this](const QString& path) {
     loadCustomTransformer(path, NEWEST_VERSION, false);
   });
   for (const QString& folder :
@@ -119,7 +120,7 @@ void TransformerMgr::loadCustomTransformer(const QString& path, int version, boo
     noteIgnored({path, opened.name, opened.version, QString(), false});
   if (!opened.network)
     return;
-  const CatalogueEntry* kept = m_prototypes.find(opened.name, opened.version);
+  const CatalogueEntry* kept = m_prototypes->find(opened.name, opened.version);
   if (kept && !replaces) {
     if (kept->fileName() != path)
       noteIgnored({path, opened.name, opened.version, kept->fileName(), true});
@@ -133,7 +134,7 @@ void TransformerMgr::loadCustomTransformer(const QString& path, int version, boo
   const PrototypeTable::Place place{prototype->getName(), prototype->getVersion(), prototype->tags(),
                                     prototype->isVisible(), QStringList()};
   bool isNewest = false;
-  m_prototypes.add(place, CatalogueEntry(std::move(prototype)), &isNewest);
+  m_prototypes->add(place, CatalogueEntry(std::move(prototype)), &isNewest);
   if (isNewest || m_customFiles->fileOf(opened.name).isEmpty())
     m_customFiles->noteFile(opened.name, path);
 }
@@ -152,24 +153,24 @@ void TransformerMgr::loadOnDemand(const QString& name, int version) {
     return;
   if (version != OLDEST_VERSION) {
     loadCustomTransformer(path, version, false);
-    if (version == 0 && !m_prototypes.find(name, 0))
+    if (version == 0 && !m_prototypes->find(name, 0))
       loadCustomTransformer(path, 1, false);
     return;
   }
-  const CatalogueEntry* oldest = m_prototypes.oldest(name);
+  const CatalogueEntry* oldest = m_prototypes->oldest(name);
   for (const int older : m_customFiles->versionsOf(name)) {
     if (older < 0)
       continue;
     if (oldest && older >= oldest->version())
       return;
     loadCustomTransformer(path, older, false);
-    if (m_prototypes.find(name, older))
+    if (m_prototypes->find(name, older))
       return;
   }
 }
 
 void TransformerMgr::getDefinitionFileName(const IORXString& name, IORXString& fileName) const {
-  const CatalogueEntry* newest = m_prototypes.newest(ORXToQString(name));
+  const CatalogueEntry* newest = m_prototypes->newest(ORXToQString(name));
   ORXAssign(fileName, newest ? newest->fileName() : QString());
 }
 
@@ -178,15 +179,15 @@ ITransformerCfg* TransformerMgr::getTransformer(const IORXString& name, int vers
 }
 
 const CatalogueEntry* TransformerMgr::findEntry(const QString& name, int version) const {
-  return version == NEWEST_VERSION   ? m_prototypes.newest(name)
-         : version == OLDEST_VERSION ? m_prototypes.oldest(name)
-                                     : m_prototypes.find(name, version);
+  return version == NEWEST_VERSION   ? m_prototypes->newest(name)
+         : version == OLDEST_VERSION ? m_prototypes->oldest(name)
+                                     : m_prototypes->find(name, version);
 }
 
 std::unique_ptr<TransformerCfg> TransformerMgr::copyOf(const QString& name, int version) const {
   const CatalogueEntry* entry = findEntry(name, version);
   if (!entry && version == 0 && !m_customFiles->fileOf(name).isEmpty())
-    entry = m_prototypes.find(name, 1);  // the first version of a custom transformer is called either way
+    entry = m_prototypes->find(name, 1);  // the first version of a custom transformer is called either way
   if (!entry)
     return nullptr;
   std::unique_ptr<TransformerCfg> copy(entry->prototype().getCopy());
@@ -205,9 +206,9 @@ std::unique_ptr<TransformerCfg> TransformerMgr::makeTransformer(const QString& n
   std::unique_ptr<TransformerCfg> copy = copyOf(name, version);
   // An alias may lead to another alias; a circle of them leads nowhere.
   QSet<QString> followed;
-  for (QString alias = name; !copy && m_prototypes.isAlias(alias) && !followed.contains(alias);) {
+  for (QString alias = name; !copy && m_prototypes->isAlias(alias) && !followed.contains(alias);) {
     followed.insert(alias);
-    alias = m_prototypes.nameOfAlias(alias);
+    alias = m_prototypes->nameOfAlias(alias);
     if (version == OLDEST_VERSION || !findEntry(alias, version))
       loadOnDemand(alias, version);
     copy = copyOf(alias, version);
@@ -231,11 +232,12 @@ TransformerCfg* TransformerMgr::getTransformer(const QString& name, int version)
 
 bool TransformerMgr::transformerExists(const QString& name, int version) const {
   QSet<QString> followed;
-  for (QString asked = name;; asked = m_prototypes.nameOfAlias(asked)) {
-    if (isAnyVersion(version) ? m_prototypes.contains(asked) : m_prototypes.find(asked, version) != nullptr) {
+  for (QString asked = name;; asked = m_prototypes->nameOfAlias(asked)) {
+    if (isAnyVersion(version) ? m_prototypes->contains(asked)
+                              : m_prototypes->find(asked, version) != nullptr) {
       return true;
     }
-    if (followed.contains(asked) || !m_prototypes.isAlias(asked)) {
+    if (followed.contains(asked) || !m_prototypes->isAlias(asked)) {
       return false;
     }
     followed.insert(asked);
@@ -243,13 +245,13 @@ bool TransformerMgr::transformerExists(const QString& name, int version) const {
 }
 
 int TransformerMgr::currentTransformerVersion(const QString& name) const {
-  const CatalogueEntry* newest = m_prototypes.newest(name);
+  const CatalogueEntry* newest = m_prototypes->newest(name);
   return newest ? newest->version() : -1;
 }
 
 QList<int> TransformerMgr::transformerVersions(const QString& name) const {
   QList<int> result = m_customFiles->versionsOf(name);
-  if (const PrototypeTable::Versions* versions = m_prototypes.versions(name)) {
+  if (const PrototypeTable::Versions* versions = m_prototypes->versions(name)) {
     for (const auto& [version, entry] : *versions) {
       result.append(version);
     }
@@ -261,8 +263,8 @@ QList<int> TransformerMgr::transformerVersions(const QString& name) const {
 
 TransformerCfg* TransformerMgr::getTransformerWithGUID(const QString& guid) const {
   // By name and version, so that the answer does not depend on a hash.
-  for (const QString& name : m_prototypes.names()) {
-    for (const auto& [version, entry] : *m_prototypes.versions(name)) {
+  for (const QString& name : m_prototypes->names()) {
+    for (const auto& [version, entry] : *m_prototypes->versions(name)) {
       if (entry.prototype().getGUID() == guid) {
         return entry.prototype().getCopy();
       }
@@ -284,24 +286,40 @@ TransformerCfg* TransformerMgr::deserialize(const QString& text) {
 }
 
 TransformerCfg* TransformerMgr::getNextTransformer() {
-  const QStringList& names = m_prototypes.names();
+  const QStringList& names = m_prototypes->names();
   return m_iteration < names.size() ? getTransformer(names.at(m_iteration++), NEWEST_VERSION) : nullptr;
 }
 
+QString TransformerMgr::getTransformerNameFromAlias(const QString& alias) const {
+  return m_prototypes->nameOfAlias(alias);
+}
+
+const QStringList& TransformerMgr::transformerNames() const {
+  return m_prototypes->names();
+}
+
+const QStringList& TransformerMgr::visibleTransformerNames() const {
+  return m_prototypes->visibleNames();
+}
+
 bool TransformerMgr::isVisibleAlias(const QString& alias) const {
-  return m_prototypes.isVisibleAlias(alias);
+  return m_prototypes->isVisibleAlias(alias);
 }
 
 QStringList TransformerMgr::getVisibleTransformerAliases() const {
-  return m_prototypes.aliasesOfVisible();
+  return m_prototypes->aliasesOfVisible();
+}
+
+QStringList TransformerMgr::getCategories() const {
+  return m_prototypes->categories();
 }
 
 void TransformerMgr::getCategories(IORXStringArray& categories) const {
-  ORXAssign(categories, m_prototypes.categories());
+  ORXAssign(categories, m_prototypes->categories());
 }
 
 QStringList TransformerMgr::getCategoryTransformers(const QString& category) const {
-  return m_prototypes.namesOf(getCategoryNameFromLocalizedCategoryName(category));
+  return m_prototypes->namesOf(getCategoryNameFromLocalizedCategoryName(category));
 }
 
 bool TransformerMgr::getCategoryDesc(const QString& category, QStringList& lines) const {

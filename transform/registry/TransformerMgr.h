@@ -18,7 +18,6 @@
 #include <platform/Export.h>
 #include <transform/core/TransformerSource.h>
 #include <transform/registry/ITransformerMgr.h>
-#include <transform/registry/PrototypeTable.h>
 
 #include <QList>
 #include <QSet>
@@ -29,12 +28,15 @@
 #include <memory>
 #include <vector>
 
+class CatalogueEntry;
 class CategoryTexts;
 class CustomTransformerFiles;
 class ExceptionList;
 class IORXStringArray;
 class NamedConnections;
+class PrototypeTable;
 class TransformerCfg;
+struct DefinitionLoad;
 
 class ORX_EXPORT TransformerMgr : public ITransformerMgr,
                                   public TransformerSource,
@@ -87,11 +89,11 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   // By order of first registration, newest version each; null after the last. Owned by the caller.
   TransformerCfg* getNextTransformer();
 
-  QString getTransformerNameFromAlias(const QString& alias) const { return m_prototypes.nameOfAlias(alias); }
+  QString getTransformerNameFromAlias(const QString& alias) const;
   bool isVisibleAlias(const QString& alias) const;
   QStringList getVisibleTransformerAliases() const;
   // In order of first appearance.
-  QStringList getCategories() const { return m_prototypes.categories(); }
+  QStringList getCategories() const;
   void getCategories(IORXStringArray& categories) const;
   // `category` may be the localised name.
   QStringList getCategoryTransformers(const QString& category) const;
@@ -101,8 +103,8 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
 
   const std::list<IgnoredTransformer>& ignoredTransformers() const { return m_ignored; }
   // In order of first registration.
-  const QStringList& transformerNames() const { return m_prototypes.names(); }
-  const QStringList& visibleTransformerNames() const { return m_prototypes.visibleNames(); }
+  const QStringList& transformerNames() const;
+  const QStringList& visibleTransformerNames() const;
   // From the lowest up; empty for an unknown name. Aliases are not followed. Those that stand in a custom
   // transformer's file and are loaded on demand count, also when they need a newer build.
   QList<int> transformerVersions(const QString& name) const;
@@ -138,7 +140,7 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   ~TransformerMgr() override;
 
   void reset();
-  void loadFolders(const std::shared_ptr<const CatalogueEntry::Load>& load);
+  void loadFolders(const std::shared_ptr<const DefinitionLoad>& load);
   // `replaces` lets it take the place of a definition of the same name and version.
   void loadCustomTransformer(const QString& path, int version, bool replaces);
   // Each refusal is listed once, however often it is met.
@@ -151,7 +153,7 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   void addChanges(std::vector<VersionChanges>& changes, const QString& name, qint64 first, int last) const;
 
   std::unique_ptr<CustomTransformerFiles> m_customFiles;  // outlives the prototypes, which listen to networks
-  PrototypeTable m_prototypes;
+  std::unique_ptr<PrototypeTable> m_prototypes;
   int m_iteration = 0;
   std::unique_ptr<CategoryTexts> m_categories;
   QStringList m_errors;

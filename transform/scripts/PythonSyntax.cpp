@@ -1,4 +1,4 @@
-#include <transform/registry/PythonSyntax.h>
+#include <transform/scripts/PythonSyntax.h>
 
 #include <QJsonArray>
 #include <QJsonDocument>

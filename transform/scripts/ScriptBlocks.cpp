@@ -1,7 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MappingFileKeywords.h>
-#include <transform/text/ScriptBlocks.h>
 #include <transform/text/TextHelpers.h>
 
 #include <algorithm>

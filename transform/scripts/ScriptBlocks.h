@@ -1,6 +1,8 @@
 // The bodies of the script blocks, as they are written into the mapping file.
 #pragma once
 
+#include <platform/Export.h>
+
 #include <QString>
 #include <QStringList>
 #include <QVector>
@@ -23,3 +25,17 @@ struct ScriptKey {
 };
 QVector<ScriptKey> redirectedPythonKeys(const QString& line);
 QVector<ScriptKey> redirectedTclKeys(const QString& line);
+
+// Whether the block that getPythonParameterLines() writes for these arguments means what the script says.
+// False, with a message for the user in `reason`, when a name or the code would break out of the block, or
+// the block would compute something else: an empty script, a text of several lines, a backslash continuation
+// over more than two lines, a last line that is the end of a statement begun above it or no expression. This
+// looks at the line structure; it does not replace Python's own check of the syntax. A caller gives an unset
+// parameter no script.
+ORX_EXPORT bool canWritePythonParameter(const QString& prefix, const QString& parameterName,
+                                        const QString& encodedCode, QString& reason);
+
+// The same for getTclParameterLines(); the code is parsed by the Tcl library. An empty script is fine: its
+// value is empty.
+ORX_EXPORT bool canWriteTclParameter(const QString& prefix, const QString& parameterName,
+                                     const QString& encodedCode, QString& reason);

@@ -1,4 +1,4 @@
-#include <transform/registry/TclSyntax.h>
+#include <transform/scripts/TclSyntax.h>
 
 #include <QByteArray>
 #include <QVector>

@@ -1,6 +1,6 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
-#include <transform/specialised/SpecialisedValues.h>
+#include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 
 namespace {

@@ -1,6 +1,6 @@
 #include <transform/specialised/ChartGeneratorTransformerCfg.h>
-#include <transform/specialised/ParameterTable.h>
-#include <transform/specialised/SpecialisedValues.h>
+#include <transform/specialised/values/ParameterTable.h>
+#include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 

@@ -1,8 +1,8 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
 #include <transform/specialised/ExpressionEvaluatorCfg.h>
-#include <transform/specialised/Formula.h>
-#include <transform/specialised/SpecialisedValues.h>
+#include <transform/specialised/values/Formula.h>
+#include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {

@@ -2,7 +2,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/WorkspaceParameterDirectory.h>
 #include <transform/specialised/ParameterFetcherTransformerCfg.h>
-#include <transform/specialised/SpecialisedValues.h>
+#include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>

@@ -1,7 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/specialised/ParameterTable.h>
 #include <transform/specialised/ReportGeneratorTransformerCfg.h>
-#include <transform/specialised/SpecialisedValues.h>
+#include <transform/specialised/values/ParameterTable.h>
+#include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 

@@ -1,8 +1,8 @@
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/specialised/Formula.h>
-#include <transform/specialised/ParameterTable.h>
-#include <transform/specialised/SpecialisedValues.h>
 #include <transform/specialised/TesterTransformerCfg.h>
+#include <transform/specialised/values/Formula.h>
+#include <transform/specialised/values/ParameterTable.h>
+#include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 

@@ -1,10 +1,10 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/GenerationKeywords.h>
-#include <transform/specialised/FactoryOption.h>
-#include <transform/specialised/ParameterTable.h>
-#include <transform/specialised/SpecialisedValues.h>
 #include <transform/specialised/ValueMapperTransformerCfg.h>
+#include <transform/specialised/values/FactoryOption.h>
+#include <transform/specialised/values/ParameterTable.h>
+#include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 

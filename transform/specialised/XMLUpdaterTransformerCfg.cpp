@@ -1,9 +1,9 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
-#include <transform/specialised/ParameterTable.h>
-#include <transform/specialised/SpecialisedValues.h>
-#include <transform/specialised/TemplateText.h>
 #include <transform/specialised/XMLUpdaterTransformerCfg.h>
+#include <transform/specialised/values/ParameterTable.h>
+#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/values/TemplateText.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 

@@ -53,24 +53,10 @@ ORX_EXPORT bool decodePortDescription(const QString& description, bool& isFeatur
 // macro of a custom transformer's instance, or empty; with one, the lookups of ORX_MacroValues read the
 // instance's macros, those of the built-in macros excepted. `encodedCode` is word-encoded. The last line that
 // is neither blank nor a comment gives the value. Whatever is given is written; ask canWritePythonParameter()
-// first.
+// (transform/scripts/ScriptBlocks.h) first. Both are defined on the floor of the scripts.
 ORX_EXPORT void getPythonParameterLines(const QString& prefix, const QString& parameterName,
                                         const QString& encodedCode, QStringList& lines);
 
 // The same for a Tcl procedure body; every line loses the blanks around it.
 ORX_EXPORT void getTclParameterLines(const QString& prefix, const QString& parameterName,
                                      const QString& encodedCode, QStringList& lines);
-
-// Whether the block that getPythonParameterLines() writes for these arguments means what the script says.
-// False, with a message for the user in `reason`, when a name or the code would break out of the block, or
-// the block would compute something else: an empty script, a text of several lines, a backslash continuation
-// over more than two lines, a last line that is the end of a statement begun above it or no expression. This
-// looks at the line structure; it does not replace Python's own check of the syntax. A caller gives an unset
-// parameter no script.
-ORX_EXPORT bool canWritePythonParameter(const QString& prefix, const QString& parameterName,
-                                        const QString& encodedCode, QString& reason);
-
-// The same for getTclParameterLines(); the code is parsed by the Tcl library. An empty script is fine: its
-// value is empty.
-ORX_EXPORT bool canWriteTclParameter(const QString& prefix, const QString& parameterName,
-                                     const QString& encodedCode, QString& reason);

@@ -1,10 +1,10 @@
 #include <platform/orxutil/Decipher.h>
 #include <transform/files/AtomicFile.h>
 #include <transform/files/TemporaryFile.h>
-#include <transform/workspace/FileLines.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/reading/FileLines.h>
 
 #include <QBuffer>
 #include <QFile>

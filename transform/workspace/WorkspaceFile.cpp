@@ -1,15 +1,15 @@
 #include <platform/vtl/SystemEncoding.h>
 #include <transform/files/AtomicFile.h>
-#include <transform/workspace/CommentLineDevice.h>
-#include <transform/workspace/DecodedInputSource.h>
-#include <transform/workspace/DocumentMessages.h>
-#include <transform/workspace/FileLines.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceFile.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
-#include <transform/workspace/WorkspaceSplitter.h>
 #include <transform/workspace/XMLComponentReader.h>
+#include <transform/workspace/reading/DecodedInputSource.h>
+#include <transform/workspace/reading/DocumentMessages.h>
+#include <transform/workspace/reading/FileLines.h>
+#include <transform/workspace/reading/WorkspaceSplitter.h>
+#include <transform/workspace/writing/CommentLineDevice.h>
 
 #include <QBuffer>
 #include <QTextCodec>

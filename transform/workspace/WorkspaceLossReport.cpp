@@ -1,16 +1,18 @@
-#include <transform/workspace/DocumentMessages.h>
-#include <transform/workspace/LossCollector.h>
 #include <transform/workspace/WorkspaceLossReport.h>
+#include <transform/workspace/reading/DocumentMessages.h>
+#include <transform/workspace/reading/XORXDOMParser.h>
+#include <transform/workspace/records/ElementTable.h>
+#include <transform/workspace/writing/LossCollector.h>
 
 namespace {
 
-WorkspaceLossReport::Kind kindOf(XORXDOMParser::Content content) {
+WorkspaceLossReport::Kind kindOf(LeftOutContent::Kind content) {
   switch (content) {
-    case XORXDOMParser::Content::Comment:
+    case LeftOutContent::Kind::Comment:
       return WorkspaceLossReport::Kind::Comment;
-    case XORXDOMParser::Content::Instruction:
+    case LeftOutContent::Kind::Instruction:
       return WorkspaceLossReport::Kind::Instruction;
-    case XORXDOMParser::Content::Text:
+    case LeftOutContent::Kind::Text:
       break;
   }
   return WorkspaceLossReport::Kind::Text;
@@ -21,8 +23,8 @@ WorkspaceLossReport::Kind kindOf(XORXDOMParser::Content content) {
 WorkspaceLossReport::WorkspaceLossReport(const XMLComponentReader& reader) {
   if (reader.getElements().size() > 0)
     LossCollector(reader.getElements(), m_losses).document(0);
-  for (const XORXDOMParser::LeftOut& entry : reader.getLeftOutContent())
-    m_losses.push_back({kindOf(entry.content), entry.line, QString(), QString(), QString()});
+  for (const LeftOutContent& entry : reader.getLeftOutContent())
+    m_losses.push_back({kindOf(entry.kind), entry.line, QString(), QString(), QString()});
   std::stable_sort(m_losses.begin(), m_losses.end(),
                    [](const Loss& left, const Loss& right) { return left.line < right.line; });
 }

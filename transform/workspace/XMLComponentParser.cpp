@@ -1,15 +1,17 @@
 #include <platform/qorxcore/Local8Bit.h>
 #include <transform/files/TemporaryFile.h>
-#include <transform/workspace/DecodedInputSource.h>
-#include <transform/workspace/DocumentMessages.h>
-#include <transform/workspace/FileLines.h>
 #include <transform/workspace/PlainFile.h>
-#include <transform/workspace/ValueText.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
-#include <transform/workspace/WorkspaceSplitter.h>
 #include <transform/workspace/XMLComponentParser.h>
-#include <transform/workspace/XercesPlatform.h>
-#include <transform/workspace/XmlText.h>
+#include <transform/workspace/reading/DecodedInputSource.h>
+#include <transform/workspace/reading/DocumentMessages.h>
+#include <transform/workspace/reading/FileLines.h>
+#include <transform/workspace/reading/WorkspaceSplitter.h>
+#include <transform/workspace/reading/XORXDOMParser.h>
+#include <transform/workspace/reading/XercesPlatform.h>
+#include <transform/workspace/records/ElementTable.h>
+#include <transform/workspace/records/ValueText.h>
+#include <transform/workspace/writing/XmlText.h>
 
 #include <QBuffer>
 #include <QFile>
@@ -106,7 +108,8 @@ std::unique_ptr<IXMLComponentParser> IXMLComponentParser::create() {
   return std::make_unique<XMLComponentParser>();
 }
 
-XMLComponentParser::XMLComponentParser() {
+XMLComponentParser::XMLComponentParser()
+    : m_elements(std::make_unique<ElementTable>()), m_map(std::make_unique<LineMap>()) {
   ensureXercesPlatform();
   m_parser = std::make_unique<XORXDOMParser>();
 }
@@ -181,8 +184,8 @@ void XMLComponentParser::splitAndParse(WorkspaceSplitter& splitter, QIODevice& i
 
 void XMLComponentParser::forgetDocument() {
   m_root = nullptr;
-  m_elements = ElementTable();
-  m_map = LineMap();
+  *m_elements = ElementTable();
+  *m_map = LineMap();
   m_parser->forget();
   m_parser->resetDocumentPool();
   documentForgotten();
@@ -252,15 +255,15 @@ void XMLComponentParser::parseGuarded(QIODevice& device, const LineMap& map) {
   if (guard.hasRefused())
     throw placedError(guard.refusal(), map.fileLine(guard.line()), guard.column());
   m_root = m_parser->getDocument() ? m_parser->getDocument()->getDocumentElement() : nullptr;
-  m_map = map;
-  m_elements = m_parser->takeElements();
-  m_elements.setLines(guard.elementLines(), map);
+  *m_map = map;
+  *m_elements = m_parser->takeElements();
+  m_elements->setLines(guard.elementLines(), map);
 }
 
-std::vector<XORXDOMParser::LeftOut> XMLComponentParser::getLeftOutContent() const {
-  std::vector<XORXDOMParser::LeftOut> entries = m_parser->leftOut();
+std::vector<LeftOutContent> XMLComponentParser::getLeftOutContent() const {
+  std::vector<LeftOutContent> entries = m_parser->leftOut();
   for (auto& entry : entries)
-    entry.line = m_map.fileLine(entry.line);
+    entry.line = m_map->fileLine(entry.line);
   return entries;
 }
 

@@ -1,17 +1,22 @@
 // The parser level of the reader: owns one XML parser and the root element of its last parse.
 #pragma once
 
-#include <transform/workspace/ElementTable.h>
 #include <transform/workspace/IXMLComponentParser.h>
-#include <transform/workspace/XORXDOMParser.h>
 
 #include <QPointF>
 #include <QRectF>
 #include <QSizeF>
 #include <QStringList>
 
+#include <memory>
+#include <vector>
+
+class ElementTable;
+class LineMap;
 class QIODevice;
 class WorkspaceSplitter;
+class XORXDOMParser;
+struct LeftOutContent;
 
 class ORX_EXPORT XMLComponentParser : public virtual IXMLComponentParser {
  public:
@@ -39,8 +44,8 @@ class ORX_EXPORT XMLComponentParser : public virtual IXMLComponentParser {
   QStringList getAttrColour(const QString& name, Node* element) const;
 
   // What the parser left out of the tree, with the line of the file.
-  std::vector<XORXDOMParser::LeftOut> getLeftOutContent() const;
-  const ElementTable& getElements() const { return m_elements; }
+  std::vector<LeftOutContent> getLeftOutContent() const;
+  const ElementTable& getElements() const { return *m_elements; }
 
  protected:
   // Parses what the device holds from where it stands; `map` leads from its lines to those of the file. The
@@ -61,6 +66,6 @@ class ORX_EXPORT XMLComponentParser : public virtual IXMLComponentParser {
 
   std::unique_ptr<XORXDOMParser> m_parser;
   Node* m_root = nullptr;
-  ElementTable m_elements;
-  LineMap m_map;
+  std::unique_ptr<ElementTable> m_elements;
+  std::unique_ptr<LineMap> m_map;
 };

@@ -1,10 +1,11 @@
 #include <transform/files/TemporaryFile.h>
 #include <transform/workspace/PlainFile.h>
-#include <transform/workspace/RecordReader.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
-#include <transform/workspace/WorkspaceSplitter.h>
 #include <transform/workspace/XMLComponentReader.h>
+#include <transform/workspace/reading/WorkspaceSplitter.h>
+#include <transform/workspace/records/ElementTable.h>
+#include <transform/workspace/records/RecordReader.h>
 
 #include <QBuffer>
 #include <QFile>

@@ -1,9 +1,9 @@
 #include <platform/vtl/SystemEncoding.h>
-#include <transform/workspace/DocumentLimits.h>
-#include <transform/workspace/ElementText.h>
-#include <transform/workspace/RecordCheck.h>
 #include <transform/workspace/XMLComponentWriter.h>
-#include <transform/workspace/XmlText.h>
+#include <transform/workspace/reading/DocumentLimits.h>
+#include <transform/workspace/records/RecordCheck.h>
+#include <transform/workspace/writing/ElementText.h>
+#include <transform/workspace/writing/XmlText.h>
 
 #include <QTextCodec>
 

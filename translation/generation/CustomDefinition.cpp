@@ -16,13 +16,13 @@
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
-#include <translation/CustomDefinition.h>
-#include <translation/FlowNames.h>
-#include <translation/FlowOrder.h>
-#include <translation/InnerNames.h>
-#include <translation/InstanceIdentity.h>
-#include <translation/MFDeviceBuffer.h>
-#include <translation/RouteStatement.h>
+#include <translation/generation/CustomDefinition.h>
+#include <translation/generation/FlowNames.h>
+#include <translation/generation/MFDeviceBuffer.h>
+#include <translation/generation/RouteStatement.h>
+#include <translation/graph/FlowOrder.h>
+#include <translation/graph/InnerNames.h>
+#include <translation/graph/InstanceIdentity.h>
 
 #include <QBuffer>
 #include <QSet>

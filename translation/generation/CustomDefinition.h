@@ -5,10 +5,9 @@
 // macro, and published parameters are read as "$($(PREFIX)_NAME)".
 #pragma once
 
-#include <platform/Export.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <translation/Diagnostics.h>
-#include <translation/InnerAttributes.h>
+#include <translation/graph/InnerAttributes.h>
 
 #include <QByteArray>
 #include <QHash>
@@ -24,7 +23,7 @@ class SubDocNetworkObj;
 class SubDocNetworkObjXformer;
 class TransformerCfg;
 
-class ORX_EXPORT CustomDefinition {
+class CustomDefinition {
  public:
   // `network` is not changed: what is written are copies of its transformers. `surroundings` is the listener
   // of the workspace. Neither is owned.

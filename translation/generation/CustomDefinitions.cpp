@@ -1,7 +1,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/NestedNetworks.h>
-#include <translation/CustomDefinitions.h>
+#include <translation/generation/CustomDefinitions.h>
 
 #include <algorithm>
 

@@ -5,9 +5,8 @@
 // instance.
 #pragma once
 
-#include <platform/Export.h>
-#include <translation/CustomDefinition.h>
-#include <translation/InnerAttributes.h>
+#include <translation/generation/CustomDefinition.h>
+#include <translation/graph/InnerAttributes.h>
 
 #include <QHash>
 
@@ -15,7 +14,7 @@
 
 class CompoundTransformerNetwork;
 
-class ORX_EXPORT CustomDefinitions {
+class CustomDefinitions {
  public:
   // `networks` stand each behind those inside it. `surroundings` is the listener of the workspace. Neither is
   // owned.

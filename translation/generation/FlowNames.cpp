@@ -1,6 +1,6 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
-#include <translation/FlowNames.h>
+#include <translation/generation/FlowNames.h>
 
 QString outputFlowName(const TransformerCfg& cfg, const QString& identifier, const QString& tag) {
   const QString name = identifier + QLatin1Char('_') + tag;

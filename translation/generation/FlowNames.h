@@ -2,8 +2,6 @@
 // streams of features mix.
 #pragma once
 
-#include <platform/Export.h>
-
 #include <QHash>
 #include <QString>
 #include <QStringList>
@@ -14,7 +12,7 @@ class TransformerCfg;
 // of a custom transformer's ports are those that its inside uses, so its outputs are named apart from them.
 QString outputFlowName(const TransformerCfg& cfg, const QString& identifier, const QString& tag);
 
-class ORX_EXPORT FlowNames {
+class FlowNames {
  public:
   // `wanted` itself, or with "_2", "_3" and so on behind when it is taken.
   QString claim(const QString& wanted);

@@ -1,4 +1,4 @@
-#include <translation/MFDeviceBuffer.h>
+#include <translation/generation/MFDeviceBuffer.h>
 
 #include <QIODevice>
 

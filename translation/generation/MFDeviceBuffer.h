@@ -1,12 +1,11 @@
 // A mapping-file buffer on any device.
 #pragma once
 
-#include <platform/Export.h>
 #include <transform/text/MFBuffer.h>
 
 class QIODevice;
 
-class ORX_EXPORT MFDeviceBuffer : public MFBuffer {
+class MFDeviceBuffer : public MFBuffer {
  public:
   // The device is open for writing, not owned, and outlives the buffer.
   explicit MFDeviceBuffer(QIODevice& device);

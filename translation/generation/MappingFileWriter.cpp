@@ -8,12 +8,12 @@
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
-#include <translation/FlowNames.h>
-#include <translation/FlowOrder.h>
-#include <translation/InnerNames.h>
-#include <translation/MappingFileWriter.h>
 #include <translation/ProgramVersion.h>
-#include <translation/RouteStatement.h>
+#include <translation/generation/FlowNames.h>
+#include <translation/generation/MappingFileWriter.h>
+#include <translation/generation/RouteStatement.h>
+#include <translation/graph/FlowOrder.h>
+#include <translation/graph/InnerNames.h>
 
 #include <QSet>
 

@@ -1,10 +1,9 @@
 // Writes a workspace as a mapping file. A workspace is written once: writing connects its transformers.
 #pragma once
 
-#include <platform/Export.h>
-#include <translation/CustomDefinitions.h>
 #include <translation/Diagnostics.h>
-#include <translation/Workspace.h>
+#include <translation/generation/CustomDefinitions.h>
+#include <translation/graph/Workspace.h>
 
 #include <QString>
 #include <QStringList>
@@ -14,7 +13,7 @@
 class FlowNames;
 class MFBuffer;
 
-class ORX_EXPORT MappingFileWriter {
+class MappingFileWriter {
  public:
   // Neither is owned.
   MappingFileWriter(Workspace& workspace, Diagnostics& diagnostics);

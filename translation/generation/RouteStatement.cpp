@@ -2,7 +2,7 @@
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
-#include <translation/RouteStatement.h>
+#include <translation/generation/RouteStatement.h>
 
 #include <QSet>
 

@@ -1,4 +1,4 @@
-#include <translation/FlowOrder.h>
+#include <translation/graph/FlowOrder.h>
 
 #include <boost/graph/compressed_sparse_row_graph.hpp>
 #include <boost/graph/strong_components.hpp>

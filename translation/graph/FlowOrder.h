@@ -1,8 +1,6 @@
 // The order in which nodes are written: each behind all that feed it.
 #pragma once
 
-#include <platform/Export.h>
-
 #include <utility>
 #include <vector>
 
@@ -14,4 +12,4 @@ struct FlowOrder {
 // Nodes are numbered from 0 in document order; an edge leads from a feeding node to the node that it feeds.
 // Among nodes that could come next, the one first in the document does. Time and memory grow with nodes and
 // edges; no recursion.
-ORX_EXPORT FlowOrder flowOrder(int nodeCount, const std::vector<std::pair<int, int>>& edges);
+FlowOrder flowOrder(int nodeCount, const std::vector<std::pair<int, int>>& edges);

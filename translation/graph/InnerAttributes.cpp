@@ -3,7 +3,7 @@
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjLoop.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
-#include <translation/InnerAttributes.h>
+#include <translation/graph/InnerAttributes.h>
 
 namespace {
 

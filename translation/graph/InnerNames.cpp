@@ -4,7 +4,7 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MessageStrings.h>
-#include <translation/InnerNames.h>
+#include <translation/graph/InnerNames.h>
 
 #include <vector>
 

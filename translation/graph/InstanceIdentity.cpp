@@ -1,5 +1,5 @@
 #include <platform/qorxcore/qorxcore.h>
-#include <translation/InstanceIdentity.h>
+#include <translation/graph/InstanceIdentity.h>
 
 #include <QUuid>
 

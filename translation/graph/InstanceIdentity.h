@@ -2,11 +2,9 @@
 // same identity wherever and whenever it is translated.
 #pragma once
 
-#include <platform/Export.h>
-
 #include <QString>
 #include <QStringList>
 
 // The stem of unique identifiers: a name-based UUID of the path of sub-document names, the record's
 // identifier and the instance's name, "-" written as "_".
-ORX_EXPORT QString instanceStem(const QStringList& documentPath, int recordIdentifier, const QString& name);
+QString instanceStem(const QStringList& documentPath, int recordIdentifier, const QString& name);

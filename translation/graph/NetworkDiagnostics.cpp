@@ -1,5 +1,5 @@
 #include <transform/custom/ExternalDocNetwork.h>
-#include <translation/NetworkDiagnostics.h>
+#include <translation/graph/NetworkDiagnostics.h>
 
 namespace {
 

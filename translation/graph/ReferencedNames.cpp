@@ -1,7 +1,7 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/text/MFBuffer.h>
-#include <translation/ReferencedNames.h>
+#include <translation/graph/ReferencedNames.h>
 
 #include <algorithm>
 

@@ -2,13 +2,11 @@
 // "$[NAME]", either of them word-encoded, or looked up by a script.
 #pragma once
 
-#include <platform/Export.h>
-
 #include <QSet>
 #include <QString>
 #include <QStringList>
 
-class ORX_EXPORT ReferencedNames {
+class ReferencedNames {
  public:
   void add(const QString& text);
   bool contains(const QString& name) const { return m_names.contains(name); }

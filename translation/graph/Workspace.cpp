@@ -1,6 +1,6 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/SubDocumentLibrary.h>
-#include <translation/Workspace.h>
+#include <translation/graph/Workspace.h>
 
 Workspace::Workspace() = default;
 Workspace::~Workspace() = default;

@@ -4,10 +4,9 @@
 // each in document order.
 #pragma once
 
-#include <platform/Export.h>
 #include <transform/workspace/ParameterLines.h>
 #include <translation/GlobalParameters.h>
-#include <translation/WorkspaceListener.h>
+#include <translation/graph/WorkspaceListener.h>
 
 #include <QHash>
 #include <QString>
@@ -62,7 +61,7 @@ struct AttributeLink {
   QString to;
 };
 
-class ORX_EXPORT Workspace {
+class Workspace {
  public:
   Workspace();
   ~Workspace();

@@ -10,9 +10,9 @@
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
-#include <translation/InstanceIdentity.h>
-#include <translation/NetworkDiagnostics.h>
-#include <translation/WorkspaceBuilder.h>
+#include <translation/graph/InstanceIdentity.h>
+#include <translation/graph/NetworkDiagnostics.h>
+#include <translation/graph/WorkspaceBuilder.h>
 
 namespace {
 

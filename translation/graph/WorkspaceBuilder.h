@@ -2,10 +2,9 @@
 // a diagnostic; the rest is built all the same, so that one run names every fault.
 #pragma once
 
-#include <platform/Export.h>
 #include <transform/custom/TransformerPorts.h>
 #include <translation/Diagnostics.h>
-#include <translation/Workspace.h>
+#include <translation/graph/Workspace.h>
 
 #include <QHash>
 
@@ -18,7 +17,7 @@ struct FeatureTypeStruct;
 struct LinkStruct;
 struct TransformerStruct;
 
-class ORX_EXPORT WorkspaceBuilder {
+class WorkspaceBuilder {
  public:
   // `source` makes the configurations; `parameterValues` gives global parameters another value, by name.
   // Neither `source` nor `diagnostics` is owned.

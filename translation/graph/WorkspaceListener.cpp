@@ -1,5 +1,5 @@
 #include <translation/GlobalParameters.h>
-#include <translation/WorkspaceListener.h>
+#include <translation/graph/WorkspaceListener.h>
 
 bool WorkspaceListener::isScopeParameter(const QString& name) const {
   return m_parameters.find(name) != nullptr;

@@ -1,12 +1,11 @@
 // The listener that a workspace sets on its transformers: it knows the workspace's global parameters.
 #pragma once
 
-#include <platform/Export.h>
 #include <transform/core/ParameterScopeListener.h>
 
 class GlobalParameters;
 
-class ORX_EXPORT WorkspaceListener : public ParameterScopeListener {
+class WorkspaceListener : public ParameterScopeListener {
  public:
   // `parameters` is not owned and must outlive the listener.
   explicit WorkspaceListener(const GlobalParameters& parameters) : m_parameters(parameters) {}

@@ -1,7 +1,7 @@
 #include <transform/text/TextHelpers.h>
-#include <translation/FlowOrder.h>
-#include <translation/MappingFileDefinitions.h>
-#include <translation/MappingFileReport.h>
+#include <translation/graph/FlowOrder.h>
+#include <translation/mappingfile/MappingFileDefinitions.h>
+#include <translation/mappingfile/MappingFileReport.h>
 
 #include <QStringList>
 

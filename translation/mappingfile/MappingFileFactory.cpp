@@ -1,9 +1,9 @@
 #include <transform/core/Keywords.h>
 #include <transform/text/MappingFileKeywords.h>
-#include <translation/MappingFileFactory.h>
-#include <translation/MappingFileFunctions.h>
-#include <translation/MappingFileReader.h>
-#include <translation/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileFactory.h>
+#include <translation/mappingfile/MappingFileFunctions.h>
+#include <translation/mappingfile/MappingFileReader.h>
+#include <translation/mappingfile/MappingFileReport.h>
 
 #include <algorithm>
 

@@ -1,8 +1,8 @@
 // Reads one FACTORY_DEF statement word by word.
 #pragma once
 
-#include <translation/MappingFileFlow.h>
-#include <translation/MappingFileWords.h>
+#include <translation/mappingfile/MappingFileFlow.h>
+#include <translation/mappingfile/MappingFileWords.h>
 
 #include <QString>
 

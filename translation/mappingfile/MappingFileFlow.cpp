@@ -1,6 +1,6 @@
 #include <transform/core/MacroText.h>
-#include <translation/MappingFileFlow.h>
-#include <translation/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileFlow.h>
+#include <translation/mappingfile/MappingFileReport.h>
 
 void MappingFileFlow::addFactory(const QString& name, Role role, int line, MappingFileReport& report) {
   QHash<QString, int>& known = role == Role::Worker ? m_workers : m_factories;

@@ -1,10 +1,10 @@
 #include <platform/qorxcore/qorxcore.h>
-#include <translation/MappingFileFunctions.h>
-#include <translation/MappingFileReader.h>
-#include <translation/MappingFileReferences.h>
-#include <translation/MappingFileReport.h>
-#include <translation/MappingFileScripts.h>
-#include <translation/MappingFileWords.h>
+#include <translation/mappingfile/MappingFileFunctions.h>
+#include <translation/mappingfile/MappingFileReader.h>
+#include <translation/mappingfile/MappingFileReferences.h>
+#include <translation/mappingfile/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileScripts.h>
+#include <translation/mappingfile/MappingFileWords.h>
 
 namespace {
 

@@ -1,9 +1,9 @@
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/text/GlobalMacros.h>
-#include <translation/MappingFileMacros.h>
-#include <translation/MappingFileReader.h>
-#include <translation/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileMacros.h>
+#include <translation/mappingfile/MappingFileReader.h>
+#include <translation/mappingfile/MappingFileReport.h>
 
 #include <cstring>
 #include <utility>

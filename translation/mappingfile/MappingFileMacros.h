@@ -1,7 +1,7 @@
 // The macros that the statements of a mapping file set, and the references to them.
 #pragma once
 
-#include <translation/MappingFileReferences.h>
+#include <translation/mappingfile/MappingFileReferences.h>
 
 #include <QHash>
 #include <QSet>

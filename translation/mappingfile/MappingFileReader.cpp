@@ -1,6 +1,6 @@
 #include <transform/text/MappingFileKeywords.h>
-#include <translation/MappingFileReader.h>
-#include <translation/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileReader.h>
+#include <translation/mappingfile/MappingFileReport.h>
 
 #include <algorithm>
 

@@ -1,4 +1,4 @@
-#include <translation/MappingFileReferences.h>
+#include <translation/mappingfile/MappingFileReferences.h>
 
 #include <algorithm>
 

@@ -1,5 +1,5 @@
 #include <transform/text/MessageStrings.h>
-#include <translation/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileReport.h>
 
 namespace {
 

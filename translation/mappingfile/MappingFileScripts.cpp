@@ -1,10 +1,10 @@
-#include <transform/registry/PythonSyntax.h>
-#include <transform/registry/TclSyntax.h>
+#include <transform/scripts/PythonSyntax.h>
+#include <transform/scripts/TclSyntax.h>
 #include <transform/text/MessageStrings.h>
-#include <translation/MappingFileReader.h>
-#include <translation/MappingFileReferences.h>
-#include <translation/MappingFileReport.h>
-#include <translation/MappingFileScripts.h>
+#include <translation/mappingfile/MappingFileReader.h>
+#include <translation/mappingfile/MappingFileReferences.h>
+#include <translation/mappingfile/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileScripts.h>
 
 #include <algorithm>
 

@@ -2,13 +2,13 @@
 #include <transform/core/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
-#include <translation/MappingFileFactory.h>
-#include <translation/MappingFileFunctions.h>
-#include <translation/MappingFileReader.h>
-#include <translation/MappingFileReferences.h>
-#include <translation/MappingFileReport.h>
-#include <translation/MappingFileStatements.h>
-#include <translation/MappingFileWords.h>
+#include <translation/mappingfile/MappingFileFactory.h>
+#include <translation/mappingfile/MappingFileFunctions.h>
+#include <translation/mappingfile/MappingFileReader.h>
+#include <translation/mappingfile/MappingFileReferences.h>
+#include <translation/mappingfile/MappingFileReport.h>
+#include <translation/mappingfile/MappingFileStatements.h>
+#include <translation/mappingfile/MappingFileWords.h>
 
 namespace {
 

@@ -1,10 +1,10 @@
 // Checks the statements of a mapping file one by one and collects what holds between them.
 #pragma once
 
-#include <translation/MappingFileDefinitions.h>
-#include <translation/MappingFileFlow.h>
-#include <translation/MappingFileMacros.h>
-#include <translation/MappingFileScripts.h>
+#include <translation/mappingfile/MappingFileDefinitions.h>
+#include <translation/mappingfile/MappingFileFlow.h>
+#include <translation/mappingfile/MappingFileMacros.h>
+#include <translation/mappingfile/MappingFileScripts.h>
 
 #include <QString>
 

@@ -1,4 +1,4 @@
-#include <translation/MappingFileWords.h>
+#include <translation/mappingfile/MappingFileWords.h>
 
 namespace {
 

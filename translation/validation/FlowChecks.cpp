@@ -3,7 +3,7 @@
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/IXMLComponentReader.h>
-#include <translation/FlowChecks.h>
+#include <translation/validation/FlowChecks.h>
 
 namespace {
 

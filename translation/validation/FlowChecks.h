@@ -3,7 +3,7 @@
 #pragma once
 
 #include <translation/Diagnostics.h>
-#include <translation/Workspace.h>
+#include <translation/graph/Workspace.h>
 
 #include <QSet>
 #include <QString>

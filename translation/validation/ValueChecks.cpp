@@ -2,8 +2,8 @@
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/ParameterLines.h>
 #include <transform/workspace/WorkspaceRecords.h>
-#include <translation/ReferencedNames.h>
-#include <translation/ValueChecks.h>
+#include <translation/graph/ReferencedNames.h>
+#include <translation/validation/ValueChecks.h>
 
 namespace {
 

@@ -1,7 +1,7 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/DocumentReading.h>
-#include <apps/orxt/ExtractCommand.h>
-#include <apps/orxt/PrintableText.h>
+#include <apps/orxt/commands/ExtractCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/PrintableText.h>
+#include <apps/orxt/facts/DocumentReading.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/workspace/VersionStore.h>
 #include <translation/CustomExtraction.h>

@@ -1,7 +1,7 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/DocumentReading.h>
-#include <apps/orxt/FormatCommand.h>
-#include <apps/orxt/PrintableText.h>
+#include <apps/orxt/commands/FormatCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/PrintableText.h>
+#include <apps/orxt/facts/DocumentReading.h>
 #include <transform/files/AtomicFile.h>
 #include <translation/WorkspaceDocument.h>
 

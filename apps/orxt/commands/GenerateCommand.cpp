@@ -1,6 +1,6 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/GenerateCommand.h>
-#include <apps/orxt/ProcessPool.h>
+#include <apps/orxt/commands/GenerateCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/ProcessPool.h>
 #include <transform/files/InputFile.h>
 #include <transform/registry/TransformerMgr.h>
 #include <translation/WorkspaceTranslation.h>

@@ -1,8 +1,8 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/DocumentReading.h>
-#include <apps/orxt/InfoCommand.h>
-#include <apps/orxt/InfoJson.h>
-#include <apps/orxt/InfoText.h>
+#include <apps/orxt/commands/InfoCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/facts/DocumentReading.h>
+#include <apps/orxt/facts/InfoJson.h>
+#include <apps/orxt/facts/InfoText.h>
 #include <translation/WorkspaceDocument.h>
 
 #include <CLI/CLI.hpp>

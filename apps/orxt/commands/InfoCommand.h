@@ -1,6 +1,6 @@
 #pragma once
 
-#include <apps/orxt/Command.h>
+#include <apps/orxt/console/Command.h>
 
 #include <QJsonArray>
 #include <QString>

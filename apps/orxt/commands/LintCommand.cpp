@@ -1,6 +1,6 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/LintCommand.h>
-#include <apps/orxt/SarifLog.h>
+#include <apps/orxt/commands/LintCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/SarifLog.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/files/InputFile.h>

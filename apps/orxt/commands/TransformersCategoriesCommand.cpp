@@ -1,7 +1,7 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/SearchText.h>
-#include <apps/orxt/TextTable.h>
-#include <apps/orxt/TransformersCategoriesCommand.h>
+#include <apps/orxt/commands/TransformersCategoriesCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/TextTable.h>
+#include <apps/orxt/facts/SearchText.h>
 #include <transform/registry/TransformerMgr.h>
 
 #include <CLI/CLI.hpp>

@@ -1,9 +1,9 @@
-#include <apps/orxt/TransformersCategoriesCommand.h>
-#include <apps/orxt/TransformersChangeLogCommand.h>
-#include <apps/orxt/TransformersCommand.h>
-#include <apps/orxt/TransformersListCommand.h>
-#include <apps/orxt/TransformersSearchCommand.h>
-#include <apps/orxt/TransformersShowCommand.h>
+#include <apps/orxt/commands/TransformersCategoriesCommand.h>
+#include <apps/orxt/commands/TransformersChangeLogCommand.h>
+#include <apps/orxt/commands/TransformersCommand.h>
+#include <apps/orxt/commands/TransformersListCommand.h>
+#include <apps/orxt/commands/TransformersSearchCommand.h>
+#include <apps/orxt/commands/TransformersShowCommand.h>
 
 #include <CLI/CLI.hpp>
 

@@ -1,7 +1,7 @@
-#include <apps/orxt/CatalogueText.h>
-#include <apps/orxt/Console.h>
-#include <apps/orxt/SearchText.h>
-#include <apps/orxt/TransformersListCommand.h>
+#include <apps/orxt/commands/TransformersListCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/facts/CatalogueText.h>
+#include <apps/orxt/facts/SearchText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
 

@@ -1,7 +1,7 @@
-#include <apps/orxt/CatalogueSearch.h>
-#include <apps/orxt/CatalogueText.h>
-#include <apps/orxt/Console.h>
-#include <apps/orxt/TransformersSearchCommand.h>
+#include <apps/orxt/commands/TransformersSearchCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/facts/CatalogueSearch.h>
+#include <apps/orxt/facts/CatalogueText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
 

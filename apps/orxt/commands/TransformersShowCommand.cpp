@@ -1,8 +1,8 @@
-#include <apps/orxt/CatalogueText.h>
-#include <apps/orxt/Console.h>
-#include <apps/orxt/ParameterSchema.h>
-#include <apps/orxt/PrintableText.h>
-#include <apps/orxt/TransformersShowCommand.h>
+#include <apps/orxt/commands/TransformersShowCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/PrintableText.h>
+#include <apps/orxt/facts/CatalogueText.h>
+#include <apps/orxt/facts/ParameterSchema.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/registry/TransformerMgr.h>

@@ -1,7 +1,7 @@
 #pragma once
 
-#include <apps/orxt/Command.h>
-#include <apps/orxt/DefinitionOptions.h>
+#include <apps/orxt/console/Command.h>
+#include <apps/orxt/console/DefinitionOptions.h>
 
 #include <string>
 

@@ -1,6 +1,6 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/SarifLog.h>
-#include <apps/orxt/ValidateCommand.h>
+#include <apps/orxt/commands/ValidateCommand.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/SarifLog.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/text/MessageStrings.h>
 

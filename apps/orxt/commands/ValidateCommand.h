@@ -1,8 +1,8 @@
 #pragma once
 
-#include <apps/orxt/Command.h>
-#include <apps/orxt/DefinitionOptions.h>
-#include <apps/orxt/FindingOptions.h>
+#include <apps/orxt/console/Command.h>
+#include <apps/orxt/console/DefinitionOptions.h>
+#include <apps/orxt/console/FindingOptions.h>
 #include <translation/WorkspaceValidation.h>
 
 #include <string>

@@ -1,4 +1,4 @@
-#include <apps/orxt/Command.h>
+#include <apps/orxt/console/Command.h>
 
 #include <CLI/CLI.hpp>
 

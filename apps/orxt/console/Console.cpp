@@ -1,5 +1,5 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/PrintableText.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/PrintableText.h>
 
 #include <cstdio>
 #include <cstdlib>

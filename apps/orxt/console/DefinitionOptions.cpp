@@ -1,5 +1,5 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/DefinitionOptions.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/DefinitionOptions.h>
 #include <platform/orxutil/orxutil.h>
 #include <platform/qorxcore/qorxcore.h>
 #include <platform/session/session.h>

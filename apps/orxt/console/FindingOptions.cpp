@@ -1,5 +1,5 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/FindingOptions.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/FindingOptions.h>
 
 #include <CLI/CLI.hpp>
 

@@ -1,4 +1,4 @@
-#include <apps/orxt/PrintableText.h>
+#include <apps/orxt/console/PrintableText.h>
 
 #include <algorithm>
 

@@ -1,5 +1,5 @@
-#include <apps/orxt/Command.h>
-#include <apps/orxt/ProcessPool.h>
+#include <apps/orxt/console/Command.h>
+#include <apps/orxt/console/ProcessPool.h>
 
 #include <array>
 #include <cstdio>

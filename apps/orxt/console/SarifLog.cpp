@@ -1,4 +1,4 @@
-#include <apps/orxt/SarifLog.h>
+#include <apps/orxt/console/SarifLog.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/ProgramVersion.h>
 

@@ -1,5 +1,5 @@
-#include <apps/orxt/PrintableText.h>
-#include <apps/orxt/TextTable.h>
+#include <apps/orxt/console/PrintableText.h>
+#include <apps/orxt/console/TextTable.h>
 
 #include <algorithm>
 

@@ -1,5 +1,5 @@
-#include <apps/orxt/CatalogueSearch.h>
-#include <apps/orxt/CatalogueText.h>
+#include <apps/orxt/facts/CatalogueSearch.h>
+#include <apps/orxt/facts/CatalogueText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
 #include <translation/NearestSpelling.h>

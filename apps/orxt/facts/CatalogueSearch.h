@@ -1,7 +1,7 @@
 // Finds transformers by words in their names and texts.
 #pragma once
 
-#include <apps/orxt/SearchText.h>
+#include <apps/orxt/facts/SearchText.h>
 
 #include <QString>
 #include <QStringList>

@@ -1,6 +1,6 @@
-#include <apps/orxt/CatalogueText.h>
-#include <apps/orxt/Console.h>
-#include <apps/orxt/TextTable.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/TextTable.h>
+#include <apps/orxt/facts/CatalogueText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/registry/TransformerMgr.h>

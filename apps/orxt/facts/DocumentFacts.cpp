@@ -1,4 +1,4 @@
-#include <apps/orxt/DocumentFacts.h>
+#include <apps/orxt/facts/DocumentFacts.h>
 #include <platform/orxparameter/orxparameter.h>
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/workspace/TransformerRecords.h>

@@ -1,5 +1,5 @@
-#include <apps/orxt/Console.h>
-#include <apps/orxt/DocumentReading.h>
+#include <apps/orxt/console/Console.h>
+#include <apps/orxt/facts/DocumentReading.h>
 #include <translation/WorkspaceDocument.h>
 
 ExitStatus readDocument(WorkspaceDocument& document, const QString& fileName, Console& console) {

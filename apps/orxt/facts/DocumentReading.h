@@ -1,7 +1,7 @@
 // The first step of every command that takes a document without translating it.
 #pragma once
 
-#include <apps/orxt/Command.h>
+#include <apps/orxt/console/Command.h>
 
 #include <QString>
 

@@ -1,5 +1,5 @@
-#include <apps/orxt/DocumentFacts.h>
-#include <apps/orxt/InfoJson.h>
+#include <apps/orxt/facts/DocumentFacts.h>
+#include <apps/orxt/facts/InfoJson.h>
 #include <translation/WorkspaceDocument.h>
 
 #include <QJsonArray>

@@ -1,8 +1,8 @@
-#include <apps/orxt/DocumentFacts.h>
-#include <apps/orxt/InfoJson.h>
-#include <apps/orxt/InfoText.h>
-#include <apps/orxt/PrintableText.h>
-#include <apps/orxt/TextTable.h>
+#include <apps/orxt/console/PrintableText.h>
+#include <apps/orxt/console/TextTable.h>
+#include <apps/orxt/facts/DocumentFacts.h>
+#include <apps/orxt/facts/InfoJson.h>
+#include <apps/orxt/facts/InfoText.h>
 #include <translation/WorkspaceDocument.h>
 
 #include <algorithm>

@@ -1,4 +1,4 @@
-#include <apps/orxt/ParameterSchema.h>
+#include <apps/orxt/facts/ParameterSchema.h>
 #include <platform/orxparameter/orxparameter.h>
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/Keywords.h>

@@ -1,4 +1,4 @@
-#include <apps/orxt/SearchText.h>
+#include <apps/orxt/facts/SearchText.h>
 
 #include <algorithm>
 

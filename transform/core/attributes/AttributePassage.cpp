@@ -1,7 +1,7 @@
-#include <transform/core/AttributePassage.h>
 #include <transform/core/AttributeRules.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/attributes/AttributePassage.h>
 
 namespace {
 

@@ -1,9 +1,9 @@
 // The part of TransformerCfg that answers for attributes: what reaches the inputs, what leaves the outputs.
-#include <transform/core/AttributePassage.h>
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/attributes/AttributePassage.h>
 
 #include <QScopedValueRollback>
 #include <QSet>

@@ -1,6 +1,6 @@
 #include <transform/core/PortTables.h>
-#include <transform/core/PortTexts.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/attributes/PortTexts.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {

@@ -1,6 +1,6 @@
-#include <transform/core/CompiledTemplate.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/TokenScanner.h>
+#include <transform/core/definition/CompiledTemplate.h>
 
 #include <algorithm>
 

@@ -4,15 +4,13 @@
 // substitutes (macros of the engine) have slots as well; they stay as they stand.
 #pragma once
 
-#include <platform/Export.h>
-
 #include <QHash>
 #include <QString>
 #include <QStringList>
 
 #include <vector>
 
-class ORX_EXPORT CompiledTemplate {
+class CompiledTemplate {
  public:
   static constexpr int kNoSlot = -1;
 

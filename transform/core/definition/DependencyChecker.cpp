@@ -1,5 +1,5 @@
-#include <transform/core/DependencyChecker.h>
-#include <transform/core/SafeTclInterpreter.h>
+#include <transform/core/definition/DependencyChecker.h>
+#include <transform/core/definition/SafeTclInterpreter.h>
 
 DependencyChecker::Verdict DependencyChecker::check(const QStringList& scripts) {
   for (const QString& script : scripts) {

@@ -1,6 +1,6 @@
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/core/SafeTclInterpreter.h>
-#include <transform/core/SystemQuestions.h>
+#include <transform/core/definition/SafeTclInterpreter.h>
+#include <transform/core/definition/SystemQuestions.h>
 
 #include <QByteArray>
 #include <QStringList>

@@ -1,5 +1,5 @@
 #include <platform/qorxcore/Local8Bit.h>
-#include <transform/core/SystemQuestions.h>
+#include <transform/core/definition/SystemQuestions.h>
 
 #include <QDir>
 #include <QFile>

@@ -1,4 +1,4 @@
-#include <transform/core/TclText.h>
+#include <transform/core/definition/TclText.h>
 
 #include <QByteArray>
 #include <QStringList>

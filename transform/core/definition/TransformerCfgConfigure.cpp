@@ -2,12 +2,12 @@
 #include <platform/qorxcore/OrxHome.h>
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/AttributeReferences.h>
-#include <transform/core/CompiledTemplate.h>
 #include <transform/core/ConfiguredDefinition.h>
-#include <transform/core/DependencyChecker.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/definition/CompiledTemplate.h>
+#include <transform/core/definition/DependencyChecker.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QSet>

@@ -1,4 +1,4 @@
-#include <transform/core/LookupWriters.h>
+#include <transform/core/generation/LookupWriters.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/TextHelpers.h>
 

@@ -3,7 +3,6 @@
 // The texts are fixed; what they cannot carry is refused by MappingFileChecks before anything is written.
 #pragma once
 
-#include <platform/Export.h>
 #include <platform/orxparameter/orxparameter.h>
 
 #include <QString>
@@ -24,18 +23,18 @@ struct BoxLookup {
 
 namespace lookup_writers {
 
-ORX_EXPORT void writeChoiceBox(MFBuffer& buffer, const ChoiceList& choices, const BoxLookup& lookup);
-ORX_EXPORT void writeListBox(MFBuffer& buffer, const ChoiceList& choices, const BoxLookup& lookup);
+void writeChoiceBox(MFBuffer& buffer, const ChoiceList& choices, const BoxLookup& lookup);
+void writeListBox(MFBuffer& buffer, const ChoiceList& choices, const BoxLookup& lookup);
 // The procedure maps the shown side to the stored one and gives back any other value as it is. Returns its
 // call.
-ORX_EXPORT QString writeChoiceProcedure(MFBuffer& buffer, const ChoiceList& choices, const QString& procedure,
-                                        const QString& value);
+QString writeChoiceProcedure(MFBuffer& buffer, const ChoiceList& choices, const QString& procedure,
+                             const QString& value);
 
 using Entries = std::vector<std::pair<QString, QString>>;
 // The order of the entries: that of the choices, unless the fragment would take one entry for another in it.
-ORX_EXPORT Entries listBoxOrder(const ChoiceList& choices);
-ORX_EXPORT Entries procedureOrder(const ChoiceList& choices);
+Entries listBoxOrder(const ChoiceList& choices);
+Entries procedureOrder(const ChoiceList& choices);
 // A text as an element of the list of a list-box lookup.
-ORX_EXPORT QString listElement(const QString& text);
+QString listElement(const QString& text);
 
 }  // namespace lookup_writers

@@ -1,6 +1,6 @@
 #include <transform/core/Keywords.h>
-#include <transform/core/MultiProcessWriter.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/generation/MultiProcessWriter.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>

@@ -1,6 +1,6 @@
 #include <transform/core/GenerationKeywords.h>
-#include <transform/core/OrderedSubstitution.h>
 #include <transform/core/TokenScanner.h>
+#include <transform/core/generation/OrderedSubstitution.h>
 
 #include <QRegularExpression>
 

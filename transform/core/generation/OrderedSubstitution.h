@@ -5,15 +5,13 @@
 // A line that a substitution leaves blank goes away at once; lines that were blank before stay.
 #pragma once
 
-#include <platform/Export.h>
-
 #include <QHash>
 #include <QString>
 #include <QStringList>
 
 #include <vector>
 
-class ORX_EXPORT OrderedSubstitution {
+class OrderedSubstitution {
  public:
   explicit OrderedSubstitution(const QStringList& lines);
 

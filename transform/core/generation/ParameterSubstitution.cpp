@@ -1,12 +1,12 @@
 #include <platform/qorxcore/Lists.h>
-#include <transform/core/CompiledTemplate.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/OrderedSubstitution.h>
-#include <transform/core/ParameterSubstitution.h>
-#include <transform/core/TemplateExpansion.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
+#include <transform/core/definition/CompiledTemplate.h>
+#include <transform/core/generation/OrderedSubstitution.h>
+#include <transform/core/generation/ParameterSubstitution.h>
+#include <transform/core/generation/TemplateExpansion.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {

@@ -1,4 +1,4 @@
-#include <transform/core/TemplateExpansion.h>
+#include <transform/core/generation/TemplateExpansion.h>
 
 #include <algorithm>
 #include <cstring>

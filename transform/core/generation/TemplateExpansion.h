@@ -4,14 +4,13 @@
 // is substituted (isInert() tells); the caller sees to both.
 #pragma once
 
-#include <platform/Export.h>
-#include <transform/core/CompiledTemplate.h>
+#include <transform/core/definition/CompiledTemplate.h>
 
 #include <QString>
 #include <QStringList>
 #include <QVarLengthArray>
 
-class ORX_EXPORT TemplateExpansion {
+class TemplateExpansion {
  public:
   // The template must outlive the expansion.
   explicit TemplateExpansion(const CompiledTemplate& compiled);

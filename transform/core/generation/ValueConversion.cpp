@@ -1,7 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/MacroText.h>
-#include <transform/core/ValueConversion.h>
+#include <transform/core/generation/ValueConversion.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {

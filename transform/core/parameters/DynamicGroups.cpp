@@ -1,10 +1,10 @@
 #include <platform/orxparameter/orxparameter.h>
 #include <platform/qorxcore/Lists.h>
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/core/DynamicGroups.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/ParameterSet.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/parameters/DynamicGroups.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QHash>

@@ -2,8 +2,8 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/ParameterDisplay.h>
 #include <transform/core/TransformParamCfg.h>
+#include <transform/core/parameters/ParameterDisplay.h>
 
 namespace {
 

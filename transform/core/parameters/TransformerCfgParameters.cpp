@@ -3,12 +3,12 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
-#include <transform/core/DynamicGroups.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/ParameterDisplay.h>
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
+#include <transform/core/parameters/DynamicGroups.h>
+#include <transform/core/parameters/ParameterDisplay.h>
 
 #include <algorithm>
 

@@ -4,9 +4,10 @@
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/custom/CustomMessages.h>
-#include <transform/custom/LookedUpParameters.h>
-#include <transform/custom/ScriptParameters.h>
+#include <transform/custom/instance/LookedUpParameters.h>
+#include <transform/custom/instance/ScriptParameters.h>
+#include <transform/custom/linked/CustomMessages.h>
+#include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>

@@ -1,8 +1,8 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/custom/CustomTransformerStatement.h>
-#include <transform/custom/InstancePrototype.h>
+#include <transform/custom/instance/CustomTransformerStatement.h>
+#include <transform/custom/instance/InstancePrototype.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>

@@ -3,7 +3,7 @@
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/custom/InnerTransformerListener.h>
+#include <transform/custom/instance/InnerTransformerListener.h>
 
 namespace {
 

@@ -8,7 +8,7 @@
 
 class CompoundTransformerNetwork;
 
-class ORX_EXPORT InnerTransformerListener : public ParameterScopeListener {
+class InnerTransformerListener : public ParameterScopeListener {
  public:
   // Not owned; outlives the listener.
   explicit InnerTransformerListener(const CompoundTransformerNetwork& network) : m_network(network) {}

@@ -1,8 +1,8 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerDefinition.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/custom/CustomMessages.h>
-#include <transform/custom/InstancePrototype.h>
+#include <transform/custom/instance/InstancePrototype.h>
+#include <transform/custom/linked/CustomMessages.h>
 #include <transform/text/MessageStrings.h>
 
 namespace {

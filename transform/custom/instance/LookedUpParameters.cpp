@@ -1,8 +1,8 @@
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/custom/LookedUpParameters.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/instance/LookedUpParameters.h>
 #include <transform/text/MFBuffer.h>
 
 #include <QHash>

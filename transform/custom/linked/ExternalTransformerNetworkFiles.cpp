@@ -1,8 +1,8 @@
 // The part of ExternalTransformerNetwork that writes files: copies of its definition, and files without it.
 #include <platform/qorxcore/Local8Bit.h>
 #include <platform/qorxcore/OrxHome.h>
-#include <transform/custom/CustomMessages.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/custom/linked/CustomMessages.h>
 #include <transform/files/AtomicFile.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/PlainFile.h>

@@ -1,10 +1,10 @@
 #include <platform/orxutil/ResourceDirectories.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerSource.h>
-#include <transform/custom/CustomMessages.h>
-#include <transform/custom/ExternalDocNetworkBuilder.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
+#include <transform/custom/linked/CustomMessages.h>
+#include <transform/custom/network/ExternalDocNetworkBuilder.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>

@@ -1,10 +1,10 @@
 // What a custom transformer answers as a whole.
 #include <transform/core/TransformerCfg.h>
-#include <transform/custom/AttributeMemo.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/custom/CustomMessages.h>
-#include <transform/custom/InstancePrototype.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/instance/InstancePrototype.h>
+#include <transform/custom/linked/CustomMessages.h>
+#include <transform/custom/network/AttributeMemo.h>
 #include <transform/text/MessageStrings.h>
 
 #include <algorithm>

@@ -1,9 +1,10 @@
 // What leaves the outputs of a network.
 #include <transform/core/TransformerCfg.h>
-#include <transform/custom/AttributeMemo.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
+#include <transform/custom/network/AttributeMemo.h>
+#include <transform/custom/network/NetworkOrder.h>
 
 #include <algorithm>
 
@@ -117,7 +118,7 @@ QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& outpu
   if (node == m_outputNodes.end() || m_isEvaluating || queryState().depth >= kDeepestNesting)
     return QStringList();
   ensureOrders();
-  const NetworkOrder& order = m_orders.at(output);
+  const NetworkOrder& order = m_orders->at(output);
   if (queryState().depth == 0)
     return evaluate(*node->second, order, origins);
 
@@ -170,8 +171,8 @@ QStringList CompoundTransformerNetwork::evaluate(SubDocNetworkObjOutput& output,
 QStringList CompoundTransformerNetwork::getUpstreamInputs(const QString& output) const {
   QStringList inputs;
   ensureOrders();
-  const auto order = m_orders.find(output);
-  if (order == m_orders.end())
+  const auto order = m_orders->find(output);
+  if (order == m_orders->end())
     return inputs;
   for (const SubDocNetworkObj* node : order->second.nodes) {
     if (node->kind() == SubDocNetworkObj::Kind::Input)

@@ -1,4 +1,4 @@
-#include <transform/custom/NetworkListeners.h>
+#include <transform/custom/network/NetworkListeners.h>
 
 void NetworkListeners::add(CompoundTransformerNetworkListener* listener) {
   if (!listener || m_numbers.contains(listener))

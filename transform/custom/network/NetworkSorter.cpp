@@ -1,5 +1,5 @@
-#include <transform/custom/NetworkSorter.h>
 #include <transform/custom/SubDocNetworkObj.h>
+#include <transform/custom/network/NetworkSorter.h>
 
 #include <algorithm>
 #include <limits>

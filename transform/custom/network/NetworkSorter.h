@@ -4,13 +4,12 @@
 // that feed it and the links between them; no recursion, so that chains of any length work.
 #pragma once
 
-#include <platform/Export.h>
-#include <transform/custom/NetworkOrder.h>
+#include <transform/custom/network/NetworkOrder.h>
 
 #include <cstdint>
 
 // The network must not change meanwhile.
-class ORX_EXPORT NetworkSorter {
+class NetworkSorter {
  public:
   // `nodes` is how many there may be.
   explicit NetworkSorter(std::size_t nodes);

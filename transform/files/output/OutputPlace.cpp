@@ -1,4 +1,4 @@
-#include <transform/files/OutputPlace.h>
+#include <transform/files/output/OutputPlace.h>
 
 #include <cerrno>
 #include <cstdlib>

@@ -1,8 +1,8 @@
 #include <platform/qorxcore/Language.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/registry/CatalogueEntry.h>
-#include <transform/registry/CompanionFileParser.h>
-#include <transform/registry/DefinitionFileParser.h>
+#include <transform/registry/catalogue/CatalogueEntry.h>
+#include <transform/registry/loading/CompanionFileParser.h>
+#include <transform/registry/loading/DefinitionFileParser.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 
 namespace {

@@ -14,22 +14,22 @@ class IORXSession;
 class TransformerCfg;
 struct CompanionEntry;
 
+// What all definitions of one load are configured with.
+struct DefinitionLoad {
+  IORXSession* session = nullptr;
+  const DefinitionDirectory* directory = nullptr;
+  QString language;  // of the texts that configuring adds
+};
+
 class CatalogueEntry {
  public:
-  // What all definitions of one load are configured with.
-  struct Load {
-    IORXSession* session = nullptr;
-    const DefinitionDirectory* directory = nullptr;
-    QString language;  // of the texts that configuring adds
-  };
-
   // A definition that has not been read yet.
   struct Unread {
     QByteArray bytes;  // as DefinitionFileParser::definitionAlone() takes them
     QString path;
     bool isAllowed = true;
     bool isBuiltIn = false;
-    std::shared_ptr<const Load> load;
+    std::shared_ptr<const DefinitionLoad> load;
     std::vector<std::shared_ptr<const CompanionEntry>> companions;  // in the order in which they came
   };
 

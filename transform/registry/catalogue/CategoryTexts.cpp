@@ -1,4 +1,4 @@
-#include <transform/registry/CategoryTexts.h>
+#include <transform/registry/catalogue/CategoryTexts.h>
 
 void CategoryTexts::setLocalizedName(const QString& category, const QString& localizedName) {
   const QString before = m_localizedNames.value(category);

@@ -1,5 +1,5 @@
 #include <platform/qorxcore/Language.h>
-#include <transform/registry/ChangeLogPage.h>
+#include <transform/registry/catalogue/ChangeLogPage.h>
 
 #include <QVector>
 

@@ -1,5 +1,5 @@
-#include <transform/registry/CompanionFileParser.h>
-#include <transform/registry/PrototypeTable.h>
+#include <transform/registry/catalogue/PrototypeTable.h>
+#include <transform/registry/loading/CompanionFileParser.h>
 
 #include <utility>
 

@@ -2,7 +2,7 @@
 // newest of each, the categories that they are listed under, and their other names.
 #pragma once
 
-#include <transform/registry/CatalogueEntry.h>
+#include <transform/registry/catalogue/CatalogueEntry.h>
 
 #include <QHash>
 #include <QSet>

@@ -1,8 +1,9 @@
 // The part of TransformerMgr that tells what changed from one version of a transformer to another.
 #include <platform/session/session.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/registry/ChangeLogPage.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/registry/catalogue/ChangeLogPage.h>
+#include <transform/registry/catalogue/PrototypeTable.h>
 #include <transform/text/MessageStrings.h>
 
 #include <algorithm>
@@ -27,7 +28,7 @@ QString TransformerMgr::changeLog(TransformerCfg* configuration) const {
   }
   const bool isReplaced = !configuration->isVisible() && !configuration->replacedBy().isEmpty();
   const QString target = isReplaced ? configuration->replacedBy() : configuration->getName();
-  const CatalogueEntry* newest = m_prototypes.newest(target);
+  const CatalogueEntry* newest = m_prototypes->newest(target);
   if (!newest) {
     return QString();
   }
@@ -37,7 +38,7 @@ QString TransformerMgr::changeLog(TransformerCfg* configuration) const {
 
 void TransformerMgr::addChanges(std::vector<VersionChanges>& changes, const QString& name, qint64 first,
                                 int last) const {
-  const PrototypeTable::Versions* versions = m_prototypes.versions(name);
+  const PrototypeTable::Versions* versions = m_prototypes->versions(name);
   if (!versions) {
     return;
   }
@@ -75,7 +76,7 @@ std::vector<TransformerMgr::VersionChanges> TransformerMgr::changes(const QStrin
 QStringList TransformerMgr::changeLog(const QString& name, int fromVersion, const QString& newName,
                                       int toVersion) const {
   const auto shownName = [this](const QString& asked) {
-    const CatalogueEntry* newest = m_prototypes.newest(asked);
+    const CatalogueEntry* newest = m_prototypes->newest(asked);
     return newest ? newest->prototype().getLocalizedName() : asked;
   };
   const QString lastText =

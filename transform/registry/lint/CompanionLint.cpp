@@ -1,4 +1,4 @@
-#include <transform/registry/CompanionLint.h>
+#include <transform/registry/lint/CompanionLint.h>
 
 #include <QIODevice>
 

@@ -1,9 +1,9 @@
 // Checks a localised companion against the definitions that it may speak of.
 #pragma once
 
-#include <transform/registry/CompanionFileParser.h>
 #include <transform/registry/LintReport.h>
-#include <transform/registry/LintedDefinition.h>
+#include <transform/registry/lint/LintedDefinition.h>
+#include <transform/registry/loading/CompanionFileParser.h>
 
 #include <QHash>
 #include <QSet>

@@ -1,8 +1,8 @@
 #include <transform/core/AttributeRules.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/RenameMapping.h>
-#include <transform/registry/DefinitionKeywords.h>
-#include <transform/registry/HeaderLint.h>
+#include <transform/registry/lint/HeaderLint.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
 
 #include <QRegularExpression>
 

@@ -2,7 +2,7 @@
 #pragma once
 
 #include <transform/registry/LintReport.h>
-#include <transform/registry/LintedDefinition.h>
+#include <transform/registry/lint/LintedDefinition.h>
 
 class HeaderLint {
  public:

@@ -1,9 +1,9 @@
 #include <platform/orxparameter/MemberList.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
-#include <transform/registry/DefinitionFileParser.h>
-#include <transform/registry/DefinitionKeywords.h>
-#include <transform/registry/LintedDefinition.h>
+#include <transform/registry/lint/LintedDefinition.h>
+#include <transform/registry/loading/DefinitionFileParser.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 
 namespace {

@@ -3,7 +3,7 @@
 
 #include <platform/orxparameter/GUIType.h>
 #include <transform/core/TransformerDefinition.h>
-#include <transform/registry/DefinitionText.h>
+#include <transform/registry/loading/DefinitionText.h>
 
 #include <QHash>
 #include <QSet>

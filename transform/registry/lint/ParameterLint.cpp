@@ -1,8 +1,8 @@
 #include <platform/orxparameter/orxparameter.h>
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/Keywords.h>
-#include <transform/registry/DefinitionKeywords.h>
-#include <transform/registry/ParameterLint.h>
+#include <transform/registry/lint/ParameterLint.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
 
 using namespace lint_rules;
 

@@ -1,10 +1,10 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
-#include <transform/registry/DefinitionKeywords.h>
-#include <transform/registry/PythonSyntax.h>
-#include <transform/registry/ScriptLint.h>
-#include <transform/registry/TclSyntax.h>
-#include <transform/text/ScriptBlocks.h>
+#include <transform/registry/lint/ScriptLint.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
+#include <transform/scripts/PythonSyntax.h>
+#include <transform/scripts/ScriptBlocks.h>
+#include <transform/scripts/TclSyntax.h>
 #include <transform/text/TextHelpers.h>
 
 using namespace lint_rules;

@@ -2,7 +2,7 @@
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TokenScanner.h>
-#include <transform/registry/TemplateLint.h>
+#include <transform/registry/lint/TemplateLint.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MappingFileKeywords.h>
 

@@ -3,7 +3,7 @@
 #pragma once
 
 #include <transform/registry/LintReport.h>
-#include <transform/registry/LintedDefinition.h>
+#include <transform/registry/lint/LintedDefinition.h>
 
 #include <QSet>
 #include <QString>

@@ -1,5 +1,5 @@
-#include <transform/registry/CompanionFileParser.h>
-#include <transform/registry/DefinitionKeywords.h>
+#include <transform/registry/loading/CompanionFileParser.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
 
 bool CompanionFileParser::parse(QIODevice& device) {
   *this = CompanionFileParser();

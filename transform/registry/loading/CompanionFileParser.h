@@ -3,8 +3,7 @@
 // entry.
 #pragma once
 
-#include <platform/Export.h>
-#include <transform/registry/DefinitionText.h>
+#include <transform/registry/loading/DefinitionText.h>
 
 #include <QByteArray>
 #include <QString>
@@ -41,7 +40,7 @@ struct CategoryName {
   int line = 0;
 };
 
-class ORX_EXPORT CompanionFileParser {
+class CompanionFileParser {
  public:
   // The device is open for reading. False, with nothing collected, when it cannot be read or holds too much.
   bool parse(QIODevice& device);

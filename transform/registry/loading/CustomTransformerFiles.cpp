@@ -1,8 +1,8 @@
 #include <platform/orxutil/Decipher.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
-#include <transform/registry/CustomTransformerFiles.h>
 #include <transform/registry/ITransformerMgr.h>
+#include <transform/registry/loading/CustomTransformerFiles.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>

@@ -1,4 +1,4 @@
-#include <transform/registry/DefinitionFileNames.h>
+#include <transform/registry/loading/DefinitionFileNames.h>
 
 #include <QRegularExpression>
 

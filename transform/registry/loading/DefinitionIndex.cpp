@@ -1,5 +1,5 @@
-#include <transform/registry/DefinitionIndex.h>
-#include <transform/registry/DefinitionKeywords.h>
+#include <transform/registry/loading/DefinitionIndex.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
 
 #include <algorithm>
 #include <iterator>

@@ -2,9 +2,8 @@
 // but the lines that tell this becomes text; the definitions themselves stay the bytes that they are.
 #pragma once
 
-#include <platform/Export.h>
 #include <transform/core/TransformerDefinition.h>
-#include <transform/registry/DefinitionText.h>
+#include <transform/registry/loading/DefinitionText.h>
 
 #include <QByteArray>
 #include <QString>
@@ -16,7 +15,7 @@ struct IndexedDefinition {
   QByteArray bytes;             // DefinitionFileParser::definitionAlone() reads them
 };
 
-class ORX_EXPORT DefinitionIndex {
+class DefinitionIndex {
  public:
   // Finds the same definitions and categories as DefinitionFileParser does.
   void read(const QByteArray& file);

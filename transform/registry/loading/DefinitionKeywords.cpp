@@ -1,7 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/registry/DefinitionKeywords.h>
-#include <transform/registry/DefinitionLines.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
+#include <transform/registry/loading/DefinitionLines.h>
 
 namespace {
 

@@ -2,7 +2,6 @@
 // documentation.
 #pragma once
 
-#include <platform/Export.h>
 #include <transform/core/TransformerDefinition.h>
 
 #include <QLatin1String>
@@ -44,15 +43,15 @@ struct DefinitionKeyword {
 };
 
 // In the order in which they are documented. None begins with another.
-ORX_EXPORT const std::vector<DefinitionKeyword>& definitionKeywords();
+const std::vector<DefinitionKeyword>& definitionKeywords();
 // The keyword that the line begins with and that means something in that kind of file; null without one.
-ORX_EXPORT const DefinitionKeyword* findDefinitionKeyword(const QString& line, unsigned place);
+const DefinitionKeyword* findDefinitionKeyword(const QString& line, unsigned place);
 const DefinitionKeyword* findDefinitionKeyword(const DefinitionLines& line, unsigned place);
 // Puts a definition's value where the keyword says.
 void takeDefinitionValue(const DefinitionKeyword& keyword, const QString& value,
                          TransformerDefinition& definition);
 // What stands behind the keyword, trimmed.
-ORX_EXPORT QString keywordValue(const DefinitionKeyword& keyword, const QString& line);
+QString keywordValue(const DefinitionKeyword& keyword, const QString& line);
 
 // Words that stand alone on a line and enclose a block; kCategoryDescriptionStart is followed by the
 // category's name.
@@ -84,10 +83,10 @@ inline const QLatin1String kBlankEntry("<BLANK>");
 inline const QLatin1String kNoInput("<NO_INPUT>");
 
 // The feature-holding bit of a mode; 0 for a word that is none.
-ORX_EXPORT int featureHoldingBit(const QString& mode);
+int featureHoldingBit(const QString& mode);
 // The value of a flag: 1, 0, or -1 for a word that is none.
-ORX_EXPORT int flagValue(const QString& value);
+int flagValue(const QString& value);
 // The pieces of a list value: split at blanks, empty pieces dropped, "<BLANK>" turned into an empty text.
-ORX_EXPORT QStringList splitDefinitionList(const QString& value);
+QStringList splitDefinitionList(const QString& value);
 // Takes apart the value of a tag description. False when it has no description.
-ORX_EXPORT bool splitTagDescription(const QString& value, QString& tag, QString& description);
+bool splitTagDescription(const QString& value, QString& tag, QString& description);

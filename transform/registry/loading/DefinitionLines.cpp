@@ -1,4 +1,4 @@
-#include <transform/registry/DefinitionLines.h>
+#include <transform/registry/loading/DefinitionLines.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QIODevice>

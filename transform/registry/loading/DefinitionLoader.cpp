@@ -1,12 +1,12 @@
 #include <platform/qorxcore/OrxHome.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/files/FolderListing.h>
-#include <transform/registry/CategoryTexts.h>
-#include <transform/registry/CompanionFileParser.h>
-#include <transform/registry/DefinitionFileNames.h>
-#include <transform/registry/DefinitionLoader.h>
-#include <transform/registry/ExceptionList.h>
-#include <transform/registry/PrototypeTable.h>
+#include <transform/registry/catalogue/CategoryTexts.h>
+#include <transform/registry/catalogue/PrototypeTable.h>
+#include <transform/registry/loading/CompanionFileParser.h>
+#include <transform/registry/loading/DefinitionFileNames.h>
+#include <transform/registry/loading/DefinitionLoader.h>
+#include <transform/registry/loading/ExceptionList.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/XMLComponentReader.h>
 
@@ -26,7 +26,7 @@ constexpr long kDefinedTwice = 370747;
 
 DefinitionLoader::DefinitionLoader(PrototypeTable& prototypes, CategoryTexts& categories,
                                    const ExceptionList& exceptions,
-                                   std::shared_ptr<const CatalogueEntry::Load> load,
+                                   std::shared_ptr<const DefinitionLoad> load,
                                    CustomTransformerLoad loadCustom)
     : m_prototypes(prototypes),
       m_categories(categories),

@@ -3,8 +3,8 @@
 #pragma once
 
 #include <transform/files/FileBytes.h>
-#include <transform/registry/CatalogueEntry.h>
-#include <transform/registry/DefinitionIndex.h>
+#include <transform/registry/catalogue/CatalogueEntry.h>
+#include <transform/registry/loading/DefinitionIndex.h>
 
 #include <QString>
 #include <QStringList>
@@ -23,7 +23,7 @@ class DefinitionLoader {
 
   // None of the tables is owned; all outlive this object. Without `load` only custom transformers are loaded.
   DefinitionLoader(PrototypeTable& prototypes, CategoryTexts& categories, const ExceptionList& exceptions,
-                   std::shared_ptr<const CatalogueEntry::Load> load, CustomTransformerLoad loadCustom);
+                   std::shared_ptr<const DefinitionLoad> load, CustomTransformerLoad loadCustom);
 
   void loadFolder(const QString& folder);
   // What failed, in the order in which it was met; each text names the file.
@@ -42,7 +42,7 @@ class DefinitionLoader {
   PrototypeTable& m_prototypes;
   CategoryTexts& m_categories;
   const ExceptionList& m_exceptions;
-  std::shared_ptr<const CatalogueEntry::Load> m_load;
+  std::shared_ptr<const DefinitionLoad> m_load;
   CustomTransformerLoad m_loadCustom;
   // Kept from file to file.
   FileBytes m_file;

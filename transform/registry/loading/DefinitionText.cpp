@@ -1,5 +1,5 @@
-#include <transform/registry/DefinitionKeywords.h>
-#include <transform/registry/DefinitionText.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
+#include <transform/registry/loading/DefinitionText.h>
 
 QStringList textsOf(const std::vector<DefinitionLine>& lines) {
   QStringList result;

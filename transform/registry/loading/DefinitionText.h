@@ -2,7 +2,7 @@
 // taken from them yet. DefinitionFileParser::interpret() makes a TransformerDefinition of it.
 #pragma once
 
-#include <transform/registry/DefinitionLines.h>
+#include <transform/registry/loading/DefinitionLines.h>
 
 #include <QString>
 #include <QStringList>

@@ -1,5 +1,5 @@
 #include <platform/qorxcore/qorxcore.h>
-#include <transform/registry/ExceptionList.h>
+#include <transform/registry/loading/ExceptionList.h>
 
 #include <QFile>
 #include <QStringList>

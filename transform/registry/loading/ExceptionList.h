@@ -4,14 +4,12 @@
 // SHOULD_CREATE_TRANSFORMER count.
 #pragma once
 
-#include <platform/Export.h>
-
 #include <QHash>
 #include <QString>
 
 class QIODevice;
 
-class ORX_EXPORT ExceptionList {
+class ExceptionList {
  public:
   // Reads the home's list; a list that is missing or lacks a column changes nothing.
   void readFromHome();

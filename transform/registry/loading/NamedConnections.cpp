@@ -1,7 +1,7 @@
 #include <platform/qorxcore/OrxHome.h>
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/registry/DefinitionLines.h>
-#include <transform/registry/NamedConnections.h>
+#include <transform/registry/loading/DefinitionLines.h>
+#include <transform/registry/loading/NamedConnections.h>
 
 #include <QFile>
 #include <QStandardPaths>

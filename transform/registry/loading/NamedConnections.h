@@ -3,15 +3,13 @@
 // lines and lines that begin with "#" are skipped.
 #pragma once
 
-#include <platform/Export.h>
-
 #include <QSet>
 #include <QString>
 #include <QStringList>
 
 class QIODevice;
 
-class ORX_EXPORT NamedConnections {
+class NamedConnections {
  public:
   // Adds the names of both files; a file that is not there adds nothing. Tells of each that could not be read
   // its path and the reason.

@@ -1,5 +1,5 @@
-#include <transform/text/PythonLineScanner.h>
-#include <transform/text/ScriptBlocks.h>
+#include <transform/scripts/ScriptBlocks.h>
+#include <transform/scripts/blocks/PythonLineScanner.h>
 
 #include <QRegularExpression>
 

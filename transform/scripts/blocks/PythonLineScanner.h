@@ -2,7 +2,7 @@
 // where statements begin and whether a line stands in a text.
 #pragma once
 
-#include <transform/text/ScriptRefusal.h>
+#include <transform/scripts/blocks/ScriptRefusal.h>
 
 #include <QString>
 #include <QVector>

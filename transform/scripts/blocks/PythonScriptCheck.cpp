@@ -1,6 +1,6 @@
-#include <transform/text/PythonLineScanner.h>
-#include <transform/text/ScriptBlocks.h>
-#include <transform/text/ScriptRefusal.h>
+#include <transform/scripts/ScriptBlocks.h>
+#include <transform/scripts/blocks/PythonLineScanner.h>
+#include <transform/scripts/blocks/ScriptRefusal.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QSet>

@@ -1,6 +1,6 @@
+#include <transform/scripts/blocks/ScriptRefusal.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
-#include <transform/text/ScriptRefusal.h>
 
 namespace {
 

@@ -1,5 +1,5 @@
-#include <transform/text/ScriptBlocks.h>
-#include <transform/text/ScriptRefusal.h>
+#include <transform/scripts/ScriptBlocks.h>
+#include <transform/scripts/blocks/ScriptRefusal.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QByteArray>

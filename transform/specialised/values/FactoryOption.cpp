@@ -2,7 +2,7 @@
 #include <transform/core/LookupChecks.h>
 #include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/specialised/FactoryOption.h>
+#include <transform/specialised/values/FactoryOption.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>

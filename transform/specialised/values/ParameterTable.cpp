@@ -3,8 +3,8 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/specialised/ParameterTable.h>
-#include <transform/specialised/SpecialisedValues.h>
+#include <transform/specialised/values/ParameterTable.h>
+#include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
 
 namespace {

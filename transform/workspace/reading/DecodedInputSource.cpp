@@ -1,5 +1,5 @@
 #include <platform/vtl/SystemEncoding.h>
-#include <transform/workspace/DecodedInputSource.h>
+#include <transform/workspace/reading/DecodedInputSource.h>
 
 #include <xercesc/util/XMLUni.hpp>
 #include <xercesc/util/XMLUniDefs.hpp>

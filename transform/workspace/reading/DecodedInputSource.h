@@ -2,7 +2,7 @@
 // of the document have: so the guard sees what the parser sees.
 #pragma once
 
-#include <transform/workspace/DocumentGuard.h>
+#include <transform/workspace/reading/DocumentGuard.h>
 
 #include <QIODevice>
 #include <QTextCodec>

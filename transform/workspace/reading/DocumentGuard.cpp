@@ -1,6 +1,6 @@
-#include <transform/workspace/DocumentGuard.h>
-#include <transform/workspace/DocumentLimits.h>
-#include <transform/workspace/DocumentMessages.h>
+#include <transform/workspace/reading/DocumentGuard.h>
+#include <transform/workspace/reading/DocumentLimits.h>
+#include <transform/workspace/reading/DocumentMessages.h>
 
 #include <algorithm>
 

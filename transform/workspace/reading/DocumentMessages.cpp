@@ -1,5 +1,5 @@
 #include <transform/text/MessageStrings.h>
-#include <transform/workspace/DocumentMessages.h>
+#include <transform/workspace/reading/DocumentMessages.h>
 
 QString documentText(long number, const QStringList& arguments) {
   const QString text = TransformResString(number, arguments);

@@ -1,5 +1,5 @@
-#include <transform/workspace/DecodedInputSource.h>
-#include <transform/workspace/FileLines.h>
+#include <transform/workspace/reading/DecodedInputSource.h>
+#include <transform/workspace/reading/FileLines.h>
 
 #include <cstring>
 

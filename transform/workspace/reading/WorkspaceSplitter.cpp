@@ -1,10 +1,10 @@
 #include <platform/orxparameter/GUIType.h>
 #include <platform/vtl/SystemEncoding.h>
 #include <transform/text/MappingFileKeywords.h>
-#include <transform/workspace/DocumentLimits.h>
-#include <transform/workspace/FileLines.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
-#include <transform/workspace/WorkspaceSplitter.h>
+#include <transform/workspace/reading/DocumentLimits.h>
+#include <transform/workspace/reading/FileLines.h>
+#include <transform/workspace/reading/WorkspaceSplitter.h>
 
 #include <QRegularExpression>
 #include <QTextCodec>

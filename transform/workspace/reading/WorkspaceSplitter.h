@@ -2,7 +2,7 @@
 // then whatever follows.
 #pragma once
 
-#include <transform/workspace/LineMap.h>
+#include <transform/workspace/reading/LineMap.h>
 
 #include <QHash>
 #include <QIODevice>

@@ -1,5 +1,5 @@
-#include <transform/workspace/CompactAttribute.h>
-#include <transform/workspace/XORXDOMParser.h>
+#include <transform/workspace/reading/CompactAttribute.h>
+#include <transform/workspace/reading/XORXDOMParser.h>
 
 #include <xercesc/dom/DOMElement.hpp>
 #include <xercesc/internal/XMLScanner.hpp>
@@ -65,7 +65,7 @@ void XORXDOMParser::docCharacters(const XMLCh* const text, const XMLSize_t lengt
   for (XMLSize_t i = 0; i < length; ++i) {
     const XMLCh unit = text[i];
     if (unit != u' ' && unit != u'\n' && unit != u'\r' && unit != u'\t') {
-      noteLeftOut(Content::Text);
+      noteLeftOut(LeftOutContent::Kind::Text);
       return;
     }
   }
@@ -78,14 +78,14 @@ DOMAttr* XORXDOMParser::createAttr(const XMLCh* name) {
 void XORXDOMParser::ignorableWhitespace(const XMLCh* const, const XMLSize_t, const bool) {}
 
 void XORXDOMParser::docComment(const XMLCh* const) {
-  noteLeftOut(Content::Comment);
+  noteLeftOut(LeftOutContent::Kind::Comment);
 }
 
 void XORXDOMParser::docPI(const XMLCh* const, const XMLCh* const) {
-  noteLeftOut(Content::Instruction);
+  noteLeftOut(LeftOutContent::Kind::Instruction);
 }
 
-void XORXDOMParser::noteLeftOut(Content content) {
+void XORXDOMParser::noteLeftOut(LeftOutContent::Kind kind) {
   if (m_leftOut.size() < kLeftOutEntries)
-    m_leftOut.push_back({content, static_cast<int>(getScanner()->getLocator()->getLineNumber())});
+    m_leftOut.push_back({kind, static_cast<int>(getScanner()->getLocator()->getLineNumber())});
 }

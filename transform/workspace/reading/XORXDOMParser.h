@@ -3,21 +3,20 @@
 // where such content stood.
 #pragma once
 
-#include <platform/Export.h>
-#include <transform/workspace/ElementTable.h>
+#include <transform/workspace/records/ElementTable.h>
 
 #include <xercesc/parsers/XercesDOMParser.hpp>
 
 #include <vector>
 
-class ORX_EXPORT XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
- public:
-  enum class Content { Text, Comment, Instruction };
-  struct LeftOut {
-    Content content;
-    int line;  // where it ends, in the text that was parsed
-  };
+struct LeftOutContent {
+  enum class Kind { Text, Comment, Instruction };
+  Kind kind;
+  int line;  // where it ends, in the text that was parsed
+};
 
+class XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
+ public:
   XORXDOMParser();
   ~XORXDOMParser() override;
 
@@ -30,7 +29,7 @@ class ORX_EXPORT XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
   // Hands over the elements of the last parse, still without lines.
   ElementTable takeElements() { return std::move(m_elements); }
   // Text only when it is not blank; at most some thousand entries are noted.
-  const std::vector<LeftOut>& leftOut() const { return m_leftOut; }
+  const std::vector<LeftOutContent>& leftOut() const { return m_leftOut; }
 
   void XMLDecl(const XMLCh* const version, const XMLCh* const encoding, const XMLCh* const standalone,
                const XMLCh* const actualEncoding) override;
@@ -49,10 +48,10 @@ class ORX_EXPORT XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
   XERCES_CPP_NAMESPACE::DOMAttr* createAttr(const XMLCh* name) override;
 
  private:
-  void noteLeftOut(Content content);
+  void noteLeftOut(LeftOutContent::Kind kind);
 
   XMLCh* m_encodingName = nullptr;
   ElementTable m_elements;
   int m_depth = 0;
-  std::vector<LeftOut> m_leftOut;
+  std::vector<LeftOutContent> m_leftOut;
 };

@@ -1,4 +1,4 @@
-#include <transform/workspace/XercesPlatform.h>
+#include <transform/workspace/reading/XercesPlatform.h>
 
 #include <QtGlobal>
 #include <xercesc/util/PlatformUtils.hpp>

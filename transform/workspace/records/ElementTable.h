@@ -2,7 +2,7 @@
 // Walks over it are quicker than over the tree itself.
 #pragma once
 
-#include <transform/workspace/LineMap.h>
+#include <transform/workspace/reading/LineMap.h>
 
 #include <xercesc/dom/DOMElement.hpp>
 

@@ -1,7 +1,7 @@
-#include <transform/workspace/DocumentLimits.h>
-#include <transform/workspace/ElementText.h>
-#include <transform/workspace/RecordCheck.h>
-#include <transform/workspace/XmlText.h>
+#include <transform/workspace/reading/DocumentLimits.h>
+#include <transform/workspace/records/RecordCheck.h>
+#include <transform/workspace/writing/ElementText.h>
+#include <transform/workspace/writing/XmlText.h>
 
 QString valueRefusal(const QString& value) {
   const int at = firstForbidden(value);

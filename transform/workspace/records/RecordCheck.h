@@ -2,8 +2,8 @@
 // values of a permitted length.
 #pragma once
 
-#include <transform/workspace/RecordTables.h>
-#include <transform/workspace/ValueText.h>
+#include <transform/workspace/records/RecordTables.h>
+#include <transform/workspace/records/ValueText.h>
 
 // Why a value cannot be written; empty when it can.
 QString valueRefusal(const QString& value);

@@ -1,5 +1,5 @@
 // Comparison of records, field by field as their tables list them.
-#include <transform/workspace/RecordTables.h>
+#include <transform/workspace/records/RecordTables.h>
 
 namespace {
 

@@ -1,5 +1,5 @@
 #include <platform/orxparameter/GUIType.h>
-#include <transform/workspace/RecordReader.h>
+#include <transform/workspace/records/RecordReader.h>
 
 namespace {
 

@@ -1,11 +1,11 @@
 // Builds records from elements, as their tables say.
 #pragma once
 
-#include <transform/workspace/ElementTable.h>
 #include <transform/workspace/IXMLComponentReader.h>
-#include <transform/workspace/RecordTables.h>
-#include <transform/workspace/ValueText.h>
-#include <transform/workspace/XmlText.h>
+#include <transform/workspace/records/ElementTable.h>
+#include <transform/workspace/records/RecordTables.h>
+#include <transform/workspace/records/ValueText.h>
+#include <transform/workspace/writing/XmlText.h>
 
 #include <xercesc/dom/DOMAttr.hpp>
 #include <xercesc/dom/DOMNamedNodeMap.hpp>

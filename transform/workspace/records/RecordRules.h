@@ -2,7 +2,7 @@
 #pragma once
 
 #include <transform/workspace/RecordList.h>
-#include <transform/workspace/Vocabulary.h>
+#include <transform/workspace/records/Vocabulary.h>
 
 #include <QPointF>
 #include <QRectF>

@@ -1,5 +1,5 @@
 #include <platform/qorxcore/Lists.h>
-#include <transform/workspace/RecordTables.h>
+#include <transform/workspace/records/RecordTables.h>
 
 namespace tables {
 

@@ -4,8 +4,8 @@
 // `layout` says how the writer lays the element out: each attribute on a line of its own, or all on one line.
 #pragma once
 
-#include <transform/workspace/RecordRules.h>
 #include <transform/workspace/WorkspaceRecords.h>
+#include <transform/workspace/records/RecordRules.h>
 
 enum class Layout { Lines, OneLine };
 

@@ -1,5 +1,5 @@
-#include <transform/workspace/ValueText.h>
-#include <transform/workspace/Vocabulary.h>
+#include <transform/workspace/records/ValueText.h>
+#include <transform/workspace/records/Vocabulary.h>
 
 #include <array>
 #include <charconv>

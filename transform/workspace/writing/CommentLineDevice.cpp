@@ -1,4 +1,4 @@
-#include <transform/workspace/CommentLineDevice.h>
+#include <transform/workspace/writing/CommentLineDevice.h>
 
 #include <cstring>
 

@@ -1,4 +1,4 @@
-#include <transform/workspace/ElementText.h>
+#include <transform/workspace/writing/ElementText.h>
 
 namespace {
 

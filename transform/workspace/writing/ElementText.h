@@ -1,8 +1,8 @@
 // Elements as text in the layout of workspace documents, appended to one string.
 #pragma once
 
-#include <transform/workspace/RecordTables.h>
-#include <transform/workspace/ValueText.h>
+#include <transform/workspace/records/RecordTables.h>
+#include <transform/workspace/records/ValueText.h>
 
 #include <QTextCodec>
 

@@ -1,4 +1,4 @@
-#include <transform/workspace/LossCollector.h>
+#include <transform/workspace/writing/LossCollector.h>
 
 using XERCES_CPP_NAMESPACE::DOMAttr;
 using XERCES_CPP_NAMESPACE::XMLString;

@@ -1,8 +1,8 @@
 // Walks over a document and holds it against the tables; the work of WorkspaceLossReport.
 #pragma once
 
-#include <transform/workspace/RecordReader.h>
 #include <transform/workspace/WorkspaceLossReport.h>
+#include <transform/workspace/records/RecordReader.h>
 
 #include <QSet>
 

@@ -1,4 +1,4 @@
-#include <transform/workspace/XmlText.h>
+#include <transform/workspace/writing/XmlText.h>
 
 #include <xercesc/util/XMLChar.hpp>
 

@@ -2,9 +2,8 @@
 // Any content ends in a result: what is no definition is passed over, and told by unfinished().
 #pragma once
 
-#include <platform/Export.h>
 #include <transform/core/TransformerDefinition.h>
-#include <transform/registry/DefinitionText.h>
+#include <transform/registry/loading/DefinitionText.h>
 
 #include <QByteArray>
 #include <QString>
@@ -13,7 +12,7 @@
 
 class QIODevice;
 
-class ORX_EXPORT DefinitionFileParser {
+class DefinitionFileParser {
  public:
   // The device is open for reading; `path` becomes each definition's file path. False, with nothing
   // collected, when the device cannot be read or holds too much; errorString() tells why.

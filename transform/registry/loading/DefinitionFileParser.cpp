@@ -1,5 +1,5 @@
-#include <transform/registry/DefinitionFileParser.h>
-#include <transform/registry/DefinitionKeywords.h>
+#include <transform/registry/loading/DefinitionFileParser.h>
+#include <transform/registry/loading/DefinitionKeywords.h>
 
 namespace {
 
