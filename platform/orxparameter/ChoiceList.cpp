@@ -48,6 +48,13 @@ bool isTypeOrVariant(const GUIType& type, QLatin1String word) {
 void ChoiceListData::set(const QString& shown, const QString& stored, bool replace) {
   const int next = int(entries.size());
   const int index = byShown.value(shown, next);
+  const int plain = replace && index == next ? byShown.value(stored, -1) : -1;
+  if (plain >= 0 && entries[size_t(plain)].second == stored) {
+    byShown.remove(stored);
+    byShown.insert(shown, plain);
+    entries[size_t(plain)].first = shown;
+    return;
+  }
   if (index == next) {
     entries.emplace_back(shown, stored);
     byShown.insert(shown, index);

@@ -27,8 +27,8 @@ class ORX_EXPORT ChoiceList {
   explicit ChoiceList(const GUIType& type);
 
   // Adds entries of the form `KEY,MAPPED%KEY,MAPPED...`, which give a plain choice a lookup table; the mapped
-  // part is word-encoded. A key that is already shown is given the new stored side, any other is a further
-  // entry.
+  // part is word-encoded. A key that is already shown is given the new stored side; a key whose mapped part
+  // is a plain choice so far becomes the shown name of that; any other is a further entry.
   void addLookup(const QString& lookupLine);
 
   bool isEmpty() const { return entries().empty(); }

@@ -116,8 +116,15 @@ TEST(ConfigDefinition, DefaultParameters) {
       words("GROUP_BY XFORMER_NAME ORX_PROCESS_COUNT ORX_PROCESS_COUNTDISP ORX_PROCESS_GROUPS_ORDERED"));
   EXPECT_EQ(grouped.getParameterValue(qs("GROUP_BY")), qs("<UNUSED>"));
   EXPECT_EQ(grouped.getParameterValue(qs("ORX_PROCESS_COUNT")), qs("No Parallelism"));
-  EXPECT_EQ(grouped.getParameterByMacroName(qs("ORX_PROCESS_COUNT"))->choices().toStored(qs("Extreme")),
-            qs("EXTREME"));
+  const ChoiceList& levels = grouped.getParameterByMacroName(qs("ORX_PROCESS_COUNT"))->choices();
+  EXPECT_EQ(levels.entries().size(), 5u);
+  for (const auto& [value, shown] :
+       {std::pair("EXTREME", "Extreme"), {"Minimal", "Minimal"}, {"$(X)", "$(X)"}}) {
+    grouped.setParameterValue(qs("ORX_PROCESS_COUNT"), qs(value), false);
+    grouped.setParameterValue(qs("ORX_PROCESS_COUNTDISP"), qs("Moderate"), false);
+    EXPECT_EQ(grouped.getParameterValue(qs("ORX_PROCESS_COUNTDISP")), qs(shown));
+  }
+  EXPECT_EQ(levels.toStored(qs("Extreme")), qs("EXTREME"));
   EXPECT_TRUE(grouped.getAttributeNamesInValue(qs("GROUP_BY")).isEmpty());
   QHash<QString, QString> table;
   EXPECT_TRUE(grouped.getParameterLookupTable(qs("ORX_PROCESS_GROUPS_ORDERED"), QString(), table));
@@ -163,7 +170,9 @@ TEST(ConfigDefinition, CopiesHoldTheirOwnValuesPortsAndIdentity) {
   EXPECT_EQ(prototype.getInputAttributeUnion(), words("x"));
   EXPECT_TRUE(prototype.getInputFeatureTypes(qs("IN")).isEmpty());
   EXPECT_EQ(prototype.getParameters(), words("A XFORMER_NAME"));
+  copy->setLastParmEditBuild(15179);
   prototype.copyValues(copy.get());
+  EXPECT_EQ(prototype.lastParmEditBuild(), 15179);
   EXPECT_EQ(prototype.getParameterValue(qs("A")), qs("2"));
   EXPECT_EQ(prototype.getInputAttributeUnion(), words("y"));
   EXPECT_FALSE(prototype.hasParameter(qs("B")));

@@ -170,6 +170,7 @@ TEST(ConfigSerial, PartialFields) {
       {"PARAMETER_VALUES", "A,2,B", "2", ""},
       {"PARAMETER_VALUES", "", "old", ""},
       {"INPUT_FEATURE_TYPES", "IN,\"x,y\",OTHER", "old", "x y x y"},
+      {"INPUT_FEATURE_TYPES", "IN,x,IN,y", "old", "x y x y"},
       {"UNKNOWN", "A,2", "old", ""},
   };
   for (const auto& c : cases) {

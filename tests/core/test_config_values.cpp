@@ -227,6 +227,12 @@ TEST(ConfigValues, RecordsStayPutWhileValuesChange) {
   EXPECT_TRUE(record->getFlag(kGUITypeOptional));
   record->setTypeFromGUILine(qs("CHOICE \"\""));
   EXPECT_EQ(record->getTypeWithConfig(), qs("CHOICE"));
+
+  TransformParamCfg looked(GUIType::fromTransformerTypeString(qs("CHOICE a%b"), qs("C")), {qs("a,1")});
+  looked.setTypeFromGUILine(qs("CHOICE a%b"));
+  EXPECT_EQ(looked.choices().toStored(qs("a")), qs("1"));
+  looked.setTypeFromGUILine(qs("CHOICE a%c"));
+  EXPECT_FALSE(looked.choices().hasLookup());
 }
 
 }  // namespace

@@ -254,7 +254,8 @@ const Header kHeaders[] = {
     {"Foo,7,Cat", "Foo;7;Cat;;1;1;0;NO_PARALLELISM;;;0;0;27"},
     {" Foo , 2 ,\tCat ,{{A}-B},Linked Always,yes,yes,g,s,5,-,yes,36",
      "Foo;2;Cat;A-B;4;0;1;NO_PARALLELISM;g;s;5;1;36"},
-    {"Foo,2,Cat,A,Linked by Default,no,MODERATE,,,x,,no,", "Foo;2;Cat;A;2;1;0;MODERATE;;;0;0;"},
+    {"Foo,2,Cat,A,Linked by Default,no,MODERATE,,,x,,no,", "Foo;2;Cat;A;2;1;0;MODERATE;;;0;0;27"},
+    {"Foo,2,Cat,A,,,,,,,,,", "Foo;2;Cat;A;1;1;0;NO_PARALLELISM;;;0;0;27"},
     {"Foo,2,Cat,A,Embedded Always,Yes,no", "Foo;2;Cat;A;3;1;0;NO_PARALLELISM;;;0;0;27"},
     {"Foo,2,Cat,A,Anything", "Foo;2;Cat;A;1;1;0;NO_PARALLELISM;;;0;0;27"},
     {"Foo,2", ";1;;;1;1;0;NO_PARALLELISM;;;0;0;27"},
@@ -293,9 +294,9 @@ TEST_F(DocumentNetwork, ReadsHeaders) {
 TEST_F(DocumentNetwork, PicksTheVersionAndLoadsItsBodyLate) {
   store("v.ort", names(QStringLiteral("Net,1,Cat")), {{QStringLiteral("Net"), split("in OLD")}});
   const QString file =
-      store("v.ort", names(QStringLiteral("Net,2,Cat,{G}")),
-            {{QStringLiteral("Net"),
-              split("set TITLE T;gui GUI TEXT P P | d;in NEW;out O;use I Inner;NEW -> I;I -> O Y")},
+      store("v.ort", names(QStringLiteral("Net,2,Cat,{G},,,,,,,,,")),
+            {{QStringLiteral("Net"), split("set TITLE T;set PYTHON_COMPATIBILITY 38;gui GUI TEXT P P | d;in "
+                                           "NEW;out O;use I Inner;NEW -> I;I -> O Y")},
              {QStringLiteral("Inner"), split("in X;out Y;t T Adder;parm T ATTR x;X -> T;T -> Y OUT")}});
   const struct {
     int wanted;
@@ -309,6 +310,8 @@ TEST_F(DocumentNetwork, PicksTheVersionAndLoadsItsBodyLate) {
     EXPECT_EQ(network.getVersion(), row.version) << row.wanted;
     EXPECT_EQ(network.getInputs(), names(QLatin1String(row.input))) << row.wanted;
     EXPECT_TRUE(network.isBodyLoaded());
+    EXPECT_EQ(network.getPythonVersion(),
+              QLatin1String(network.getVersion() == 2 && row.wanted != 3 ? "38" : "27"));
     EXPECT_TRUE(network.problems().empty());
   }
   ExternalTransformerNetwork network(file, 2, &definitions);

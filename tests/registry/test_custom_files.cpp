@@ -97,6 +97,34 @@ TEST(CustomTransformerFiles, VersionsAreFoundOnDemand) {
   }
 }
 
+TEST(CustomTransformerFiles, TheBuildIsFoundInEveryFormOfXml) {
+  const struct {
+    const char* attribute;
+    bool isTooNew;
+  } cases[] = {
+      {"LAST_SAVE_BUILD='99999'", true},
+      {"LAST_SAVE_BUILD = \"99999\"", true},
+      {"LAST_SAVE_BUILD\n=\n\n' 99999 '", true},
+      {"LAST_SAVE_BUILD=\"&#57;9&#x39;99\"", true},
+      {"LAST_SAVE_BUILD=\"99999999999999999999999\"", true},
+      {"NOTE=\"LAST_SAVE_BUILD='99999'\"", false},
+      {"X_LAST_SAVE_BUILD='99999'", false},
+      {"LAST_SAVE_BUILD='1'><!-- <A LAST_SAVE_BUILD='99999'/> --", false},
+      {"LAST_SAVE_BUILD='&&&&'", false},
+  };
+  for (const auto& test : cases) {
+    RegistryFolders folders;
+    QByteArray text = document("OUT", 1);
+    text.replace("LAST_SAVE_BUILD=\"1\"", test.attribute);
+    QString error;
+    const QString path = folders.path("home/transformers/Cleaner.ort");
+    folders.define("Other.ort", definitionText("Other", 1));
+    ASSERT_TRUE(VersionStore(path).insert({"Cleaner", "1", "Mine"}, {"note <a \"b"}, text, error));
+    EXPECT_EQ(versionOf(folders.load(), ITransformerMgr::NEWEST_VERSION), test.isTooNew ? -1 : 1)
+        << test.attribute;
+  }
+}
+
 TEST(CustomTransformerFiles, RefusedOnesAreListed) {
   RegistryFolders folders;
   const QString first = customFile(folders, "A.ort", {{2, 1}});

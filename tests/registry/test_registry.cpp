@@ -198,7 +198,8 @@ TEST(Registry, CompanionsOfTheLanguage) {
   folders.define("b-localized.de", companion);
   folders.define("b-localized.fr", "TRANSFORMER_NAME: T\nVERSION: 2\nLOCALIZED_NAME: falsch\n");
   folders.define("CategoryDefinitions",
-                 "CATEGORY_DESCRIPTION_START Attributes\nabout them\nCATEGORY_DESCRIPTION_END\n");
+                 "CATEGORY_DESCRIPTION_START Attributes\nabout them\nCATEGORY_DESCRIPTION_END\n"
+                 "CATEGORY_DESCRIPTION_START Empty\nCATEGORY_DESCRIPTION_END\n");
   QStringList lines;
   {
     const LanguageGuard german("de");
@@ -226,6 +227,7 @@ TEST(Registry, CompanionsOfTheLanguage) {
   EXPECT_TRUE(registry.getCategoryDesc("Attributes", lines));
   EXPECT_EQ(lines, list({"about them"}));
   EXPECT_FALSE(registry.getCategoryDesc("Merkmale", lines));
+  EXPECT_FALSE(registry.getCategoryDesc("Empty", lines));
 }
 
 TEST(Registry, ChangeLogPages) {

@@ -33,7 +33,12 @@ QString TransformParamCfg::getTypeWithConfig() const {
 void TransformParamCfg::setTypeFromGUILine(const QString& line) {
   const GUIType promptLine = GUIType::fromGuiLine(line);
   const QString typeText = promptLine.isNull() ? line : promptLine.getTypeText();
+  const QString before = getTypeWithConfig();
   GUIType::operator=(GUIType::fromTransformerTypeString(typeText, getName(), getDescription()));
+  // The lookups of the definition belong to the entries of its own type.
+  if (getTypeWithConfig() != before) {
+    m_lookupLines.clear();
+  }
   rebuildLookupData();
 }
 

@@ -75,6 +75,7 @@ void TransformerCfg::copyValues(const TransformerCfg* other) {
       record.setValue(record.settable(theirs.getValue()));
     }
   }
+  m_lastParmEditBuild = other->m_lastParmEditBuild;
   deepCopyAttributeInfo(other);
   // Its order is that of the inputs, which may be others here.
   m_attributeUnion.reset();

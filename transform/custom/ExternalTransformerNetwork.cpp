@@ -80,7 +80,7 @@ void ExternalTransformerNetwork::readHeader(int version) {
   if (!m_isLoaded)
     return;
   const QStringList& fields = m_header.fields;
-  const auto has = [&](Field field) { return fields.size() > field; };
+  const auto has = [&](Field field) { return !fields.value(field).isEmpty(); };
   setName(m_header.name());
   setVersion(m_header.version());
   setCategory(fields.at(2));
@@ -104,9 +104,9 @@ void ExternalTransformerNetwork::readHeader(int version) {
 
 void ExternalTransformerNetwork::takeIdentity(const QHash<QString, QString>& settings) {
   QHash<QString, QString> unknown = settings;
-  if (m_settingsChanged || m_header.fields.size() > kBlockedLooping)
+  if (m_settingsChanged || !m_header.fields.value(kBlockedLooping).isEmpty())
     unknown.remove(QStringLiteral("BLOCKED_LOOPING"));
-  if (m_header.fields.size() > kPython)
+  if (!m_header.fields.value(kPython).isEmpty())
     unknown.remove(QStringLiteral("PYTHON_COMPATIBILITY"));
   takeRunSettings(unknown);
 }

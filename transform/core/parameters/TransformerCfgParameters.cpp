@@ -108,7 +108,16 @@ bool TransformerCfg::applyParameterValue(const QString& parameter, const QString
   if (!record) {
     return false;
   }
+  // What is shown of the process count follows it, whatever a document says.
+  if (parameter == kProcessCountDisplayParameter && hasParameter(kProcessCountParameter)) {
+    return true;
+  }
   storeValue(*record, parameter, value);
+  if (parameter == kProcessCountParameter) {
+    if (TransformParamCfg* shown = getParameterByMacroName(kProcessCountDisplayParameter)) {
+      shown->setValue(record->choices().toShown(record->getValue()));
+    }
+  }
   // The order of the inputs may hang on a parameter.
   m_attributeUnion.reset();
   return true;

@@ -64,26 +64,35 @@ QString packTable(const QHash<QString, Value>& table, const QStringList& tagOrde
   return pack(elements);
 }
 
-// Key and value by turns; a last key without a value is left out. A key that is there twice keeps its first
-// place and its last value.
-std::vector<std::pair<QString, QString>> unpackTable(const QString& text) {
+// Key and value by turns; a last key without a value is left out.
+std::vector<std::pair<QString, QString>> unpackPairs(const QString& text) {
   const QStringList elements = unpack(text);
+  std::vector<std::pair<QString, QString>> pairs;
+  for (int i = 0; i + 1 < elements.size(); i += 2) {
+    pairs.emplace_back(elements[i], elements[i + 1]);
+  }
+  return pairs;
+}
+
+// A key that is there twice keeps its first place and its last value.
+std::vector<std::pair<QString, QString>> unpackTable(const QString& text) {
   std::vector<std::pair<QString, QString>> entries;
   QHash<QString, std::size_t> places;
-  for (int i = 0; i + 1 < elements.size(); i += 2) {
-    const auto place = places.constFind(elements[i]);
+  for (const auto& [key, value] : unpackPairs(text)) {
+    const auto place = places.constFind(key);
     if (place == places.constEnd()) {
-      places.insert(elements[i], entries.size());
-      entries.emplace_back(elements[i], elements[i + 1]);
+      places.insert(key, entries.size());
+      entries.emplace_back(key, value);
     } else {
-      entries[*place].second = elements[i + 1];
+      entries[*place].second = value;
     }
   }
   return entries;
 }
 
+// A tag that is there twice gets both lists.
 void appendLists(const QString& text, QHash<QString, QStringList>& table) {
-  for (const auto& [tag, packed] : unpackTable(text)) {
+  for (const auto& [tag, packed] : unpackPairs(text)) {
     table[tag] += unpack(packed);
   }
 }

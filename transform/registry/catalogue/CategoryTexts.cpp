@@ -11,7 +11,7 @@ void CategoryTexts::setLocalizedName(const QString& category, const QString& loc
 
 bool CategoryTexts::description(const QString& category, QStringList& lines) const {
   const auto description = m_descriptions.constFind(category);
-  if (description == m_descriptions.constEnd()) {
+  if (description == m_descriptions.constEnd() || description.value().isEmpty()) {
     return false;
   }
   lines = description.value();

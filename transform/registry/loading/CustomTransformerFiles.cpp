@@ -1,37 +1,33 @@
-#include <platform/orxutil/Decipher.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/registry/ITransformerMgr.h>
 #include <transform/registry/loading/CustomTransformerFiles.h>
+#include <transform/workspace/AttributeScan.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 
 #include <algorithm>
+#include <limits>
 
 namespace {
 
 // The build that saved a version last, told by its document without parsing it; 0 when it does not say.
 int lastSaveBuild(const QString& path, const VersionInfo& version) {
-  static const QByteArray mark("LAST_SAVE_BUILD=\"");
   QByteArray text;
-  int place = -1;
   try {
     PlainFile plain(path, QStringLiteral("kx-in-XXXXXX"));
     if (plain.device().seek(version.byteOffset))
       text = plain.device().read(version.byteLength);
-    place = text.lastIndexOf(mark);
-    if (place < 0 && ORW_hasDecipherRoutine()) {
-      text = VersionStore(path).read(version.byteOffset, version.byteLength).document;
-      place = text.lastIndexOf(mark);
-    }
+    const int document = text.indexOf(QByteArray("\n") + VersionStore::kDocument);
+    text = document >= 0 ? text.mid(document + 1)
+                         : VersionStore(path).read(version.byteOffset, version.byteLength).document;
   } catch (const WorkspaceLoaderException&) {
     return 0;
   }
-  if (place < 0)
-    return 0;
-  const int begin = place + mark.size();
-  return text.mid(begin, text.indexOf('"', begin) - begin).toInt();
+  const QByteArray build = lastAttributeValue(text, "LAST_SAVE_BUILD").trimmed();
+  const bool isLarge = build.toDouble() > std::numeric_limits<int>::max();
+  return isLarge ? std::numeric_limits<int>::max() : build.toInt();
 }
 
 }  // namespace
