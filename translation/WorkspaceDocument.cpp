@@ -6,6 +6,8 @@
 #include <QBuffer>
 #include <QFile>
 
+#include <algorithm>
+
 WorkspaceDocument::Reading WorkspaceDocument::read(Diagnostics& diagnostics, QString& error) {
   // Asked before the reader is, because its exceptions do not tell a missing file from a malformed one.
   if (!m_input.open()) {
@@ -25,6 +27,7 @@ WorkspaceDocument::Reading WorkspaceDocument::read(Diagnostics& diagnostics, QSt
 
 WorkspaceDocument::Reading WorkspaceDocument::readOpened(Diagnostics& diagnostics, QString& error) {
   m_form = WorkspaceFile::recognise(m_input.path());
+  m_rawLines = RawLine::find(m_input.path());
   if (m_form == WorkspaceFile::Form::Versioned) {
     m_versions = VersionStore(m_input.path()).versions(error);
     if (!error.isEmpty())
@@ -54,7 +57,15 @@ bool WorkspaceDocument::originalBytes(QByteArray& bytes, QString& error) const {
 }
 
 std::vector<WorkspaceLossReport::Loss> WorkspaceDocument::losses() const {
-  return WorkspaceLossReport(m_reader).losses();
+  using Loss = WorkspaceLossReport::Loss;
+  std::vector<Loss> losses = WorkspaceLossReport(m_reader).losses();
+  for (const RawLine& line : m_rawLines) {
+    if (line.kind == RawLine::Kind::Stray)
+      losses.push_back({WorkspaceLossReport::Kind::RawLine, line.line, QString(), QString(), line.text});
+  }
+  std::stable_sort(losses.begin(), losses.end(),
+                   [](const Loss& left, const Loss& right) { return left.line < right.line; });
+  return losses;
 }
 
 bool WorkspaceDocument::canonicalBytes(QByteArray& bytes, QString& error) const {

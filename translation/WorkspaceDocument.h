@@ -4,6 +4,7 @@
 
 #include <platform/Export.h>
 #include <transform/files/InputFile.h>
+#include <transform/workspace/RawLines.h>
 #include <transform/workspace/VersionInfo.h>
 #include <transform/workspace/WorkspaceFile.h>
 #include <transform/workspace/WorkspaceLossReport.h>
@@ -65,4 +66,5 @@ class ORX_EXPORT WorkspaceDocument {
   WorkspaceFile::Form m_form = WorkspaceFile::Form::Unknown;
   QStringList m_headerLines;
   QList<VersionInfo> m_versions;
+  std::vector<RawLine> m_rawLines;
 };

@@ -51,6 +51,11 @@ class RandomRecords {
   void fillSpecial(R&) {}
   void fillSpecial(DatasetStruct& record) { record.role += QLatin1Char('R'); }
   void fillSpecial(FeatureTypeStruct& record);
+  void fillSpecial(TransformerStruct& record) {
+    fill(record.position);
+    if (flag())
+      record.boundingRect = QRectF();
+  }
   void fillSpecial(GlobalParameterStruct& record);
   void fillSpecial(SubDocumentIOStruct& record);
 

@@ -1,6 +1,7 @@
 #include "DocumentContent.h"
 #include <platform/qorxcore/Language.h>
 #include <transform/workspace/DocumentCopy.h>
+#include <transform/workspace/RawLines.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceFile.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
@@ -9,6 +10,7 @@
 #include <QDir>
 #include <QFile>
 #include <QTemporaryDir>
+#include <QTextCodec>
 #include <gtest/gtest.h>
 
 namespace {
@@ -57,7 +59,8 @@ TEST(WorkspaceFile, SavingKeepsWhatSurroundsTheXml) {
 TEST(WorkspaceFile, LineEndsRawLinesAndWhatFollowsAreKept) {
   const QByteArray start = "# first\r\n";
   const QByteArray end =
-      "a line between\r\n#! START_HEADER\r\nMACRO A \xe9\r\n#! END_HEADER\r\nFACTORY_DEF * X\r\n\r\n#! "
+      "a line between\r\n  #!START_HEADER of all\nMACRO A \xe9\r\n#! END_HEADER now\r\nFACTORY_DEF * "
+      "X\r\n\r\n#! "
       "END_HEADER\r\n\xff";
   QByteArray xml = written(randomContent(2, 1), "ISO-8859-1");
   xml = "#! " + xml.trimmed().replace("\n", "\r\n#! ") + "\r\n";
@@ -219,6 +222,30 @@ TEST(VersionStore, OpeningLinesAndPlacesThatAreOff) {
   EXPECT_EQ(error.toStdString(), "File Error!\nCould not open file: /nowhere/x");
 }
 
+TEST(RawLines, StrayLinesAndMarksOfMerges) {
+  const struct {
+    QByteArray bytes;
+    const char* found;  // line and, for a conflict, "!"
+  } cases[] = {
+      {"note\n#! <W/>\n\nmore\n#! START_HEADER\nMACRO A 1\n=======\n#! END_HEADER\n#! x\nbehind\n", ""},
+      {"#! <W\n\n#!\n  two \n#!A='1'\n#! />\n", "4 5"},
+      {"#! <W\n<<<<<<< a\n#! A='1'\n|||||||\r\n=======\n#! A='2'\n>>>>>>> b\n#! />\n=======\n",
+       "2! 4! 5! 7!"},
+      {"<W\n<<<<<<<\nA='1'\n=======\n>>>>>>>\n/>", "2! 4! 5!"},
+      {"#! START_HEADER\n<<<<<<<<\n>>>>>>>\n=======\n", "3!"},
+  };
+  for (const auto& test : cases) {
+    for (const bool isWide : {false, true}) {
+      const QString text = QString::fromLatin1(test.bytes);
+      const ScratchFile file(isWide ? QTextCodec::codecForName("UTF-16BE")->fromUnicode(text) : test.bytes);
+      QStringList found;
+      for (const RawLine& line : RawLine::find(file.name()))
+        found.append(QString::number(line.line) + (line.kind == RawLine::Kind::Conflict ? "!" : ""));
+      EXPECT_EQ(found.join(' ').toStdString(), test.found) << test.bytes.toStdString();
+    }
+  }
+}
+
 TEST(LossReport, NamesEachLossWithItsLine) {
   QORXSetLanguage("en");
   const ScratchFile file(
@@ -226,10 +253,12 @@ TEST(LossReport, NamesEachLossWithItsLine) {
       "#! <CONSTANTS><CONSTANT CONST_VALUE='1'/>\n"
       "#! <PARAMETER_CONSTANT/></CONSTANTS>\n"
       "#! <TRANSFORMERS X='1'>\n"
-      "#! <TRANSFORMER ENABLED='yes' IDENTIFIER='007' OWN='1'>\n"
+      "#! <TRANSFORMER ENABLED='yes' IDENTIFIER='007' POSITION='5 6' BOUNDING_RECT='5 7 1 0' OWN='1'>\n"
       "#! <XFORM_PARM CUSTOM_PROMPT='p' ALWAYS_PROMPT_PARM='false'/>\n"
       "#! <XFORM_PARM CUSTOM_PROMPT=''><DEEP/></XFORM_PARM>\n"
       "#! <STRANGE/></TRANSFORMER></TRANSFORMERS>\n"
+      "#! <FEATURE_TYPES><FEATURE_TYPE DYNAMIC_SCHEMA_ATTRIBUTES_TO_REMOVE='\"a\"b'/>\n"
+      "#! <FEATURE_TYPE DYNAMIC_SCHEMA_ATTRIBUTES_TO_REMOVE=' \"a\"\"\" ,b\",c'/></FEATURE_TYPES>\n"
       "#! <ATTR_LINKS><ATTR_LINK HIDDEN='true'/></ATTR_LINKS>\n"
       "#! text<ORXSERVER><DOCUMENT NAME='d'/></ORXSERVER><!-- note -->\n"
       "skipped\n"
@@ -250,17 +279,20 @@ TEST(LossReport, NamesEachLossWithItsLine) {
             "4 the attribute X of TRANSFORMERS is not known\n"
             "5 the attribute ENABLED of TRANSFORMER has a malformed value: yes\n"
             "5 the attribute OWN of TRANSFORMER is not known\n"
+            "5 the attribute POSITION of TRANSFORMER would become 5 7, the corner of its rectangle\n"
             "6 the attribute CUSTOM_PROMPT of XFORM_PARM is only read\n"
             "7 the element DEEP is not known here\n"
             "8 the element STRANGE is not known here\n"
-            "9 the attribute HIDDEN of ATTR_LINK is not known\n"
-            "10 the element DOCUMENT is not known here\n"
-            "10 text is not kept\n"
-            "10 a comment is not kept\n"
-            "12 a sub-document has no name\n"
-            "12 the element DATASETS is not known here\n"
-            "13 there is an earlier sub-document of the name s\n"
-            "13 the element T is not known here");
+            "9 the attribute DYNAMIC_SCHEMA_ATTRIBUTES_TO_REMOVE of FEATURE_TYPE has a malformed value: "
+            "\"a\"b\n"
+            "11 the attribute HIDDEN of ATTR_LINK is not known\n"
+            "12 the element DOCUMENT is not known here\n"
+            "12 text is not kept\n"
+            "12 a comment is not kept\n"
+            "14 a sub-document has no name\n"
+            "14 the element DATASETS is not known here\n"
+            "15 there is an earlier sub-document of the name s\n"
+            "15 the element T is not known here");
   const struct {
     const char* language;
     const char* first;

@@ -83,8 +83,8 @@ TEST(Writer, LayoutIsExact) {
       "<BOOKMARKS>\n</BOOKMARKS>\n<TRANSFORMERS>\n</TRANSFORMERS>\n<FEAT_LINKS>\n</FEAT_LINKS>\n"
       "<BREAKPOINTS>\n</BREAKPOINTS>\n<ATTR_LINKS>\n</ATTR_LINKS>\n";
   const QByteArray transformers =
-      "<TRANSFORMERS>\n<TRANSFORMER\n  IDENTIFIER=\"5\"\n  TYPE=\"T\"\n  VERSION=\"0\"\n  POSITION=\"1.5 "
-      "-2\"\n"
+      "<TRANSFORMERS>\n<TRANSFORMER\n  IDENTIFIER=\"5\"\n  TYPE=\"T\"\n  VERSION=\"0\"\n  POSITION=\"0.1 "
+      "2\"\n"
       "  BOUNDING_RECT=\"0.1 2 1000000000000000000000 4\"\n  ORDER=\"-1\"\n  PARMS_EDITED=\"false\"\n"
       "  ENABLED=\"true\"\n  LAST_PARM_EDIT=\"0\"\n>\n    <OUTPUT_FEAT NAME=\"\"/>\n"
       "    <FEAT_COLLAPSED COLLAPSED=\"-1\"/>\n"

@@ -130,15 +130,19 @@ WorkspaceFile::WorkspaceFile(const QString& fileName) {
     if (lines.startsLine()) {
       if (m_hasHeader && !hasHeaderEnded) {
         hasHeaderEnded = lines.matchComment(WorkspaceSplitter::kEndHeader) > 0;
+        m_rawHeader.append(lines.data(), lines.size());
         continue;
       }
       if (!m_hasHeader && lines.matchComment(WorkspaceSplitter::kStartHeader) > 0) {
         m_hasHeader = true;
+        inXml = false;
+        m_rawHeader.append(lines.data(), lines.size());
         continue;
       }
       inXml = !m_hasHeader && lines.matchComment("") > 0;
       hasXml = hasXml || inXml;
     } else if (m_hasHeader && !hasHeaderEnded) {
+      m_rawHeader.append(lines.data(), lines.size());
       continue;
     }
     if (inXml)
@@ -170,6 +174,8 @@ bool WorkspaceFile::setEncoding(const QByteArray& name) {
   const QTextCodec* const codec = fileCodec(name);
   if (!codec)
     return false;
+  if (m_encoding != codec->name())
+    m_rawHeader.clear();
   m_encoding = codec->name();
   m_mark =
       isWide() ? (m_encoding == "UTF-16BE" ? QByteArray("\xfe\xff") : QByteArray("\xff\xfe")) : QByteArray();
@@ -178,6 +184,7 @@ bool WorkspaceFile::setEncoding(const QByteArray& name) {
 
 void WorkspaceFile::setHeaderLines(const QStringList& lines) {
   m_headerLines = lines;
+  m_rawHeader.clear();
   m_hasHeader = true;
 }
 
@@ -258,7 +265,7 @@ bool WorkspaceFile::write(QIODevice& device, DocumentType type,
       error = QStringLiteral("a file of plain XML has no header");
       return false;
     }
-    header = encodedHeader(error);
+    header = m_rawHeader.isEmpty() ? encodedHeader(error) : m_rawHeader;
     if (!error.isEmpty())
       return false;
   }

@@ -68,6 +68,7 @@ class ORX_EXPORT WorkspaceFile {
   QByteArray m_lineEnd = "\n";  // in ASCII
   bool m_hasHeader = false;
   QStringList m_headerLines;
+  QByteArray m_rawHeader;  // with its marks, as read; empty once lines or encoding are others
   // Raw lines: in front of the first line of XML, between the XML and the header, behind the header.
   QByteArray m_before;
   QByteArray m_between;

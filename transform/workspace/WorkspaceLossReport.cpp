@@ -12,6 +12,8 @@ WorkspaceLossReport::Kind kindOf(LeftOutContent::Kind content) {
       return WorkspaceLossReport::Kind::Comment;
     case LeftOutContent::Kind::Instruction:
       return WorkspaceLossReport::Kind::Instruction;
+    case LeftOutContent::Kind::Declaration:
+      return WorkspaceLossReport::Kind::Declaration;
     case LeftOutContent::Kind::Text:
       break;
   }
@@ -55,6 +57,12 @@ QString WorkspaceLossReport::Loss::describe() const {
       return documentText(kLostComment);
     case Kind::Instruction:
       return documentText(kLostInstruction);
+    case Kind::Declaration:
+      return documentText(kLostDeclaration);
+    case Kind::ChangedValue:
+      return documentText(kChangedValue, {attribute, element, value});
+    case Kind::RawLine:
+      return documentText(kMovedLine, {value});
   }
   return QString();
 }

@@ -27,6 +27,9 @@ constexpr long kRepeatedSubDocument = 370776;
 constexpr long kLostText = 370777;
 constexpr long kLostComment = 370778;
 constexpr long kLostInstruction = 370779;
+constexpr long kLostDeclaration = 371300;
+constexpr long kChangedValue = 371301;
+constexpr long kMovedLine = 371302;
 
 }  // namespace document_messages
 

@@ -43,6 +43,8 @@ void XORXDOMParser::XMLDecl(const XMLCh* const version, const XMLCh* const encod
   XMLString::release(&m_encodingName);
   const bool isDeclared = encoding && *encoding;
   m_encodingName = XMLString::replicate(isDeclared ? encoding : actualEncoding);
+  if (!XMLString::equals(version, XMLUni::fgVersion1_0) || (standalone && *standalone))
+    noteLeftOut(LeftOutContent::Kind::Declaration);
   XercesDOMParser::XMLDecl(version, encoding, standalone, actualEncoding);
 }
 

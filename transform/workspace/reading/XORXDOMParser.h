@@ -10,7 +10,7 @@
 #include <vector>
 
 struct LeftOutContent {
-  enum class Kind { Text, Comment, Instruction };
+  enum class Kind { Text, Comment, Instruction, Declaration };
   Kind kind;
   int line;  // where it ends, in the text that was parsed
 };
@@ -28,7 +28,8 @@ class XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
 
   // Hands over the elements of the last parse, still without lines.
   ElementTable takeElements() { return std::move(m_elements); }
-  // Text only when it is not blank; at most some thousand entries are noted.
+  // Text only when it is not blank, declarations only when they say more than version 1.0; at most some
+  // thousand entries are noted.
   const std::vector<LeftOutContent>& leftOut() const { return m_leftOut; }
 
   void XMLDecl(const XMLCh* const version, const XMLCh* const encoding, const XMLCh* const standalone,

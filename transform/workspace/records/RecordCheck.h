@@ -8,6 +8,13 @@
 // Why a value cannot be written; empty when it can.
 QString valueRefusal(const QString& value);
 
+// Whether the reader takes what is written of a value that no single field holds.
+template <class R>
+bool isReadBack(const AttributeRule<R>& rule, const R& record) {
+  R read;
+  return rule.read(read, rule.write(record));
+}
+
 template <class Table>
 QString recordRefusal(const typename Table::Record& record) {
   using R = typename Table::Record;
@@ -28,6 +35,8 @@ QString recordRefusal(const typename Table::Record& record) {
       finite = valuetext::isFinite(record.*rule.size);
     else if (rule.rectangle)
       finite = valuetext::isFinite(record.*rule.rectangle);
+    else if (rule.write && refusal.isEmpty())
+      finite = isReadBack(rule, record);
     if (!finite)
       refusal = QStringLiteral("a number is not finite");
     if (!refusal.isEmpty())

@@ -300,13 +300,18 @@ struct XformParm {
   static constexpr auto children = std::make_tuple();
 };
 
+// The top left corner of the rectangle, when there is one.
+bool readTransformerPosition(TransformerStruct& record, const QString& text);
+QString writeTransformerPosition(const TransformerStruct& record);
+
 struct Transformer {
   using Record = TransformerStruct;
   static constexpr Word element = words::kTransformer;
   static constexpr Layout layout = Layout::Lines;
   static constexpr auto attributes = inOrder(
       attribute(words::kIdentifier, &Record::identifier), attribute(words::kType, &Record::type),
-      attribute(words::kVersion, &Record::version), attribute(words::kPosition, &Record::position),
+      attribute(words::kVersion, &Record::version),
+      special<Record>(words::kPosition, &readTransformerPosition, &writeTransformerPosition),
       attribute(words::kBoundingRect, &Record::boundingRect), attribute(words::kOrder, &Record::order),
       attribute(words::kParmsEdited, &Record::parmsEdited), attribute(words::kEnabled, &Record::enabled),
       attribute(words::kLastParmEdit, &Record::lastParmEdit),

@@ -144,8 +144,15 @@ void LossCollector::section(Place holder) {
 
 template <class Table>
 void LossCollector::record(Place element) {
+  using Record = typename Table::Record;
   const auto& rules = SortedRules<Table>::get();
   std::size_t hint = 0;
+  Record whole;
+  eachAttribute(m_elements.element(element), [&](const DOMAttr& attribute) {
+    if (const auto* const rule = rules.find(attribute.getName(), hint))
+      RecordReader::readValue(*rule, whole, attribute.getValue());
+  });
+  hint = 0;
   eachAttribute(m_elements.element(element), [&](const DOMAttr& attribute) {
     const auto* const rule = rules.find(attribute.getName(), hint);
     const auto lose = [&](Kind kind) {
@@ -155,9 +162,11 @@ void LossCollector::record(Place element) {
       lose(Kind::UnknownAttribute);
       return;
     }
-    typename Table::Record read;
+    Record read;
     if (!RecordReader::readValue(*rule, read, attribute.getValue()))
       lose(Kind::MalformedValue);
+    else if (rule->write && rule->write(read) != rule->write(whole))
+      report(Kind::ChangedValue, element, fromXml(attribute.getName()), rule->write(whole));
     else if (rule->emission == Emission::Never && differsFromDefault(*rule, attribute.getValue()))
       lose(Kind::ReadOnlyAttribute);
   });
