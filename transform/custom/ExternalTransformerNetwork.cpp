@@ -80,7 +80,7 @@ void ExternalTransformerNetwork::readHeader(int version) {
   if (!m_isLoaded)
     return;
   const QStringList& fields = m_header.fields;
-  const auto has = [&](Field field) { return !fields.value(field).isEmpty(); };
+  const auto has = [&](Field field) { return fields.size() > field; };
   setName(m_header.name());
   setVersion(m_header.version());
   setCategory(fields.at(2));
