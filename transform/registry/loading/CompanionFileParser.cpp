@@ -1,5 +1,5 @@
 #include <transform/registry/loading/CompanionFileParser.h>
-#include <transform/registry/loading/DefinitionKeywords.h>
+#include <transform/registry/loading/DefinitionWalk.h>
 
 bool CompanionFileParser::parse(QIODevice& device) {
   *this = CompanionFileParser();
@@ -19,44 +19,45 @@ void CompanionFileParser::parse(const QByteArray& file) {
   read(lines);
 }
 
-void CompanionFileParser::read(DefinitionLines& lines) {
-  while (lines.next()) {
-    if (lines.isSkipped()) {
-      continue;
-    }
+// What the walk over a file's lines tells the parser.
+class CompanionFileParser::Visitor {
+ public:
+  explicit Visitor(CompanionFileParser& parser) : m_parser(parser) {}
+
+  void begin(const DefinitionLines&) {}
+  void header(const DefinitionLines& lines) {
     const QString line = lines.trimmed();
-    const int number = lines.number();
-    if (line.startsWith(kCategoryDescriptionStart)) {
-      if (!readCategoryText(lines, m_categoryDescriptions)) {
-        m_openBlockLine = number;
-      }
-      continue;
-    }
-    QStringList CompanionEntry::*block = line == kDescriptionStart ? &CompanionEntry::descriptionLines
-                                         : line == kTooltipStart   ? &CompanionEntry::tooltipLines
-                                         : line == kChangeLogStart ? &CompanionEntry::changeLog
-                                                                   : nullptr;
-    if (!block) {
-      if (!takeLine(line, number)) {
-        m_strayLines.push_back({line, number});
-      }
-      continue;
-    }
-    std::vector<DefinitionLine> texts;
-    if (!lines.readBlock(line == kDescriptionStart ? kDescriptionEnd
-                         : line == kTooltipStart   ? kTooltipEnd
-                                                   : kChangeLogEnd,
-                         &texts)) {
-      m_openBlockLine = number;
-    }
-    if (m_entries.empty()) {
-      m_strayLines.push_back({line, number});
-      continue;
-    }
-    for (const DefinitionLine& text : texts) {
-      (m_entries.back().*block).append(text.text);
+    if (!m_parser.takeLine(line, lines.number())) {
+      m_parser.m_strayLines.push_back({line, lines.number()});
     }
   }
+  std::vector<DefinitionLine>* block(DefinitionBlock) {
+    m_texts.clear();
+    return &m_texts;
+  }
+  void blockRead(DefinitionBlock block, int number) {
+    if (m_parser.m_entries.empty()) {
+      m_parser.m_strayLines.push_back({wordsOf(block).start, number});
+      return;
+    }
+    CompanionEntry& entry = m_parser.m_entries.back();
+    QStringList& target = block == DefinitionBlock::Description ? entry.descriptionLines
+                          : block == DefinitionBlock::Tooltip   ? entry.tooltipLines
+                                                                : entry.changeLog;
+    target += textsOf(m_texts);
+  }
+  std::vector<DefinitionLine>* templateBlock() { return nullptr; }
+  void templateRead(const DefinitionLines&) {}
+  std::vector<CategoryText>& categories() { return m_parser.m_categoryDescriptions; }
+  void open(int number) { m_parser.m_openBlockLine = number; }
+
+ private:
+  CompanionFileParser& m_parser;
+  std::vector<DefinitionLine> m_texts;  // of the block under way
+};
+
+void CompanionFileParser::read(DefinitionLines& lines) {
+  walkDefinitionLines(lines, DefinitionFileKind::Companion, Visitor(*this));
   m_isSoundUtf8 = lines.isSoundUtf8();
 }
 

@@ -59,6 +59,8 @@ class CompanionFileParser {
   bool isSoundUtf8() const { return m_isSoundUtf8; }
 
  private:
+  class Visitor;
+
   void read(DefinitionLines& lines);
   bool takeLine(const QString& line, int number);
 

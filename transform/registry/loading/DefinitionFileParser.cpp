@@ -1,5 +1,7 @@
 #include <transform/registry/loading/DefinitionFileParser.h>
-#include <transform/registry/loading/DefinitionKeywords.h>
+#include <transform/registry/loading/DefinitionWalk.h>
+
+#include <utility>
 
 namespace {
 
@@ -49,35 +51,38 @@ bool DefinitionFileParser::parse(QIODevice& device, const QString& path) {
   return true;
 }
 
-void DefinitionFileParser::read(DefinitionLines& lines, const QString& path) {
-  DefinitionText& current = m_unfinished;
-  current.filePath = path;
-  while (lines.next()) {
-    if (lines.isSkipped()) {
-      continue;
-    }
-    const int number = lines.number();
-    bool isClosed = true;
-    if (lines.is(kTemplateStart)) {
-      isClosed = lines.readTemplate(kTemplateEnd, &current.templateLines);
-      if (isClosed) {
-        m_definitions.push_back(std::move(current));
-        current = DefinitionText();
-        current.filePath = path;
-      }
-    } else if (lines.is(kDescriptionStart)) {
-      isClosed = lines.readBlock(kDescriptionEnd, &current.description);
-    } else if (lines.is(kTooltipStart)) {
-      isClosed = lines.readBlock(kTooltipEnd, &current.tooltip);
-    } else if (lines.is(kChangeLogStart)) {
-      isClosed = lines.readBlock(kChangeLogEnd, &current.changeLog);
-    } else if (lines.startsWith(kCategoryDescriptionStart)) {
-      isClosed = readCategoryText(lines, m_categories);
-    } else if (m_keepsUnknownLines || findDefinitionKeyword(lines, DefinitionKeyword::kDefinition)) {
-      current.header.push_back({lines.trimmed(), number});
-    }
-    if (!isClosed) {
-      m_openBlockLine = number;
+// What the walk over a file's lines tells the parser.
+class DefinitionFileParser::Visitor {
+ public:
+  explicit Visitor(DefinitionFileParser& parser) : m_parser(parser) {}
+
+  void begin(const DefinitionLines&) {}
+  void header(const DefinitionLines& lines) {
+    if (m_parser.m_keepsUnknownLines || findDefinitionKeyword(lines, DefinitionKeyword::kDefinition)) {
+      m_parser.m_unfinished.header.push_back({lines.trimmed(), lines.number()});
     }
   }
+  std::vector<DefinitionLine>* block(DefinitionBlock block) {
+    DefinitionText& text = m_parser.m_unfinished;
+    return block == DefinitionBlock::Description ? &text.description
+           : block == DefinitionBlock::Tooltip   ? &text.tooltip
+                                                 : &text.changeLog;
+  }
+  void blockRead(DefinitionBlock, int) {}
+  std::vector<DefinitionLine>* templateBlock() { return &m_parser.m_unfinished.templateLines; }
+  void templateRead(const DefinitionLines&) {
+    DefinitionText next;
+    next.filePath = m_parser.m_unfinished.filePath;
+    m_parser.m_definitions.push_back(std::exchange(m_parser.m_unfinished, std::move(next)));
+  }
+  std::vector<CategoryText>& categories() { return m_parser.m_categories; }
+  void open(int number) { m_parser.m_openBlockLine = number; }
+
+ private:
+  DefinitionFileParser& m_parser;
+};
+
+void DefinitionFileParser::read(DefinitionLines& lines, const QString& path) {
+  m_unfinished.filePath = path;
+  walkDefinitionLines(lines, DefinitionFileKind::Definitions, Visitor(*this));
 }

@@ -34,6 +34,8 @@ class DefinitionFileParser {
   static TransformerDefinition definitionAlone(const QByteArray& bytes, const QString& path);
 
  private:
+  class Visitor;
+
   void read(DefinitionLines& lines, const QString& path);
 
   bool m_keepsUnknownLines = true;

@@ -27,6 +27,8 @@ class DefinitionIndex {
   const QString& unfinishedName() const { return m_unfinishedName; }
 
  private:
+  class Visitor;
+
   std::vector<IndexedDefinition> m_definitions;
   std::vector<CategoryText> m_categories;
   bool m_endsUnfinished = false;
