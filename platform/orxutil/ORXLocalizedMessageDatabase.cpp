@@ -33,8 +33,12 @@ QString unescaped(const QString& text) {
 }  // namespace
 
 bool ORXLocalizedMessageDatabase::getMessage(long number, QORXString& text) const {
-  for (const QString& language : {QORXLanguage(), QStringLiteral("en")}) {
-    const Table& texts = table(language);
+  return getMessage(number, text, QORXLanguage());
+}
+
+bool ORXLocalizedMessageDatabase::getMessage(long number, QORXString& text, const QString& language) const {
+  for (const QString& asked : {language, QStringLiteral("en")}) {
+    const Table& texts = table(asked);
     const auto found = texts.constFind(number);
     if (found != texts.constEnd()) {
       text.assign(found.value());

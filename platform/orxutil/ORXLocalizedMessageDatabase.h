@@ -25,6 +25,8 @@ class ORX_EXPORT ORXLocalizedMessageDatabase {
   // whether there was one. Follows a change of language; a language's file is read once. May
   // be asked by several threads at once.
   bool getMessage(long number, QORXString& text) const;
+  // The same of another language, two lower-case letters.
+  bool getMessage(long number, QORXString& text, const QString& language) const;
 
  private:
   using Table = QHash<long, QString>;

@@ -46,6 +46,8 @@ struct TransformerDefinition {
   QHash<QString, QString> tagDescriptions;
   QStringList dependencyScripts;  // Tcl, one script per line of the definition
 
+  QString language;  // of the texts that configuring adds; empty: the current one
+
   QStringList templateLines;
   QStringList descriptionLines;
   QStringList tooltipLines;

@@ -1,6 +1,23 @@
 #include <platform/orxutil/ORXLocalizedMessageDatabase.h>
 #include <transform/text/MessageStrings.h>
 
+namespace {
+
+const ORXLocalizedMessageDatabase& database() {
+  static const ORXLocalizedMessageDatabase kDatabase;
+  return kDatabase;
+}
+
+}  // namespace
+
+QString TransformResStringIn(const QString& language, long number) {
+  if (language.isEmpty())
+    return TransformResString(number);
+  QORXString message;
+  database().getMessage(number, message, language);
+  return message.toQString();
+}
+
 QString TransformResString(long number) {
   return TransformResString(number, QStringList());
 }
@@ -10,9 +27,8 @@ QString TransformResString(long number, const QString& argument) {
 }
 
 QString TransformResString(long number, const QStringList& arguments) {
-  static const ORXLocalizedMessageDatabase kDatabase;
   QORXString message;
-  kDatabase.getMessage(number, message);
+  database().getMessage(number, message);
   const QString& text = message.toQString();
   if (text.isEmpty()) {
     return QString();

@@ -11,3 +11,7 @@
 ORX_EXPORT QString TransformResString(long number);
 ORX_EXPORT QString TransformResString(long number, const QString& argument);
 ORX_EXPORT QString TransformResString(long number, const QStringList& arguments);
+
+// The message without arguments in a language of the caller's choice (two lower-case letters) instead of the
+// current one; an empty one is the current one.
+ORX_EXPORT QString TransformResStringIn(const QString& language, long number);

@@ -173,25 +173,30 @@ void TransformerCfg::addDefinedParameters(const TransformerDefinition& fields, Q
 }
 
 void TransformerCfg::addDefaultParms() {
+  const QString& language = configured().fields.language;
   const auto add = [this](const TransformParamCfg& record) {
     if (!hasParameter(record.getName())) {
       m_parameters.append(record);
     }
   };
-  add(makeParameter(kTextType, kIdentifierParameter, TransformResString(kIdentifierPrompt), QString()));
+  add(makeParameter(kTextType, kIdentifierParameter, TransformResStringIn(language, kIdentifierPrompt),
+                    QString()));
   if (configured().fields.multiProcess.isEmpty()) {
     return;
   }
-  add(makeParameter(kProcessCountType, kProcessCountParameter, TransformResString(kProcessCountPrompt),
-                    kProcessCountDefault, QStringList(kProcessCountLookup)));
+  add(makeParameter(kProcessCountType, kProcessCountParameter,
+                    TransformResStringIn(language, kProcessCountPrompt), kProcessCountDefault,
+                    QStringList(kProcessCountLookup)));
   add(makeParameter(kProcessCountDisplayType, kProcessCountDisplayParameter, QString(),
                     kProcessCountDefault));
-  const auto entry = [](long shown, QLatin1String stored) {
-    return ORX_quoteConfigPiece(TransformResString(shown)) + QLatin1Char(',') + QORXWwjdEncode(stored);
+  const auto entry = [&language](long shown, QLatin1String stored) {
+    return ORX_quoteConfigPiece(TransformResStringIn(language, shown)) + QLatin1Char(',') +
+           QORXWwjdEncode(stored);
   };
   add(makeParameter(QLatin1String("LOOKUP_CHOICE ") + entry(kNoMessage, kNoStored) + QLatin1Char('%') +
                         entry(kYesMessage, kYesStored),
-                    kGroupsOrderedParameter, TransformResString(kGroupsOrderedPrompt), kNoStored));
+                    kGroupsOrderedParameter, TransformResStringIn(language, kGroupsOrderedPrompt),
+                    kNoStored));
 }
 
 void TransformerCfg::checkDependencies(ConfiguredDefinition& definition, QTextStream* log) {

@@ -1,4 +1,3 @@
-#include <platform/qorxcore/Language.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/catalogue/CatalogueEntry.h>
 #include <transform/registry/loading/CompanionFileParser.h>
@@ -6,18 +5,6 @@
 #include <transform/specialised/TransformerCfgFactory.h>
 
 namespace {
-
-// The language of the load, for as long as this object lives.
-class LanguageOfLoad {
- public:
-  explicit LanguageOfLoad(const QString& language) : m_before(QORXLanguage()) { QORXSetLanguage(language); }
-  ~LanguageOfLoad() { QORXSetLanguage(m_before); }
-  LanguageOfLoad(const LanguageOfLoad&) = delete;
-  LanguageOfLoad& operator=(const LanguageOfLoad&) = delete;
-
- private:
-  QString m_before;
-};
 
 void applyCompanion(const CompanionEntry& entry, TransformerCfg& prototype) {
   if (!entry.localizedName.isEmpty()) {
@@ -43,9 +30,9 @@ void applyCompanion(const CompanionEntry& entry, TransformerCfg& prototype) {
 }
 
 std::unique_ptr<TransformerCfg> makePrototype(const CatalogueEntry::Unread& unread) {
-  const LanguageOfLoad language(unread.load->language);
   TransformerDefinition fields = DefinitionFileParser::definitionAlone(unread.bytes, unread.path);
   fields.allowed = unread.isAllowed;
+  fields.language = unread.load->language;
   std::unique_ptr<TransformerCfg> prototype(createTransformerCfg(fields.name, fields.version));
   prototype->configure(fields, unread.load->session);
   prototype->setDefinitionDirectory(unread.load->directory);
