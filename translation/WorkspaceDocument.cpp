@@ -1,3 +1,4 @@
+#include <transform/text/MessageStrings.h>
 #include <transform/workspace/DocumentCopy.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
@@ -8,14 +9,21 @@
 
 #include <algorithm>
 
-WorkspaceDocument::Reading WorkspaceDocument::read(Diagnostics& diagnostics, QString& error) {
+namespace {
+
+constexpr long kOnlyCustomTransformers = 370867;
+
+}  // namespace
+
+WorkspaceDocument::Reading WorkspaceDocument::read(Diagnostics& diagnostics, QString& error,
+                                                   Versions versions) {
   // Asked before the reader is, because its exceptions do not tell a missing file from a malformed one.
   if (!m_input.open()) {
     error = m_input.errorString();
     return Reading::Unreadable;
   }
   try {
-    return readOpened(diagnostics, error);
+    return readOpened(diagnostics, error, versions);
   } catch (const WorkspaceLoaderException& exception) {
     QString text = exception.getMessage();
     if (m_input.isCopy())
@@ -25,19 +33,22 @@ WorkspaceDocument::Reading WorkspaceDocument::read(Diagnostics& diagnostics, QSt
   }
 }
 
-WorkspaceDocument::Reading WorkspaceDocument::readOpened(Diagnostics& diagnostics, QString& error) {
+WorkspaceDocument::Reading WorkspaceDocument::readOpened(Diagnostics& diagnostics, QString& error,
+                                                         Versions versions) {
   m_form = WorkspaceFile::recognise(m_input.path());
   m_rawLines = RawLine::find(m_input.path());
   if (m_form == WorkspaceFile::Form::Versioned) {
     m_versions = VersionStore(m_input.path()).versions(error);
     if (!error.isEmpty())
       return Reading::Unreadable;
+    if (versions == Versions::Refused || m_versions.isEmpty()) {
+      diagnostics.reportText(Rule::NoDocument, 0, QString(), TransformResString(kOnlyCustomTransformers));
+      return Reading::Refused;
+    }
   } else if (m_form != WorkspaceFile::Form::Unknown) {
     m_file = WorkspaceFile(m_input.path());
   }
-  const bool hasDocument = m_form == WorkspaceFile::Form::Versioned ? !m_versions.isEmpty()
-                                                                    : m_form != WorkspaceFile::Form::Unknown;
-  if (hasDocument)
+  if (m_form != WorkspaceFile::Form::Unknown)
     WorkspaceFile::read(m_reader, m_input.path(), m_headerLines);
   if (m_reader.getRootNode())
     return Reading::Done;
@@ -73,11 +84,6 @@ bool WorkspaceDocument::canonicalBytes(QByteArray& bytes, QString& error) const 
 }
 
 bool WorkspaceDocument::bytesWith(const Fill& fill, QByteArray& bytes, QString& error) const {
-  if (m_form == WorkspaceFile::Form::Versioned) {
-    error = QStringLiteral(
-        "the file holds versions of a custom transformer, of which none is rewritten once it is stored");
-    return false;
-  }
   QBuffer buffer(&bytes);
   buffer.open(QIODevice::WriteOnly);
   return m_file.write(buffer, m_reader.GetDocumentType(), fill, error);

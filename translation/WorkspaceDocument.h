@@ -27,13 +27,15 @@ class ORX_EXPORT WorkspaceDocument {
     Refused,     // diagnostics say why
     Unreadable,  // the file could not be read
   };
+  // What is done with a file of versions: most have no use for one.
+  enum class Versions { Refused, NewestRead };
   // Queues the records to write.
   using Fill = std::function<void(XMLComponentWriter&)>;
 
   // "-" is standard input. `error` receives why the file cannot be read.
   explicit WorkspaceDocument(const QString& fileName) : m_input(fileName), m_fileName(fileName) {}
 
-  Reading read(Diagnostics& diagnostics, QString& error);
+  Reading read(Diagnostics& diagnostics, QString& error, Versions versions = Versions::Refused);
 
   // All below: valid after reading.
   const XMLComponentReader& reader() const { return m_reader; }
@@ -41,7 +43,7 @@ class ORX_EXPORT WorkspaceDocument {
   // The encoding in which the file would be written again.
   const QByteArray& encoding() const { return m_file.encoding(); }
   const QStringList& headerLines() const { return m_headerLines; }
-  // Of a file of versions: all of them, in file order. The document is the first one's.
+  // Of a file of versions: all of them, in file order. The document is the newest one's.
   const QList<VersionInfo>& versions() const { return m_versions; }
   // Whether there is a file that can be replaced.
   bool isReplaceable() const { return !m_input.isCopy(); }
@@ -50,14 +52,15 @@ class ORX_EXPORT WorkspaceDocument {
 
   // What canonicalBytes() would leave out.
   std::vector<WorkspaceLossReport::Loss> losses() const;
-  // The file with every record of the document written again, and all around it as it was. False when the
-  // file holds versions, or something that was read cannot be written; `error` says what.
+  // The file with every record of the document written again, and all around it as it was. False when
+  // something that was read cannot be written; `error` says what. Not for a file of versions, of which none
+  // is rewritten once it is stored.
   bool canonicalBytes(QByteArray& bytes, QString& error) const;
   // The same with other records.
   bool bytesWith(const Fill& fill, QByteArray& bytes, QString& error) const;
 
  private:
-  Reading readOpened(Diagnostics& diagnostics, QString& error);
+  Reading readOpened(Diagnostics& diagnostics, QString& error, Versions versions);
 
   InputFile m_input;
   QString m_fileName;

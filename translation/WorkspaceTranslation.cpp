@@ -1,8 +1,6 @@
 #include <transform/core/TransformerSource.h>
 #include <transform/files/AtomicFile.h>
-#include <transform/files/InputFile.h>
-#include <transform/workspace/IXMLComponentReader.h>
-#include <transform/workspace/WorkspaceLoaderException.h>
+#include <translation/WorkspaceDocument.h>
 #include <translation/WorkspaceTranslation.h>
 #include <translation/generation/MFDeviceBuffer.h>
 #include <translation/generation/MappingFileWriter.h>
@@ -10,27 +8,11 @@
 
 std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, TransformerSource& source,
                                          Diagnostics& diagnostics, QString& error) {
-  // Asked before the reader is, because its exceptions do not tell a missing file from a malformed one.
-  InputFile file(request.workspaceFile);
-  if (!file.open()) {
-    error = file.errorString();
+  WorkspaceDocument document(request.workspaceFile);
+  if (document.read(diagnostics, error) != WorkspaceDocument::Reading::Done)
     return nullptr;
-  }
-
-  QStringList headerLines;
-  const std::unique_ptr<IXMLComponentReader> reader = IXMLComponentReader::create();
-  try {
-    reader->ReadInput(file.path(), headerLines);
-  } catch (const WorkspaceLoaderException& exception) {
-    diagnostics.reportText(Rule::MalformedDocument, exception.line(), QString(), exception.getMessage());
-    return nullptr;
-  }
-  if (!reader->getRootNode()) {
-    diagnostics.report(Rule::NoDocument, 0, QString());
-    return nullptr;
-  }
   WorkspaceBuilder builder(source, diagnostics, request.parameterValues);
-  return builder.build(*reader, request.workspaceFile, headerLines);
+  return builder.build(document.reader(), request.workspaceFile, document.headerLines());
 }
 
 TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,

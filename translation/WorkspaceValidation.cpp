@@ -19,7 +19,6 @@
 namespace {
 
 constexpr long kDeprecatedOnly = 370861;
-constexpr long kOnlyCustomTransformers = 370867;
 
 class Validation {
  public:
@@ -245,10 +244,7 @@ ValidationReport validateWorkspace(const QString& fileName, TransformerSource& s
     case WorkspaceDocument::Reading::Refused:
       break;
     case WorkspaceDocument::Reading::Done:
-      if (document.form() == WorkspaceFile::Form::Versioned)
-        diagnostics.reportText(Rule::NoDocument, 0, QString(), TransformResString(kOnlyCustomTransformers));
-      else
-        Validation(document, source, settings, diagnostics).run();
+      Validation(document, source, settings, diagnostics).run();
       break;
   }
   report.findings = settings.apply(inDocumentOrder(diagnostics));

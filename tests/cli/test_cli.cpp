@@ -31,7 +31,7 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
       {{"generate", good, "--param", "novalue"}, 2, "", "NAME=VALUE"},
       {{"generate", good, "--param", "NO_SUCH=1"}, 1, "", "NO_SUCH"},
       {{"generate", "missing.orw"}, 3, "", "missing.orw: error: "},
-      {{"generate", "empty.orw"}, 1, "", "empty.orw:1: error: "},
+      {{"generate", "empty.orw"}, 1, "", "empty.orw: error: "},
       {{"generate", "cut.orw", "-o", "cut.mf"}, 1, "", "cut.orw:"},
       {{"generate", good, "-o", "/dev/full"}, 3, "", "/dev/full"},
       {{"generate", good, "-o", "no/such/folder/x.mf"}, 3, "", "no/such/folder/x.mf"},

@@ -127,6 +127,60 @@ TEST(DocumentCommands, EndWithTheStatusThatFits) {
   EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files | QDir::Hidden).size(), 8) << "a file was left behind";
 }
 
+TEST(DocumentCommands, TellTheFormOfAFileAlike) {
+  const QByteArray xml =
+      "<WORKSPACE TITLE='Tiny'><SUBDOCUMENTS><SUBDOCUMENT NAME='Inner'><SUBDOCUMENT_IOS>"
+      "<SUBDOCUMENT_IO IDENTIFIER='1' NAME='IN' IS_SOURCE='true'/></SUBDOCUMENT_IOS></SUBDOCUMENT>"
+      "</SUBDOCUMENTS></WORKSPACE>\n";
+  const QByteArray notes = QByteArray("# a note that says nothing\n").repeated(10000);
+  const QByteArray late = QByteArray(kVersions).replace("Cleaner,1,", "Cleaner,17,");
+  const QByteArray wide(reinterpret_cast<const char*>(QString("#! " + xml).utf16()), 2 * (3 + xml.size()));
+  const char* const none = "The file holds no workspace document.";
+  const char* const onlyVersions = "The file holds custom transformers and no workspace.";
+  const struct {
+    QByteArray bytes;
+    const char* refusal;  // empty: the file is read
+    const char* shown;    // by info, which also shows versions; empty: refused as by the others
+  } forms[] = {
+      {"#! " + xml, "", "TITLE  Tiny"},
+      {notes + "#! " + xml, "", "TITLE  Tiny"},
+      {QByteArray("\n").repeated(200000) + "  #!   " + xml + notes, "", "TITLE  Tiny"},
+      {"\xff\xfe" + wide, "", "TITLE  Tiny"},
+      {xml, "", "TITLE  Tiny"},
+      {"\xef\xbb\xbf" + xml, "", "TITLE  Tiny"},
+      {kVersions, onlyVersions, "TITLE  second"},
+      {late, onlyVersions, "TITLE  first"},
+      {notes + late, onlyVersions, "TITLE  first"},
+      {"# ORW custom transformers\n" + notes, onlyVersions, ""},
+      {QByteArray("\n").repeated(200000) + xml, none, ""},
+      {notes, none, ""},
+      {notes + xml, none, ""},
+      {"FACTORY_DEF * X\n", none, ""},
+      {"", none, ""},
+  };
+  QTemporaryDir folder;
+  for (const auto& form : forms) {
+    write(folder.filePath("file"), form.bytes);
+    const std::string begin = form.bytes.left(60).toStdString() + " ...\n";
+    const QStringList commands[] = {{"info", "file"},
+                                    {"format", "--drop", "file"},
+                                    {"validate", "-q", "file"},
+                                    {"generate", "file"},
+                                    {"extract", "file", "Inner", "-o", "x"}};
+    for (const QStringList& command : commands) {
+      const Outcome run = orxt(command, folder.path());
+      const bool isInfo = command.first() == "info";
+      const bool isRead = isInfo ? *form.shown : !*form.refusal;
+      const std::string what = command.first().toStdString() + ": " + begin + run.err.toStdString();
+      EXPECT_EQ(run.status, isRead ? 0 : 1) << what;
+      const QString said = QString("file: error: ") + form.refusal;
+      EXPECT_TRUE(isRead || run.err.startsWith(said)) << what;
+      EXPECT_TRUE(!isRead || !isInfo || run.out.contains(form.shown)) << what << run.out.toStdString();
+      QFile::remove(folder.filePath("x"));
+    }
+  }
+}
+
 TEST(DocumentCommands, StandardOutputThatTakesNothingIsAnError) {
   for (const char* const command : {"info", "format"}) {
     const Outcome run = orxt({command, samples().first()}, QString(), "/dev/full");

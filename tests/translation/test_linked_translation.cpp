@@ -243,7 +243,7 @@ TEST_F(LinkedTranslation, AnEncipheredWorkspaceIsReadByARoutine) {
     QString error;
     const TranslationResult result = translateWorkspace({path, output, {}}, registry, diagnostics, error);
     EXPECT_EQ(result, hasRoutine ? TranslationResult::Done : TranslationResult::Refused);
-    EXPECT_EQ(describe(diagnostics), hasRoutine ? QStringList() : QStringList("malformed-document "));
+    EXPECT_EQ(describe(diagnostics), hasRoutine ? QStringList() : QStringList("no-document "));
     EXPECT_EQ(WorkspaceFile::recognise(path) == WorkspaceFile::Form::Workspace, hasRoutine);
     EXPECT_EQ(readAll(output).contains("INCLUDE_CUSTOM_TRANSFORMER_VER Tidy:1"), hasRoutine);
   }

@@ -57,7 +57,7 @@ TEST(WorkspaceFile, SavingKeepsWhatSurroundsTheXml) {
 }
 
 TEST(WorkspaceFile, LineEndsRawLinesAndWhatFollowsAreKept) {
-  const QByteArray start = "# first\r\n";
+  const QByteArray start = QByteArray("# first\r\n").repeated(20000);
   const QByteArray end =
       "a line between\r\n  #!START_HEADER of all\nMACRO A \xe9\r\n#! END_HEADER now\r\nFACTORY_DEF * "
       "X\r\n\r\n#! "
@@ -105,11 +105,15 @@ TEST(WorkspaceFile, WhatStoodThereSurvivesEveryFailure) {
   EXPECT_FALSE(file16.setEncoding("UTF-32") || file16.setEncoding("nonsense"));
 }
 
-TEST(WorkspaceFile, TheFirstBytesTellTheForm) {
+TEST(WorkspaceFile, TheFirstDecisiveLineTellsTheForm) {
   using Form = WorkspaceFile::Form;
   const std::pair<QByteArray, Form> cases[] = {
       {"\n #!  <?xml version", Form::Workspace},
-      {"# note\n#! <WORKSPACE>", Form::Workspace},
+      {"# note\n#! <WORKSPACE>\n# TRANSFORMER_BEGIN a,1,c\n", Form::Workspace},
+      {"# note\n# TRANSFORMER_BEGIN a,1,c\n#! <WORKSPACE>\n", Form::Versioned},
+      {QByteArray("# note\n").repeated(100000) + "#! <WORKSPACE>", Form::Workspace},
+      {QByteArray(600000, ' ') + "<WORKSPACE/>", Form::PlainXml},
+      {"#" + QByteArray(600000, ' ') + "\n <WORKSPACE/>", Form::Unknown},
       {"\xef\xbb\xbf <WORKSPACE/>", Form::PlainXml},
       {"# ORW custom transformers\n", Form::Versioned},
       {"# ORW custom transformers\n# TRANSFORMER_BEGIN a,1,c\n", Form::Versioned},

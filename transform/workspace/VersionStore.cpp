@@ -9,6 +9,8 @@
 #include <QBuffer>
 #include <QFile>
 
+#include <algorithm>
+
 const char* const VersionStore::kFirstLine = "# ORW custom transformers";
 const char* const VersionStore::kBegin = "# TRANSFORMER_BEGIN ";
 const char* const VersionStore::kEnd = "# TRANSFORMER_END";
@@ -142,6 +144,12 @@ QList<VersionInfo> VersionStore::versions(QString& error) const {
     error = exception.getMessage();
     return {};
   }
+}
+
+VersionInfo VersionStore::newest(const QList<VersionInfo>& versions) {
+  return *std::max_element(
+      versions.begin(), versions.end(),
+      [](const VersionInfo& left, const VersionInfo& right) { return left.version < right.version; });
 }
 
 VersionStore::Piece VersionStore::read(qint64 offset, qint64 length) const {

@@ -32,6 +32,8 @@ class ORX_EXPORT VersionStore {
   // In file order. `error` is empty unless the file could not be read. A line that opens a version with fewer
   // than three fields is no version.
   QList<VersionInfo> versions(QString& error) const;
+  // The one with the highest number, of several such the first. There must be one.
+  static VersionInfo newest(const QList<VersionInfo>& versions);
 
   struct Piece {
     QByteArray before;

@@ -16,40 +16,38 @@
 
 namespace {
 
-constexpr int kFirstBytes = 4096;
+constexpr int kDeclarationLength = 1024;
 const QString kCopyName = QStringLiteral("kx-in-XXXXXX");
 
-// The first bytes as 8-bit text, without a byte order mark.
-QByteArray narrowed(const QByteArray& bytes) {
-  const char order = utf16ByteOrder(bytes);
-  if (order == 0)
-    return bytes.startsWith("\xef\xbb\xbf") ? bytes.mid(3) : bytes;
-  QByteArray text;
-  const int first = static_cast<unsigned char>(bytes[0]) >= 0xfe ? 2 : 0;
-  for (int i = first + (order == 'L' ? 0 : 1); i < bytes.size(); i += 2)
-    text += bytes[i];
-  return text;
+// The first character that is no blank; 0 when there is none.
+ushort firstMark(const FileLines& lines) {
+  for (int i = 0; i < lines.unitCount(); ++i) {
+    if (!QChar(lines.unit(i)).isSpace())
+      return lines.unit(i);
+  }
+  return 0;
 }
 
-WorkspaceFile::Form formOf(const QByteArray& firstBytes) {
-  const QByteArray text = narrowed(firstBytes);
-  int at = 0;
-  while (at < text.size() && isspace(static_cast<unsigned char>(text[at])))
-    ++at;
-  if (at < text.size() && text[at] == '<')
-    return WorkspaceFile::Form::PlainXml;
-  QBuffer buffer;
-  buffer.setData(text);
-  buffer.open(QIODevice::ReadOnly);
-  FileLines lines(buffer);
+WorkspaceFile::Form formOf(QIODevice& device) {
+  FileLines lines(device);
+  bool isBlank = true;
+  bool saysVersions = false;
   while (lines.next()) {
+    if (isBlank) {
+      const ushort mark = firstMark(lines);
+      if (mark == '<')
+        return WorkspaceFile::Form::PlainXml;
+      isBlank = mark == 0;
+    }
+    if (!lines.startsLine())
+      continue;
     if (lines.startsWith(VersionStore::kBegin))
       return WorkspaceFile::Form::Versioned;
     if (lines.matchComment("") > 0)
       return WorkspaceFile::Form::Workspace;
+    saysVersions = saysVersions || (lines.lineNumber() == 1 && lines.startsWith(VersionStore::kFirstLine));
   }
-  return text.startsWith(VersionStore::kFirstLine) ? WorkspaceFile::Form::Versioned
-                                                   : WorkspaceFile::Form::Unknown;
+  return saysVersions ? WorkspaceFile::Form::Versioned : WorkspaceFile::Form::Unknown;
 }
 
 // The codec for a file's text: one that contains ASCII, or UTF-16 in a stated byte order; null for all else.
@@ -72,7 +70,7 @@ WorkspaceLoaderException noWorkspaceFile(const QString& fileName) {
 
 WorkspaceFile::Form WorkspaceFile::recognise(const QString& fileName) {
   try {
-    return formOf(PlainFile(fileName, kCopyName).device().read(kFirstBytes));
+    return formOf(PlainFile(fileName, kCopyName).device());
   } catch (const WorkspaceLoaderException&) {
     return Form::Unknown;
   }
@@ -81,7 +79,7 @@ WorkspaceFile::Form WorkspaceFile::recognise(const QString& fileName) {
 void WorkspaceFile::read(IXMLComponentReader& reader, const QString& fileName, QStringList& headerLines) {
   // An enciphered file shows its form only when deciphered.
   PlainFile plain(fileName, kCopyName);
-  switch (formOf(plain.device().peek(kFirstBytes))) {
+  switch (formOf(plain.device())) {
     case Form::Workspace:
       reader.ReadInput(fileName, headerLines);
       return;
@@ -95,8 +93,9 @@ void WorkspaceFile::read(IXMLComponentReader& reader, const QString& fileName, Q
         break;
       QByteArray before;
       QByteArray behind;
-      reader.ReadVersionedInput(fileName, versions.first().byteOffset, versions.first().byteLength, true,
-                                headerLines, before, behind);
+      const VersionInfo newest = VersionStore::newest(versions);
+      reader.ReadVersionedInput(fileName, newest.byteOffset, newest.byteLength, true, headerLines, before,
+                                behind);
       return;
     }
     case Form::Unknown:
@@ -107,11 +106,16 @@ void WorkspaceFile::read(IXMLComponentReader& reader, const QString& fileName, Q
 
 WorkspaceFile::WorkspaceFile(const QString& fileName) {
   PlainFile plain(fileName, kCopyName);
-  const QByteArray firstBytes = plain.device().peek(kFirstBytes);
-  m_form = formOf(firstBytes);
+  m_form = formOf(plain.device());
   if (m_form != Form::Workspace && m_form != Form::PlainXml)
     throw noWorkspaceFile(fileName);
+  plain.device().seek(0);
   QByteArray declaration;
+  const auto addToDeclaration = [&](const FileLines& lines, int prefix) {
+    if (declaration.size() < kDeclarationLength)
+      declaration.append(lines.data() + prefix, std::min(lines.size() - prefix, kDeclarationLength));
+    return declaration.size() < kDeclarationLength;
+  };
   FileLines lines(plain.device());
   bool hasXml = m_form == Form::PlainXml;
   bool hasHeaderEnded = false;
@@ -124,9 +128,13 @@ WorkspaceFile::WorkspaceFile(const QString& fileName) {
       const int count = lines.unitCount();
       if (lines.endsLine() && count >= 2 && lines.unit(count - 2) == '\r' && lines.unit(count - 1) == '\n')
         m_lineEnd = "\r\n";
-      if (m_form == Form::PlainXml)
-        break;
     }
+    if (m_form == Form::PlainXml) {
+      if (!addToDeclaration(lines, 0))
+        break;
+      continue;
+    }
+    int prefix = 0;
     if (lines.startsLine()) {
       if (m_hasHeader && !hasHeaderEnded) {
         hasHeaderEnded = lines.matchComment(WorkspaceSplitter::kEndHeader) > 0;
@@ -139,23 +147,24 @@ WorkspaceFile::WorkspaceFile(const QString& fileName) {
         m_rawHeader.append(lines.data(), lines.size());
         continue;
       }
-      inXml = !m_hasHeader && lines.matchComment("") > 0;
+      prefix = m_hasHeader ? 0 : lines.matchComment("");
+      inXml = prefix > 0;
       hasXml = hasXml || inXml;
     } else if (m_hasHeader && !hasHeaderEnded) {
       m_rawHeader.append(lines.data(), lines.size());
       continue;
     }
-    if (inXml)
+    if (inXml) {
+      addToDeclaration(lines, prefix * lines.unitSize());
       continue;
+    }
     QByteArray& part = hasHeaderEnded ? m_behind : hasXml ? m_between : m_before;
     part.append(lines.data(), lines.size());
   }
   if (lines.byteOrder()) {
     m_encoding = lines.byteOrder() == 'L' ? "UTF-16LE" : "UTF-16BE";
   } else {
-    QByteArray start = narrowed(firstBytes);
-    const int xml = start.indexOf("<?xml");
-    const QTextCodec* const codec = xml < 0 ? nullptr : fileCodec(declaredEncoding(start.mid(xml)));
+    const QTextCodec* const codec = fileCodec(declaredEncoding(declaration));
     m_encoding = codec ? codec->name() : QByteArray();
     if (m_encoding.isEmpty() || isWide())
       m_encoding = ORXSystemEncodingName();

@@ -23,10 +23,10 @@ class ORX_EXPORT WorkspaceFile {
     Versioned,  // several versions of a custom transformer
   };
 
-  // By the first bytes of the file.
+  // By the first line that tells it, however far down it stands.
   static Form recognise(const QString& fileName);
-  // Reads a file of any form with the reader's operation for it; of several versions the first, which is the
-  // newest. Throws WorkspaceLoaderException, also for a file of no known form.
+  // Reads a file of any form with the reader's operation for it; of several versions the one with the
+  // highest number. Throws WorkspaceLoaderException, also for a file of no known form.
   static void read(IXMLComponentReader& reader, const QString& fileName, QStringList& headerLines);
 
   // A new workspace file: UTF-8, line feeds, no header.

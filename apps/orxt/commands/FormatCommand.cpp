@@ -81,7 +81,7 @@ ExitStatus FormatCommand::format(const QString& fileName, Console& console) cons
   QByteArray bytes;
   QByteArray original;
   QString error;
-  if (document.form() != WorkspaceFile::Form::Versioned && !mayLose(document, shownName, console))
+  if (!mayLose(document, shownName, console))
     return kExitRefused;
   if (!document.canonicalBytes(bytes, error)) {
     console.showFinding(shownName, 0, Severity::Error, onOneLine(error, kLongestFinding));

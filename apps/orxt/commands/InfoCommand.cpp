@@ -46,7 +46,8 @@ ExitStatus InfoCommand::run(Console& console) {
 ExitStatus InfoCommand::describe(const QString& fileName, bool isFirst, QJsonArray& entries,
                                  Console& console) const {
   WorkspaceDocument document(fileName);
-  const ExitStatus status = readDocument(document, fileName, console);
+  const ExitStatus status =
+      readDocument(document, fileName, console, WorkspaceDocument::Versions::NewestRead);
   if (status != kExitDone)
     return status;
   const QString shownName = InputFile::shownName(fileName);

@@ -1,11 +1,11 @@
 #include <apps/orxt/console/Console.h>
 #include <apps/orxt/facts/DocumentReading.h>
-#include <translation/WorkspaceDocument.h>
 
-ExitStatus readDocument(WorkspaceDocument& document, const QString& fileName, Console& console) {
+ExitStatus readDocument(WorkspaceDocument& document, const QString& fileName, Console& console,
+                        WorkspaceDocument::Versions versions) {
   Diagnostics diagnostics(InputFile::shownName(fileName));
   QString error;
-  const WorkspaceDocument::Reading reading = document.read(diagnostics, error);
+  const WorkspaceDocument::Reading reading = document.read(diagnostics, error, versions);
   console.show(diagnostics);
   switch (reading) {
     case WorkspaceDocument::Reading::Done:

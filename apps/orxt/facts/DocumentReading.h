@@ -2,10 +2,10 @@
 #pragma once
 
 #include <apps/orxt/console/Command.h>
+#include <translation/WorkspaceDocument.h>
 
 #include <QString>
 
-class WorkspaceDocument;
-
 // Reads the document and says on the console what is wrong with it.
-ExitStatus readDocument(WorkspaceDocument& document, const QString& fileName, Console& console);
+ExitStatus readDocument(WorkspaceDocument& document, const QString& fileName, Console& console,
+                        WorkspaceDocument::Versions versions = WorkspaceDocument::Versions::Refused);
