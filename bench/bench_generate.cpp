@@ -77,7 +77,7 @@ int main() {
     double parts[3] = {0, 0, 0};
     // A small workspace is over quickly: repeat it until the clock is worth reading.
     for (int run = 0; run < (count <= 1000 ? 20 : count <= 10000 ? 5 : 2); ++run) {
-      Diagnostics diagnostics(file);
+      orx::Findings diagnostics(file);
       QString error;
       QElapsedTimer timer;
       timer.start();
@@ -88,8 +88,8 @@ int main() {
       const double read = static_cast<double>(timer.nsecsElapsed());
       MappingFileWriter writer(*workspace, diagnostics);
       if (!writer.prepare()) {
-        for (const Diagnostic& diagnostic : diagnostics.all())
-          std::printf("%s\n", qUtf8Printable(formatDiagnostic(diagnostic)));
+        for (const orx::Finding& diagnostic : diagnostics.all())
+          std::printf("%s\n", qUtf8Printable(orx::formatFinding(diagnostic)));
         return 1;
       }
       const double prepared = static_cast<double>(timer.nsecsElapsed());

@@ -16,6 +16,8 @@
 #include <cstdio>
 #include <ctime>
 
+using orx::Severity;
+
 namespace {
 
 double microsecondsSince(std::clock_t start) {
@@ -69,7 +71,7 @@ int main() {
       if (report.count(Severity::Error) != count / 10 ||
           !std::is_sorted(
               report.findings.begin(), report.findings.end(),
-              [](const Diagnostic& left, const Diagnostic& right) { return left.line < right.line; })) {
+              [](const orx::Finding& left, const orx::Finding& right) { return left.line < right.line; })) {
         std::printf("%d findings instead of %d, or not in their order\n", report.count(Severity::Error),
                     count / 10);
         return 1;
@@ -78,7 +80,7 @@ int main() {
         std::printf("the last finding suggests nothing\n");
         return 1;
       }
-      Diagnostics diagnostics(file);
+      orx::Findings diagnostics(file);
       QString error;
       start = std::clock();
       if (translateWorkspace({file, written, {}}, registry, diagnostics, error) != TranslationResult::Done)

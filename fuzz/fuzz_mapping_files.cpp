@@ -17,7 +17,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   require(result.readError.isEmpty(), "the file is read");
   const int lines = 1 + bytes.count('\n') + bytes.count('\r');
   int line = 0;
-  for (const Diagnostic& finding : result.findings) {
+  for (const orx::Finding& finding : result.findings) {
     require(finding.line >= line && finding.line <= lines, "findings stand in the order of the lines");
     require(!finding.text.isEmpty() && finding.text.size() < 1000, "findings have texts of bounded length");
     line = finding.line;

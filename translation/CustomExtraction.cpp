@@ -15,6 +15,8 @@
 #include <QBuffer>
 #include <QSet>
 
+using orx::Rule;
+
 namespace {
 
 const QString kSubDocumentType = QStringLiteral("SubDocumentTransformer");
@@ -50,7 +52,7 @@ QStringList CustomExtraction::names() const {
   return names;
 }
 
-bool CustomExtraction::prepare(const QString& name, int version, Diagnostics& diagnostics) {
+bool CustomExtraction::prepare(const QString& name, int version, orx::Findings& diagnostics) {
   findParts(name);
   findWorkspaceParameters();
   SubDocumentLibrary library(m_reader, &m_source);
@@ -113,7 +115,7 @@ void CustomExtraction::findWorkspaceParameters() {
   }
 }
 
-bool CustomExtraction::makeDefinition(SubDocumentLibrary& library, Diagnostics& diagnostics) {
+bool CustomExtraction::makeDefinition(SubDocumentLibrary& library, orx::Findings& diagnostics) {
   m_definition.clear();
   const std::vector<ExternalDocNetwork*>& networks = library.networks();
   for (const ExternalDocNetwork* network : networks)
@@ -142,7 +144,7 @@ void CustomExtraction::addFields(const ExternalDocNetwork& network, int version)
                QString(),        yesOrNo(network.isDeprecated()),   network.getPythonVersion()};
 }
 
-bool CustomExtraction::makeDocument(const QString& name, int version, Diagnostics& diagnostics) {
+bool CustomExtraction::makeDocument(const QString& name, int version, orx::Findings& diagnostics) {
   m_document.clear();
   QBuffer buffer(&m_document);
   buffer.open(QIODevice::WriteOnly);

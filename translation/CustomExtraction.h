@@ -3,7 +3,7 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 #include <translation/GlobalParameters.h>
 
 #include <QByteArray>
@@ -26,7 +26,7 @@ class ORX_EXPORT CustomExtraction {
   QStringList names() const;
   // `name` is one of names(); a version of 0 leaves the document's own. False when the custom transformer
   // cannot be written: the diagnostics say why.
-  bool prepare(const QString& name, int version, Diagnostics& diagnostics);
+  bool prepare(const QString& name, int version, orx::Findings& diagnostics);
 
   // All below: valid after prepare() answered true.
   const QStringList& fields() const { return m_fields; }
@@ -42,9 +42,9 @@ class ORX_EXPORT CustomExtraction {
  private:
   void findParts(const QString& name);
   void findWorkspaceParameters();
-  bool makeDefinition(SubDocumentLibrary& library, Diagnostics& diagnostics);
+  bool makeDefinition(SubDocumentLibrary& library, orx::Findings& diagnostics);
   void addFields(const ExternalDocNetwork& network, int version);
-  bool makeDocument(const QString& name, int version, Diagnostics& diagnostics);
+  bool makeDocument(const QString& name, int version, orx::Findings& diagnostics);
 
   const IXMLComponentReader& m_reader;
   TransformerSource& m_source;

@@ -5,9 +5,11 @@
 
 #include <algorithm>
 
+using orx::Rule;
+
 MappingFileFindings lintMappingFile(const QString& path, const QString& shownName,
                                     const CustomTransformerLookup& isInstalled) {
-  Diagnostics diagnostics(shownName);
+  orx::Findings diagnostics(shownName);
   MappingFileReport report(diagnostics);
   MappingFileReader reader(path, report);
   if (!reader.open())
@@ -35,8 +37,8 @@ MappingFileFindings lintMappingFile(const QString& path, const QString& shownNam
   if (item != MappingFileReader::Item::End)
     report.add(Rule::TooManyNames, reader.lineNumber());
   statements.finish(isInstalled);
-  std::vector<Diagnostic> findings = diagnostics.all();
+  std::vector<orx::Finding> findings = diagnostics.all();
   std::stable_sort(findings.begin(), findings.end(),
-                   [](const Diagnostic& a, const Diagnostic& b) { return a.line < b.line; });
+                   [](const orx::Finding& a, const orx::Finding& b) { return a.line < b.line; });
   return {reader.errorString(), std::move(findings)};
 }

@@ -5,7 +5,7 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 
 #include <QString>
 
@@ -13,8 +13,8 @@
 #include <vector>
 
 struct ORX_EXPORT MappingFileFindings {
-  QString readError;                 // why the file cannot be read; empty when it can
-  std::vector<Diagnostic> findings;  // by line
+  QString readError;                   // why the file cannot be read; empty when it can
+  std::vector<orx::Finding> findings;  // by line
 };
 
 // Whether the installation has a version of a custom transformer. Without an answer no include is judged by

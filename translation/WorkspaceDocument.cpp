@@ -9,13 +9,15 @@
 
 #include <algorithm>
 
+using orx::Rule;
+
 namespace {
 
 constexpr long kOnlyCustomTransformers = 370867;
 
 }  // namespace
 
-WorkspaceDocument::Reading WorkspaceDocument::read(Diagnostics& diagnostics, QString& error,
+WorkspaceDocument::Reading WorkspaceDocument::read(orx::Findings& diagnostics, QString& error,
                                                    Versions versions) {
   // Asked before the reader is, because its exceptions do not tell a missing file from a malformed one.
   if (!m_input.open()) {
@@ -33,7 +35,7 @@ WorkspaceDocument::Reading WorkspaceDocument::read(Diagnostics& diagnostics, QSt
   }
 }
 
-WorkspaceDocument::Reading WorkspaceDocument::readOpened(Diagnostics& diagnostics, QString& error,
+WorkspaceDocument::Reading WorkspaceDocument::readOpened(orx::Findings& diagnostics, QString& error,
                                                          Versions versions) {
   m_form = WorkspaceFile::recognise(m_input.path());
   m_rawLines = RawLine::find(m_input.path());

@@ -4,12 +4,12 @@
 
 #include <platform/Export.h>
 #include <transform/files/InputFile.h>
+#include <transform/findings/Findings.h>
 #include <transform/workspace/RawLines.h>
 #include <transform/workspace/VersionInfo.h>
 #include <transform/workspace/WorkspaceFile.h>
 #include <transform/workspace/WorkspaceLossReport.h>
 #include <transform/workspace/XMLComponentReader.h>
-#include <translation/Diagnostics.h>
 
 #include <QByteArray>
 #include <QIODevice>
@@ -35,7 +35,7 @@ class ORX_EXPORT WorkspaceDocument {
   // "-" is standard input. `error` receives why the file cannot be read.
   explicit WorkspaceDocument(const QString& fileName) : m_input(fileName), m_fileName(fileName) {}
 
-  Reading read(Diagnostics& diagnostics, QString& error, Versions versions = Versions::Refused);
+  Reading read(orx::Findings& diagnostics, QString& error, Versions versions = Versions::Refused);
 
   // All below: valid after reading.
   const XMLComponentReader& reader() const { return m_reader; }
@@ -60,7 +60,7 @@ class ORX_EXPORT WorkspaceDocument {
   bool bytesWith(const Fill& fill, QByteArray& bytes, QString& error) const;
 
  private:
-  Reading readOpened(Diagnostics& diagnostics, QString& error, Versions versions);
+  Reading readOpened(orx::Findings& diagnostics, QString& error, Versions versions);
 
   InputFile m_input;
   QString m_fileName;

@@ -6,8 +6,10 @@
 #include <translation/generation/MappingFileWriter.h>
 #include <translation/graph/WorkspaceBuilder.h>
 
+using orx::Rule;
+
 std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, TransformerSource& source,
-                                         Diagnostics& diagnostics, QString& error) {
+                                         orx::Findings& diagnostics, QString& error) {
   WorkspaceDocument document(request.workspaceFile);
   if (document.read(diagnostics, error) != WorkspaceDocument::Reading::Done)
     return nullptr;
@@ -16,7 +18,7 @@ std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, Tran
 }
 
 TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,
-                                     Diagnostics& diagnostics, QString& error) {
+                                     orx::Findings& diagnostics, QString& error) {
   const std::unique_ptr<Workspace> workspace = readWorkspace(request, source, diagnostics, error);
   if (!workspace)
     return error.isEmpty() ? TranslationResult::Refused : TranslationResult::Unreadable;

@@ -2,7 +2,7 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 
 #include <QHash>
 #include <QString>
@@ -28,10 +28,10 @@ struct TranslationRequest {
 // Reads a workspace file into a graph of configured transformers. Null when there is no document to build
 // from: `error` says why the file cannot be read, and is empty when diagnostics say what is wrong inside.
 ORX_EXPORT std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request,
-                                                    TransformerSource& source, Diagnostics& diagnostics,
+                                                    TransformerSource& source, orx::Findings& diagnostics,
                                                     QString& error);
 
 // The whole job. Output appears whole or not at all. `error` receives why a file could not be read or
 // written.
 ORX_EXPORT TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,
-                                                Diagnostics& diagnostics, QString& error);
+                                                orx::Findings& diagnostics, QString& error);

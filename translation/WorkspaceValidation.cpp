@@ -16,14 +16,17 @@
 
 #include <algorithm>
 
+using orx::Rule;
+using orx::Severity;
+
 namespace {
 
 constexpr long kDeprecatedOnly = 370861;
 
 class Validation {
  public:
-  Validation(const WorkspaceDocument& document, TransformerSource& source, const RuleSettings& settings,
-             Diagnostics& diagnostics)
+  Validation(const WorkspaceDocument& document, TransformerSource& source, const orx::RuleSettings& settings,
+             orx::Findings& diagnostics)
       : m_reader(document.reader()),
         m_headerLines(document.headerLines()),
         m_source(source),
@@ -47,7 +50,7 @@ class Validation {
   const IXMLComponentReader& m_reader;
   const QStringList& m_headerLines;
   TransformerSource& m_source;
-  Diagnostics& m_diagnostics;
+  orx::Findings& m_diagnostics;
   ValueChecks m_values;
   ORXTValSlist<TransformerStruct> m_transformers;  // of the main document
   QStringList m_parameterNames;
@@ -210,17 +213,18 @@ void Validation::checkParameterUse(const Workspace& workspace) {
   }
 }
 
-std::vector<Diagnostic> inDocumentOrder(const Diagnostics& diagnostics) {
-  std::vector<Diagnostic> findings = diagnostics.all();
-  std::stable_sort(findings.begin(), findings.end(), [&](const Diagnostic& left, const Diagnostic& right) {
-    const bool isLeftOther = left.file != diagnostics.file();
-    const bool isRightOther = right.file != diagnostics.file();
-    if (isLeftOther != isRightOther)
-      return isRightOther;
-    if (left.file != right.file)
-      return left.file < right.file;
-    return left.line < right.line;
-  });
+std::vector<orx::Finding> inDocumentOrder(const orx::Findings& diagnostics) {
+  std::vector<orx::Finding> findings = diagnostics.all();
+  std::stable_sort(findings.begin(), findings.end(),
+                   [&](const orx::Finding& left, const orx::Finding& right) {
+                     const bool isLeftOther = left.file != diagnostics.file();
+                     const bool isRightOther = right.file != diagnostics.file();
+                     if (isLeftOther != isRightOther)
+                       return isRightOther;
+                     if (left.file != right.file)
+                       return left.file < right.file;
+                     return left.line < right.line;
+                   });
   return findings;
 }
 
@@ -229,14 +233,14 @@ std::vector<Diagnostic> inDocumentOrder(const Diagnostics& diagnostics) {
 int ValidationReport::count(Severity severity) const {
   return static_cast<int>(
       std::count_if(findings.begin(), findings.end(),
-                    [severity](const Diagnostic& finding) { return finding.severity == severity; }));
+                    [severity](const orx::Finding& finding) { return finding.severity == severity; }));
 }
 
 ValidationReport validateWorkspace(const QString& fileName, TransformerSource& source,
-                                   const RuleSettings& settings) {
+                                   const orx::RuleSettings& settings) {
   ValidationReport report;
   report.file = InputFile::shownName(fileName);
-  Diagnostics diagnostics(report.file);
+  orx::Findings diagnostics(report.file);
   WorkspaceDocument document(fileName);
   switch (document.read(diagnostics, report.readError)) {
     case WorkspaceDocument::Reading::Unreadable:

@@ -9,8 +9,8 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <translation/Diagnostics.h>
-#include <translation/RuleSettings.h>
+#include <transform/findings/Findings.h>
+#include <transform/findings/RuleSettings.h>
 
 #include <QString>
 
@@ -19,14 +19,14 @@
 class TransformerSource;
 
 struct ORX_EXPORT ValidationReport {
-  QString file;                      // as messages call it
-  QString readError;                 // why the file cannot be read; empty when it can
-  std::vector<Diagnostic> findings;  // by line; behind them those in linked files, by file and line
+  QString file;                        // as messages call it
+  QString readError;                   // why the file cannot be read; empty when it can
+  std::vector<orx::Finding> findings;  // by line; behind them those in linked files, by file and line
 
   bool isReadable() const { return readError.isEmpty(); }
-  int count(Severity severity) const;
+  int count(orx::Severity severity) const;
 };
 
 // `fileName` may be "-", standard input.
 ORX_EXPORT ValidationReport validateWorkspace(const QString& fileName, TransformerSource& source,
-                                              const RuleSettings& settings = {});
+                                              const orx::RuleSettings& settings = {});

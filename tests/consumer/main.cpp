@@ -52,11 +52,11 @@ int main(int argc, char** argv) {
   TranslationRequest request;
   request.workspaceFile = QORXFromLocal8Bit(argv[2]);
   request.outputFile = QORXFromLocal8Bit(argv[3]);
-  Diagnostics diagnostics(request.workspaceFile);
+  orx::Findings diagnostics(request.workspaceFile);
   QString error;
   const TranslationResult result = translateWorkspace(request, manager, diagnostics, error);
-  for (const Diagnostic& diagnostic : diagnostics.all()) {
-    std::cerr << formatDiagnostic(diagnostic).toStdString() << '\n';
+  for (const orx::Finding& diagnostic : diagnostics.all()) {
+    std::cerr << orx::formatFinding(diagnostic).toStdString() << '\n';
   }
   if (result != TranslationResult::Done) {
     std::cerr << "the workspace was not translated " << error.toStdString() << '\n';

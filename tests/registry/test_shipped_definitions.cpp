@@ -383,9 +383,9 @@ TEST(ShippedResources, PassTheirChecks) {
   qputenv("ORX_HOME", kResources.toUtf8());
   DefinitionLint lint;
   lint.checkPath(kResources);
-  for (const LintFinding& finding : lint.findings()) {
+  for (const orx::Finding& finding : lint.findings()) {
     ADD_FAILURE() << finding.file.toStdString() << ":" << finding.line << ": " << finding.text.toStdString()
-                  << " [" << finding.rule.toStdString() << "]";
+                  << " [" << orx::ruleRow(finding.rule).name.data() << "]";
   }
 }
 

@@ -192,12 +192,12 @@ TEST(ParameterFetcher, WorksInAWorkspace) {
     QTemporaryDir folder;
     const QString file = workspace.save(folder);
     QStringList rules;
-    for (const Diagnostic& finding : validateWorkspace(file, registry).findings) {
-      rules << diagnosticRule(finding.rule).name;
+    for (const orx::Finding& finding : validateWorkspace(file, registry).findings) {
+      rules << orx::ruleRow(finding.rule).name;
     }
     rules.removeAll("dropped-features");
     EXPECT_EQ(rules.join(' '), c.rules);
-    Diagnostics diagnostics(file);
+    orx::Findings diagnostics(file);
     QString error;
     const QString output = folder.filePath("out.mf");
     translateWorkspace({file, output, {}}, registry, diagnostics, error);

@@ -14,11 +14,11 @@ struct Outcome {
   QString text;
 };
 
-inline QStringList describe(const Diagnostics& diagnostics) {
+inline QStringList describe(const orx::Findings& diagnostics) {
   QStringList result;
-  for (const Diagnostic& diagnostic : diagnostics.all()) {
-    EXPECT_FALSE(diagnostic.text.isEmpty()) << diagnosticRule(diagnostic.rule).name.latin1();
-    result << QString("%1 %2").arg(diagnosticRule(diagnostic.rule).name, diagnostic.node);
+  for (const orx::Finding& diagnostic : diagnostics.all()) {
+    EXPECT_FALSE(diagnostic.text.isEmpty()) << orx::ruleRow(diagnostic.rule).name.latin1();
+    result << QString("%1 %2").arg(orx::ruleRow(diagnostic.rule).name, diagnostic.node);
   }
   return result;
 }
@@ -32,14 +32,14 @@ inline Outcome translate(const SmallWorkspace& workspace, TransformerSource& sou
                          const QHash<QString, QString>& values = {}) {
   QTemporaryDir folder;
   const QString file = workspace.save(folder);
-  Diagnostics diagnostics(file);
+  orx::Findings diagnostics(file);
   QString error;
   const QString output = folder.filePath("out.mf");
   Outcome outcome;
   outcome.result = translateWorkspace({file, output, values}, source, diagnostics, error);
   EXPECT_EQ(error, QString());
   outcome.diagnostics = describe(diagnostics);
-  for (const Diagnostic& diagnostic : diagnostics.all())
+  for (const orx::Finding& diagnostic : diagnostics.all())
     outcome.texts << diagnostic.text;
   // Continuation lines joined and padding dropped: what is compared is the statements.
   outcome.text = readAll(output)

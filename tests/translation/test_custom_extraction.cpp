@@ -70,7 +70,7 @@ class Extraction : public testing::Test {
     reader.ReadInput(workspace.save(folder), headerLines);
   }
   QStringList rulesOf(CustomExtraction& extraction, const QString& name, bool& isPrepared, int version = 0) {
-    Diagnostics diagnostics("test.orw");
+    orx::Findings diagnostics("test.orw");
     isPrepared = extraction.prepare(name, version, diagnostics);
     return describe(diagnostics);
   }

@@ -239,7 +239,7 @@ TEST_F(LinkedTranslation, AnEncipheredWorkspaceIsReadByARoutine) {
   const QString output = folders.path("w.mf");
   for (const bool hasRoutine : {false, true}) {
     ORW_setDecipherRoutine(hasRoutine ? ORWDecipherRoutine(decipher) : ORWDecipherRoutine());
-    Diagnostics diagnostics(path);
+    orx::Findings diagnostics(path);
     QString error;
     const TranslationResult result = translateWorkspace({path, output, {}}, registry, diagnostics, error);
     EXPECT_EQ(result, hasRoutine ? TranslationResult::Done : TranslationResult::Refused);

@@ -21,8 +21,8 @@ QStringList rulesOf(const QByteArray& text) {
   EXPECT_EQ(result.readError, QString());
   QStringList rules;
   QMap<QString, int> places;
-  for (const Diagnostic& finding : result.findings) {
-    const QString rule = diagnosticRule(finding.rule).name;
+  for (const orx::Finding& finding : result.findings) {
+    const QString rule = orx::ruleRow(finding.rule).name;
     EXPECT_LT(finding.text.size(), 1000);
     if (places.contains(rule)) {
       if (!rules[places.value(rule)].endsWith('*'))

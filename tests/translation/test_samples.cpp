@@ -28,12 +28,12 @@ TEST(Samples, GiveTheirReferenceOutput) {
   for (const QString& name : names) {
     const QString file = samples.filePath(name);
     const QString output = folder.filePath("out.mf");
-    Diagnostics diagnostics(file);
+    orx::Findings diagnostics(file);
     QString error;
     EXPECT_EQ(translateWorkspace({file, output, {}}, registry, diagnostics, error), TranslationResult::Done)
         << name.toStdString();
-    for (const Diagnostic& diagnostic : diagnostics.all())
-      ADD_FAILURE() << formatDiagnostic(diagnostic).toStdString();
+    for (const orx::Finding& diagnostic : diagnostics.all())
+      ADD_FAILURE() << orx::formatFinding(diagnostic).toStdString();
     EXPECT_EQ(readAll(output), readAll(samples.filePath(name.chopped(4) + ".mf"))) << name.toStdString();
   }
 }

@@ -411,14 +411,14 @@ TEST(Translation, RefusesWhatItCannotTranslate) {
 
 TEST(Translation, EveryRuleHasItsTextInEveryLanguage) {
   int place = 0;
-  for (const DiagnosticRule& rule : diagnosticRules()) {
+  for (const orx::RuleRow& rule : orx::ruleTable()) {
     EXPECT_EQ(static_cast<int>(rule.rule), place++);
     if (rule.message == 0)
       continue;
     QStringList texts;
     for (const char* language : {"en", "de", "fr"}) {
       QORXSetLanguage(language);
-      Diagnostics diagnostics("f");
+      orx::Findings diagnostics("f");
       diagnostics.report(rule.rule, 1, "n");
       texts << diagnostics.all().front().text;
     }
@@ -433,7 +433,7 @@ TEST(Translation, FilesThatCannotBeReadOrWritten) {
   SmallSource source;
   const QString good = copyBetween().save(folder);
   const auto run = [&](const QString& input, const QString& output, QString& error) {
-    Diagnostics diagnostics(input);
+    orx::Findings diagnostics(input);
     return translateWorkspace({input, output, {}}, source, diagnostics, error);
   };
   QString error;
@@ -472,7 +472,7 @@ TEST(Translation, TruncatedDocumentsAreRefused) {
     ASSERT_TRUE(file.open(QIODevice::WriteOnly));
     file.write(whole.left(length));
     file.close();
-    Diagnostics diagnostics(path);
+    orx::Findings diagnostics(path);
     QString error;
     EXPECT_EQ(translateWorkspace({path, folder.filePath("o"), {}}, source, diagnostics, error),
               TranslationResult::Refused)
@@ -490,7 +490,7 @@ TEST(Translation, TheSameDocumentGivesTheSameBytes) {
     workspace.parameter("GUI TEXT Speed Prompt", "Fast")
         .transformer(8, "Pick", {"XFORMER_NAME", "P", "MODE", "$(Speed)"});
     const QString file = workspace.save(folder, QString("name%1.orw").arg(run));
-    Diagnostics diagnostics(file);
+    orx::Findings diagnostics(file);
     QString error;
     const QString output = folder.filePath("out");
     ASSERT_EQ(translateWorkspace({file, output, {}}, source, diagnostics, error), TranslationResult::Done);

@@ -73,9 +73,15 @@ void ExternalDocNetwork::takeRunSettings(const QHash<QString, QString>& settings
     m_pythonVersion = *python;
 }
 
-void ExternalDocNetwork::addProblem(NetworkProblem::Kind kind, int line, const QString& node,
+void ExternalDocNetwork::addProblem(orx::Rule rule, long message, int line, const QString& node,
                                     const QString& text) {
-  m_problems.push_back({kind, line, node, text});
+  orx::Finding problem;
+  problem.rule = rule;
+  problem.line = line;
+  problem.node = node;
+  problem.text = text;
+  problem.message = message;
+  addProblem(problem);
 }
 
 bool ExternalDocNetwork::hasTransformerNamed(const QString& identifier) const {

@@ -8,7 +8,7 @@
 #pragma once
 
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/custom/NetworkProblem.h>
+#include <transform/findings/Finding.h>
 
 #include <vector>
 
@@ -24,8 +24,8 @@ class ORX_EXPORT ExternalDocNetwork : public CompoundTransformerNetwork {
   // before is given up. `source` makes the inner transformers. What cannot be placed becomes a problem, the
   // rest is built all the same. Neither argument is kept.
   void build(const IXMLComponentReader& reader, const QString& subDocumentName, TransformerSource& source);
-  // In the order in which they were found.
-  const std::vector<NetworkProblem>& problems() const { return m_problems; }
+  // In the order in which they were found, without the name of a file.
+  const std::vector<orx::Finding>& problems() const { return m_problems; }
 
   bool hasTransformerNamed(const QString& identifier) const override;
   IncomingAttributePropogationMode getIncomingAttributePropogationMode() const override;
@@ -48,7 +48,8 @@ class ORX_EXPORT ExternalDocNetwork : public CompoundTransformerNetwork {
   // What a file of its own tells in its header as well.
   void takeRunSettings(const QHash<QString, QString>& settings);
 
-  void addProblem(NetworkProblem::Kind kind, int line, const QString& node, const QString& text);
+  void addProblem(const orx::Finding& problem) { m_problems.push_back(problem); }
+  void addProblem(orx::Rule rule, long message, int line, const QString& node, const QString& text);
   void clearProblems() { m_problems.clear(); }
 
   void setGUID(const QString& guid) { m_guid = guid; }
@@ -63,7 +64,7 @@ class ORX_EXPORT ExternalDocNetwork : public CompoundTransformerNetwork {
 
   void takeSettings(const QHash<QString, QString>& settings);
 
-  std::vector<NetworkProblem> m_problems;
+  std::vector<orx::Finding> m_problems;
   QSet<QString> m_transformerNames;
   IncomingAttributePropogationMode m_incomingMode = kIncomingDeclared;
   QString m_guid;

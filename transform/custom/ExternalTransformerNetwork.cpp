@@ -74,7 +74,7 @@ void ExternalTransformerNetwork::readHeader(int version) {
     error = exception.getMessage();
   }
   if (!error.isEmpty()) {
-    addProblem(NetworkProblem::Kind::NoBody, 0, QString(),
+    addProblem(orx::Rule::CustomTransformerFault, custom_messages::kNoBody, 0, QString(),
                TransformResString(custom_messages::kNoBody, {getName(), m_fileName, error}));
   }
   if (!m_isLoaded)
@@ -135,7 +135,9 @@ void ExternalTransformerNetwork::forceLoad() {
         m_lacksRoutine
             ? TransformResString(custom_messages::kEncipheredBody, {getName(), m_fileName})
             : TransformResString(custom_messages::kNoBody, {getName(), m_fileName, exception.getMessage()});
-    addProblem(NetworkProblem::Kind::NoBody, exception.line(), QString(), m_bodyFault);
+    addProblem(orx::Rule::CustomTransformerFault,
+               m_lacksRoutine ? custom_messages::kEncipheredBody : custom_messages::kNoBody, exception.line(),
+               QString(), m_bodyFault);
     doneAdding(true);
   }
 }
@@ -187,8 +189,8 @@ void ExternalTransformerNetwork::loadBody() {
   m_library->build(*this, bodyName(reader, getName()));
   m_library->forgetReader();
   for (const ExternalDocNetwork* inner : m_library->networks()) {
-    for (const NetworkProblem& problem : inner->problems())
-      addProblem(problem.kind, problem.line, problem.node, problem.text);
+    for (const orx::Finding& problem : inner->problems())
+      addProblem(problem);
   }
 }
 

@@ -15,7 +15,7 @@
 #include <QFile>
 #include <QFileInfo>
 
-using namespace lint_rules;
+using orx::Rule;
 
 namespace {
 
@@ -60,7 +60,7 @@ void DefinitionLint::checkPath(const QString& path) {
 void DefinitionLint::addFolder(const QString& folder) {
   const FolderListing listing = FolderListing::files(folder);
   if (listing.failed()) {
-    m_report.add(kUnreadable, folder, 0, listing.errorString());
+    m_report.add(Rule::UnreadableFile, folder, 0, listing.errorString());
   }
   for (const QString& name : listing.names()) {
     if (isDefinitionFileName(name) || isCompanionFileName(name)) {
@@ -69,7 +69,7 @@ void DefinitionLint::addFolder(const QString& folder) {
   }
   for (const QString& name : listing.unusableNames()) {
     if (isDefinitionFileName(name) || isCompanionFileName(name)) {
-      m_report.add(kUnreadable, folder + QLatin1Char('/') + name, 0,
+      m_report.add(Rule::UnreadableFile, folder + QLatin1Char('/') + name, 0,
                    QStringLiteral("This is no file that can be read"));
     }
   }
@@ -100,11 +100,11 @@ void DefinitionLint::readDefinitions(const QString& path, bool isGiven) {
   QFile file(path);
   DefinitionFileParser parser;
   if (!file.open(QIODevice::ReadOnly)) {
-    report.add(kUnreadable, path, 0, file.errorString());
+    report.add(Rule::UnreadableFile, path, 0, file.errorString());
     return;
   }
   if (!parser.parse(file, path)) {
-    report.add(kUnreadable, path, 0, parser.errorString());
+    report.add(Rule::UnreadableFile, path, 0, parser.errorString());
     return;
   }
   if (XMLComponentReader::IsFileXMLWorkspace(path)) {
@@ -112,23 +112,23 @@ void DefinitionLint::readDefinitions(const QString& path, bool isGiven) {
       return;
     }
     report.add(
-        kWorkspaceMark, path, 1,
+        Rule::WorkspaceMark, path, 1,
         QStringLiteral("The first 100 bytes hold ORW or a tag of a workspace, so the file is taken for one "
                        "and its definitions are not read"));
   }
   if (!parser.isSoundUtf8()) {
-    report.add(kNotUtf8, path, 0, QStringLiteral("The file is not UTF-8"));
+    report.add(Rule::NotUtf8, path, 0, QStringLiteral("The file is not UTF-8"));
   }
   if (parser.openBlockLine() != 0) {
-    report.add(kOpenBlock, path, parser.openBlockLine(), QStringLiteral("This block has no end"));
+    report.add(Rule::OpenBlock, path, parser.openBlockLine(), QStringLiteral("This block has no end"));
   }
   if (!parser.unfinished().isEmpty()) {
-    report.add(kUnfinished, path, parser.unfinished().firstLine(),
+    report.add(Rule::UnfinishedDefinition, path, parser.unfinished().firstLine(),
                QStringLiteral("What stands behind the last TEMPLATE_END is no definition and is lost"));
   }
   for (const CategoryText& category : parser.categories()) {
     if (category.name.isEmpty()) {
-      report.add(kBadValue, path, category.line, QStringLiteral("The category has no name"));
+      report.add(Rule::BadValue, path, category.line, QStringLiteral("The category has no name"));
     }
     m_catalogue->addCategory(category.name);
   }
@@ -158,7 +158,7 @@ void DefinitionLint::checkDefinition(const LintedDefinition& definition) {
   const TransformerDefinition& fields = definition.fields();
   const QString key = entryKey(QFileInfo(definition.file()).absolutePath(), fields.name, fields.version);
   if (m_defined.contains(key)) {
-    m_report.add(kDuplicateDefinition, definition.file(), definition.nameLine(),
+    m_report.add(Rule::DuplicateDefinition, definition.file(), definition.nameLine(),
                  QStringLiteral("The folder defines %1 version %2 already; the last one read is kept")
                      .arg(fields.name)
                      .arg(fields.version));
@@ -174,7 +174,7 @@ void DefinitionLint::checkDefinition(const LintedDefinition& definition) {
 void DefinitionLint::checkCompanion(const QString& path) {
   QFile file(path);
   if (!file.open(QIODevice::ReadOnly)) {
-    m_report.add(kUnreadable, path, 0, file.errorString());
+    m_report.add(Rule::UnreadableFile, path, 0, file.errorString());
     return;
   }
   CompanionLint lint(path, *m_catalogue, m_report);
@@ -217,7 +217,7 @@ void DefinitionLint::checkShipped() {
     for (const QLatin1String language : kShippedLanguages) {
       const TransformerDefinition& fields = definition->fields();
       if (!m_translated.contains(entryKey(language, fields.name, fields.version))) {
-        m_report.add(kMissingTranslation, definition->file(), definition->nameLine(),
+        m_report.add(Rule::MissingTranslation, definition->file(), definition->nameLine(),
                      QStringLiteral("%1 version %2 has no entry in a companion for '%3'")
                          .arg(fields.name)
                          .arg(fields.version)
@@ -228,7 +228,7 @@ void DefinitionLint::checkShipped() {
   m_shipped.clear();
 }
 
-const std::vector<LintFinding>& DefinitionLint::findings() {
+const std::vector<orx::Finding>& DefinitionLint::findings() {
   for (const auto& definition : m_definitions) {
     checkDefinition(*definition);
     if (isShipped(QFileInfo(definition->file()).absoluteFilePath())) {

@@ -33,7 +33,7 @@ class ORX_EXPORT DefinitionLint {
   void checkPath(const QString& path);
   // By file and line. Everything given so far is checked before the answer; runs python3 when there are
   // Python scripts.
-  const std::vector<LintFinding>& findings();
+  const std::vector<orx::Finding>& findings();
 
  private:
   void addFolder(const QString& folder);

@@ -10,36 +10,18 @@ constexpr int kLongestText = 400;
 
 }  // namespace
 
-const std::vector<LintRule>& lintRules() {
-  using namespace lint_rules;
-  static const std::vector<LintRule> rules = {
-      kUnreadable,          kNotUtf8,
-      kWorkspaceMark,       kOpenBlock,
-      kUnfinished,          kUnknownKeyword,
-      kRepeatedKeyword,     kBadValue,
-      kDuplicateDefinition, kMissingText,
-      kUnknownPort,         kBadListAction,
-      kBadMapping,          kParameterLines,
-      kDuplicateParameter,  kUnknownParameter,
-      kUnknownType,         kPlainText,
-      kBadDefault,          kBadStatement,
-      kUnknownToken,        kOutputRoute,
-      kOmittableLine,       kUnusedPort,
-      kUnusedParameter,     kUnknownInCompanion,
-      kMissingTranslation,  kTclSyntax,
-      kPythonSyntax,        kUncheckedPython,
-  };
-  return rules;
-}
-
-void LintReport::add(const LintRule& rule, const QString& file, int line, const QString& text) {
-  const bool isLong = text.size() > kLongestText;
-  m_findings.push_back(
-      {file, line, rule.isError, rule.name, isLong ? text.left(kLongestText) + QLatin1String("...") : text});
+void LintReport::add(orx::Rule rule, const QString& file, int line, const QString& text) {
+  orx::Finding finding;
+  finding.rule = rule;
+  finding.severity = orx::ruleRow(rule).severity;
+  finding.file = file;
+  finding.line = line;
+  finding.text = text.size() > kLongestText ? text.left(kLongestText) + QLatin1String("...") : text;
+  m_findings.push_back(std::move(finding));
 }
 
 void LintReport::sort() {
-  std::stable_sort(m_findings.begin(), m_findings.end(), [](const LintFinding& a, const LintFinding& b) {
+  std::stable_sort(m_findings.begin(), m_findings.end(), [](const orx::Finding& a, const orx::Finding& b) {
     return std::tie(a.file, a.line) < std::tie(b.file, b.line);
   });
 }

@@ -29,6 +29,8 @@
 
 #include <algorithm>
 
+using orx::Rule;
+
 // Inside a definition the published parameters are macros whose values only the instance knows: whatever
 // refers to them also refers to the prefix macro.
 class CustomDefinition::Listener : public ParameterScopeListener {
@@ -81,7 +83,7 @@ QString CustomDefinition::redirect(const TransformerCfg& cfg, const QString& par
                                     });
 }
 
-bool CustomDefinition::arrange(Diagnostics& diagnostics) {
+bool CustomDefinition::arrange(orx::Findings& diagnostics) {
   const QString nameFault = findNameFault(m_network.getName());
   if (!nameFault.isEmpty())
     diagnostics.reportText(Rule::CustomTransformerFault, 0, m_network.getName(), nameFault);
@@ -123,7 +125,7 @@ std::vector<const TransformerCfg*> CustomDefinition::customTransformers() const 
   return found;
 }
 
-bool CustomDefinition::prepare(Diagnostics& diagnostics) {
+bool CustomDefinition::prepare(orx::Findings& diagnostics) {
   if (!m_isArranged)
     return false;
   for (const Part& part : m_parts)
@@ -164,7 +166,7 @@ void CustomDefinition::write(MFBuffer& buffer) const {
   buffer.write(block());
 }
 
-bool CustomDefinition::order(Diagnostics& diagnostics) {
+bool CustomDefinition::order(orx::Findings& diagnostics) {
   std::vector<const SubDocNetworkObjXformer*> nodes;
   QHash<const SubDocNetworkObj*, int> places;
   for (const SubDocNetworkObj* node : m_network.nodes()) {
@@ -196,7 +198,7 @@ bool CustomDefinition::order(Diagnostics& diagnostics) {
 }
 
 // Ports and what stands in custom transformers further in have fixed names; the others keep clear of them.
-void CustomDefinition::nameFlows(Diagnostics& diagnostics) {
+void CustomDefinition::nameFlows(orx::Findings& diagnostics) {
   FlowNames names;
   QSet<QString> ports;
   for (const SubDocNetworkObj* node : m_network.nodes()) {
@@ -279,7 +281,7 @@ QString CustomDefinition::title(const Part& part) const {
   return m_network.getName() + QLatin1Char('/') + part.node->name();
 }
 
-void CustomDefinition::check(const Part& part, Diagnostics& diagnostics) const {
+void CustomDefinition::check(const Part& part, orx::Findings& diagnostics) const {
   const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(part.cfg.get());
   const QHash<QString, QString> faults =
       custom ? custom->findUnwritableParameters() : part.cfg->findUnwritableValues();
@@ -297,7 +299,7 @@ void CustomDefinition::check(const Part& part, Diagnostics& diagnostics) const {
   }
 }
 
-QByteArray CustomDefinition::makeBody(Diagnostics& diagnostics) {
+QByteArray CustomDefinition::makeBody(orx::Findings& diagnostics) {
   QByteArray text;
   QBuffer device(&text);
   device.open(QIODevice::WriteOnly);

@@ -6,7 +6,7 @@
 #pragma once
 
 #include <transform/core/TransformerCfgListener.h>
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 #include <translation/graph/InnerAttributes.h>
 
 #include <QByteArray>
@@ -34,7 +34,7 @@ class CustomDefinition {
 
   // Orders and connects the copies. False when they feed each other in a circle, or a name cannot be
   // written.
-  bool arrange(Diagnostics& diagnostics);
+  bool arrange(orx::Findings& diagnostics);
   // The four below: call after arrange() answered true. Whether a statement names the attributes that reach
   // it.
   bool namesAttributes() const;
@@ -43,7 +43,7 @@ class CustomDefinition {
   // Those of the copies that are custom transformers, in the order of their statements.
   std::vector<const TransformerCfg*> customTransformers() const;
   // Checks what will be written, makes the text. False when anything was reported as an error.
-  bool prepare(Diagnostics& diagnostics);
+  bool prepare(orx::Findings& diagnostics);
   // All below: call after prepare() answered true.
   void write(MFBuffer& buffer) const;
   // The definition's own lines, without the marks around them and without their prefix.
@@ -61,16 +61,16 @@ class CustomDefinition {
     std::unique_ptr<TransformerCfg> cfg;
   };
 
-  bool order(Diagnostics& diagnostics);
-  void nameFlows(Diagnostics& diagnostics);
+  bool order(orx::Findings& diagnostics);
+  void nameFlows(orx::Findings& diagnostics);
   void makePart(const SubDocNetworkObjXformer& node);
   void connect(Part& part) const;
-  void check(const Part& part, Diagnostics& diagnostics) const;
+  void check(const Part& part, orx::Findings& diagnostics) const;
   QString innerName(const QString& name) const;
   // The flow that a link's end brings, or takes, at that node and port.
   QString flowFrom(const SubDocNetworkObj& node, const QString& port) const;
   QString title(const Part& part) const;
-  QByteArray makeBody(Diagnostics& diagnostics);
+  QByteArray makeBody(orx::Findings& diagnostics);
   // The value of a copy's parameter, its references to published parameters led to the instance's macros.
   QString redirect(const TransformerCfg& cfg, const QString& parameter) const;
 

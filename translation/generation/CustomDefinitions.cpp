@@ -23,7 +23,7 @@ void CustomDefinitions::addInstance(const TransformerCfg* instance) {
     arriving[port.key()] += port.value();
 }
 
-bool CustomDefinitions::prepare(Diagnostics& diagnostics) {
+bool CustomDefinitions::prepare(orx::Findings& diagnostics) {
   bool isArranged = true;
   for (CustomDefinition& definition : m_definitions)
     isArranged = definition.arrange(diagnostics) && isArranged;

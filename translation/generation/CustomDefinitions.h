@@ -25,7 +25,7 @@ class CustomDefinitions {
   // Notes what reaches an instance in the main document; other transformers are passed over.
   void addInstance(const TransformerCfg* instance);
   // False when anything was reported as an error.
-  bool prepare(Diagnostics& diagnostics);
+  bool prepare(orx::Findings& diagnostics);
 
   // Innermost first; to be written after prepare() answered true.
   const std::deque<CustomDefinition>& all() const { return m_definitions; }

@@ -19,6 +19,8 @@
 
 #include <limits>
 
+using orx::Rule;
+
 namespace {
 
 std::size_t at(int number) {
@@ -32,7 +34,7 @@ void writeStatement(MFBuffer& buffer, const QString& line) {
 
 }  // namespace
 
-MappingFileWriter::MappingFileWriter(Workspace& workspace, Diagnostics& diagnostics)
+MappingFileWriter::MappingFileWriter(Workspace& workspace, orx::Findings& diagnostics)
     : m_workspace(workspace),
       m_diagnostics(diagnostics),
       m_definitions(workspace.customTransformers(), workspace.listener) {}

@@ -1,7 +1,7 @@
 // Writes a workspace as a mapping file. A workspace is written once: writing connects its transformers.
 #pragma once
 
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 #include <translation/generation/CustomDefinitions.h>
 #include <translation/graph/Workspace.h>
 
@@ -16,7 +16,7 @@ class MFBuffer;
 class MappingFileWriter {
  public:
   // Neither is owned.
-  MappingFileWriter(Workspace& workspace, Diagnostics& diagnostics);
+  MappingFileWriter(Workspace& workspace, orx::Findings& diagnostics);
 
   // Orders and connects the transformers and pushes attributes through; checks everything that will be
   // written. False when there are errors, those found before included; nothing may be written then.
@@ -44,7 +44,7 @@ class MappingFileWriter {
   void writeWriterRoutes(MFBuffer& buffer) const;
 
   Workspace& m_workspace;
-  Diagnostics& m_diagnostics;
+  orx::Findings& m_diagnostics;
   bool m_isConnected = false;
   std::vector<int> m_order;                              // transformers, each behind what feeds it
   std::vector<QHash<QString, QString>> m_flows;          // per node: output tag to flow; "" for feature types

@@ -1,11 +1,11 @@
-// What was found wrong inside a custom transformer, as diagnostics.
+// What was found wrong inside a custom transformer, as findings of the workspace.
 #pragma once
 
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 
 #include <QString>
 
 class ExternalDocNetwork;
 
 // `file` is the one that the lines of the problems belong to.
-void reportNetworkProblems(const ExternalDocNetwork& network, const QString& file, Diagnostics& diagnostics);
+void reportNetworkProblems(const ExternalDocNetwork& network, const QString& file, orx::Findings& findings);

@@ -14,13 +14,15 @@
 #include <translation/graph/NetworkDiagnostics.h>
 #include <translation/graph/WorkspaceBuilder.h>
 
+using orx::Rule;
+
 namespace {
 
 constexpr long kRepeatedCustomTransformer = 370869;
 
 }  // namespace
 
-WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
+WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, orx::Findings& diagnostics,
                                    const QHash<QString, QString>& parameterValues)
     : m_source(source), m_diagnostics(diagnostics), m_parameterValues(parameterValues) {}
 

@@ -3,7 +3,7 @@
 #pragma once
 
 #include <transform/custom/TransformerPorts.h>
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 #include <translation/graph/Workspace.h>
 
 #include <QHash>
@@ -21,7 +21,7 @@ class WorkspaceBuilder {
  public:
   // `source` makes the configurations; `parameterValues` gives global parameters another value, by name.
   // Neither `source` nor `diagnostics` is owned.
-  WorkspaceBuilder(TransformerSource& source, Diagnostics& diagnostics,
+  WorkspaceBuilder(TransformerSource& source, orx::Findings& diagnostics,
                    const QHash<QString, QString>& parameterValues = {});
 
   // Also builds the embedded custom transformers that the workspace does not use, and says so.
@@ -59,7 +59,7 @@ class WorkspaceBuilder {
                 QString& tag);
 
   TransformerSource& m_source;
-  Diagnostics& m_diagnostics;
+  orx::Findings& m_diagnostics;
   const QHash<QString, QString> m_parameterValues;
   bool m_includesUnused = false;
   std::unique_ptr<Workspace> m_workspace;

@@ -5,6 +5,8 @@
 
 #include <QStringList>
 
+using orx::Rule;
+
 namespace {
 
 constexpr int kNeededFields = 3;

@@ -7,6 +7,8 @@
 
 #include <algorithm>
 
+using orx::Rule;
+
 namespace {
 
 const QLatin1String kInput("INPUT");

@@ -2,6 +2,8 @@
 #include <translation/mappingfile/MappingFileFlow.h>
 #include <translation/mappingfile/MappingFileReport.h>
 
+using orx::Rule;
+
 void MappingFileFlow::addFactory(const QString& name, Role role, int line, MappingFileReport& report) {
   QHash<QString, int>& known = role == Role::Worker ? m_workers : m_factories;
   const auto earlier = known.constFind(name);

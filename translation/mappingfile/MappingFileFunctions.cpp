@@ -6,6 +6,8 @@
 #include <translation/mappingfile/MappingFileScripts.h>
 #include <translation/mappingfile/MappingFileWords.h>
 
+using orx::Rule;
+
 namespace {
 
 const QLatin1String kValue("Value");

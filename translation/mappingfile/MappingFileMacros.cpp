@@ -8,6 +8,8 @@
 #include <cstring>
 #include <utility>
 
+using orx::Rule;
+
 namespace {
 
 // What is longer is not remembered: it is no part of a name. So values inside values cannot grow without end.

@@ -4,6 +4,8 @@
 
 #include <algorithm>
 
+using orx::Rule;
+
 namespace {
 
 constexpr int kMebibyte = 1024 * 1024;

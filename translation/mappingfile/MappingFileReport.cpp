@@ -1,6 +1,8 @@
 #include <transform/text/MessageStrings.h>
 #include <translation/mappingfile/MappingFileReport.h>
 
+using orx::Rule;
+
 namespace {
 
 constexpr int kMostFindings = 20000;
@@ -37,7 +39,7 @@ void MappingFileReport::addMisspelt(Rule rule, int line, const QStringList& argu
   if (meant.isEmpty() || meant == arguments.first()) {
     add(rule, line, arguments);
   } else if (takesMore(line)) {
-    const QString text = TransformResString(diagnosticRule(rule).message, shortened(arguments));
+    const QString text = TransformResString(orx::ruleRow(rule).message, shortened(arguments));
     m_diagnostics.reportText(
         rule, line, QString(),
         text + QLatin1Char(' ') + TransformResString(kSuggestion, shortened({meant, arguments.first()})));

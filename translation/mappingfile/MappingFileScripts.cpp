@@ -8,6 +8,8 @@
 
 #include <algorithm>
 
+using orx::Rule;
+
 namespace {
 
 // What is handed to one Python interpreter, in characters.

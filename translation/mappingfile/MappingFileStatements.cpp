@@ -10,6 +10,8 @@
 #include <translation/mappingfile/MappingFileStatements.h>
 #include <translation/mappingfile/MappingFileWords.h>
 
+using orx::Rule;
+
 namespace {
 
 using Use = MappingFileMacros::Use;

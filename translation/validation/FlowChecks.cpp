@@ -5,6 +5,8 @@
 #include <transform/workspace/IXMLComponentReader.h>
 #include <translation/validation/FlowChecks.h>
 
+using orx::Rule;
+
 namespace {
 
 constexpr long kUnfedOutputPort = 370876;
@@ -15,7 +17,7 @@ std::size_t at(int number) {
 }
 
 void reportUnfed(const TransformerCfg& cfg, const QSet<QString>& fed, int line, const QString& title,
-                 Diagnostics& diagnostics) {
+                 orx::Findings& diagnostics) {
   QStringList tags;
   cfg.getInputTags(tags);
   for (const QString& tag : tags) {
@@ -25,7 +27,7 @@ void reportUnfed(const TransformerCfg& cfg, const QSet<QString>& fed, int line, 
 }
 
 void reportDropped(const TransformerCfg& cfg, const QSet<QString>& taken, int line, const QString& title,
-                   Diagnostics& diagnostics) {
+                   orx::Findings& diagnostics) {
   QStringList tags;
   cfg.getOutputTags(tags);
   tags.removeAll(cfg.getHiddenOutputTag());
@@ -85,7 +87,7 @@ void FlowChecks::findUnknownFlows() {
   }
 }
 
-void FlowChecks::report(Diagnostics& diagnostics) const {
+void FlowChecks::report(orx::Findings& diagnostics) const {
   for (std::size_t number = 0; number < m_workspace.nodes.size(); ++number) {
     const WorkspaceNode& node = m_workspace.nodes[number];
     if (!node.lacksInputLink && node.kind != WorkspaceNode::Kind::Reader)
@@ -95,7 +97,8 @@ void FlowChecks::report(Diagnostics& diagnostics) const {
   }
 }
 
-void FlowChecks::reportInputs(const WorkspaceNode& node, const QSet<QString>& fed, Diagnostics& diagnostics) {
+void FlowChecks::reportInputs(const WorkspaceNode& node, const QSet<QString>& fed,
+                              orx::Findings& diagnostics) {
   if (node.isTransformer())
     reportUnfed(*node.cfg, fed, node.line, node.name, diagnostics);
   else if (fed.isEmpty())
@@ -103,7 +106,7 @@ void FlowChecks::reportInputs(const WorkspaceNode& node, const QSet<QString>& fe
 }
 
 void FlowChecks::reportOutputs(const WorkspaceNode& node, const QSet<QString>& taken,
-                               Diagnostics& diagnostics) {
+                               orx::Findings& diagnostics) {
   if (node.isTransformer())
     reportDropped(*node.cfg, taken, node.line, node.name, diagnostics);
   else if (taken.isEmpty())
@@ -111,9 +114,9 @@ void FlowChecks::reportOutputs(const WorkspaceNode& node, const QSet<QString>& t
 }
 
 void reportFlowsInside(const ExternalDocNetwork& network, const IXMLComponentReader& reader,
-                       Diagnostics& diagnostics) {
+                       orx::Findings& diagnostics) {
   QSet<int> faultyLines;
-  for (const NetworkProblem& problem : network.problems())
+  for (const orx::Finding& problem : network.problems())
     faultyLines.insert(problem.line);
   QSet<const SubDocNetworkObj*> lacksInput;
   QSet<const SubDocNetworkObj*> lacksOutput;

@@ -2,7 +2,7 @@
 // nothing takes, and where, in consequence, nobody can tell which attributes arrive.
 #pragma once
 
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 #include <translation/graph/Workspace.h>
 
 #include <QSet>
@@ -19,15 +19,16 @@ class FlowChecks {
   explicit FlowChecks(const Workspace& workspace);
 
   // Ends that a link leads to which had to be left out are passed over: the link's own finding is enough.
-  void report(Diagnostics& diagnostics) const;
+  void report(orx::Findings& diagnostics) const;
   // Whether everything that flows into the node is known; where it is not, attributes may only seem to be
   // missing.
   bool knowsWhatArrives(int node) const { return m_isKnown[static_cast<std::size_t>(node)]; }
 
  private:
   void findUnknownFlows();
-  static void reportInputs(const WorkspaceNode& node, const QSet<QString>& fed, Diagnostics& diagnostics);
-  static void reportOutputs(const WorkspaceNode& node, const QSet<QString>& taken, Diagnostics& diagnostics);
+  static void reportInputs(const WorkspaceNode& node, const QSet<QString>& fed, orx::Findings& diagnostics);
+  static void reportOutputs(const WorkspaceNode& node, const QSet<QString>& taken,
+                            orx::Findings& diagnostics);
 
   const Workspace& m_workspace;
   std::vector<QSet<QString>> m_fed;    // per node: inputs that a link leads to
@@ -37,4 +38,4 @@ class FlowChecks {
 
 // The same for the inside of a custom transformer that the document embeds.
 void reportFlowsInside(const ExternalDocNetwork& network, const IXMLComponentReader& reader,
-                       Diagnostics& diagnostics);
+                       orx::Findings& diagnostics);

@@ -5,6 +5,9 @@
 #include <translation/graph/ReferencedNames.h>
 #include <translation/validation/ValueChecks.h>
 
+using orx::Rule;
+using orx::Severity;
+
 namespace {
 
 constexpr long kSuggestion = 370866;
@@ -13,12 +16,12 @@ const QLatin1String kInstanceNames("XFORMER_NAME");
 
 }  // namespace
 
-ValueChecks::ValueChecks(Diagnostics& diagnostics, const RuleSettings& settings)
+ValueChecks::ValueChecks(orx::Findings& diagnostics, const orx::RuleSettings& settings)
     : m_diagnostics(diagnostics), m_settings(settings) {
   const QChar mark(0xfffc);
   for (const Rule rule :
        {Rule::MissingAttribute, Rule::MissingValue, Rule::MissingFile, Rule::UnknownConnection}) {
-    const QString text = TransformResString(diagnosticRule(rule).message, QString(mark));
+    const QString text = TransformResString(orx::ruleRow(rule).message, QString(mark));
     const int place = text.indexOf(mark);
     if (place >= 0)
       m_forms.push_back({rule, text.left(place), text.mid(place + 1)});
@@ -46,7 +49,7 @@ QString ValueChecks::suggestion(const QString& name, const QStringList& candidat
 }
 
 QString ValueChecks::referenceText(const QString& name, const QStringList& names) {
-  const QString text = TransformResString(diagnosticRule(Rule::UnknownReference).message, name);
+  const QString text = TransformResString(orx::ruleRow(Rule::UnknownReference).message, name);
   return (text + QLatin1Char(' ') + suggestion(name, names)).trimmed();
 }
 
@@ -67,7 +70,7 @@ QString ValueChecks::missingText(const TransformerCfg& cfg, const QString& param
     if (!suggested.isEmpty())
       suggestions += QLatin1String(suggestions.isEmpty() ? ". " : " ") + suggested;
   }
-  return TransformResString(diagnosticRule(Rule::MissingAttribute).message, quoted.join(QLatin1Char(' '))) +
+  return TransformResString(orx::ruleRow(Rule::MissingAttribute).message, quoted.join(QLatin1Char(' '))) +
          suggestions;
 }
 
@@ -92,6 +95,11 @@ ValueChecks::LooseReferences ValueChecks::looseReferences(const Node& node, cons
   return loose;
 }
 
+bool ValueChecks::standsForReferences(Rule rule) const {
+  const std::optional<Severity> refusal = m_settings.severity(rule);
+  return refusal && *refusal <= m_settings.severity(Rule::UnknownReference).value_or(Severity::Hint);
+}
+
 void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names) {
   for (const QString& parameter : node.cfg.getParameters()) {
     QString text;
@@ -103,10 +111,9 @@ void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const
         continue;
       text = missingText(node.cfg, parameter);
     } else if (text.isEmpty()) {
-      text = TransformResString(diagnosticRule(Rule::InvalidValue).message);
+      text = TransformResString(orx::ruleRow(Rule::InvalidValue).message);
     }
-    const bool tellsReferences = !loose.isEmpty() && m_settings.severity(diagnosticRule(rule).name,
-                                                                         Severity::Error) == Severity::Error;
+    const bool tellsReferences = !loose.isEmpty() && standsForReferences(rule);
     for (const QString& name : tellsReferences ? ReferencedNames::inValue(text) : QStringList()) {
       // What the transformer itself says about the value need not be said again.
       if (loose[parameter].removeOne(name))

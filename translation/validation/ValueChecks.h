@@ -2,9 +2,9 @@
 // nowhere.
 #pragma once
 
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
+#include <transform/findings/RuleSettings.h>
 #include <translation/NearestSpelling.h>
-#include <translation/RuleSettings.h>
 
 #include <QHash>
 #include <QString>
@@ -23,7 +23,7 @@ class ValueChecks {
   using Knows = std::function<bool(const QString& name)>;
 
   // Neither is owned.
-  ValueChecks(Diagnostics& diagnostics, const RuleSettings& settings);
+  ValueChecks(orx::Findings& diagnostics, const orx::RuleSettings& settings);
 
   struct Node {
     const TransformerCfg& cfg;
@@ -39,7 +39,7 @@ class ValueChecks {
  private:
   // The fixed text around the argument of a message, by which a refusal's rule is told.
   struct Form {
-    Rule rule;
+    orx::Rule rule;
     QString before;
     QString behind;
   };
@@ -57,16 +57,18 @@ class ValueChecks {
   // A reference that a refusal shows is told with it, and taken out of `loose`; but not where such refusals
   // are turned down, which must not silence the reference.
   void reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names);
+  // Whether a finding of the rule counts as much as one about a reference.
+  bool standsForReferences(orx::Rule rule) const;
   void reportReferences(const Node& node, LooseReferences& loose, const QStringList& names);
   QString referenceText(const QString& name, const QStringList& names);
   // Empty when no name comes near.
   QString suggestion(const QString& name, const QStringList& candidates);
-  Rule ruleOf(const QString& message) const;
+  orx::Rule ruleOf(const QString& message) const;
   QString nearestName(const QString& name, const QStringList& candidates);
   QString missingText(const TransformerCfg& cfg, const QString& parameter);
 
-  Diagnostics& m_diagnostics;
-  const RuleSettings& m_settings;
+  orx::Findings& m_diagnostics;
+  const orx::RuleSettings& m_settings;
   NearestSpelling m_spelling;
   QHash<QString, Suggestion> m_suggestions;  // by the name that was used
   std::vector<Form> m_forms;

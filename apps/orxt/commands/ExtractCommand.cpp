@@ -12,6 +12,8 @@
 #include <algorithm>
 #include <limits>
 
+using orx::Severity;
+
 namespace {
 
 constexpr CommandFacts kFacts = {"extract", "Make an embedded custom transformer a file of its own",
@@ -79,7 +81,7 @@ ExitStatus ExtractCommand::run(Console& console) {
                                   .arg(name, names.join(QLatin1String(", "))));
     return kExitRefused;
   }
-  Diagnostics diagnostics(shownName);
+  orx::Findings diagnostics(shownName);
   const bool isPrepared = extraction.prepare(name, m_version, diagnostics);
   console.show(diagnostics);
   if (!isPrepared)

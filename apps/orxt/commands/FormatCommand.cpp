@@ -9,6 +9,8 @@
 
 #include <algorithm>
 
+using orx::Severity;
+
 namespace {
 
 constexpr CommandFacts kFacts = {"format", "Rewrite workspaces in canonical form",

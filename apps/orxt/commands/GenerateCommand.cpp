@@ -116,7 +116,7 @@ ExitStatus GenerateCommand::run(Console& console) {
 ExitStatus GenerateCommand::runJob(const Job& job, const QHash<QString, QString>& values,
                                    TransformerSource& source, Console& console) const {
   const QString shownName = InputFile::shownName(job.workspace);
-  Diagnostics diagnostics(shownName);
+  orx::Findings diagnostics(shownName);
   QString error;
   const TranslationResult result =
       translateWorkspace({job.workspace, job.output, values}, source, diagnostics, error);

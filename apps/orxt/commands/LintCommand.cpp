@@ -1,5 +1,6 @@
 #include <apps/orxt/commands/LintCommand.h>
 #include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/FindingJson.h>
 #include <apps/orxt/console/SarifLog.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
@@ -13,12 +14,12 @@
 #include <QDirIterator>
 #include <QFile>
 #include <QFileInfo>
-#include <QJsonArray>
 #include <QJsonDocument>
-#include <QJsonObject>
 
 #include <algorithm>
 #include <tuple>
+
+using orx::Severity;
 
 namespace {
 
@@ -56,10 +57,6 @@ bool isMappingFile(const QString& path, const QString& shownName) {
          !name.startsWith(QLatin1String("CategoryDefinitions")) && !isDefinitionFile(beginning);
 }
 
-Severity severityOf(bool isError) {
-  return isError ? Severity::Error : Severity::Warning;
-}
-
 }  // namespace
 
 LintCommand::LintCommand() : Command(kFacts) {}
@@ -76,11 +73,8 @@ void LintCommand::declare(CLI::App& app) {
 
 ExitStatus LintCommand::run(Console& console) {
   m_definitionOptions.setLanguage();
-  QStringList definitionRules;
-  for (const LintRule& rule : lintRules())
-    definitionRules.append(rule.name);
-  RuleSettings settings;
-  if (!m_options.readRules(settings, console, definitionRules))
+  orx::RuleSettings settings;
+  if (!m_options.readRules(settings, console))
     return kExitUsage;
   m_definitions = std::make_unique<DefinitionLint>();
   bool isReadable = true;
@@ -90,11 +84,11 @@ ExitStatus LintCommand::run(Console& console) {
     isReadable = isRead && isReadable;
   }
   takeDefinitionFindings();
-  applySettings(settings);
+  m_findings = settings.apply(std::move(m_findings));
   show(console);
   if (!isReadable)
     return kExitFile;
-  const bool hasErrors = std::any_of(m_findings.begin(), m_findings.end(), [](const Finding& finding) {
+  const bool hasErrors = std::any_of(m_findings.begin(), m_findings.end(), [](const orx::Finding& finding) {
     return finding.severity == Severity::Error;
   });
   return hasErrors ? kExitRefused : kExitDone;
@@ -142,10 +136,7 @@ bool LintCommand::checkMappingFile(const QString& path, const QString& shownName
   const MappingFileFindings result = lintMappingFile(path, shownName, [&](const QString& name, int version) {
     return isCustomTransformer(m_definitionOptions.load(console).makeTransformer(name, version).get());
   });
-  for (const Diagnostic& finding : result.findings) {
-    m_findings.push_back({finding.file, finding.line, finding.severity,
-                          QString(diagnosticRule(finding.rule).name), finding.text});
-  }
+  m_findings.insert(m_findings.end(), result.findings.begin(), result.findings.end());
   if (!result.readError.isEmpty())
     return failFile(shownName, result.readError, console);
   return true;
@@ -158,51 +149,27 @@ bool LintCommand::failFile(const QString& shownName, const QString& reason, Cons
 }
 
 void LintCommand::takeDefinitionFindings() {
-  for (const LintFinding& finding : m_definitions->findings()) {
-    m_findings.push_back({m_shownNames.value(finding.file, finding.file), finding.line,
-                          severityOf(finding.isError), finding.rule, finding.text});
+  for (orx::Finding finding : m_definitions->findings()) {
+    finding.file = m_shownNames.value(finding.file, finding.file);
+    m_findings.push_back(std::move(finding));
   }
-  std::stable_sort(m_findings.begin(), m_findings.end(), [](const Finding& a, const Finding& b) {
+  std::stable_sort(m_findings.begin(), m_findings.end(), [](const orx::Finding& a, const orx::Finding& b) {
     return std::tie(a.file, a.line) < std::tie(b.file, b.line);
   });
-}
-
-void LintCommand::applySettings(const RuleSettings& settings) {
-  std::vector<Finding> left;
-  for (Finding& finding : m_findings) {
-    if (const std::optional<Severity> counted = settings.severity(finding.rule, finding.severity)) {
-      finding.severity = *counted;
-      left.push_back(std::move(finding));
-    }
-  }
-  m_findings = std::move(left);
 }
 
 void LintCommand::show(Console& console) const {
   if (m_options.isSarif()) {
     SarifLog log;
-    for (const LintRule& rule : lintRules())
-      log.addRule(rule.name, severityOf(rule.isError));
-    for (const Finding& finding : m_findings)
-      log.addFinding(finding.file, finding.line, finding.severity, finding.rule, QString(), finding.text);
+    for (const orx::Finding& finding : m_findings)
+      log.add(finding);
     for (const auto& [file, reason] : m_unreadable)
       log.addUnreadable(file, reason);
     console.print(log.text());
-    return;
+  } else if (m_options.isJson()) {
+    console.print(QString::fromUtf8(QJsonDocument(toJson(m_findings)).toJson()));
+  } else {
+    for (const orx::Finding& finding : m_findings)
+      console.show(finding);
   }
-  QJsonArray list;
-  for (const Finding& finding : m_findings) {
-    if (m_options.isJson()) {
-      list.append(QJsonObject{{QStringLiteral("file"), finding.file},
-                              {QStringLiteral("line"), finding.line},
-                              {QStringLiteral("severity"), severityName(finding.severity)},
-                              {QStringLiteral("rule"), finding.rule},
-                              {QStringLiteral("text"), finding.text}});
-    } else {
-      console.showFinding(finding.file, finding.line, finding.severity,
-                          finding.text + QLatin1String(" [") + finding.rule + QLatin1Char(']'));
-    }
-  }
-  if (m_options.isJson())
-    console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
 }

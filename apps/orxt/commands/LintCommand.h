@@ -3,7 +3,7 @@
 #include <apps/orxt/console/Command.h>
 #include <apps/orxt/console/DefinitionOptions.h>
 #include <apps/orxt/console/FindingOptions.h>
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 
 #include <QHash>
 #include <QSet>
@@ -25,21 +25,12 @@ class LintCommand : public Command {
   ExitStatus run(Console& console) override;
 
  private:
-  struct Finding {
-    QString file;
-    int line;
-    Severity severity;
-    QString rule;
-    QString text;
-  };
-
   // Each is false when something cannot be read.
   bool checkFolder(const QString& folder, Console& console);
   bool checkFile(const QString& path, Console& console);
   bool checkMappingFile(const QString& path, const QString& shownName, Console& console);
   bool failFile(const QString& shownName, const QString& reason, Console& console);
   void takeDefinitionFindings();
-  void applySettings(const RuleSettings& settings);
   void show(Console& console) const;
 
   std::vector<std::string> m_paths;
@@ -49,6 +40,6 @@ class LintCommand : public Command {
   std::vector<std::unique_ptr<InputFile>> m_copies;  // of streams that hold definitions
   QHash<QString, QString> m_shownNames;              // of those copies
   QSet<QString> m_checked;                           // mapping files, by their canonical paths
-  std::vector<Finding> m_findings;
+  std::vector<orx::Finding> m_findings;
   std::vector<std::pair<QString, QString>> m_unreadable;  // files, and why
 };

@@ -1,14 +1,16 @@
 #include <apps/orxt/commands/ValidateCommand.h>
 #include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/FindingJson.h>
 #include <apps/orxt/console/SarifLog.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/text/MessageStrings.h>
 
 #include <CLI/CLI.hpp>
-#include <QJsonArray>
 #include <QJsonDocument>
 
 #include <algorithm>
+
+using orx::Severity;
 
 namespace {
 
@@ -20,31 +22,20 @@ constexpr CommandFacts kFacts = {"validate", "Find everything that is wrong with
                                  "orxt validate --quiet --rule missing-file=warning nightly/*.orw\n"
                                  "orxt validate --sarif parcels.orw >parcels.sarif"};
 
-QJsonObject toJson(const ValidationReport& report) {
-  QJsonArray findings;
-  for (const Diagnostic& finding : report.findings) {
-    findings.append(QJsonObject{{QStringLiteral("file"), finding.file},
-                                {QStringLiteral("line"), finding.line},
-                                {QStringLiteral("severity"), severityName(finding.severity)},
-                                {QStringLiteral("rule"), QString(diagnosticRule(finding.rule).name)},
-                                {QStringLiteral("node"), finding.node},
-                                {QStringLiteral("parameter"), finding.parameter},
-                                {QStringLiteral("text"), finding.text}});
-  }
+QJsonObject reportJson(const ValidationReport& report) {
   return {{QStringLiteral("file"), report.file},
           {QStringLiteral("unreadable"), report.readError},
           {QStringLiteral("errors"), report.count(Severity::Error)},
           {QStringLiteral("warnings"), report.count(Severity::Warning)},
           {QStringLiteral("hints"), report.count(Severity::Hint)},
-          {QStringLiteral("findings"), findings}};
+          {QStringLiteral("findings"), toJson(report.findings)}};
 }
 
 QString sarif(const std::vector<ValidationReport>& reports) {
   SarifLog log;
   for (const ValidationReport& report : reports) {
-    for (const Diagnostic& finding : report.findings)
-      log.addFinding(finding.file, finding.line, finding.severity, diagnosticRule(finding.rule).name,
-                     finding.node, textWithNode(finding));
+    for (const orx::Finding& finding : report.findings)
+      log.add(finding);
     if (!report.isReadable())
       log.addUnreadable(report.file, report.readError);
   }
@@ -77,18 +68,18 @@ void ValidateCommand::declare(CLI::App& app) {
 
 ExitStatus ValidateCommand::run(Console& console) {
   m_definitions.setLanguage();
-  RuleSettings settings;
+  orx::RuleSettings settings;
   if (!m_options.readRules(settings, console))
     return kExitUsage;
   TransformerMgr& registry = m_definitions.load(console);
   std::vector<ValidationReport> reports;
   for (const std::string& workspace : m_workspaces) {
     reports.push_back(validateWorkspace(QString::fromStdString(workspace), registry, settings));
-    std::vector<Diagnostic>& findings = reports.back().findings;
+    std::vector<orx::Finding>& findings = reports.back().findings;
     if (m_quiet) {
       findings.erase(
           std::remove_if(findings.begin(), findings.end(),
-                         [](const Diagnostic& finding) { return finding.severity != Severity::Error; }),
+                         [](const orx::Finding& finding) { return finding.severity != Severity::Error; }),
           findings.end());
     }
     show(reports.back(), console);
@@ -99,10 +90,8 @@ ExitStatus ValidateCommand::run(Console& console) {
 
 void ValidateCommand::show(const ValidationReport& report, Console& console) const {
   if (!m_options.isJson() && !m_options.isSarif()) {
-    for (const Diagnostic& finding : report.findings)
-      console.showFinding(
-          finding.file, finding.line, finding.severity,
-          textWithNode(finding) + QLatin1String(" [") + diagnosticRule(finding.rule).name + QLatin1Char(']'));
+    for (const orx::Finding& finding : report.findings)
+      console.show(finding);
   }
   if (!report.isReadable())
     console.failFile(report.file, report.readError);
@@ -116,7 +105,7 @@ void ValidateCommand::summarize(const std::vector<ValidationReport>& reports, Co
   if (m_options.isJson()) {
     QJsonArray list;
     for (const ValidationReport& report : reports)
-      list.append(toJson(report));
+      list.append(reportJson(report));
     console.print(QString::fromUtf8(QJsonDocument(list).toJson()));
     return;
   }

@@ -5,6 +5,8 @@
 #include <cstdlib>
 #include <unistd.h>
 
+using orx::Severity;
+
 namespace {
 
 constexpr int kLongestMessage = 12000;  // two long paths have room
@@ -39,24 +41,26 @@ void Console::failFile(const QString& file, const QString& reason) {
   writeError(file + QLatin1String(": error: ") + reason);
 }
 
-void Console::show(const Diagnostics& diagnostics) {
-  for (const Diagnostic& diagnostic : diagnostics.all())
-    show(diagnostic);
+void Console::show(const orx::Findings& findings) {
+  for (const orx::Finding& finding : findings.all())
+    show(finding);
 }
 
-void Console::show(const Diagnostic& diagnostic) {
-  showFinding(diagnostic.file, diagnostic.line, diagnostic.severity, textWithNode(diagnostic));
+void Console::show(const orx::Finding& finding) {
+  showFinding(
+      finding.file, finding.line, finding.severity,
+      orx::textWithNode(finding) + QLatin1String(" [") + orx::ruleRow(finding.rule).name + QLatin1Char(']'));
 }
 
 void Console::showFinding(const QString& file, int line, Severity severity, const QString& text) {
-  QString word = severityName(severity);
+  QString word = orx::severityName(severity);
   if (m_colours) {
     const char* colour = severity == Severity::Error     ? "\x1b[1;31m"
                          : severity == Severity::Warning ? "\x1b[1;33m"
                                                          : "\x1b[1;36m";
     word = QLatin1String(colour) + word + QLatin1String("\x1b[0m");
   }
-  writeError(formatFinding(file, line, word, text));
+  writeError(orx::formatFinding(file, line, word, text));
 }
 
 void Console::showProgress(const QString& text) {

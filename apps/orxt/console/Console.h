@@ -1,7 +1,7 @@
 // Standard output for results, standard error for all else.
 #pragma once
 
-#include <translation/Diagnostics.h>
+#include <transform/findings/Findings.h>
 
 #include <QByteArray>
 #include <QString>
@@ -17,10 +17,11 @@ class Console {
   void fail(const QString& text);
   // A file that could not be read or written: "FILE: error: reason".
   void failFile(const QString& file, const QString& reason);
-  void show(const Diagnostics& diagnostics);
-  void show(const Diagnostic& diagnostic);
+  void show(const orx::Findings& findings);
+  // With the name of its rule behind it.
+  void show(const orx::Finding& finding);
   // The same form for findings that no rule of workspaces covers.
-  void showFinding(const QString& file, int line, Severity severity, const QString& text);
+  void showFinding(const QString& file, int line, orx::Severity severity, const QString& text);
   // Overwrites the last progress line; nothing unless standard error is a terminal.
   void showProgress(const QString& text);
   void endProgress();

@@ -13,11 +13,10 @@ void FindingOptions::declare(CLI::App& app, const char* jsonHelp) {
       ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
 }
 
-bool FindingOptions::readRules(RuleSettings& settings, Console& console,
-                               const QStringList& furtherRules) const {
+bool FindingOptions::readRules(orx::RuleSettings& settings, Console& console) const {
   for (const std::string& rule : m_rules) {
     QString reason;
-    if (!settings.set(QString::fromStdString(rule), reason, furtherRules)) {
+    if (!settings.set(QString::fromStdString(rule), reason)) {
       console.fail(QLatin1String("--rule: ") + reason);
       return false;
     }

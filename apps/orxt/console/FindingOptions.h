@@ -1,7 +1,7 @@
 // What every command that lists findings takes: their form, and how severe each rule counts.
 #pragma once
 
-#include <translation/RuleSettings.h>
+#include <transform/findings/RuleSettings.h>
 
 #include <string>
 #include <vector>
@@ -16,7 +16,7 @@ class FindingOptions {
   // `jsonHelp` tells what the JSON holds.
   void declare(CLI::App& app, const char* jsonHelp);
   // Call once the language is set. False, with the reason on the console, for a setting that is none.
-  bool readRules(RuleSettings& settings, Console& console, const QStringList& furtherRules = {}) const;
+  bool readRules(orx::RuleSettings& settings, Console& console) const;
 
   bool isJson() const { return m_json; }
   bool isSarif() const { return m_sarif; }

@@ -4,7 +4,10 @@
 
 #include <QFileInfo>
 #include <QJsonDocument>
+#include <QJsonObject>
 #include <QUrl>
+
+using orx::Severity;
 
 namespace {
 
@@ -13,7 +16,7 @@ QJsonObject message(const QString& text) {
 }
 
 QString level(Severity severity) {
-  return severity == Severity::Hint ? QStringLiteral("note") : severityName(severity);
+  return severity == Severity::Hint ? QStringLiteral("note") : orx::severityName(severity);
 }
 
 // A relative name stays relative; everything that means something in a URI is encoded.
@@ -31,37 +34,35 @@ QJsonObject physicalLocation(const QString& file, int line) {
   return physical;
 }
 
+QJsonObject ruleEntry(const orx::RuleRow& row) {
+  QJsonObject entry{
+      {QStringLiteral("id"), QString(row.name)},
+      {QStringLiteral("shortDescription"),
+       message(QString(row.name).replace(QLatin1Char('-'), QLatin1Char(' ')))},
+      {QStringLiteral("defaultConfiguration"), QJsonObject{{QStringLiteral("level"), level(row.severity)}}}};
+  if (row.message != 0)
+    entry.insert(QStringLiteral("fullDescription"), message(TransformResString(row.message)));
+  return entry;
+}
+
+QJsonArray ruleEntries() {
+  QJsonArray entries;
+  for (const orx::RuleRow& row : orx::ruleTable())
+    entries.append(ruleEntry(row));
+  return entries;
+}
+
 }  // namespace
 
-SarifLog::SarifLog() {
-  for (const DiagnosticRule& rule : diagnosticRules())
-    addRule(rule.name, rule.severity, rule.message == 0 ? QString() : TransformResString(rule.message));
-}
-
-void SarifLog::addRule(const QString& name, Severity severity, const QString& description) {
-  if (m_rulePlaces.contains(name))
-    return;
-  QJsonObject entry{
-      {QStringLiteral("id"), name},
-      {QStringLiteral("shortDescription"),
-       message(QString(name).replace(QLatin1Char('-'), QLatin1Char(' ')))},
-      {QStringLiteral("defaultConfiguration"), QJsonObject{{QStringLiteral("level"), level(severity)}}}};
-  if (!description.isEmpty())
-    entry.insert(QStringLiteral("fullDescription"), message(description));
-  m_rulePlaces.insert(name, m_rules.size());
-  m_rules.append(entry);
-}
-
-void SarifLog::addFinding(const QString& file, int line, Severity severity, const QString& rule,
-                          const QString& node, const QString& text) {
-  QJsonObject location{{QStringLiteral("physicalLocation"), physicalLocation(file, line)}};
-  if (!node.isEmpty())
+void SarifLog::add(const orx::Finding& finding) {
+  QJsonObject location{{QStringLiteral("physicalLocation"), physicalLocation(finding.file, finding.line)}};
+  if (!finding.node.isEmpty())
     location.insert(QStringLiteral("logicalLocations"),
-                    QJsonArray{QJsonObject{{QStringLiteral("name"), node}}});
-  m_results.append(QJsonObject{{QStringLiteral("ruleId"), rule},
-                               {QStringLiteral("ruleIndex"), m_rulePlaces.value(rule, -1)},
-                               {QStringLiteral("level"), level(severity)},
-                               {QStringLiteral("message"), message(text)},
+                    QJsonArray{QJsonObject{{QStringLiteral("name"), finding.node}}});
+  m_results.append(QJsonObject{{QStringLiteral("ruleId"), QString(orx::ruleRow(finding.rule).name)},
+                               {QStringLiteral("ruleIndex"), static_cast<int>(finding.rule)},
+                               {QStringLiteral("level"), level(finding.severity)},
+                               {QStringLiteral("message"), message(orx::textWithNode(finding))},
                                {QStringLiteral("locations"), QJsonArray{location}}});
 }
 
@@ -76,7 +77,7 @@ void SarifLog::addUnreadable(const QString& file, const QString& reason) {
 QString SarifLog::text() const {
   const QJsonObject driver{{QStringLiteral("name"), QStringLiteral("orxt")},
                            {QStringLiteral("version"), programVersion().section(QLatin1Char(' '), -1)},
-                           {QStringLiteral("rules"), m_rules}};
+                           {QStringLiteral("rules"), ruleEntries()}};
   const QJsonObject run{
       {QStringLiteral("tool"), QJsonObject{{QStringLiteral("driver"), driver}}},
       {QStringLiteral("columnKind"), QStringLiteral("utf16CodeUnits")},

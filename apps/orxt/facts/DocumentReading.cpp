@@ -3,7 +3,7 @@
 
 ExitStatus readDocument(WorkspaceDocument& document, const QString& fileName, Console& console,
                         WorkspaceDocument::Versions versions) {
-  Diagnostics diagnostics(InputFile::shownName(fileName));
+  orx::Findings diagnostics(InputFile::shownName(fileName));
   QString error;
   const WorkspaceDocument::Reading reading = document.read(diagnostics, error, versions);
   console.show(diagnostics);

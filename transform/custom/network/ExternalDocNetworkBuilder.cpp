@@ -10,6 +10,8 @@
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
 
+using orx::Rule;
+
 void ExternalDocNetwork::build(const IXMLComponentReader& reader, const QString& subDocumentName,
                                TransformerSource& source) {
   Builder(*this, reader, subDocumentName, source).build();
@@ -35,9 +37,9 @@ void ExternalDocNetwork::Builder::build() {
   m_network.doneAdding(true);
 }
 
-void ExternalDocNetwork::Builder::report(NetworkProblem::Kind kind, int line, const QString& node,
-                                         long message, const QStringList& arguments) {
-  m_network.addProblem(kind, line, node, TransformResString(message, arguments));
+void ExternalDocNetwork::Builder::report(Rule rule, int line, const QString& node, long message,
+                                         const QStringList& arguments) {
+  m_network.addProblem(rule, message, line, node, TransformResString(message, arguments));
 }
 
 bool ExternalDocNetwork::Builder::enter(int identifier, const Place& place) {
@@ -46,7 +48,7 @@ bool ExternalDocNetwork::Builder::enter(int identifier, const Place& place) {
     m_places.insert(identifier, place);
     return true;
   }
-  report(NetworkProblem::Kind::DuplicateNumber, place.line, place.title, custom_messages::kDuplicateNumber,
+  report(Rule::DuplicateNumber, place.line, place.title, custom_messages::kDuplicateNumber,
          {QString::number(identifier), QString::number(earlier->line)});
   return false;
 }
@@ -87,13 +89,13 @@ void ExternalDocNetwork::Builder::addPorts() {
     }
   }
   if (m_network.blockedLooping() && m_network.getLoops().isEmpty())
-    report(NetworkProblem::Kind::NoLoop, m_reader.GetDocumentLine(m_document), QString(),
+    report(Rule::CustomTransformerFault, m_reader.GetDocumentLine(m_document), QString(),
            custom_messages::kNoLoop, {});
   const QStringList inputNames = m_network.getInputs();
   const QSet<QString> taken(inputNames.begin(), inputNames.end());
   for (const QString& output : m_network.getOutputs()) {
     if (taken.contains(output)) {
-      report(NetworkProblem::Kind::DuplicateName, m_reader.GetDocumentLine(m_document), output,
+      report(Rule::DuplicateName, m_reader.GetDocumentLine(m_document), output,
              custom_messages::kSamePortName, {output});
     }
   }
@@ -108,7 +110,7 @@ void ExternalDocNetwork::Builder::addTransformer(const TransformerStruct& record
   if (record.enabled) {
     const auto sameName = m_linesByTitle.constFind(place.title);
     if (sameName != m_linesByTitle.constEnd()) {
-      report(NetworkProblem::Kind::DuplicateName, record.line, place.title, custom_messages::kDuplicateName,
+      report(Rule::DuplicateName, record.line, place.title, custom_messages::kDuplicateName,
              {place.title, QString::number(*sameName)});
     } else {
       m_linesByTitle.insert(place.title, record.line);
@@ -134,8 +136,7 @@ std::unique_ptr<TransformerCfg> ExternalDocNetwork::Builder::makeTransformer(con
   const bool isCustom = record.kind == TransformerKind::SubDocument;
   const QString type = isCustom ? subDocumentName(record) : record.type;
   if (isCustom && type.isEmpty()) {
-    report(NetworkProblem::Kind::UnknownTransformer, record.line, title, custom_messages::kNoSubDocumentName,
-           {});
+    report(Rule::UnknownTransformer, record.line, title, custom_messages::kNoSubDocumentName, {});
     return nullptr;
   }
   std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(type, record.version);
@@ -144,16 +145,16 @@ std::unique_ptr<TransformerCfg> ExternalDocNetwork::Builder::makeTransformer(con
   const QString refusal = m_source.refusalReason();
   if (!refusal.isEmpty()) {
     const bool isOfDocument = m_reader.GetSubDocList().contains(type);
-    m_network.addProblem(isOfDocument ? NetworkProblem::Kind::Nesting : NetworkProblem::Kind::NoBody,
-                         record.line, title, refusal);
+    m_network.addProblem(isOfDocument ? Rule::Nesting : Rule::CustomTransformerFault, 0, record.line, title,
+                         refusal);
     return nullptr;
   }
   const auto newest = m_source.makeTransformer(type, TransformerSource::kNewestVersion);
   if (newest) {
-    report(NetworkProblem::Kind::UnknownVersion, record.line, title, custom_messages::kUnknownVersion,
+    report(Rule::UnknownVersion, record.line, title, custom_messages::kUnknownVersion,
            {type, QString::number(record.version), QString::number(newest->getVersion())});
   } else {
-    report(NetworkProblem::Kind::UnknownTransformer, record.line, title, custom_messages::kUnknownTransformer,
+    report(Rule::UnknownTransformer, record.line, title, custom_messages::kUnknownTransformer,
            {type, QString::number(record.version),
             ORX_resourcePlaces(QStringLiteral("transformer")).join(QLatin1String(", "))});
   }
@@ -169,17 +170,16 @@ void ExternalDocNetwork::Builder::configure(const TransformerStruct& record, Pla
     if (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentNameParameter)
       continue;
     if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
-      report(NetworkProblem::Kind::UnknownParameter, parameter.line, place.title,
-             custom_messages::kUnknownParameter, {nameWithFile(cfg), parameter.parmName});
+      report(Rule::UnknownParameter, parameter.line, place.title, custom_messages::kUnknownParameter,
+             {nameWithFile(cfg), parameter.parmName});
     }
   }
   cfg.autoUpgradeTransformer();
   if (cfg.isAutoUpgraded()) {
-    report(NetworkProblem::Kind::Upgraded, record.line, place.title, custom_messages::kUpgraded,
-           {cfg.getName()});
+    report(Rule::Upgraded, record.line, place.title, custom_messages::kUpgraded, {cfg.getName()});
   }
   if (!cfg.dependencyMet()) {
-    report(NetworkProblem::Kind::UnmetDependency, record.line, place.title, custom_messages::kUnmetDependency,
+    report(Rule::UnmetDependency, record.line, place.title, custom_messages::kUnmetDependency,
            {cfg.getName(), cfg.dependencyMsg()});
   }
 
@@ -192,7 +192,7 @@ bool ExternalDocNetwork::Builder::findEnds(const LinkStruct& record, Place*& sou
   for (const int identifier : {record.sourceNode, record.targetNode}) {
     if (m_places.contains(identifier))
       continue;
-    report(NetworkProblem::Kind::DanglingLink, record.line, QString(), custom_messages::kDanglingLink,
+    report(Rule::DanglingLink, record.line, QString(), custom_messages::kDanglingLink,
            {QString::number(record.identifier), QString::number(identifier)});
     return false;
   }
@@ -203,7 +203,7 @@ bool ExternalDocNetwork::Builder::findEnds(const LinkStruct& record, Place*& sou
 
 void ExternalDocNetwork::Builder::reportPort(const LinkStruct& record, const Place& place,
                                              const QString& description) {
-  report(NetworkProblem::Kind::BadPort, record.line, place.title, custom_messages::kBadPort,
+  report(Rule::BadPort, record.line, place.title, custom_messages::kBadPort,
          {QString::number(record.identifier), description});
 }
 
@@ -225,8 +225,8 @@ bool ExternalDocNetwork::Builder::findPort(const LinkStruct& record, const Place
     place.cfg->getOutputTags(tags);
   else
     place.cfg->getInputTags(tags);
-  report(isOutput ? NetworkProblem::Kind::UnknownOutput : NetworkProblem::Kind::UnknownInput, record.line,
-         place.title, isOutput ? custom_messages::kUnknownOutput : custom_messages::kUnknownInput,
+  report(isOutput ? Rule::UnknownOutput : Rule::UnknownInput, record.line, place.title,
+         isOutput ? custom_messages::kUnknownOutput : custom_messages::kUnknownInput,
          {nameWithFile(*place.cfg), name.isEmpty() ? QString::number(number) : name,
           tags.join(QLatin1String(", "))});
   return false;
@@ -297,8 +297,7 @@ void ExternalDocNetwork::Builder::addParameters() {
   for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(m_document)) {
     const GUIType type = GUIType::fromGuiLine(record.guiLine);
     if (type.getName().isEmpty()) {
-      report(NetworkProblem::Kind::BadPromptLine, record.line, QString(), custom_messages::kBadPromptLine,
-             {record.guiLine});
+      report(Rule::BadPromptLine, record.line, QString(), custom_messages::kBadPromptLine, {record.guiLine});
       continue;
     }
     m_network.addPublishedParameter(type, type.getName());

@@ -39,8 +39,7 @@ class ExternalDocNetwork::Builder {
   bool findEnds(const LinkStruct& record, Place*& source, Place*& target);
   bool findPort(const LinkStruct& record, const Place& place, bool isOutput, unsigned number,
                 const QString& name, QString& tag);
-  void report(NetworkProblem::Kind kind, int line, const QString& node, long message,
-              const QStringList& arguments);
+  void report(orx::Rule rule, int line, const QString& node, long message, const QStringList& arguments);
   void reportPort(const LinkStruct& record, const Place& place, const QString& description);
 
   ExternalDocNetwork& m_network;

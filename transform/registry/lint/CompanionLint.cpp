@@ -4,7 +4,7 @@
 
 #include <algorithm>
 
-using namespace lint_rules;
+using orx::Rule;
 
 namespace {
 
@@ -21,36 +21,38 @@ void LintedCatalogue::add(const std::shared_ptr<const LintedDefinition>& definit
   }
 }
 
-void CompanionLint::add(const LintRule& rule, int line, const QString& text) {
+void CompanionLint::add(Rule rule, int line, const QString& text) {
   m_report.add(rule, m_file, line, text);
 }
 
 void CompanionLint::check(QIODevice& device, bool isComplete) {
   CompanionFileParser parser;
   if (!parser.parse(device)) {
-    add(kUnreadable, 0, parser.errorString());
+    add(Rule::UnreadableFile, 0, parser.errorString());
     return;
   }
   if (!parser.isSoundUtf8()) {
-    add(kNotUtf8, 0, QStringLiteral("The file is not UTF-8"));
+    add(Rule::NotUtf8, 0, QStringLiteral("The file is not UTF-8"));
   }
   if (parser.openBlockLine() != 0) {
-    add(kOpenBlock, parser.openBlockLine(), QStringLiteral("This block has no end"));
+    add(Rule::OpenBlock, parser.openBlockLine(), QStringLiteral("This block has no end"));
   }
   for (const DefinitionLine& line : parser.strayLines()) {
-    add(kUnknownKeyword, line.number, QLatin1String("This line means nothing here: ") + line.text);
+    add(Rule::UnknownKeyword, line.number, QLatin1String("This line means nothing here: ") + line.text);
   }
   for (const CompanionEntry& entry : parser.entries()) {
     checkEntry(entry, isComplete);
   }
   for (const CategoryText& category : parser.categoryDescriptions()) {
     if (!m_catalogue.hasCategory(category.name)) {
-      add(kUnknownInCompanion, category.line, QStringLiteral("There is no category '%1'").arg(category.name));
+      add(Rule::UnknownInCompanion, category.line,
+          QStringLiteral("There is no category '%1'").arg(category.name));
     }
   }
   for (const CategoryName& category : parser.categoryNames()) {
     if (!m_catalogue.hasCategory(category.name)) {
-      add(kUnknownInCompanion, category.line, QStringLiteral("There is no category '%1'").arg(category.name));
+      add(Rule::UnknownInCompanion, category.line,
+          QStringLiteral("There is no category '%1'").arg(category.name));
     }
   }
 }
@@ -59,7 +61,7 @@ void CompanionLint::checkRepetitions(const std::vector<CompanionEntry::Text>& te
   QSet<QString> names;
   for (const CompanionEntry::Text& text : texts) {
     if (names.contains(text.name)) {
-      add(kRepeatedKeyword, text.line,
+      add(Rule::RepeatedKeyword, text.line,
           QStringLiteral("This replaces an earlier text of '%1'").arg(text.name));
     }
     names.insert(text.name);
@@ -79,7 +81,7 @@ void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
     m_translated.insert({entry.name, version});
     for (const CompanionEntry::Text& prompt : entry.prompts) {
       if (!definition->parameterNames().contains(prompt.name)) {
-        add(kUnknownInCompanion, prompt.line,
+        add(Rule::UnknownInCompanion, prompt.line,
             QStringLiteral("%1 version %2 has no parameter '%3'")
                 .arg(entry.name)
                 .arg(version)
@@ -88,7 +90,7 @@ void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
     }
     for (const CompanionEntry::Text& tag : entry.tagDescriptions) {
       if (!definition->isInput(tag.name) && !definition->isOutput(tag.name)) {
-        add(kUnknownInCompanion, tag.line,
+        add(Rule::UnknownInCompanion, tag.line,
             QStringLiteral("%1 version %2 has no port '%3'").arg(entry.name).arg(version).arg(tag.name));
       }
     }
@@ -97,7 +99,7 @@ void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
     }
   }
   if (!isKnown) {
-    add(kUnknownInCompanion, entry.line,
+    add(Rule::UnknownInCompanion, entry.line,
         entry.hasVersion
             ? QStringLiteral("There is no transformer '%1' of version %2").arg(entry.name).arg(entry.version)
             : QStringLiteral("There is no transformer '%1'").arg(entry.name));
@@ -107,7 +109,7 @@ void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
 void CompanionLint::checkCompleteness(const CompanionEntry& entry, const LintedDefinition& definition) {
   const auto need = [&](bool isThere, const QString& what) {
     if (!isThere) {
-      add(kMissingTranslation, entry.line,
+      add(Rule::MissingTranslation, entry.line,
           QStringLiteral("%1 version %2: %3 is not translated")
               .arg(entry.name)
               .arg(definition.fields().version)

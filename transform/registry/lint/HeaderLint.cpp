@@ -8,7 +8,7 @@
 
 #include <algorithm>
 
-using namespace lint_rules;
+using orx::Rule;
 
 namespace {
 
@@ -34,7 +34,7 @@ int mappedVersion(const QString& token, int& end) {
 
 }  // namespace
 
-void HeaderLint::add(const LintRule& rule, int line, const QString& text) {
+void HeaderLint::add(Rule rule, int line, const QString& text) {
   m_report.add(rule, m_definition.file(), line, text);
 }
 
@@ -42,14 +42,15 @@ void HeaderLint::check() {
   QHash<QString, int> seen;
   for (const LintedDefinition::HeaderLine& line : m_definition.header()) {
     if (!line.keyword) {
-      add(kUnknownKeyword, line.line.number, QLatin1String("No keyword begins like this: ") + line.line.text);
+      add(Rule::UnknownKeyword, line.line.number,
+          QLatin1String("No keyword begins like this: ") + line.line.text);
       continue;
     }
     const KeywordKind kind = line.keyword->kind;
     if (kind == KeywordKind::Text || kind == KeywordKind::Number || kind == KeywordKind::Flag) {
       int& first = seen[line.keyword->word];
       if (first != 0) {
-        add(kRepeatedKeyword, line.line.number,
+        add(Rule::RepeatedKeyword, line.line.number,
             QStringLiteral("%1 stands on line %2 already; this line replaces it")
                 .arg(line.keyword->word)
                 .arg(first));
@@ -60,7 +61,7 @@ void HeaderLint::check() {
     checkReferences(line);
   }
   if (m_definition.fields().name.isEmpty()) {
-    add(kBadValue, m_definition.line(), QStringLiteral("The definition has no TRANSFORMER_NAME"));
+    add(Rule::BadValue, m_definition.line(), QStringLiteral("The definition has no TRANSFORMER_NAME"));
   }
   checkTexts();
 }
@@ -72,36 +73,37 @@ void HeaderLint::checkValue(const LintedDefinition::HeaderLine& line) {
     case KeywordKind::Number: {
       bool isNumber = false;
       if (line.value.toInt(&isNumber) < 0 || !isNumber) {
-        add(kBadValue, number,
+        add(Rule::BadValue, number,
             QStringLiteral("%1 needs a whole number from 0 up, not '%2'").arg(word, line.value));
       }
       break;
     }
     case KeywordKind::Flag:
       if (flagValue(line.value) < 0) {
-        add(kBadValue, number,
+        add(Rule::BadValue, number,
             QStringLiteral("%1 needs yes, true, no or false, not '%2'").arg(word, line.value));
       }
       break;
     case KeywordKind::Modes:
       for (const QString& mode : splitDefinitionList(line.value)) {
         if (featureHoldingBit(mode) == 0) {
-          add(kBadValue, number, QStringLiteral("%1 knows NONE, GROUPED and ALL, not '%2'").arg(word, mode));
+          add(Rule::BadValue, number,
+              QStringLiteral("%1 knows NONE, GROUPED and ALL, not '%2'").arg(word, mode));
         }
       }
       break;
     case KeywordKind::Lookup:
       if (line.value.isEmpty()) {
-        add(kBadValue, number, QStringLiteral("%1 needs entries KEY,MAPPED separated by %").arg(word));
+        add(Rule::BadValue, number, QStringLiteral("%1 needs entries KEY,MAPPED separated by %").arg(word));
       }
       break;
     case KeywordKind::TagDescription: {
       QString tag;
       QString description;
       if (!splitTagDescription(line.value, tag, description)) {
-        add(kBadValue, number, QStringLiteral("%1 needs a tag and its description").arg(word));
+        add(Rule::BadValue, number, QStringLiteral("%1 needs a tag and its description").arg(word));
       } else if (!m_definition.isInput(tag) && !m_definition.isOutput(tag)) {
-        add(kUnknownPort, number, QStringLiteral("There is no port '%1'").arg(tag));
+        add(Rule::UnknownPort, number, QStringLiteral("There is no port '%1'").arg(tag));
       }
       break;
     }
@@ -116,7 +118,7 @@ void HeaderLint::checkReferences(const LintedDefinition::HeaderLine& line) {
   const int number = line.line.number;
   if (keyword.text == &Fields::multiProcess) {
     if (!m_definition.parameterNames().contains(line.value)) {
-      add(kUnknownParameter, number,
+      add(Rule::UndeclaredParameter, number,
           QStringLiteral("There is no parameter '%1' to group by").arg(line.value));
     }
   } else if (keyword.list == &Fields::listActions) {
@@ -138,13 +140,13 @@ void HeaderLint::checkReferences(const LintedDefinition::HeaderLine& line) {
 
 void HeaderLint::checkInput(const QString& tag, int line) {
   if (!m_definition.isInput(tag)) {
-    add(kUnknownPort, line, QStringLiteral("There is no input '%1'").arg(tag));
+    add(Rule::UnknownPort, line, QStringLiteral("There is no input '%1'").arg(tag));
   }
 }
 
 void HeaderLint::checkOutput(const QString& tag, int line) {
   if (!m_definition.isOutput(tag)) {
-    add(kUnknownPort, line, QStringLiteral("There is no output '%1'").arg(tag));
+    add(Rule::UnknownPort, line, QStringLiteral("There is no output '%1'").arg(tag));
   }
 }
 
@@ -152,7 +154,7 @@ void HeaderLint::checkParametersOf(const QString& text, int line) {
   const ParameterText parsed(text);
   for (const ParameterText::Piece& piece : parsed.pieces()) {
     if (piece.isParameter && !m_definition.parameterNames().contains(piece.text)) {
-      add(kUnknownParameter, line, QStringLiteral("There is no parameter '%1'").arg(piece.text));
+      add(Rule::UndeclaredParameter, line, QStringLiteral("There is no parameter '%1'").arg(piece.text));
     }
   }
 }
@@ -181,7 +183,7 @@ void HeaderLint::checkAdded(const QString& token, int line) {
 void HeaderLint::checkListAction(const QString& action, int line) {
   AttributeRules rules;
   if (!rules.addListAction(action)) {
-    add(kBadListAction, line,
+    add(Rule::BadListAction, line,
         QStringLiteral("Needs OUT KEEP, OUT DROP, OUT COLLECT IN LIST or OUT EXPLODE LIST, not '%1'")
             .arg(action));
     return;
@@ -201,7 +203,7 @@ void HeaderLint::checkMappedVersion(const QString& token, int line) {
   int end = 0;
   const int version = mappedVersion(token, end);
   if (version > m_definition.fields().version || version == 0) {
-    add(kBadMapping, line,
+    add(Rule::BadMapping, line,
         QStringLiteral("Version %1 in '%2' is not one that could have brought the change")
             .arg(version)
             .arg(token));
@@ -211,13 +213,13 @@ void HeaderLint::checkMappedVersion(const QString& token, int line) {
 void HeaderLint::checkParameterMapping(const QString& token, int line) {
   RenameMapping mapping;
   if (!mapping.add(token)) {
-    add(kBadMapping, line, QStringLiteral("Needs [VERSION:]OLD=NEW, not '%1'").arg(token));
+    add(Rule::BadMapping, line, QStringLiteral("Needs [VERSION:]OLD=NEW, not '%1'").arg(token));
     return;
   }
   checkMappedVersion(token, line);
   const QString name = token.mid(token.indexOf(QLatin1Char('=')) + 1);
   if (!m_definition.parameterNames().contains(name)) {
-    add(kUnknownParameter, line, QStringLiteral("There is no parameter '%1'").arg(name));
+    add(Rule::UndeclaredParameter, line, QStringLiteral("There is no parameter '%1'").arg(name));
   }
 }
 
@@ -228,7 +230,7 @@ void HeaderLint::checkTagMapping(const QString& token, int line) {
   const bool isInput = mapping.startsWith(QLatin1String("I:"));
   const QString renaming = mapping.mid(2);
   if ((!isInput && !mapping.startsWith(QLatin1String("O:"))) || !RenameMapping().add(renaming)) {
-    add(kBadMapping, line,
+    add(Rule::BadMapping, line,
         QStringLiteral("Needs [VERSION:]I:OLD=NEW or [VERSION:]O:OLD=NEW, not '%1'").arg(token));
     return;
   }
@@ -246,7 +248,7 @@ void HeaderLint::checkTexts() {
   const int line = m_definition.nameLine();
   const auto need = [&](bool isThere, const QString& what) {
     if (!isThere) {
-      add(kMissingText, line, QStringLiteral("%1 has no %2").arg(fields.name, what));
+      add(Rule::MissingText, line, QStringLiteral("%1 has no %2").arg(fields.name, what));
     }
   };
   need(!fields.category.isEmpty(), QStringLiteral("category"));

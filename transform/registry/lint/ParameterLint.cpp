@@ -4,7 +4,7 @@
 #include <transform/registry/lint/ParameterLint.h>
 #include <transform/registry/loading/DefinitionKeywords.h>
 
-using namespace lint_rules;
+using orx::Rule;
 
 namespace {
 
@@ -37,7 +37,7 @@ bool isWholeNumberType(const QString& type) {
 
 }  // namespace
 
-void ParameterLint::add(const LintRule& rule, int line, const QString& text) {
+void ParameterLint::add(Rule rule, int line, const QString& text) {
   m_report.add(rule, m_definition.file(), line, text);
 }
 
@@ -48,9 +48,9 @@ bool ParameterLint::check() {
   QHash<QString, int> seen;
   for (const LintedParameter& parameter : m_definition.parameters()) {
     if (parameter.name.isEmpty()) {
-      add(kBadValue, parameter.line, QStringLiteral("The parameter has no name"));
+      add(Rule::BadValue, parameter.line, QStringLiteral("The parameter has no name"));
     } else if (seen.contains(parameter.name)) {
-      add(kDuplicateParameter, parameter.line,
+      add(Rule::DuplicateParameter, parameter.line,
           QStringLiteral("Parameter '%1' stands on line %2 already")
               .arg(parameter.name)
               .arg(seen[parameter.name]));
@@ -58,7 +58,8 @@ bool ParameterLint::check() {
       seen.insert(parameter.name, parameter.line);
     }
     if (parameter.prompt.isEmpty() && parameter.type.getType() != kDividerType) {
-      add(kMissingText, parameter.line, QStringLiteral("Parameter '%1' has no prompt").arg(parameter.name));
+      add(Rule::MissingText, parameter.line,
+          QStringLiteral("Parameter '%1' has no prompt").arg(parameter.name));
     }
     checkType(parameter, parameter.type);
     const MemberList members(parameter.type);
@@ -93,7 +94,7 @@ bool ParameterLint::checkLines() {
       name = line.value;
     } else if (line.keyword->word == kParameterLookup && names == 0) {
       isSound = false;
-      add(kParameterLines, line.line.number, QStringLiteral("No parameter is named above this line"));
+      add(Rule::ParameterLines, line.line.number, QStringLiteral("No parameter is named above this line"));
     }
     for (Kind& kind : kinds) {
       if (line.keyword->word != kind.word) {
@@ -106,7 +107,7 @@ bool ParameterLint::checkLines() {
       kind.isTold = true;
       isSound = false;
       const QString taken = m_definition.fields().parameterNames.value(kind.count - 1);
-      add(kParameterLines, line.line.number,
+      add(Rule::ParameterLines, line.line.number,
           taken.isEmpty() ? QStringLiteral("No parameter is named for this %1").arg(kind.word)
           : taken == name
               ? QStringLiteral("Parameter '%1' has this %2 already").arg(name, kind.word)
@@ -118,7 +119,7 @@ bool ParameterLint::checkLines() {
     if (parameter.type.isNull()) {
       isSound = false;
       if (!kinds[0].isTold) {
-        add(kParameterLines, parameter.typeLine,
+        add(Rule::ParameterLines, parameter.typeLine,
             QStringLiteral("Parameter '%1' has no type").arg(parameter.name));
       }
     }
@@ -128,10 +129,10 @@ bool ParameterLint::checkLines() {
 
 void ParameterLint::checkType(const LintedParameter& parameter, const GUIType& type) {
   if (!type.isKnown()) {
-    add(kUnknownType, parameter.typeLine,
+    add(Rule::UnknownType, parameter.typeLine,
         QStringLiteral("There is no parameter type '%1'").arg(type.getType()));
   } else if (!type.valueIsEncoded() && hasEncodedForm(type)) {
-    add(kPlainText, parameter.typeLine,
+    add(Rule::PlainTextType, parameter.typeLine,
         QStringLiteral("'%1' may hold any text, so its type needs to be %2%3")
             .arg(type.getName(), type.getType(), kEncodedSuffix));
   }
@@ -140,7 +141,7 @@ void ParameterLint::checkType(const LintedParameter& parameter, const GUIType& t
 void ParameterLint::checkGroup(const LintedParameter& parameter) {
   for (const QString& member : ORX_splitConfig(parameter.type.getConfigToken(), QLatin1Char('%'))) {
     if (!m_definition.parameterNames().contains(member)) {
-      add(kUnknownParameter, parameter.typeLine,
+      add(Rule::UndeclaredParameter, parameter.typeLine,
           QStringLiteral("There is no parameter '%1' to frame").arg(member));
     }
   }
@@ -157,7 +158,7 @@ void ParameterLint::checkDefault(const LintedParameter& parameter) {
     if (const GUIType* member = members.find(pieces[i])) {
       checkDefault(parameter, *member, pieces[i + 1]);
     } else {
-      add(kUnknownParameter, parameter.defaultLine,
+      add(Rule::UndeclaredParameter, parameter.defaultLine,
           QStringLiteral("'%1' has no member '%2'").arg(parameter.name, pieces[i]));
     }
   }
@@ -172,7 +173,8 @@ void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType
     return;
   }
   const auto refuse = [&](const QString& text) {
-    add(kBadDefault, parameter.defaultLine, QStringLiteral("Default of '%1': %2").arg(type.getName(), text));
+    add(Rule::BadDefault, parameter.defaultLine,
+        QStringLiteral("Default of '%1': %2").arg(type.getName(), text));
   };
   if (ORX_isChoiceType(type)) {
     ChoiceList choices(type);

@@ -7,7 +7,7 @@
 #include <transform/scripts/TclSyntax.h>
 #include <transform/text/TextHelpers.h>
 
-using namespace lint_rules;
+using orx::Rule;
 
 namespace {
 
@@ -46,14 +46,14 @@ void ScriptLint::checkDefault(const LintedParameter& parameter, const Place& pla
     checkTcl(script, place, report);
     if (type == kTclParameterType &&
         !canWriteTclParameter(QString(), parameter.name, parameter.defaultValue, reason)) {
-      report.add(kTclSyntax, place.file, place.line, reason);
+      report.add(Rule::TclSyntax, place.file, place.line, reason);
     }
   } else if (type == kPythonType) {
     m_python.append(script);
     m_pythonPlaces.push_back(place);
   } else if (type == kPythonParameterType) {
     if (!canWritePythonParameter(QString(), parameter.name, parameter.defaultValue, reason)) {
-      report.add(kPythonSyntax, place.file, place.line, reason);
+      report.add(Rule::PythonSyntax, place.file, place.line, reason);
       return;
     }
     // As the engine gets it, inside a function.
@@ -67,7 +67,7 @@ void ScriptLint::checkDefault(const LintedParameter& parameter, const Place& pla
 void ScriptLint::checkTcl(const QString& script, const Place& place, LintReport& report) {
   const TclFault fault = findTclFault(script);
   if (!fault.text.isEmpty()) {
-    report.add(kTclSyntax, place.file, place.line,
+    report.add(Rule::TclSyntax, place.file, place.line,
                QStringLiteral("Tcl script of %1, line %2: %3")
                    .arg(place.owner.trimmed())
                    .arg(fault.line)
@@ -78,7 +78,7 @@ void ScriptLint::checkTcl(const QString& script, const Place& place, LintReport&
 void ScriptLint::checkPython(LintReport& report) {
   PythonSyntax python;
   if (!python.check(m_python)) {
-    report.add(kUncheckedPython, m_pythonPlaces.front().file, m_pythonPlaces.front().line,
+    report.add(Rule::UncheckedPython, m_pythonPlaces.front().file, m_pythonPlaces.front().line,
                QStringLiteral("%1 Python script(s) could not be checked: %2")
                    .arg(m_python.size())
                    .arg(python.errorString()));
@@ -86,7 +86,7 @@ void ScriptLint::checkPython(LintReport& report) {
   for (const PythonFault& fault : python.faults()) {
     const Place& place = m_pythonPlaces[static_cast<std::size_t>(fault.script)];
     report.add(
-        kPythonSyntax, place.file, place.line,
+        Rule::PythonSyntax, place.file, place.line,
         QStringLiteral("Python script of %1, line %2: %3").arg(place.owner).arg(fault.line).arg(fault.text));
   }
   m_python.clear();

@@ -8,7 +8,7 @@
 
 #include <QRegularExpression>
 
-using namespace lint_rules;
+using orx::Rule;
 
 namespace {
 
@@ -50,7 +50,7 @@ TemplateLint::TemplateLint(const LintedDefinition& definition, LintReport& repor
   }
 }
 
-void TemplateLint::add(const LintRule& rule, int line, const QString& text) {
+void TemplateLint::add(Rule rule, int line, const QString& text) {
   m_report.add(rule, m_definition.file(), line, text);
 }
 
@@ -82,12 +82,13 @@ void TemplateLint::checkStatement(const DefinitionLine& line) {
   static const QRegularExpression keyword(QStringLiteral("^(#|[A-Za-z_][A-Za-z0-9_]*( |$))"));
   static const QRegularExpression secondFactory(QStringLiteral("\\sFACTORY_DEF\\s"));
   if (line.text.endsWith(QLatin1Char('\\'))) {
-    add(kBadStatement, line.number, QStringLiteral("Each line is a whole statement; write it on one line"));
+    add(Rule::BadStatement, line.number,
+        QStringLiteral("Each line is a whole statement; write it on one line"));
   } else if (!keyword.match(line.text).hasMatch()) {
-    add(kBadStatement, line.number,
+    add(Rule::BadStatement, line.number,
         QStringLiteral("Each line is a whole statement and begins with its keyword"));
   } else if (secondFactory.match(line.text).hasMatch()) {
-    add(kBadStatement, line.number,
+    add(Rule::BadStatement, line.number,
         QStringLiteral("A second %1 needs a line of its own").arg(kFactoryStatement));
   }
 }
@@ -106,7 +107,7 @@ bool TemplateLint::takePortToken(const QString& token, int line, LineTokens& tok
     tokens.hasInputs = true;
     m_usedInputs.insert(input);
     if (!m_definition.isInput(input) && !m_definition.hasOwnClass()) {
-      add(kUnknownPort, line, QStringLiteral("There is no input '%1'").arg(input));
+      add(Rule::UnknownPort, line, QStringLiteral("There is no input '%1'").arg(input));
     }
     return true;
   }
@@ -118,7 +119,7 @@ bool TemplateLint::takePortToken(const QString& token, int line, LineTokens& tok
     m_routedOutputs.insert(output);
   }
   if (!m_definition.isOutput(output) && !m_definition.hasOwnClass()) {
-    add(kUnknownPort, line, QStringLiteral("There is no output '%1'").arg(output));
+    add(Rule::UnknownPort, line, QStringLiteral("There is no output '%1'").arg(output));
   }
   return true;
 }
@@ -136,7 +137,7 @@ TemplateLint::LineTokens TemplateLint::takeTokens(const DefinitionLine& line) {
       m_usesAllParameters = true;
     } else if (!isInstanceToken(token) && !takePortToken(token, line.number, tokens) &&
                !m_macros.contains(token) && !isGlobalMacro(token)) {
-      add(kUnknownToken, line.number,
+      add(Rule::UnknownToken, line.number,
           QStringLiteral("$(%1) names neither a parameter nor a port").arg(token));
     }
   }
@@ -150,15 +151,15 @@ void TemplateLint::checkOutputs(const LineTokens& tokens, int line) {
   const QSet<QString> half =
       (tokens.featureTypes - tokens.functions) + (tokens.functions - tokens.featureTypes);
   if (!half.isEmpty()) {
-    add(kOutputRoute, line,
+    add(Rule::OutputRoute, line,
         QStringLiteral("A statement that routes an output holds both its _FTYPE and its _FUNCS token: %1")
             .arg(sortedList(half)));
   } else if (tokens.featureTypes.size() > 1) {
-    add(kOutputRoute, line,
+    add(Rule::OutputRoute, line,
         QStringLiteral("Each output is routed in a statement of its own: %1")
             .arg(sortedList(tokens.featureTypes)));
   } else if (tokens.hasInputs || !tokens.parameters.isEmpty()) {
-    add(kOutputRoute, line,
+    add(Rule::OutputRoute, line,
         QStringLiteral(
             "While %1 is not connected, this whole line goes away; route the output in a statement of "
             "its own")
@@ -174,7 +175,7 @@ void TemplateLint::checkOmittables(const LineTokens& tokens, const DefinitionLin
   const bool isOwn = line.text.startsWith(kOption) && tokens.parameters.size() == 1 && !tokens.hasInputs &&
                      tokens.featureTypes.isEmpty() && tokens.functions.isEmpty();
   if (!isOwn) {
-    add(kOmittableLine, line.number,
+    add(Rule::OmittableLine, line.number,
         QStringLiteral(
             "While %1 has no value, this whole line goes away; write %2$(%3) KEY VALUE on a line of its own")
             .arg(sortedList(omittables), kOption, kEncodedNameToken));
@@ -188,12 +189,12 @@ void TemplateLint::checkUse() {
   const int line = m_definition.nameLine();
   for (const QString& tag : m_definition.inputs()) {
     if (!m_usesAllInputs && !m_usedInputs.contains(tag)) {
-      add(kUnusedPort, line, QStringLiteral("The template does not use input '%1'").arg(tag));
+      add(Rule::UnusedPort, line, QStringLiteral("The template does not use input '%1'").arg(tag));
     }
   }
   for (const QString& tag : m_definition.outputs()) {
     if (!m_routedOutputs.contains(tag)) {
-      add(kUnusedPort, line, QStringLiteral("The template does not route output '%1'").arg(tag));
+      add(Rule::UnusedPort, line, QStringLiteral("The template does not route output '%1'").arg(tag));
     }
   }
   if (m_usesAllParameters) {
@@ -211,7 +212,7 @@ void TemplateLint::checkUse() {
     }
     for (const QString& name : std::as_const(names)) {
       if (needsUse(parameter.type) && !isGroupBy && !m_used.contains(name) && name != kIdentifierParameter) {
-        add(kUnusedParameter, parameter.line,
+        add(Rule::UnplacedParameter, parameter.line,
             QStringLiteral("The template does not use parameter '%1'").arg(name));
       }
     }

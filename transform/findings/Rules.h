@@ -1,14 +1,24 @@
-// Everything that can be wrong with a workspace, as one table: the rule's name, how severe it is by default,
-// and the number of its message.
+// Everything that can be wrong with what people write, as one table: the rule's name, how severe it is by
+// default, what it is about, and the number of its message.
 #pragma once
 
 #include <platform/Export.h>
 
 #include <QLatin1String>
+#include <QString>
 
 #include <vector>
 
+namespace orx {
+
 enum class Severity { Error, Warning, Hint };
+
+// What a rule is about, which decides how far settings may change its severity.
+enum class RuleKind {
+  Judgement,  // they may do as they like
+  Writing,    // whether something can be written at all: they cannot lower it
+  Machine,    // what this machine has: a warning, until somebody wants more
+};
 
 enum class Rule {
   MalformedDocument,
@@ -90,17 +100,48 @@ enum class Rule {
   UncheckedPython,
   TooManyFindings,
   TooManyNames,
+  // Of definition files; some of those above are told of them as well.
+  UnreadableFile,
+  WorkspaceMark,
+  UnfinishedDefinition,
+  UnknownKeyword,
+  RepeatedKeyword,
+  BadValue,
+  DuplicateDefinition,
+  MissingText,
+  UnknownPort,
+  BadListAction,
+  BadMapping,
+  ParameterLines,
+  DuplicateParameter,
+  UndeclaredParameter,
+  UnknownType,
+  PlainTextType,
+  BadDefault,
+  UnknownToken,
+  OutputRoute,
+  OmittableLine,
+  UnusedPort,
+  UnplacedParameter,
+  UnknownInCompanion,
+  MissingTranslation,
 };
 
-struct DiagnosticRule {
+struct RuleRow {
   Rule rule;
   QLatin1String name;
   Severity severity;
-  long message;
+  RuleKind kind;
+  long message;  // 0 when the text comes from where the finding arises
 };
 
 // In the order of the enumeration.
-ORX_EXPORT const std::vector<DiagnosticRule>& diagnosticRules();
-ORX_EXPORT const DiagnosticRule& diagnosticRule(Rule rule);
+ORX_EXPORT const std::vector<RuleRow>& ruleTable();
+ORX_EXPORT const RuleRow& ruleRow(Rule rule);
 // By name; null when there is none.
-ORX_EXPORT const DiagnosticRule* findDiagnosticRule(const QString& name);
+ORX_EXPORT const RuleRow* findRule(const QString& name);
+
+// "error", "warning" or "hint".
+ORX_EXPORT QString severityName(Severity severity);
+
+}  // namespace orx

@@ -1,0 +1,61 @@
+#include <transform/findings/Findings.h>
+#include <transform/text/MessageStrings.h>
+
+namespace orx {
+
+namespace {
+
+// Without the message files, under a wrong home, the rule and its arguments still tell what is meant.
+QString textOf(Rule rule, long message, const QStringList& arguments) {
+  const QString text = TransformResString(message, arguments);
+  return text.isEmpty() ? (QStringList{ruleRow(rule).name} + arguments).join(QLatin1Char(' ')) : text;
+}
+
+}  // namespace
+
+void Findings::report(Rule rule, int line, const QString& node, const QStringList& arguments) {
+  reportAs(rule, ruleRow(rule).message, line, node, arguments);
+}
+
+void Findings::reportAs(Rule rule, long message, int line, const QString& node,
+                        const QStringList& arguments) {
+  Finding finding;
+  finding.rule = rule;
+  finding.line = line;
+  finding.node = node;
+  finding.text = textOf(rule, message, arguments);
+  finding.message = message;
+  add(std::move(finding));
+}
+
+void Findings::reportText(Rule rule, int line, const QString& node, const QString& text) {
+  reportParameter(rule, line, node, QString(), text);
+}
+
+void Findings::reportParameter(Rule rule, int line, const QString& node, const QString& parameter,
+                               const QString& text) {
+  Finding finding;
+  finding.rule = rule;
+  finding.line = line;
+  finding.node = node;
+  finding.text = text;
+  finding.parameter = parameter;
+  add(std::move(finding));
+}
+
+void Findings::reportUnwritable(int line, const QString& node, const QString& parameter,
+                                const QString& reason) {
+  report(Rule::UnwritableValue, line, node, {parameter, reason});
+  m_all.back().parameter = parameter;
+}
+
+void Findings::add(Finding finding) {
+  finding.severity = ruleRow(finding.rule).severity;
+  if (finding.file.isEmpty())
+    finding.file = m_file;
+  if (finding.severity == Severity::Error)
+    ++m_errors;
+  m_all.push_back(std::move(finding));
+}
+
+}  // namespace orx
