@@ -1,5 +1,6 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <tests/core/ConfigHelpers.h>
+#include <transform/core/FormulaChecks.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/TransformerSource.h>
 #include <transform/text/MessageStrings.h>
@@ -227,6 +228,37 @@ TEST_F(ConfigValidation, AsksItsDirectory) {
       qs("MULTIPARAMETER ;,GUI<space>TEXT<space>OTHER<space>Other<space>One")));
   cfg.setDefinitionDirectory(&m_connections);
   EXPECT_EQ(refused(), (QStringList{TransformResString(370608, qs("Other One")), none, none}));
+}
+
+TEST_F(ConfigValidation, FormulasAreReadWhereverTheyStand) {
+  const struct {
+    const char* type;
+    const char* value;
+    bool isSound;
+  } cases[] = {
+      {"EXPRESSION_ENCODED", "1<space>+<space>2", true},
+      {"EXPRESSION_ENCODED", "1+", false},
+      {"EXPRESSION_ENCODED", "1+$(P)", true},
+      {"OPTIONAL EXPRESSION_ENCODED", "<Unused>", true},
+      {"INT_OR_ATTR", "@Value(a)+1", true},
+      {"INT_OR_ATTR", "@Value(a)+", false},
+      {"INT_OR_ATTR", "7+", true},  // nothing is computed
+      {"TEXT_OR_ATTR", "@Value(a)+", true},
+      {"TEXT", "ORX_CONDITIONAL:@Value<leftparenthesis>a<rightparenthesis>=1;x+;", true},
+      {"TEXT", "ORX_CONDITIONAL:1=;x", false},
+      {"TEXT", "ORX_CONDITIONAL:1=1;x;2=;y", false},
+      {"TEXT", "ORX_CONDITIONAL:1=1;x;2=", true},  // the last has no partner
+      {"FLOAT", "ORX_CONDITIONAL:1=1;2+;3", false},
+      {"RANGE_SLIDER 0%1%0", "ORX_CONDITIONAL:1=1;2;3+", false},
+      {kPair, "K;x+;T;y", true},
+      {kTable, "x+;y+", true},
+      {"GUI_LINE_TABLE <semicolon>,GUI<space>TEXT<space>K<space>K,GUI<space>FLOAT_OR_ATTR<space>T<space>T",
+       "k;1;k;@Value(a)*", false},
+  };
+  for (const auto& c : cases) {
+    const TransformParamCfg parameter(GUIType::fromTransformerTypeString(qs(c.type), qs("P"), qs("P")));
+    EXPECT_EQ(findFormulaFault(parameter, qs(c.value)).isEmpty(), c.isSound) << c.type << " " << c.value;
+  }
 }
 
 TEST_F(ConfigValidation, AllParameters) {

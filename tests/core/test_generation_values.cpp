@@ -163,6 +163,16 @@ TEST(Values, SeveralProcesses) {
   // The group-by value stands in no line of the template, yet it is written.
   const auto faulty = makeCfg({{}, {}, {{"GROUP", "ATTR_LIST", "a\nb"}}, {"F"}, false, "GROUP"});
   EXPECT_EQ(faulty->findUnwritableValues().keys(), QStringList("GROUP"));
+  // A factory without the statements that its workers run is not left behind.
+  for (const TestDefinition& broken :
+       {TestDefinition{{}, {}, {{"GROUP", "ATTR_LIST", "a"}}, {"F", "G $["}, false, "GROUP"},
+        TestDefinition{{}, {}, {{"GROUP", "ATTR_LIST", "a$["}}, {"F"}, false, "GROUP"}}) {
+    const auto cfg = makeCfg(broken);
+    ASSERT_TRUE(cfg->setParameterValue("ORX_PROCESS_COUNT", "MODERATE", false));
+    TextBuffer buffer;
+    EXPECT_FALSE(cfg->instantiate(buffer, QString()));
+    EXPECT_EQ(buffer.text(), "");
+  }
   for (const Case& c : cases) {
     const auto cfg = makeCfg({{"IN"},
                               {"OUT", "FREE"},

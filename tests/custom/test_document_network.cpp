@@ -123,9 +123,15 @@ const Fault kFaults[] = {
      Rule::BadPort, "A", "fi 0"},
     {"t T Adder;t T Adder", Rule::DuplicateName, "T", "T"},
     {"in A;out A", Rule::DuplicateName, "A", "A"},
+    {"in A;in A", Rule::DuplicateName, "A", "A"},
+    {"set BLOCKED_LOOPING yes;loop A;out A", Rule::DuplicateName, "A", "'A'"},
+    {"set BLOCKED_LOOPING yes;loop A;out INCOMPLETE", Rule::DuplicateName, "INCOMPLETE", "INCOMPLETE"},
     {"gui NONSENSE | 1", Rule::BadPromptLine, "", "NONSENSE"},
     {"use T Net", Rule::Nesting, "T", "Net > Net"},
     {"set BLOCKED_LOOPING yes", Rule::CustomTransformerFault, "", "BLOCKED_LOOPING"},
+    {"loop L;t T Adder;T -> L OUT", Rule::CustomTransformerFault, "L", "BLOCKED_LOOPING"},
+    {"loop L", Rule::LoopPoint, "L", "BLOCKED_LOOPING"},
+    {"set BLOCKED_LOOPING yes;loop L;loop M", Rule::LoopPoint, "M", "'L'"},
 };
 
 TEST_F(DocumentNetwork, TellsWhatIsWrongAndBuildsTheRest) {

@@ -151,6 +151,23 @@ TEST(Instance, ResolvesParallelSettings) {
   }
 }
 
+TEST(Instance, LeavesNothingBehindWhenItFails) {
+  OpenNetwork network;
+  assemble(network, {QStringLiteral("in A"), QStringLiteral("out B")});
+  ParallelSettings settings;
+  settings.groupBy = QStringLiteral("$(PAR)");
+  network.setParallelSettings(settings);
+  network.publish(QStringLiteral("GUI TEXT PAR Attributes"), QStringLiteral("a"));
+  network.doneAdding(true);
+  CompoundTransformerCfg instance(&network);
+  instance.addInputFeatureType(QStringLiteral("A"), QStringLiteral("flow"));
+  EXPECT_FALSE(written(instance).isEmpty());
+  instance.setParameterValue(QStringLiteral("PAR"), QStringLiteral("a$["), false);
+  TextBuffer buffer;
+  EXPECT_FALSE(static_cast<TransformerCfg&>(instance).instantiate(buffer, QString(), true));
+  EXPECT_EQ(buffer.lines(), QStringList());
+}
+
 struct MacroCase {
   const char* guiLine;
   const char* value;
@@ -162,7 +179,8 @@ const MacroCase kMacros[] = {
     {"GUI TEXT P P", "$(OTHER)_x", "$(OTHER)_x", "$(OTHER)_x"},
     {"GUI INSTANCE_MACROS TEXT P P", "$(OTHER)_x", "$($(PRE)_OTHER)_x", "$(OTHER)_x"},
     {"GUI INSTANCE_MACROS TEXT P P", "$(A)-$(B)$(", "$($(PRE)_A)-$($(PRE)_B)$(", "$(A)-$(B)$("},
-    {"GUI INSTANCE_MACROS TEXT P P", "$(ORX_MF_DIR)", "$(ORX_MF_DIR)", "$(ORX_MF_DIR)"},
+    {"GUI INSTANCE_MACROS TEXT P P", "$[A]$(ELSEWHERE)$(ORX_MF_DIR)", "$($(PRE)_A)$(ELSEWHERE)$(ORX_MF_DIR)",
+     "$[A]$(ELSEWHERE)$(ORX_MF_DIR)"},
     {"GUI STRING_OR_ATTR_ENCODED SET P", "a<space>b", "@Value(a<space>b)", "@Value(a<space>b)"},
     {"GUI STRING_OR_ATTR_ENCODED SET P", "@Value<leftparenthesis>a<rightparenthesis>", "@Value(a)",
      "@Value(a)"},
@@ -184,6 +202,8 @@ TEST(Instance, WritesParameterMacros) {
     inner.doneAdding(true);
     OpenNetwork network;
     network.addTransformer(new CompoundTransformerCfg(&inner), {}, 1);
+    for (const char* other : {"A", "B", "OTHER"})
+      network.publish(QStringLiteral("GUI TEXT %1 %1").arg(QLatin1String(other)), QStringLiteral("1"));
     network.publish(QLatin1String(row.guiLine), QLatin1String(row.value));
     network.doneAdding(true);
     const CompoundTransformerCfg instance(&network);

@@ -10,6 +10,7 @@
 #include <QBuffer>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <functional>
 #include <memory>
 #include <random>
@@ -396,11 +397,11 @@ TEST(ShippedResources, DefineWhatTheFactoryNames) {
   ORXSession session;
   manager.loadTransformers(&session);
   for (const TransformerCfgRule& rule : transformerCfgRules()) {
-    bool isServed = false;
-    for (const int version : manager.transformerVersions(rule.name)) {
-      isServed = isServed || (version >= rule.firstVersion && version <= rule.lastVersion);
+    for (const QLatin1String name : rule.names) {
+      const QList<int> versions = manager.transformerVersions(name);
+      EXPECT_TRUE(std::any_of(versions.begin(), versions.end(), [&](int v) { return rule.versions.hold(v); }))
+          << name.data() << " from version " << rule.versions.first;
     }
-    EXPECT_TRUE(isServed) << rule.name.data() << " from version " << rule.firstVersion;
   }
 }
 

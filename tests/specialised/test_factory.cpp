@@ -34,7 +34,7 @@ TEST(Factory, TheTableGivesEachTransformerItsClass) {
     const QString name = QString::fromLatin1(c.name);
     const std::unique_ptr<TransformerCfg> made(createTransformerCfg(name, c.version));
     const std::unique_ptr<TransformerCfg> copy(made->getCopy());
-    EXPECT_STREQ(findTransformerCfgRule(name, c.version)->className.data(), c.className) << c.name;
+    EXPECT_EQ(findTransformerCfgRule(name, c.version)->type, typeid(*made)) << c.name;
     EXPECT_TRUE(QString::fromLatin1(typeid(*made).name()).endsWith(c.className)) << c.name;
     EXPECT_EQ(typeid(*copy), typeid(*made)) << c.name;
     for (const QString& other : {name.toLower(), name + " ", name.mid(1)}) {
@@ -54,19 +54,29 @@ TEST(Factory, TheTableGivesEachTransformerItsClass) {
 }
 
 TEST(Factory, TheFirstFittingRuleDecides) {
-  const auto make = [] { return new TransformerCfg; };
-  constexpr int kHighest = TransformerCfgRule::kHighestVersion;
+  struct Old : TransformerCfg {};
+  struct New : TransformerCfg {};
+  struct Two : TransformerCfg {};
+  const auto make = []() -> TransformerCfg* { return new TransformerCfg; };
+  constexpr int kHighest = std::numeric_limits<int>::max();
   const std::vector<TransformerCfgRule> rules = {
-      {QLatin1String("A"), 0, 1, QLatin1String("Old"), make},
-      {QLatin1String("A"), 3, kHighest, QLatin1String("New"), make},
-      {QLatin1String("A"), 0, kHighest, QLatin1String("Rest"), make},
-      {QLatin1String("B"), 2, 2, QLatin1String("Two"), make},
+      {{QLatin1String("A")}, {0, 1}, typeid(Old), make},
+      {{QLatin1String("A")}, {3}, typeid(New), make},
+      {{QLatin1String("B"), QLatin1String("C")}, {2, 2}, typeid(Two), make},
+      {{QLatin1String("A")}, {0}, typeid(TransformerCfg), make},
   };
-  const Case cases[] = {{"A", 0, "Old"},        {"A", 1, "Old"}, {"A", 2, "Rest"}, {"A", 3, "New"},
-                        {"A", kHighest, "New"}, {"B", 1, ""},    {"B", 2, "Two"},  {"B", 3, ""},
-                        {"a", 0, ""},           {"", 0, ""}};
-  for (const Case& c : cases) {
+  struct Choice {
+    const char* name;
+    int version;
+    std::type_index type;  // that of void for none
+  };
+  const Choice cases[] = {
+      {"A", 0, typeid(Old)},  {"A", 1, typeid(Old)},        {"A", 2, typeid(TransformerCfg)},
+      {"A", 3, typeid(New)},  {"A", kHighest, typeid(New)}, {"B", 1, typeid(void)},
+      {"B", 2, typeid(Two)},  {"C", 2, typeid(Two)},        {"C", 3, typeid(void)},
+      {"a", 0, typeid(void)}, {"", 0, typeid(void)}};
+  for (const Choice& c : cases) {
     const TransformerCfgRule* rule = findTransformerCfgRule(rules, QString::fromLatin1(c.name), c.version);
-    EXPECT_STREQ(rule ? rule->className.data() : "", c.className) << c.name << " " << c.version;
+    EXPECT_EQ(rule ? rule->type : std::type_index(typeid(void)), c.type) << c.name << " " << c.version;
   }
 }

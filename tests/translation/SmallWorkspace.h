@@ -58,6 +58,11 @@ class SmallWorkspace {
     m_customSettings = settings;
     return *this;
   }
+  // A further attribute of the sub-document that was begun.
+  SmallWorkspace& setting(const QString& name, const QString& value) {
+    m_customSettings += {name, value};
+    return *this;
+  }
   // `kind` is "true" for an input, "false" for an output, "loop" for a loop point.
   SmallWorkspace& port(int id, const QString& name, const QString& kind) {
     m_ports +=

@@ -64,6 +64,7 @@ TEST(CustomTranslation, StatementsNameTheAttributesOfAllInstances) {
       {"what comes back by a loop",
        "A",
        [&](SmallWorkspace& w) {
+         w.setting("BLOCKED_LOOPING", "yes");
          w.port(8, "AGAIN", "loop").transformer(3, "Copy", names).transformer(4, "Copy", {});
          w.link(8, "fo 0", 3, "fi 0 INPUT").link(1, "fo 0", 4, "fi 0 INPUT").link(4, "fo 0", 8, "fi 0");
        },
@@ -250,6 +251,79 @@ TEST(CustomTranslation, FlowsAndNodesInsideKeepApart) {
     const QString flow = QString("FEATURE_TYPE \"$(Outer_WORKSPACE_NAME)_%1\" ").arg(test.flow);
     EXPECT_EQ(outcome.text.count("OUTPUT " + flow), 1) << test.promise << outcome.text.toStdString();
     EXPECT_EQ(outcome.text.count("INPUT INPUT " + flow), 1) << test.promise << outcome.text.toStdString();
+  }
+}
+
+TEST(CustomTranslation, NamesOfDifferentDepthsKeepApart) {
+  const auto begin = [](SmallWorkspace& w, const char* name, const char* input) {
+    w.beginCustom(name).parameter("GUI TEXT LIMIT Limit", "1").port(1, input, "true").port(2, "OUT", "false");
+  };
+  // The instance O has B_X inside, which has V inside.
+  const struct {
+    const char* what;
+    const char* second;    // an instance beside O
+    const char* inSecond;  // a node and an input in it
+    const char* reader;
+    const char* writer;
+    const char* parameter;
+    QStringList diagnostics;
+  } cases[] = {
+      {"nothing", "P", "V", "R", "W", "G", {}},
+      {"nodes in two instances", "O_B", "X_V", "R", "W", "G", {"taken-name O"}},
+      {"an input and one further in", "O_B", "X_IN", "R", "W", "G", {"taken-name O"}},
+      {"nodes of names in between", "O_B", "X_Y", "R", "W", "G", {}},
+      {"a reader's type", "P", "V", "O_B_X_V_OUTPUT", "W", "G", {"taken-name O"}},
+      {"a writer's type", "P", "V", "R", "O_B_X_IN", "G", {"taken-name O"}},
+      {"a type that nothing inside bears", "P", "V", "O_B_X_V_REST", "O_B_X", "G", {}},
+      {"a parameter", "P", "V", "R", "W", "O_B_X_LIMIT", {"taken-name O"}},
+      {"a parameter of a name in between", "P", "V", "R", "W", "O_B_LIMIT", {}},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.parameter(QString("GUI TEXT %1 Global").arg(test.parameter), "1");
+    workspace.reader(1, test.reader).writer(2, test.writer);
+    workspace.transformer(3, kInstance, {"SUB_DOC_NAME", "Outer", "XFORMER_NAME", "O"});
+    workspace.transformer(4, kInstance, {"SUB_DOC_NAME", "Second", "XFORMER_NAME", test.second});
+    workspace.link(1, "fo 0", 3, "fi 0 IN").link(3, "fo 0 OUT", 2, "fi 0");
+    begin(workspace, "Outer", "IN");
+    workspace.transformer(3, kInstance, {"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "B_X"}).endCustom();
+    begin(workspace, "Inner", "IN");
+    workspace.transformer(3, "Copy", {"XFORMER_NAME", "V"}).link(3, "fo 0 OUTPUT", 2, "fi 0").endCustom();
+    begin(workspace, "Second", test.inSecond);
+    workspace.transformer(3, "Copy", {"XFORMER_NAME", test.inSecond}).endCustom();
+    EXPECT_EQ(translate(workspace).diagnostics, test.diagnostics) << test.what;
+  }
+}
+
+TEST(CustomTranslation, WhatALoopIsHandedIsJudged) {
+  const struct {
+    const char* type;  // of the parameter P of the instance, which also has Q
+    const char* value;
+    const char* maximum;
+    QStringList diagnostics;
+    const char* written;
+  } cases[] = {
+      {"TEXT", "$(Q)", "4", {}, "MAX_LOOP_ITERATIONS:4 "},
+      {"TEXT", "x", "<Unused>", {}, "MAX_LOOP_ITERATIONS: "},
+      {"TEXT", "x", "$(ORX_NUMBER)", {}, "MAX_LOOP_ITERATIONS:$(ORX_NUMBER) "},
+      {"TEXT", "x", "0", {"unwritable-value L"}, ""},
+      {"TEXT", "x", "4 OUTPUT", {"unwritable-value L"}, ""},
+      {"INSTANCE_MACROS TEXT", "$[Q]", "4", {"unwritable-value L"}, ""},
+      {"INSTANCE_MACROS TEXT", "$(ELSEWHERE)", "4", {}, "P,$(ELSEWHERE)"},
+      {"TEXT_EDIT_TCL_PARM", "return<space>1", "4", {"unwritable-value L"}, ""},
+      {"OPTIONAL TEXT_EDIT_TCL_PARM", "<Unused>", "4", {}, "MAX_LOOP_ITERATIONS:4 "},
+      {"TEXT", "ORX_CONDITIONAL:1=1;a;b", "4", {"unwritable-value L"}, ""},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    workspace.transformer(3, kInstance,
+                          {"SUB_DOC_NAME", "Looper", "XFORMER_NAME", "L", "P", test.value,
+                           "MAX_LOOP_ITERATIONS", test.maximum});
+    workspace.beginCustom("Looper", {"BLOCKED_LOOPING", "yes"}).port(1, "AGAIN", "loop");
+    workspace.parameter(QString("GUI %1 P P").arg(test.type), "").parameter("GUI TEXT Q Q", "1").endCustom();
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.diagnostics, test.diagnostics) << test.type << " " << test.value << test.maximum;
+    EXPECT_TRUE(outcome.text.contains(test.written)) << outcome.text.toStdString();
   }
 }
 

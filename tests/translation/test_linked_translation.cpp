@@ -87,6 +87,31 @@ class LinkedTranslation : public testing::Test {
   QString file;
 };
 
+// One that stands inside a linked one, and one that the document embeds.
+TEST_F(LinkedTranslation, EqualNamesMeanEqualDefinitions) {
+  store(tidyDocument()
+            .replace("TYPE=\"Other\" VERSION=\"1\"/>",
+                     "TYPE=\"SubDocumentTransformer\" VERSION=\"1\"><XFORM_PARM PARM_NAME=\"SUB_DOC_NAME\" "
+                     "PARM_VALUE=\"Inner\"/></TRANSFORMER>")
+            .replace("</SUBDOCUMENTS>",
+                     "<SUBDOCUMENT NAME=\"Inner\"><TRANSFORMERS><TRANSFORMER IDENTIFIER=\"3\" TYPE=\"Other\" "
+                     "VERSION=\"1\"><XFORM_PARM PARM_NAME=\"XFORMER_NAME\" PARM_VALUE=\"N\"/></TRANSFORMER>"
+                     "</TRANSFORMERS></SUBDOCUMENT></SUBDOCUMENTS>"));
+  for (const char* node : {"N", "M"}) {
+    SmallWorkspace document = workspace();
+    document.transformer(8, "SubDocumentTransformer", {"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "I"});
+    document.beginCustom("Inner")
+        .transformer(3, "Other", {"XFORMER_NAME", node}, {"VERSION", "1"})
+        .endCustom();
+    const Outcome outcome = translate(document, folders.load());
+    EXPECT_EQ(outcome.diagnostics,
+              *node == 'N' ? QStringList() : QStringList("custom-transformer-fault Inner"))
+        << outcome.texts.join('\n').toStdString();
+    EXPECT_TRUE(*node == 'N' || outcome.texts.value(0).contains(file))
+        << outcome.texts.value(0).toStdString();
+  }
+}
+
 TEST_F(LinkedTranslation, TellsWhatDoesNotFit) {
   const QString all = folders.path("home/transformers");
   const struct {

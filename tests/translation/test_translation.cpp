@@ -257,7 +257,7 @@ TEST(Translation, RefusesFaultyCustomTransformers) {
     EXPECT_EQ(outcome.result, TranslationResult::Refused);
     EXPECT_EQ(outcome.text, QString());
   }
-  for (const char* name : {"Cleaner (2)", "A,B", "A$B"}) {
+  for (const char* name : {"Cleaner (2)", "A,B", "A$B", "A "}) {
     SmallWorkspace workspace;
     workspace.transformer(3, "SubDocumentTransformer", {"SUB_DOC_NAME", name, "XFORMER_NAME", "First"});
     workspace.beginCustom(name, {}).endCustom();

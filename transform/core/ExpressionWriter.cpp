@@ -15,6 +15,7 @@ const QLatin1String kExpressionType("EXPRESSION");
 const QLatin1String kIntegerTypes("INT");
 const QLatin1String kFloatTypes("FLOAT");
 const QLatin1String kSliderTypes("RANGE_SLIDER");
+const QLatin1String kTextResult("STRING");
 const QLatin1Char kPartSeparator(';');
 
 struct Reference {
@@ -139,7 +140,7 @@ QLatin1String expressionType(const QString& type, bool encoded) {
   if (type.startsWith(kFloatTypes) || type.startsWith(kSliderTypes)) {
     return QLatin1String("FLOAT");
   }
-  return encoded ? QLatin1String("STRING_ENCODED") : QLatin1String("STRING");
+  return encoded ? QLatin1String("STRING_ENCODED") : kTextResult;
 }
 
 }  // namespace
@@ -147,6 +148,10 @@ QLatin1String expressionType(const QString& type, bool encoded) {
 bool ExpressionWriter::holdsReference(const QString& value) {
   return value.contains(kValueReference) || value.contains(kValueReferenceEncoded) ||
          value.contains(kValueReferenceWord);
+}
+
+bool ExpressionWriter::isComputed(const GUIType& type) {
+  return !expressionType(type.getType(), false).startsWith(kTextResult);
 }
 
 bool ExpressionWriter::needsWrapping(const GUIType& type, const QString& value) {

@@ -23,6 +23,8 @@ class ORX_EXPORT ExpressionWriter {
   // Whether the value depends on the feature: it is conditional, it is an attribute reference as a whole, or
   // it holds one and the type may. Expressions are evaluated by their factory and stay as they are.
   static bool needsWrapping(const GUIType& type, const QString& value);
+  // Whether what is wrapped for the type is a formula, whose result is a number.
+  static bool isComputed(const GUIType& type);
   // A conditional value with the stored sides of the choices as its results; any other value as it is.
   static QString withStoredResults(const QString& value, const ChoiceList& choices);
   // Whether the text holds an attribute reference, plain or encoded.

@@ -102,6 +102,7 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   // One line each.
   QStringList parameterStatements(const QString& prefixMacro, bool defaultsOnly) const;
   // The number of the message that says why, or 0.
+  long refuseApart(const QString& parameter, const GUIType& type, const QString& stored) const;
   long refuseMacroValue(const QString& parameter, const QString& value,
                         std::optional<LookedUpParameters>& lookedUp) const;
   QString macroValue(const QString& parameter, const GUIType& type, const QString& prefixMacro) const;

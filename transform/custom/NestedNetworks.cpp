@@ -91,7 +91,7 @@ QString circle(const std::vector<OpenNetwork>& open, const CompoundTransformerNe
 
 QString findNameFault(const QString& name) {
   // It is part of the prefix macro, and a field of the definition's opening line.
-  return isMacroName(makePrefixMacro(name)) && !name.contains(QLatin1Char(','))
+  return isMacroName(makePrefixMacro(name)) && !name.contains(QLatin1Char(',')) && name == name.trimmed()
              ? QString()
              : TransformResString(custom_messages::kNoMacroName, name);
 }

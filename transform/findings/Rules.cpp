@@ -38,6 +38,7 @@ const std::vector<RuleRow>& ruleTable() {
       {Rule::Nesting, QLatin1String("nesting"), Severity::Error, RuleKind::Writing, 0},
       {Rule::CustomTransformerFault, QLatin1String("custom-transformer-fault"), Severity::Error,
        RuleKind::Writing, 0},
+      {Rule::LoopPoint, QLatin1String("loop-point"), Severity::Warning, RuleKind::Judgement, 0},
       {Rule::NotWritten, QLatin1String("not-written"), Severity::Error, RuleKind::Writing, 370853},
       {Rule::MissingAttribute, QLatin1String("missing-attribute"), Severity::Error, RuleKind::Judgement,
        370607},

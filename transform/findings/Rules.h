@@ -45,6 +45,7 @@ enum class Rule {
   TakenName,
   Nesting,
   CustomTransformerFault,
+  LoopPoint,
   NotWritten,
   MissingAttribute,
   MissingValue,

@@ -17,10 +17,6 @@ const QLatin1String kFeatureTypeAttribute("orx_feature_type");
 
 }  // namespace
 
-TransformerCfg* AttributeExpressionRemoverTransformerCfg::getCopy() const {
-  return copyAs(*this);
-}
-
 bool AttributeExpressionRemoverTransformerCfg::parmValueAffectsOutputAttrs(const QString& parameter) const {
   return parameter == kExpression || parameter == kMode || parameter == kIgnoreCase ||
          TransformerCfg::parmValueAffectsOutputAttrs(parameter);

@@ -2,13 +2,13 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
 #include <QRegularExpression>
 
-class ORX_EXPORT AttributeExpressionRemoverTransformerCfg : public TransformerCfg {
+class ORX_EXPORT AttributeExpressionRemoverTransformerCfg
+    : public SpecialisedCfg<AttributeExpressionRemoverTransformerCfg> {
  public:
-  TransformerCfg* getCopy() const override;
   bool parmValueAffectsOutputAttrs(const QString& parameter) const override;
   // Refuses an expression that is none, as far as it is known before the mapping file runs.
   bool validateParameter(const QString& parameter, QString& message) const override;

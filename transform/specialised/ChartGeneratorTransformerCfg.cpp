@@ -27,10 +27,6 @@ enum Column { kLabel, kPosition, kValue, kColumns };
 
 }  // namespace
 
-TransformerCfg* ChartGeneratorTransformerCfg::getCopy() const {
-  return copyAs(*this);
-}
-
 bool ChartGeneratorTransformerCfg::isKind(const QString& kind, UnpackLevel level) const {
   const TransformParamCfg* type = getParameterByMacroName(kChartType);
   return type && type->choices().toStored(getParameterValue(kChartType, level)) == kind;

@@ -2,11 +2,10 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
-class ORX_EXPORT ChartGeneratorTransformerCfg : public TransformerCfg {
+class ORX_EXPORT ChartGeneratorTransformerCfg : public SpecialisedCfg<ChartGeneratorTransformerCfg> {
  public:
-  TransformerCfg* getCopy() const override;
   // Of the series, those alone that charts of the kind make use of.
   QStringList getAttributeNamesInValue(const QString& parameter) const override;
   // Refuses series that lack what the kind of chart needs, and sizes that no picture can have.

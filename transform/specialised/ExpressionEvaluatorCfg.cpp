@@ -1,7 +1,8 @@
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/Formula.h>
+#include <transform/core/FormulaChecks.h>
 #include <transform/core/Keywords.h>
 #include <transform/specialised/ExpressionEvaluatorCfg.h>
-#include <transform/specialised/values/Formula.h>
 #include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/TextHelpers.h>
 
@@ -9,37 +10,21 @@ namespace {
 
 const QLatin1String kExpression("EXPRESSION");
 const QLatin1String kResultType("FLOAT");
-const QLatin1Char kPartSeparator(';');
-
-// The formulas that a value is made of, encoded.
-QStringList formulasOf(const QString& value) {
-  return value.startsWith(kConditionalPrefix)
-             ? value.mid(kConditionalPrefix.size()).split(kPartSeparator, Qt::SkipEmptyParts)
-             : QStringList(value);
-}
 
 }  // namespace
-
-TransformerCfg* ExpressionEvaluatorCfg::getCopy() const {
-  return copyAs(*this);
-}
 
 bool ExpressionEvaluatorCfg::validateParameter(const QString& parameter, QString& message) const {
   if (!TransformerCfg::validateParameter(parameter, message)) {
     return false;
   }
-  const QString value = getParameterValue(parameter, UnpackLevel::Resolved);
-  if (parameter != kExpression || isUnsetValue(value)) {
-    return true;
+  const TransformParamCfg* record = getParameterByMacroName(parameter);
+  const QString fault = parameter == kExpression && record
+                            ? findFormulaFault(*record, getParameterValue(parameter, UnpackLevel::Resolved))
+                            : QString();
+  if (!fault.isEmpty()) {
+    message = fault;
   }
-  for (const QString& part : formulasOf(value)) {
-    const Formula formula(QORXWwjdDecode(part));
-    if (!refersToMacros(part) && !formula.isValid()) {
-      message = formula.faultMessage();
-      return false;
-    }
-  }
-  return true;
+  return fault.isEmpty();
 }
 
 QString ExpressionEvaluatorCfg::getParameterValueForMappingFile(const QString& name,

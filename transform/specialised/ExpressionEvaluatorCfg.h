@@ -2,11 +2,10 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
-class ORX_EXPORT ExpressionEvaluatorCfg : public TransformerCfg {
+class ORX_EXPORT ExpressionEvaluatorCfg : public SpecialisedCfg<ExpressionEvaluatorCfg> {
  public:
-  TransformerCfg* getCopy() const override;
   // Refuses an expression that cannot be understood, as far as it is known before the mapping file runs.
   bool validateParameter(const QString& parameter, QString& message) const override;
   // The expression is evaluated before the factory sees it, so that what divides with fractions is settled by

@@ -30,38 +30,22 @@ QString referenceTo(const QString& name) {
   return kMacroOpen + name + kReferenceEnd;
 }
 
-bool isReference(const QString& text) {
-  return text.startsWith(kMacroOpen) && text.endsWith(kReferenceEnd);
-}
-
 bool isWrapped(const QString& entry, char open, char close) {
   return entry.size() >= 2 && entry.startsWith(QLatin1Char(open)) && entry.endsWith(QLatin1Char(close));
 }
 
-// Between a quote or brace at either end; the two need not match.
-bool isWrappedReference(const QString& entry) {
-  const auto stands = [&](int position, const char* any) {
-    return QLatin1String(any).contains(entry.at(position));
-  };
-  return entry.size() >= 5 && stands(0, "\"{") && stands(entry.size() - 1, "\"}") &&
-         isReference(entry.mid(1, entry.size() - 2));
+bool isWrappedUnevenly(const QString& entry) {
+  return isWrappedMacroReference(entry) && !isWrapped(entry, '"', '"') && !isWrapped(entry, '{', '}');
 }
 
 }  // namespace
-
-TransformerCfg* ParameterFetcherTransformerCfg::getCopy() const {
-  return copyAs(*this);
-}
 
 QString ParameterFetcherTransformerCfg::attrListSeparator() const {
   return separatorOf(getVersion());
 }
 
 QString ParameterFetcherTransformerCfg::macroNameFromMacroDef(const QString& entry) const {
-  if (isReference(entry)) {
-    return entry.mid(2, entry.size() - 3);
-  }
-  return isWrappedReference(entry) ? entry.mid(3, entry.size() - 5) : globalMacroName(entry);
+  return macroNamedBy(entry);
 }
 
 bool ParameterFetcherTransformerCfg::isPublishedParameter(const QString& parameter) const {
@@ -100,7 +84,7 @@ QString ParameterFetcherTransformerCfg::getParameterDisplayValue(const QString& 
     return TransformerCfg::getParameterDisplayValue(parameter, level);
   }
   const QString value = getParameterValue(parameter);
-  return value.size() > 3 && isReference(value) ? value.mid(2, value.size() - 3) : value;
+  return value.size() > 3 && isMacroReference(value) ? value.mid(2, value.size() - 3) : value;
 }
 
 QString ParameterFetcherTransformerCfg::getDefaultMacroLine(const QString& parameter) const {
@@ -128,7 +112,8 @@ bool ParameterFetcherTransformerCfg::validateParameter(const QString& parameter,
     return true;
   }
   for (const QString& entry : entries()) {
-    if (!parameterDirectory()->knows(referenceTo(macroNameFromMacroDef(entry)))) {
+    // What begins in one way and ends in another is no wrapping when the list is split for the attributes.
+    if (isWrappedUnevenly(entry) || !parameterDirectory()->knows(referenceTo(macroNameFromMacroDef(entry)))) {
       message = TransformResString(kUnknownParameterMessage, entry);
       return false;
     }
@@ -144,23 +129,29 @@ QString ParameterFetcherTransformerCfg::getParameterValueForMappingFile(const QS
   }
   const QString stored = stripBasicStringInfo(getParameterValue(name));
   QStringList list = entriesOf(stored, attrListSeparator());
-  if (list.size() < 2) {
-    return textForMappingFile(stored, name, parameter, buffer);
-  }
   const bool usesBraces = getVersion() >= kFirstBlankVersion;
   const char open = usesBraces ? '{' : '"';
   const char close = usesBraces ? '}' : '"';
+  const bool isSingle = list.size() < 2;
+  bool isChanged = !isSingle;
   for (QString& entry : list) {
-    if (!isWrapped(entry, open, close)) {
+    if (isWrapped(entry, open, close)) {
+      continue;
+    }
+    if (isWrappedMacroReference(entry)) {
+      // In what another version wraps its entries.
+      entry = entry.mid(1, entry.size() - 2);
+      isChanged = true;
+    }
+    if (!isSingle) {
       entry = QLatin1Char(open) + entry + QLatin1Char(close);
     }
   }
-  return textForMappingFile(list.join(attrListSeparator()), name, parameter, buffer);
+  return textForMappingFile(isChanged ? list.join(attrListSeparator()) : stored, name, parameter, buffer);
 }
 
 QStringList ParameterFetcherTransformerCfg::fetchedAttributes() const {
-  const QString value = getParameterValue(kListParameter);
-  const QStringList list = QORXStringToList(value, attrListSeparator().at(0));
+  const QStringList list = QORXStringToList(getParameterValue(kListParameter), attrListSeparator().at(0));
   QStringList names;
   for (const QString& entry : list) {
     const QString macro = macroNameFromMacroDef(entry);
@@ -176,8 +167,10 @@ void ParameterFetcherTransformerCfg::transformAllAttrs(QStringList& incoming, QS
                                                        const QString& inputTag,
                                                        const QString& outputTag) const {
   TransformerCfg::transformAllAttrs(incoming, result, inputTag, outputTag);
-  if (getVersion() >= kFirstListVersion) {
-    result += fetchedAttributes();
+  // A single entry is an attribute that the definition adds.
+  const QStringList fetched = getVersion() >= kFirstListVersion ? fetchedAttributes() : QStringList();
+  if (fetched.size() > 1) {
+    result += fetched;
   }
 }
 

@@ -6,11 +6,10 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
-class ORX_EXPORT ParameterFetcherTransformerCfg : public TransformerCfg {
+class ORX_EXPORT ParameterFetcherTransformerCfg : public SpecialisedCfg<ParameterFetcherTransformerCfg> {
  public:
-  TransformerCfg* getCopy() const override;
   // Version 1: a published parameter is shown by its bare name.
   QString getParameterDisplayValue(const QString& parameter,
                                    UnpackLevel level = UnpackLevel::Stored) const override;

@@ -54,10 +54,6 @@ ParameterTable::IsUsed usedCells(const ParameterTable& parts) {
 
 }  // namespace
 
-TransformerCfg* ReportGeneratorTransformerCfg::getCopy() const {
-  return copyAs(*this);
-}
-
 QStringList ReportGeneratorTransformerCfg::getAttributeNamesInValue(const QString& parameter) const {
   const ParameterTable parts(*this, parameter, kColumns, UnpackLevel::Resolved);
   return parameter == kParts && parts.isValid() ? parts.attributeNames(usedCells(parts))

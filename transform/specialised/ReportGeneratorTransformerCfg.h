@@ -2,11 +2,10 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
-class ORX_EXPORT ReportGeneratorTransformerCfg : public TransformerCfg {
+class ORX_EXPORT ReportGeneratorTransformerCfg : public SpecialisedCfg<ReportGeneratorTransformerCfg> {
  public:
-  TransformerCfg* getCopy() const override;
   // Of the parts, what their kinds make use of.
   QStringList getAttributeNamesInValue(const QString& parameter) const override;
   // Refuses parts that lack what their kind needs, and addresses that are none.

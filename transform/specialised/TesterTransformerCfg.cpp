@@ -1,6 +1,8 @@
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/AttributeReferences.h>
+#include <transform/core/Formula.h>
+#include <transform/core/FormulaChecks.h>
 #include <transform/specialised/TesterTransformerCfg.h>
-#include <transform/specialised/values/Formula.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/MessageStrings.h>
@@ -58,11 +60,37 @@ const Comparison* findComparison(const QString& text) {
   return found == std::end(comparisons) ? nullptr : found;
 }
 
-}  // namespace
-
-TransformerCfg* TesterTransformerCfg::getCopy() const {
-  return copyAs(*this);
+// A whole reference as the name that it holds, since the attribute's value cannot tell whether it is there.
+QString attributeNameOf(const QString& encoded) {
+  const QString text = QORXWwjdDecode(encoded);
+  const QStringList names = valueReferences(text);
+  const bool isWhole = names.size() == 1 && text == kValueReference + names.first() + QLatin1Char(')');
+  return isWhole ? QORXWwjdEncode(names.first()) : encoded;
 }
+
+// Whether the formula joins numbers of tests by words, and there are as many; `message` says what is wrong.
+bool namesTests(const Formula& formula, int count, QString& message) {
+  for (const Formula::Token& token : formula.tokens()) {
+    const bool isWord = token.text.at(0).isLetter();
+    if (token.kind == Formula::Kind::Open || token.kind == Formula::Kind::Close ||
+        ((token.kind == Formula::Kind::Operator || token.kind == Formula::Kind::Sign) && isWord)) {
+      continue;
+    }
+    bool isNumber = false;
+    const int test = token.text.toInt(&isNumber);
+    if (token.kind != Formula::Kind::Number || !isNumber) {
+      message = TransformResString(kNoTestNumberMessage, token.text);
+      return false;
+    }
+    if (test < 1 || test > count) {
+      message = TransformResString(kUnknownTestMessage, {token.text, QString::number(count)});
+      return false;
+    }
+  }
+  return true;
+}
+
+}  // namespace
 
 bool TesterTransformerCfg::parameterSupportsAttributeReference(const QString& parameter) const {
   return parameter != kExpression && TransformerCfg::parameterSupportsAttributeReference(parameter);
@@ -136,33 +164,18 @@ bool TesterTransformerCfg::validateExpression(QString& message) const {
     message = TransformResString(kMissingValueMessage, getParameterPrompt(kExpression));
     return false;
   }
-  if (refersToMacros(value)) {
-    return true;
-  }
-  const Formula formula(QORXWwjdDecode(value));
-  if (!formula.isValid()) {
-    message = formula.faultMessage();
+  const TransformParamCfg* expression = getParameterByMacroName(kExpression);
+  const QString fault = findFormulaFault(*expression, value);
+  if (!fault.isEmpty()) {
+    message = fault;
     return false;
   }
+  // Conditions are about attributes.
+  const QStringList formulas =
+      value.startsWith(kConditionalPrefix) ? QStringList() : formulasIn(*expression, value);
   const int count = ParameterTable(*this, kTests, kColumns).rowCount();
-  for (const Formula::Token& token : formula.tokens()) {
-    const bool isWord = token.text.at(0).isLetter();
-    if (token.kind == Formula::Kind::Open || token.kind == Formula::Kind::Close ||
-        ((token.kind == Formula::Kind::Operator || token.kind == Formula::Kind::Sign) && isWord)) {
-      continue;
-    }
-    bool isNumber = false;
-    const int test = token.text.toInt(&isNumber);
-    if (token.kind != Formula::Kind::Number || !isNumber) {
-      message = TransformResString(kNoTestNumberMessage, token.text);
-      return false;
-    }
-    if (test < 1 || test > count) {
-      message = TransformResString(kUnknownTestMessage, {token.text, QString::number(count)});
-      return false;
-    }
-  }
-  return true;
+  return std::all_of(formulas.begin(), formulas.end(),
+                     [&](const QString& text) { return namesTests(Formula(text), count, message); });
 }
 
 QString TesterTransformerCfg::getParameterValueForMappingFile(const QString& name,
@@ -177,6 +190,9 @@ QString TesterTransformerCfg::getParameterValueForMappingFile(const QString& nam
     if (const Comparison* comparison = findComparison(tests.cell(row, kComparison))) {
       tests.setCell(row, kComparison, comparison->name);
       tests.setCell(row, kRight, comparison->takesRight ? tests.cell(row, kRight) : QString());
+      if (!comparison->needsAttribute) {
+        tests.setCell(row, kLeft, attributeNameOf(tests.cell(row, kLeft)));
+      }
     }
   }
   return textForMappingFile(tests.packed(), name, record, buffer);

@@ -3,11 +3,10 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
-class ORX_EXPORT TesterTransformerCfg : public TransformerCfg {
+class ORX_EXPORT TesterTransformerCfg : public SpecialisedCfg<TesterTransformerCfg> {
  public:
-  TransformerCfg* getCopy() const override;
   // The expression is one over numbers of tests, not attributes.
   bool parameterSupportsAttributeReference(const QString& parameter) const override;
   // Attributes that are tested for being there may be missing, and values that a comparison does not take

@@ -10,54 +10,42 @@
 #include <transform/specialised/XMLTemplaterTransformerCfg.h>
 #include <transform/specialised/XMLUpdaterTransformerCfg.h>
 
+#include <algorithm>
+#include <initializer_list>
+
 namespace {
 
-constexpr int kLowest = TransformerCfgRule::kLowestVersion;
-constexpr int kHighest = TransformerCfgRule::kHighestVersion;
-
-template <typename Class>
-TransformerCfg* make() {
-  return new Class;
+// `arguments` go to the constructor.
+template <typename Class, auto... arguments>
+TransformerCfgRule row(std::initializer_list<const char*> names, TransformerCfgRule::Versions versions = {}) {
+  TransformerCfgRule rule = {
+      {}, versions, typeid(Class), []() -> TransformerCfg* { return new Class(arguments...); }};
+  for (const char* name : names) {
+    rule.names.emplace_back(name);
+  }
+  return rule;
 }
 
-// Of the classes that serve both languages.
-template <typename Class>
-TransformerCfg* makeXml() {
-  return new Class(false);
-}
-
-template <typename Class>
-TransformerCfg* makeJson() {
-  return new Class(true);
+template <typename Class, auto... arguments>
+TransformerCfgRule row(const char* name, TransformerCfgRule::Versions versions = {}) {
+  return row<Class, arguments...>(std::initializer_list<const char*>{name}, versions);
 }
 
 }  // namespace
 
 const std::vector<TransformerCfgRule>& transformerCfgRules() {
   static const std::vector<TransformerCfgRule> rules = {
-      {QLatin1String("BulkAttributeRemover"), kLowest, kHighest,
-       QLatin1String("AttributeExpressionRemoverTransformerCfg"),
-       make<AttributeExpressionRemoverTransformerCfg>},
-      {QLatin1String("AttributeValueMapper"), kLowest, kHighest, QLatin1String("ValueMapperTransformerCfg"),
-       make<ValueMapperTransformerCfg>},
-      {QLatin1String("ExpressionEvaluator"), kLowest, kHighest, QLatin1String("ExpressionEvaluatorCfg"),
-       make<ExpressionEvaluatorCfg>},
-      {QLatin1String("Tester"), kLowest, kHighest, QLatin1String("TesterTransformerCfg"),
-       make<TesterTransformerCfg>},
-      {QLatin1String("ParameterFetcher"), kLowest, kHighest, QLatin1String("ParameterFetcherTransformerCfg"),
-       make<ParameterFetcherTransformerCfg>},
-      {QLatin1String("XMLTemplater"), kLowest, kHighest, QLatin1String("XMLTemplaterTransformerCfg"),
-       makeXml<XMLTemplaterTransformerCfg>},
-      {QLatin1String("JSONTemplater"), kLowest, kHighest, QLatin1String("XMLTemplaterTransformerCfg"),
-       makeJson<XMLTemplaterTransformerCfg>},
-      {QLatin1String("XMLUpdater"), kLowest, kHighest, QLatin1String("XMLUpdaterTransformerCfg"),
-       makeXml<XMLUpdaterTransformerCfg>},
-      {QLatin1String("JSONUpdater"), kLowest, kHighest, QLatin1String("XMLUpdaterTransformerCfg"),
-       makeJson<XMLUpdaterTransformerCfg>},
-      {QLatin1String("ChartGenerator"), kLowest, kHighest, QLatin1String("ChartGeneratorTransformerCfg"),
-       make<ChartGeneratorTransformerCfg>},
-      {QLatin1String("HTMLReportGenerator"), kLowest, kHighest,
-       QLatin1String("ReportGeneratorTransformerCfg"), make<ReportGeneratorTransformerCfg>},
+      row<AttributeExpressionRemoverTransformerCfg>("BulkAttributeRemover"),
+      row<ValueMapperTransformerCfg>("AttributeValueMapper"),
+      row<ExpressionEvaluatorCfg>("ExpressionEvaluator"),
+      row<TesterTransformerCfg>("Tester"),
+      row<ParameterFetcherTransformerCfg>("ParameterFetcher"),
+      row<XMLTemplaterTransformerCfg, false>("XMLTemplater"),
+      row<XMLTemplaterTransformerCfg, true>("JSONTemplater"),
+      row<XMLUpdaterTransformerCfg, false>("XMLUpdater"),
+      row<XMLUpdaterTransformerCfg, true>("JSONUpdater"),
+      row<ChartGeneratorTransformerCfg>("ChartGenerator"),
+      row<ReportGeneratorTransformerCfg>("HTMLReportGenerator"),
   };
   return rules;
 }
@@ -69,7 +57,8 @@ const TransformerCfgRule* findTransformerCfgRule(const QString& name, int versio
 const TransformerCfgRule* findTransformerCfgRule(const std::vector<TransformerCfgRule>& rules,
                                                  const QString& name, int version) {
   for (const TransformerCfgRule& rule : rules) {
-    if (name == rule.name && version >= rule.firstVersion && version <= rule.lastVersion) {
+    const auto bears = [&name](QLatin1String candidate) { return name == candidate; };
+    if (rule.versions.hold(version) && std::any_of(rule.names.begin(), rule.names.end(), bears)) {
       return &rule;
     }
   }

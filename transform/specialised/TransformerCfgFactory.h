@@ -7,19 +7,23 @@
 #include <QString>
 
 #include <limits>
+#include <typeindex>
 #include <vector>
 
 class TransformerCfg;
 
-// One row of the table: the class of the transformers of that name whose version lies in the range.
+// One row of the table: the class of the transformers of these names whose version lies in the range.
 struct TransformerCfgRule {
-  static constexpr int kLowestVersion = std::numeric_limits<int>::min();
-  static constexpr int kHighestVersion = std::numeric_limits<int>::max();
+  struct Versions {
+    int first = std::numeric_limits<int>::min();
+    int last = std::numeric_limits<int>::max();
 
-  QLatin1String name;
-  int firstVersion;
-  int lastVersion;
-  QLatin1String className;
+    bool hold(int version) const { return version >= first && version <= last; }
+  };
+
+  std::vector<QLatin1String> names;
+  Versions versions;
+  std::type_index type;
   TransformerCfg* (*make)();  // a new object
 };
 

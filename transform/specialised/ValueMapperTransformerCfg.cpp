@@ -30,10 +30,6 @@ QString word(const QString& cell) {
 
 }  // namespace
 
-TransformerCfg* ValueMapperTransformerCfg::getCopy() const {
-  return copyAs(*this);
-}
-
 bool ValueMapperTransformerCfg::looksUpRight() const {
   const TransformParamCfg* direction = getParameterByMacroName(kDirection);
   return direction &&

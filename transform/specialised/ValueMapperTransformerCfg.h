@@ -2,11 +2,10 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
-class ORX_EXPORT ValueMapperTransformerCfg : public TransformerCfg {
+class ORX_EXPORT ValueMapperTransformerCfg : public SpecialisedCfg<ValueMapperTransformerCfg> {
  public:
-  TransformerCfg* getCopy() const override;
   // Cells of the table may refer to attributes while they are not what is looked up.
   bool parameterSupportsAttributeReference(const QString& parameter) const override;
   // The direction has to be known when the statements are written.

@@ -68,10 +68,6 @@ QString findCircle(const QHash<QString, QStringList>& inserted, const QStringLis
 
 }  // namespace
 
-TransformerCfg* XMLTemplaterTransformerCfg::getCopy() const {
-  return copyAs(*this, m_isJson);
-}
-
 const QStringList& XMLTemplaterTransformerCfg::subTemplateTags() const {
   const QString value = getParameterValue(kSubTemplates, UnpackLevel::Resolved);
   if (value != m_tagsOf) {

@@ -3,14 +3,14 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
-class ORX_EXPORT XMLTemplaterTransformerCfg : public TransformerCfg {
+class ORX_EXPORT XMLTemplaterTransformerCfg : public SpecialisedCfg<XMLTemplaterTransformerCfg> {
  public:
   explicit XMLTemplaterTransformerCfg(bool isJson) : m_isJson(isJson) {}
 
   bool isJson() const { return m_isJson; }
-  TransformerCfg* getCopy() const override;
+  XMLTemplaterTransformerCfg* blank() const { return new XMLTemplaterTransformerCfg(m_isJson); }
   // The definition's, and one for each sub-template, by its name.
   void getInputTags(QStringList& tags, QHash<QString, QString>* shownNames = nullptr) const override;
   // Refuses templates that are not well formed, ask for each other in a circle or for one that there is not,

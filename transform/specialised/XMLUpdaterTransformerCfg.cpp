@@ -68,10 +68,6 @@ QString fromRoot(const QString& encodedPath, bool isJson) {
 
 }  // namespace
 
-TransformerCfg* XMLUpdaterTransformerCfg::getCopy() const {
-  return copyAs(*this, m_isJson);
-}
-
 bool XMLUpdaterTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
   return TransformerCfg::validateParameter(parameter, message) &&
          (parameter != kDocument || validateDocument(message)) &&

@@ -2,14 +2,14 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/core/TransformerCfg.h>
+#include <transform/specialised/SpecialisedCfg.h>
 
-class ORX_EXPORT XMLUpdaterTransformerCfg : public TransformerCfg {
+class ORX_EXPORT XMLUpdaterTransformerCfg : public SpecialisedCfg<XMLUpdaterTransformerCfg> {
  public:
   explicit XMLUpdaterTransformerCfg(bool isJson) : m_isJson(isJson) {}
 
   bool isJson() const { return m_isJson; }
-  TransformerCfg* getCopy() const override;
+  XMLUpdaterTransformerCfg* blank() const { return new XMLUpdaterTransformerCfg(m_isJson); }
   // Refuses documents and values that are not well formed, paths that cannot be understood, and updates that
   // lack a value.
   bool validateParameter(const QString& parameter, QString& message) const override;

@@ -63,3 +63,22 @@ QString globalMacroName(const QString& nameOrDisplayName) {
   const auto found = tables.byName.constFind(nameOrDisplayName);
   return found != tables.byName.constEnd() ? *found : tables.byDisplayName.value(nameOrDisplayName);
 }
+
+bool isMacroReference(const QString& text) {
+  return text.startsWith(QLatin1String("$(")) && text.endsWith(QLatin1Char(')'));
+}
+
+bool isWrappedMacroReference(const QString& text) {
+  const auto stands = [&text](int position, const char* any) {
+    return QLatin1String(any).contains(text.at(position));
+  };
+  return text.size() >= 5 && stands(0, "\"{") && stands(text.size() - 1, "\"}") &&
+         isMacroReference(text.mid(1, text.size() - 2));
+}
+
+QString macroNamedBy(const QString& entry) {
+  if (isMacroReference(entry)) {
+    return entry.mid(2, entry.size() - 3);
+  }
+  return isWrappedMacroReference(entry) ? entry.mid(3, entry.size() - 5) : globalMacroName(entry);
+}

@@ -217,16 +217,21 @@ void CustomDefinition::nameFlows(orx::Findings& diagnostics) {
       diagnostics.report(Rule::TakenName, node->line(), scope + node->name(), {taken});
   }
   for (const SubDocNetworkObjXformer* node : m_order) {
-    const auto [holder, line] = inner.findHolder(node->name());
-    if (!holder.isEmpty())
-      diagnostics.report(Rule::TakenName, line, scope + holder, {node->name()});
-  }
-  for (const SubDocNetworkObjXformer* node : m_order) {
     for (const auto& [port, links] : node->consumers()) {
-      if (!links.empty())
-        m_flows[node].insert(port, names.claim(outputFlowName(*node->getTransformer(), node->name(), port)));
+      if (links.empty())
+        continue;
+      const QString flow = names.claim(outputFlowName(*node->getTransformer(), node->name(), port));
+      m_flows[node].insert(port, flow);
+      inner.addFlow(flow);
     }
   }
+  for (const SubDocNetworkObj* node : m_network.nodes()) {
+    if (node->kind() != SubDocNetworkObj::Kind::Transformer)
+      inner.addFlow(node->name());
+  }
+  for (const QString& parameter : m_network.getParameters())
+    inner.addParameter(parameter);
+  inner.report(scope, diagnostics);
 }
 
 void CustomDefinition::makePart(const SubDocNetworkObjXformer& node) {

@@ -5,8 +5,15 @@
 
 #include <algorithm>
 
+namespace {
+
+constexpr long kUnequalTwins = 370906;
+
+}  // namespace
+
 CustomDefinitions::CustomDefinitions(const std::vector<ExternalDocNetwork*>& networks,
-                                     const TransformerCfgListener& surroundings) {
+                                     const TransformerCfgListener& surroundings)
+    : m_surroundings(surroundings) {
   for (const ExternalDocNetwork* network : networks)
     m_definitions.emplace_back(*network, surroundings);
 }
@@ -14,9 +21,10 @@ CustomDefinitions::CustomDefinitions(const std::vector<ExternalDocNetwork*>& net
 CustomDefinitions::~CustomDefinitions() = default;
 
 void CustomDefinitions::addInstance(const TransformerCfg* instance) {
-  const CompoundTransformerNetwork* network = networkOf(instance);
+  CompoundTransformerNetwork* network = networkOf(instance);
   if (!network)
     return;
+  m_roots.push_back(network);
   InnerAttributes::ByPort& arriving = m_arriving[network];
   const InnerAttributes::ByPort added = instance->getInputAttributes();
   for (auto port = added.cbegin(); port != added.cend(); ++port)
@@ -32,7 +40,41 @@ bool CustomDefinitions::prepare(orx::Findings& diagnostics) {
     passAttributes();
   for (CustomDefinition& definition : m_definitions)
     definition.prepare(diagnostics);
+  checkTwins(diagnostics);
   return !diagnostics.hasErrors();
+}
+
+void CustomDefinitions::checkTwins(orx::Findings& diagnostics) {
+  QHash<QPair<QString, int>, CompoundTransformerNetwork*> known;
+  for (CompoundTransformerNetwork* network : nestedNetworks(m_roots)) {
+    CompoundTransformerNetwork*& first = known[{network->getName(), network->getVersion()}];
+    if (!first)
+      first = network;
+    if (first == network || statementsOf(*first) == statementsOf(*network))
+      continue;
+    diagnostics.reportAs(orx::Rule::CustomTransformerFault, kUnequalTwins, 0, network->getName(),
+                         {network->getName(), QString::number(network->getVersion()),
+                          placeOf(*first, diagnostics.file()), placeOf(*network, diagnostics.file())});
+  }
+}
+
+QStringList CustomDefinitions::statementsOf(const CompoundTransformerNetwork& network) const {
+  const auto* document = dynamic_cast<const ExternalDocNetwork*>(&network);
+  if (!document)
+    return QStringList();
+  orx::Findings ignored{QString()};
+  CustomDefinition definition(*document, m_surroundings);
+  return definition.arrange(ignored) && definition.prepare(ignored) ? definition.lines() : QStringList();
+}
+
+// The file of a linked one, or of the one that it stands in.
+QString CustomDefinitions::placeOf(CompoundTransformerNetwork& network, const QString& document) const {
+  for (CompoundTransformerNetwork* root : nestedNetworks(m_roots)) {
+    const std::vector<CompoundTransformerNetwork*> inside = nestedNetworks(*root);
+    if (!root->getFileName().isEmpty() && std::find(inside.begin(), inside.end(), &network) != inside.end())
+      return root->getFileName();
+  }
+  return document;
 }
 
 // Outermost first: what reaches an instance inside is known when all that reaches the outside is.

@@ -32,7 +32,14 @@ class CustomDefinitions {
 
  private:
   void passAttributes();
+  // An engine finds a definition by name and version, so what has the same has to be the same.
+  void checkTwins(orx::Findings& diagnostics);
+  // The statements of the definition; none when they cannot be written.
+  QStringList statementsOf(const CompoundTransformerNetwork& network) const;
+  QString placeOf(CompoundTransformerNetwork& network, const QString& document) const;
 
+  const TransformerCfgListener& m_surroundings;
   std::deque<CustomDefinition> m_definitions;
+  std::vector<CompoundTransformerNetwork*> m_roots;  // of the instances in the main document
   QHash<const CompoundTransformerNetwork*, InnerAttributes::ByPort> m_arriving;
 };

@@ -95,6 +95,7 @@ void MappingFileWriter::nameFlows() {
     connected[at(link.source)].insert(link.output);
 
   FlowNames names;
+  InnerNames inner;
   const int count = static_cast<int>(m_workspace.nodes.size());
   const auto claimTypes = [&](WorkspaceNode::Kind kind) {
     for (int node = 0; node < count; ++node) {
@@ -105,7 +106,7 @@ void MappingFileWriter::nameFlows() {
   // What a writer takes keeps the writer's own name, and the inner names of custom transformers are fixed, so
   // those come first.
   claimTypes(WorkspaceNode::Kind::Writer);
-  reserveInnerNames(names);
+  reserveInnerNames(names, inner);
   claimTypes(WorkspaceNode::Kind::Reader);
   for (int node = 0; node < count; ++node) {
     const WorkspaceNode& place = m_workspace.nodes[at(node)];
@@ -117,24 +118,24 @@ void MappingFileWriter::nameFlows() {
       for (const QString& tag : tags) {
         if (connected[at(node)].contains(tag))
           m_flows[at(node)].insert(tag, names.claim(outputFlowName(*place.cfg, place.name, tag)));
+        inner.addFlow(m_flows[at(node)].value(tag));
       }
     }
+    inner.addFlow(m_flows[at(node)].value(QString()));
+    inner.addFlow(m_copiedFlows[at(node)]);
   }
+  for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all())
+    inner.addParameter(parameter.name);
+  inner.report(QString(), m_diagnostics);
 }
 
-void MappingFileWriter::reserveInnerNames(FlowNames& names) {
-  InnerNames inner;
+void MappingFileWriter::reserveInnerNames(FlowNames& names, InnerNames& inner) {
   for (const WorkspaceNode& node : m_workspace.nodes) {
     if (!node.isTransformer())
       continue;
     inner.add(node.name, node.line, *node.cfg);
     for (const QString& taken : names.reserve(*node.cfg, node.name))
       m_diagnostics.report(Rule::TakenName, node.line, node.name, {taken});
-  }
-  for (const WorkspaceNode& node : m_workspace.nodes) {
-    const auto holder = node.isTransformer() ? inner.findHolder(node.name) : std::pair<QString, int>();
-    if (!holder.first.isEmpty())
-      m_diagnostics.report(Rule::TakenName, holder.second, holder.first, {node.name});
   }
 }
 

@@ -11,6 +11,7 @@
 #include <vector>
 
 class FlowNames;
+class InnerNames;
 class MFBuffer;
 
 class MappingFileWriter {
@@ -29,7 +30,7 @@ class MappingFileWriter {
 
  private:
   bool order();
-  void reserveInnerNames(FlowNames& names);
+  void reserveInnerNames(FlowNames& names, InnerNames& inner);
   void nameFlows();
   void connect();
   void pushAttributes();

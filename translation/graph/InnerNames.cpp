@@ -2,30 +2,18 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/findings/Findings.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/graph/InnerNames.h>
 
-#include <vector>
+using orx::Rule;
 
 namespace {
 
-// Calls for each of the custom transformers that `name` begins with, "_" behind, and for what is left.
-template <class Call>
-void eachBeginning(const QString& name, const std::set<int>& lengths,
-                   const QHash<QString, InnerNames::Holder>& customTransformers, const Call& call) {
-  for (const int length : lengths) {
-    if (length + 1 >= name.size())
-      return;
-    if (name.at(length) != QLatin1Char('_'))
-      continue;
-    const auto found = customTransformers.constFind(name.left(length));
-    if (found != customTransformers.constEnd())
-      call(*found, name.left(length), name.mid(length + 1));
-  }
-}
-
 constexpr long kReplacesParameter = 370875;
+constexpr long kSameInnerName = 370907;
+constexpr long kInnerParameter = 370908;
 
 }  // namespace
 
@@ -46,52 +34,43 @@ QHash<QString, QString> InnerNames::findReplacedParameters(
 }
 
 void InnerNames::add(const QString& name, int line, const TransformerCfg& cfg) {
-  m_names.insert(name);
-  const CompoundTransformerNetwork* network = networkOf(&cfg);
+  m_names.append(name);
+  CompoundTransformerNetwork* network = networkOf(&cfg);
   if (!network)
     return;
-  m_customTransformers.insert(name, {network, line});
-  m_lengths.insert(name.size());
+  for (JoinedNames* names : {&m_nodes, &m_flows, &m_macros})
+    names->add(name, line, network);
+  for (const QString& port : network->getInputs() + network->getOutputs())
+    addFlow(name + QLatin1Char('_') + port);
 }
 
-std::pair<QString, int> InnerNames::findHolder(const QString& name) {
-  std::pair<QString, int> holder;
-  eachBeginning(name, m_lengths, m_customTransformers,
-                [&](const Holder& custom, const QString& outer, const QString& rest) {
-                  if (holder.first.isEmpty() && holds(custom.network, rest))
-                    holder = {outer, custom.line};
-                });
-  return holder;
-}
-
-const InnerNames& InnerNames::inside(const CompoundTransformerNetwork* network) {
-  std::shared_ptr<InnerNames>& names = m_insides[network];
-  if (!names) {
-    names = std::make_shared<InnerNames>();
-    for (const TransformerCfg* cfg : network->getTransformers())
-      names->add(cfg->getIdentifier(), 0, *cfg);
+void InnerNames::report(const QString& scope, orx::Findings& diagnostics) {
+  const auto reportTaken = [&](JoinedNames& inner, const QStringList& names) {
+    for (const QString& name : names) {
+      const JoinedNames::Holder holder = inner.findHolder(name);
+      if (!holder.name.isEmpty())
+        diagnostics.report(Rule::TakenName, holder.line, scope + holder.name, {name});
+    }
+  };
+  m_flowNames.removeDuplicates();
+  reportTaken(m_nodes, m_names);
+  reportTaken(m_flows, m_flowNames);
+  for (const QString& parameter : m_parameters) {
+    const JoinedNames::Holder holder = m_macros.findHolder(parameter);
+    if (!holder.name.isEmpty())
+      diagnostics.reportAs(Rule::TakenName, kInnerParameter, holder.line, scope + holder.name,
+                           {holder.name, parameter});
   }
-  return *names;
-}
-
-bool InnerNames::holds(const CompoundTransformerNetwork* network, const QString& rest) {
-  using Place = QPair<const CompoundTransformerNetwork*, QString>;
-  std::vector<Place> open{{network, rest}};
-  QSet<Place> seen{open.front()};
-  while (!open.empty()) {
-    const Place place = open.back();
-    open.pop_back();
-    const InnerNames& names = inside(place.first);
-    if (names.m_names.contains(place.second))
-      return true;
-    eachBeginning(place.second, names.m_lengths, names.m_customTransformers,
-                  [&](const Holder& inner, const QString&, const QString& further) {
-                    const Place next(inner.network, further);
-                    if (seen.contains(next))
-                      return;
-                    seen.insert(next);
-                    open.push_back(next);
-                  });
+  QSet<QString> told;
+  for (JoinedNames* names : {&m_nodes, &m_flows}) {
+    for (const JoinedNames::Clash& clash : names->findClashes()) {
+      const QString pair = clash.holder.name + QLatin1Char('\n') + clash.other;
+      if (told.contains(pair))
+        continue;
+      told.insert(pair);
+      diagnostics.reportText(
+          Rule::TakenName, clash.holder.line, scope + clash.holder.name,
+          TransformResString(kSameInnerName, {clash.holder.name, clash.other, clash.name}));
+    }
   }
-  return false;
 }

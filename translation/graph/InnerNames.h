@@ -1,18 +1,21 @@
-// The names of transformers that stand side by side, and those that their insides are written under: what
-// stands as "V" inside the custom transformer "O" is written as "O_V".
+// The names of what stands side by side, in the main document or in a custom transformer, against the names
+// under which the insides of the custom transformers among them are written.
 #pragma once
 
+#include <translation/graph/JoinedNames.h>
+
 #include <QHash>
-#include <QSet>
 #include <QString>
+#include <QStringList>
 
 #include <functional>
-#include <memory>
-#include <set>
-#include <utility>
+#include <vector>
 
-class CompoundTransformerNetwork;
 class TransformerCfg;
+
+namespace orx {
+class Findings;
+}
 
 class InnerNames {
  public:
@@ -22,22 +25,20 @@ class InnerNames {
   static QHash<QString, QString> findReplacedParameters(const QString& name, const TransformerCfg& cfg,
                                                         const std::function<bool(const QString&)>& isAround);
 
-  struct Holder {
-    const CompoundTransformerNetwork* network = nullptr;
-    int line = 0;
-  };
-
   void add(const QString& name, int line, const TransformerCfg& cfg);
-  // The name of the custom transformer with something inside that is written as `name`, and its line; empty
-  // when there is none.
-  std::pair<QString, int> findHolder(const QString& name);
+  // A name that features flow under here.
+  void addFlow(const QString& name) { m_flowNames.append(name); }
+  // A parameter that is in force here.
+  void addParameter(const QString& name) { m_parameters.append(name); }
+
+  // Reports every name that is needed further in as well; `scope` stands before the names of nodes.
+  void report(const QString& scope, orx::Findings& diagnostics);
 
  private:
-  bool holds(const CompoundTransformerNetwork* network, const QString& rest);
-  const InnerNames& inside(const CompoundTransformerNetwork* network);
-
-  QSet<QString> m_names;
-  QHash<QString, Holder> m_customTransformers;
-  std::set<int> m_lengths;                                                          // of their names
-  QHash<const CompoundTransformerNetwork*, std::shared_ptr<InnerNames>> m_insides;  // read once
+  QStringList m_names;
+  QStringList m_flowNames;
+  QStringList m_parameters;
+  JoinedNames m_nodes{JoinedNames::Kind::Node};
+  JoinedNames m_flows{JoinedNames::Kind::Flow};
+  JoinedNames m_macros{JoinedNames::Kind::Macro};
 };

@@ -1,4 +1,6 @@
+#include <transform/core/FormulaChecks.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/ParameterLines.h>
 #include <transform/workspace/WorkspaceRecords.h>
@@ -85,9 +87,14 @@ ValueChecks::LooseReferences ValueChecks::looseReferences(const Node& node, cons
   for (const XformParmStruct& given : node.record.parameters) {
     if (!given.parmValue.contains(QLatin1Char('$')))
       continue;
+    // A custom transformer's own parameters have other macros, and are meant only where the type says so.
+    const TransformParamCfg* record = node.cfg.getParameterByMacroName(given.parmName);
+    const bool meansOwn =
+        !isCustomTransformer(&node.cfg) || (record && record->getFlag(kGUITypeInstanceMacros));
     QStringList unknown;
     for (const QString& name : ReferencedNames::inValue(given.parmValue)) {
-      if (!knows(name) && !name.startsWith(kInstanceNames) && !node.cfg.getParameterByMacroName(name))
+      const bool isOwn = name.startsWith(kInstanceNames) || node.cfg.getParameterByMacroName(name);
+      if (!knows(name) && !(meansOwn && isOwn))
         unknown.append(name);
     }
     loose.insert(given.parmName, unknown);
@@ -103,8 +110,12 @@ bool ValueChecks::standsForReferences(Rule rule) const {
 void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names) {
   for (const QString& parameter : node.cfg.getParameters()) {
     QString text;
-    if (node.cfg.validateParameter(parameter, text))
-      continue;
+    if (node.cfg.validateParameter(parameter, text)) {
+      text = findFormulaFault(*node.cfg.getParameterByMacroName(parameter),
+                              node.cfg.getParameterValue(parameter, UnpackLevel::Resolved));
+      if (text.isEmpty())
+        continue;
+    }
     const Rule rule = ruleOf(text);
     if (rule == Rule::MissingAttribute) {
       if (!node.knowsWhatArrives)

@@ -2,8 +2,10 @@
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/attributes/AttributePassage.h>
+#include <transform/text/GlobalMacros.h>
 
 #include <QScopedValueRollback>
 #include <QSet>
@@ -12,6 +14,8 @@
 #include <iterator>
 
 namespace {
+
+const QLatin1String kPublishedParameterType("PUBLISHED_PARAMETER");
 
 // A few are compared faster than hashed.
 void dropRepeats(QStringList& names) {
@@ -162,7 +166,13 @@ QStringList TransformerCfg::attributesListedBy(const QString& parameter) const {
   if (value == kUnusedGroupBy && parameter == configured().fields.multiProcess) {
     return QStringList();
   }
-  return listedAttributeNames(typeOfValue(parameter), value);
+  const GUIType& type = typeOfValue(parameter);
+  if (type.getType().startsWith(kPublishedParameterType)) {
+    // The attribute bears the name of the workspace's parameter, whatever that holds.
+    const QString name = macroNamedBy(getParameterValue(parameter, UnpackLevel::Stored));
+    return isMacroName(name) ? QStringList(name) : QStringList();
+  }
+  return listedAttributeNames(type, value);
 }
 
 bool TransformerCfg::parmValueAffectsOutputAttrs(const QString& parameter) const {

@@ -9,7 +9,7 @@
 
 namespace multi_process_writer {
 
-void write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, const QString& parallelism,
+bool write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, const QString& parallelism,
            const QString& processSetting) {
   const QString identifier = cfg.getIdentifier();
   // A transformer without a template of its own is a custom one, whose definition stands elsewhere.
@@ -41,10 +41,12 @@ void write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, 
     lines << QLatin1String("   OUTPUT ") + tag + QLatin1String(" FEATURE_TYPE ") +
                  quotifyStringForMF(featureType);
   }
-  if (std::all_of(lines.cbegin(), lines.cend(), &MFBuffer::closesDeferredMacros)) {
-    buffer.addLines(lines);
-    buffer.flush();
+  if (!std::all_of(lines.cbegin(), lines.cend(), &MFBuffer::closesDeferredMacros)) {
+    return false;
   }
+  buffer.addLines(lines);
+  buffer.flush();
+  return true;
 }
 
 }  // namespace multi_process_writer

@@ -9,8 +9,8 @@ class TransformerCfg;
 
 namespace multi_process_writer {
 
-// Unset settings are left out. Nothing is written when a deferred reference in a text never closes.
-void write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, const QString& parallelism,
+// Unset settings are left out. False, with nothing written, when a deferred reference in a text never closes.
+bool write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, const QString& parallelism,
            const QString& processSetting);
 
 }  // namespace multi_process_writer

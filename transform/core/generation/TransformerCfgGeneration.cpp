@@ -33,6 +33,12 @@ const QLatin1String kUserTypedEnd("_USERTYPED)");
 const QLatin1String kNo("NO");
 const QLatin1String kChoiceType("CHOICE");
 
+// For statements that are only tried.
+class UnusedBuffer : public MFBuffer {
+ public:
+  void write(const QByteArray&) override {}
+};
+
 bool isUnset(const QString& value) {
   return value.isEmpty() || value == kUnusedValue;
 }
@@ -55,7 +61,16 @@ bool TransformerCfg::instantiate(MFBuffer& buffer, const QString&, bool inlineFl
     const QString parallelism = stored(kProcessCountParameter);
     const QString groupBy = getParameterValue(groupByParameter);
     if (parallelism != kNoParallelism && parallelism != kNo && groupBy != kUnusedGroupBy) {
-      writeMultiProcessTransformFact(buffer, groupBy, parallelism, stored(kGroupsOrderedParameter));
+      // The factory is of no use without the statements that its workers run.
+      UnusedBuffer unused;
+      unused.setReplaceDeferredMacros(true);
+      const int count = m_instantiationCounter;
+      if (!doInstantiate(unused, inlineFlag) ||
+          !multi_process_writer::write(buffer, *this, groupBy, parallelism,
+                                       stored(kGroupsOrderedParameter))) {
+        return false;
+      }
+      m_instantiationCounter = count;
     }
   }
   return doInstantiate(buffer, inlineFlag);

@@ -1,14 +1,16 @@
 // What an instance of a custom transformer writes into the mapping file.
 #include <transform/core/LookupChecks.h>
+#include <transform/core/MacroText.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/instance/CustomTransformerStatement.h>
+#include <transform/custom/instance/InstancePrototype.h>
 #include <transform/custom/instance/LookedUpParameters.h>
 #include <transform/custom/instance/ScriptParameters.h>
 #include <transform/custom/linked/CustomMessages.h>
 #include <transform/scripts/ScriptBlocks.h>
-#include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
@@ -24,14 +26,28 @@ QString factoryName(const QString& id, const QString& tag, QLatin1String role) {
   return QLatin1String("  FACTORY_NAME \"") + id + QLatin1Char(' ') + tag + role + QLatin1Char('"');
 }
 
-// References to parameters, "$(NAME)", become references to the instance's macros. Macros that every mapping
-// file has, and the prefix macro of a custom transformer around, are no parameters.
-QString redirectReferences(const QString& value, const QString& prefixMacro) {
-  static const QString prefixMacroEnd = makePrefixMacro(QString());
+// References to the instance's parameters, "$(NAME)", become references to its macros.
+QString redirectReferences(const QString& value, const QString& prefixMacro, const TransformerCfg& instance) {
   return replaceParameterReferences(value, [&](const QString& name, QString& replacement) {
     replacement = QLatin1String("$($(") + prefixMacro + QLatin1String(")_") + name + QLatin1Char(')');
-    return !isGlobalMacro(name) && !name.endsWith(prefixMacroEnd);
+    return instance.hasParameter(name);
   });
+}
+
+// The first parameter of the instance that the value refers to; empty when there is none.
+QString ownReference(const QString& value, const TransformerCfg& instance) {
+  QString own;
+  anyParameterReference(MFBuffer::withOrdinaryMacros(value), [&](const QString& name) {
+    own = instance.hasParameter(name) ? name : QString();
+    return !own.isEmpty();
+  });
+  return own;
+}
+
+bool isIterationCount(const QString& value) {
+  bool isNumber = false;
+  return value.isEmpty() || value == kUnusedValue || value.toInt(&isNumber) > 0 ||
+         isParameterReference(MFBuffer::withOrdinaryMacros(value));
 }
 
 // "@Value(NAME)" of a name or of an encoded reference; the name keeps its encoding.
@@ -74,14 +90,19 @@ bool CompoundTransformerCfg::doInstantiate(MFBuffer& buffer, bool inlineFlag) {
       before.push_back({statement});
   }
   const Statements behind = outputRenamers();
-  const ParallelSettings parallel = m_network->getParallelSettings();
-  const QStringList body{id,
-                         m_network->getName(),
-                         getVisualName(),
-                         getTransformerParams(),
-                         parallel.groupBy,
-                         parallel.parallelism,
-                         parallel.processSetting};
+  const ParallelSettings parallel = parallelSettingsOf(*m_network, *this);
+  QStringList inputs;
+  QStringList outputs;
+  getInputTags(inputs);
+  getOutputTags(outputs);
+  const QStringList body = QStringList{id,
+                                       m_network->getName(),
+                                       getVisualName(),
+                                       getTransformerParams(),
+                                       parallel.groupBy,
+                                       parallel.parallelism,
+                                       parallel.processSetting} +
+                           m_network->getLoops() + inputs + outputs;
   if (!areClosed(before) || !areClosed({body}) || !areClosed(behind))
     return false;
 
@@ -189,12 +210,13 @@ QString CompoundTransformerCfg::macroValue(const QString& parameter, const GUITy
       getParameterValueForMappingFile(getParameterValue(parameter), type.valueIsEncoded(), false));
   const TransformParamCfg* record = getParameterByMacroName(parameter);
   return record && record->getFlag(kGUITypeInstanceMacros) && !prefixMacro.isEmpty()
-             ? redirectReferences(value, prefixMacro)
+             ? redirectReferences(MFBuffer::withOrdinaryMacros(value), prefixMacro, *this)
              : value;
 }
 
 QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const {
   const QString prefix = makePrefixMacro(getVisualName());
+  const bool isApart = m_network && isRunApart(*m_network, *this);
   std::optional<LookedUpParameters> lookedUp;  // found when the first value asks for them
   QHash<QString, QString> messages;
   for (const QString& parameter : getParameters()) {
@@ -217,6 +239,10 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
       else
         getTclParameterLines(prefix, parameter, stored, lines);
     }
+    if (const long number = message.isEmpty() && isApart ? refuseApart(parameter, type, stored) : 0)
+      message = number == custom_messages::kOwnReferenceForWorkers
+                    ? TransformResString(number, ownReference(stored, *this))
+                    : TransformResString(number);
     if (message.isEmpty() && !areClosed({lines}))
       message = TransformResString(custom_messages::kUnclosedReference, parameter);
     if (message.isEmpty() && language == ScriptLanguage::None) {
@@ -229,12 +255,35 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
   return messages;
 }
 
+// What the list of parameters that a loop or a process of its own is given does not carry.
+long CompoundTransformerCfg::refuseApart(const QString& parameter, const GUIType& type,
+                                         const QString& stored) const {
+  if (m_network->blockedLooping() && parameter == kMaxLoopIterationsParameter) {
+    if (parallelSettingsOf(*m_network, *this).isEnabled())
+      return custom_messages::kLoopInProcesses;
+    if (!isIterationCount(getParameterValue(parameter, UnpackLevel::Decoded)))
+      return custom_messages::kBadMaximum;
+  }
+  if (scriptLanguage(type) != ScriptLanguage::None)
+    return isUnsetScript(stored) ? 0 : custom_messages::kScriptForWorkers;
+  const TransformParamCfg* record = getParameterByMacroName(parameter);
+  return record && record->getFlag(kGUITypeInstanceMacros) && !ownReference(stored, *this).isEmpty()
+             ? custom_messages::kOwnReferenceForWorkers
+             : 0;
+}
+
 // The inside is written once for all instances, so what its fragments cannot carry is found here.
 long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QString& value,
                                               std::optional<LookedUpParameters>& lookedUp) const {
   const bool isName = parameter == kIdentifierParameter;
   if (value.endsWith(QLatin1Char('\\')))
     return lookup_checks::kEndsInBackslash;
+  if (!isMacroName(parameter))
+    return lookup_checks::kNameInMacro;
+  if (isName && value != value.trimmed())
+    return custom_messages::kBlankAtEnd;
+  if (getParameterValue(parameter).startsWith(kConditionalPrefix))
+    return custom_messages::kConditionInMacro;
   QString expanded = MFBuffer::withOrdinaryMacros(value);
   const bool ends = !listener() || listener()->expandMacros(*this, expanded);
   // The name stands in quotes as it is.

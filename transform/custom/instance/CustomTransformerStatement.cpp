@@ -52,10 +52,12 @@ void writeLoopFactory(MFBuffer& buffer, const CompoundTransformerNetwork& networ
   buffer.add(QLatin1String("   LOOPBACK_INPUT_TAG:") + quotifyStringForMF(loopTo));
   buffer.add(QLatin1String("   LOOPBACK_OUTPUT_TAG:") + network.getLoopOutput());
   buffer.add(QLatin1String("   RECURRING_INPUT_TAG:") + recurring.join(QLatin1Char(',')));
-  buffer.add(QLatin1String("   MAX_LOOP_ITERATIONS:") +
-             instance.getParameterValue(kMaxLoopIterationsParameter, UnpackLevel::Decoded));
-  buffer.add(QLatin1String("   ITERATION_COUNT_ATTR:") +
-             instance.getParameterValue(kIterationCountParameter, UnpackLevel::Decoded));
+  const auto setting = [&instance](const QString& parameter) {
+    const QString value = instance.getParameterValue(parameter, UnpackLevel::Decoded);
+    return value == kUnusedValue ? QString() : value;
+  };
+  buffer.add(QLatin1String("   MAX_LOOP_ITERATIONS:") + setting(kMaxLoopIterationsParameter));
+  buffer.add(QLatin1String("   ITERATION_COUNT_ATTR:") + setting(kIterationCountParameter));
   const auto addPorts = [&](const char* keyword, const QStringList& tags) {
     for (const QString& tag : tags) {
       buffer.add(QLatin1String(keyword) + tag + QLatin1String(" FEATURE_TYPE ") +
@@ -68,13 +70,22 @@ void writeLoopFactory(MFBuffer& buffer, const CompoundTransformerNetwork& networ
 
 }  // namespace
 
+ParallelSettings parallelSettingsOf(const CompoundTransformerNetwork& network,
+                                    const TransformerCfg& instance) {
+  ParallelSettings settings = network.getParallelSettings();
+  settings.groupBy = resolveGroupBy(settings.groupBy, instance);
+  settings.parallelism = resolve(settings.parallelism, instance);
+  settings.processSetting = resolve(settings.processSetting, instance);
+  return settings;
+}
+
+bool isRunApart(const CompoundTransformerNetwork& network, const TransformerCfg& instance) {
+  return network.blockedLooping() || parallelSettingsOf(network, instance).isEnabled();
+}
+
 void writeCustomTransformerStatement(MFBuffer& buffer, const CompoundTransformerNetwork& network,
                                      const TransformerCfg& instance, bool inlineFlag) {
-  const ParallelSettings settings = network.getParallelSettings();
-  ParallelSettings resolved = settings;
-  resolved.groupBy = resolveGroupBy(settings.groupBy, instance);
-  resolved.parallelism = resolve(settings.parallelism, instance);
-  resolved.processSetting = resolve(settings.processSetting, instance);
+  const ParallelSettings resolved = parallelSettingsOf(network, instance);
   if (resolved.isEnabled()) {
     instance.writeMultiProcessTransformFact(buffer, resolved.groupBy, resolved.parallelism,
                                             resolved.processSetting);

@@ -35,5 +35,15 @@ constexpr long kNoInstance = 370851;
 constexpr long kNoMacroName = 370852;
 constexpr long kEncipheredBody = 370854;
 constexpr long kNoLoop = 370878;
+constexpr long kLostLoop = 370900;
+constexpr long kIdleLoop = 370901;
+constexpr long kSecondLoop = 370902;
+constexpr long kBadMaximum = 370903;
+constexpr long kScriptForWorkers = 370904;
+constexpr long kOwnReferenceForWorkers = 370905;
+constexpr long kBlankAtEnd = 370909;
+constexpr long kConditionInMacro = 370910;
+constexpr long kLoopInProcesses = 370911;
+constexpr long kSameLoopName = 370912;
 
 }  // namespace custom_messages

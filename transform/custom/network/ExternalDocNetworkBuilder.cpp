@@ -10,6 +10,8 @@
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
 
+#include <map>
+
 using orx::Rule;
 
 void ExternalDocNetwork::build(const IXMLComponentReader& reader, const QString& subDocumentName,
@@ -34,6 +36,7 @@ void ExternalDocNetwork::Builder::build() {
   for (const LinkStruct& record : m_reader.GetAttributeLinkList(m_document))
     addAttributeLink(record);
   addParameters();
+  checkLoops();
   m_network.doneAdding(true);
 }
 
@@ -58,6 +61,7 @@ bool ExternalDocNetwork::Builder::enter(int identifier, const Place& place) {
 void ExternalDocNetwork::Builder::addPorts() {
   int inputs = 0;
   int outputs = 0;
+  std::map<Kind, QHash<QString, int>> lines;
   for (const SubDocumentIOStruct& record : m_reader.GetSubDocumentIOList(m_document)) {
     Place place;
     place.line = record.line;
@@ -65,32 +69,34 @@ void ExternalDocNetwork::Builder::addPorts() {
     QStringList attributes;
     for (const SubDocumentIOAttrStruct& attribute : record.attributes)
       attributes.append(attribute.attrName);
-    switch (record.isSource) {
-      case SubDocumentIOKind::Input:
-        place.kind = Kind::Input;
-        if (!enter(record.identifier, place))
-          break;
+    place.kind = record.isSource == SubDocumentIOKind::Input    ? Kind::Input
+                 : record.isSource == SubDocumentIOKind::Output ? Kind::Output
+                                                                : Kind::Loop;
+    // The network has room for one of each name.
+    QHash<QString, int>& known = lines[place.kind];
+    const auto earlier = known.constFind(record.name);
+    place.isLeftOut = earlier != known.constEnd();
+    if (place.isLeftOut)
+      report(Rule::DuplicateName, record.line, record.name, custom_messages::kDuplicateName,
+             {record.name, QString::number(*earlier)});
+    else
+      known.insert(record.name, record.line);
+    if (!enter(record.identifier, place) || place.isLeftOut)
+      continue;
+    switch (place.kind) {
+      case Kind::Input:
         m_network.addInput(record.name, record.identifier, inputs++);
         m_network.setStaticInputAttributes(record.name, attributes);
         break;
-      case SubDocumentIOKind::Output:
-        place.kind = Kind::Output;
-        if (!enter(record.identifier, place))
-          break;
+      case Kind::Output:
         m_network.addOutput(record.name, record.identifier,
                             record.attrMode == kOutgoingOwnList ? kOutgoingOwnList : kOutgoingArriving,
                             attributes, outputs++);
         break;
-      case SubDocumentIOKind::Loop:
-        place.kind = Kind::Loop;
-        if (enter(record.identifier, place))
-          m_network.addLoop(record.name, record.identifier);
-        break;
+      default:
+        m_network.addLoop(record.name, record.identifier);
     }
   }
-  if (m_network.blockedLooping() && m_network.getLoops().isEmpty())
-    report(Rule::CustomTransformerFault, m_reader.GetDocumentLine(m_document), QString(),
-           custom_messages::kNoLoop, {});
   const QStringList inputNames = m_network.getInputs();
   const QSet<QString> taken(inputNames.begin(), inputNames.end());
   for (const QString& output : m_network.getOutputs()) {
@@ -289,6 +295,34 @@ void ExternalDocNetwork::Builder::addAttributeLink(const LinkStruct& record) {
   QString tag;
   if (from != to && findPort(record, *source, true, port, QString(), tag))
     m_network.nodeByNumber(record.sourceNode)->addAttributeCopy(tag, from, to);
+}
+
+// Features come back at the first loop point alone, and only where the whole is repeated.
+void ExternalDocNetwork::Builder::checkLoops() {
+  const QStringList loops = m_network.getLoops();
+  if (m_network.blockedLooping() && loops.isEmpty())
+    report(Rule::CustomTransformerFault, m_reader.GetDocumentLine(m_document), QString(),
+           custom_messages::kNoLoop, {});
+  for (const QString& output : m_network.getOutputs()) {
+    if (loops.contains(output) || (!loops.isEmpty() && output == m_network.getLoopOutput()))
+      report(Rule::DuplicateName, m_reader.GetDocumentLine(m_document), output,
+             custom_messages::kSameLoopName, {output});
+  }
+  for (const SubDocNetworkObj* node : m_network.nodes()) {
+    if (node->kind() != SubDocNetworkObj::Kind::Loop ||
+        (m_network.blockedLooping() && node->name() == loops.first()))
+      continue;
+    const int line = m_places.value(node->number()).line;
+    const bool isLost =
+        !m_network.blockedLooping() && !(node->feeders().empty() && node->consumers().empty());
+    if (isLost)
+      report(Rule::CustomTransformerFault, line, node->name(), custom_messages::kLostLoop, {node->name()});
+    else if (m_network.blockedLooping())
+      report(Rule::LoopPoint, line, node->name(), custom_messages::kSecondLoop,
+             {node->name(), loops.first()});
+    else
+      report(Rule::LoopPoint, line, node->name(), custom_messages::kIdleLoop, {node->name()});
+  }
 }
 
 // --- parameters --------------------------------------------------------------------------------------------

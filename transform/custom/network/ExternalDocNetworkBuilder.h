@@ -33,6 +33,7 @@ class ExternalDocNetwork::Builder {
   void addLink(const LinkStruct& record);
   void addAttributeLink(const LinkStruct& record);
   void addParameters();
+  void checkLoops();
 
   bool enter(int identifier, const Place& place);
   // False, with a problem, when an end is unknown; also false, without one, when an end is left out.

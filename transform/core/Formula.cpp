@@ -1,5 +1,5 @@
+#include <transform/core/Formula.h>
 #include <transform/core/Keywords.h>
-#include <transform/specialised/values/Formula.h>
 #include <transform/text/MessageStrings.h>
 
 #include <algorithm>

@@ -1,0 +1,56 @@
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/AttributeReferences.h>
+#include <transform/core/ExpressionWriter.h>
+#include <transform/core/Formula.h>
+#include <transform/core/FormulaChecks.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/TransformParamCfg.h>
+
+namespace {
+
+const QLatin1String kExpressionType("EXPRESSION");
+const QLatin1Char kPartSeparator(';');
+
+void add(QStringList& formulas, const QString& text, bool isEncoded) {
+  const QString decoded = isEncoded ? QORXWwjdDecode(text) : text;
+  const bool isUnset = decoded.trimmed().isEmpty() || text == kUnusedValue || decoded == kUnusedValue;
+  if (!isUnset && !decoded.contains(kMacroOpen) && !decoded.contains(kDeferredOpen)) {
+    formulas.append(decoded);
+  }
+}
+
+}  // namespace
+
+QStringList formulasIn(const GUIType& type, const QString& value) {
+  const bool isExpression = type.getType().startsWith(kExpressionType);
+  const bool isComputed = isExpression || ExpressionWriter::isComputed(type);
+  QStringList formulas;
+  if (!value.startsWith(kConditionalPrefix)) {
+    if (isExpression || (isComputed && ExpressionWriter::needsWrapping(type, value))) {
+      add(formulas, value, type.valueIsEncoded());
+    }
+    return formulas;
+  }
+  const QStringList parts = value.mid(kConditionalPrefix.size()).split(kPartSeparator);
+  for (int i = 0; i < parts.size(); ++i) {
+    const bool isResult = i % 2 == 1 || i + 1 == parts.size();
+    if (isComputed || !isResult) {
+      add(formulas, parts.at(i), true);
+    }
+  }
+  return formulas;
+}
+
+QString findFormulaFault(const TransformParamCfg& parameter, const QString& value) {
+  QString message;
+  forEachPart(parameter, value, [&message](const GUIType& type, const QString& part) {
+    const QStringList formulas = message.isEmpty() ? formulasIn(type, part) : QStringList();
+    for (const QString& text : formulas) {
+      const Formula formula(text);
+      if (message.isEmpty() && !formula.isValid()) {
+        message = formula.faultMessage();
+      }
+    }
+  });
+  return message;
+}
