@@ -6,6 +6,7 @@
 #include <transform/core/LookupChecks.h>
 #include <transform/core/generation/LookupWriters.h>
 #include <transform/text/MessageStrings.h>
+#include <transform/text/TextPlaces.h>
 
 #include <gtest/gtest.h>
 
@@ -437,6 +438,7 @@ TEST(Lookups, KnownMacrosFitOrAreRefused) {
 
 TEST(Lookups, FaultsAreFoundBeforeWriting) {
   using namespace lookup_checks;
+  using namespace text_refusals;
   struct Case {
     TestParameter parameter;
     QString line;
@@ -470,6 +472,17 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P Q", "LOOKUP_CHOICE A,a", "$(G)"}, "K", kNameInMacro},
       {{"XFORMER_NAME", "TEXT", "a\"$(G)"}, "K $(XFORMER_NAME)", kIdentifierInScript},
       {{"XFORMER_NAME", "TEXT", "a\" b\\"}, "K $(XFORMER_NAME)", 0},
+      {{"XFORMER_NAME", "TEXT", "a\\\" b"}, "K $(XFORMER_NAME)", kNoWord},
+      {{"P", "TEXT", "a\\\" b"}, "K $(ORX_PARM_VAL_LIST)", kNoWord},
+      {{"P", "TEXT", "a\\\" b"}, "K $(P)", 0},
+      {{"P", "INT", "1 OUTPUT X"}, "K $(P)", kKeywordInValue},
+      {{"P", "TEXT", "KEY"}, "FACTORY_DEF * F FACTORY_NAME n KEY $(P)", kKeywordInValue},
+      {{"P", "TEXT", "F n"}, "FACTORY_DEF * F FACTORY_NAME n KEY $(P)", 0},
+      {{"P", "TEXT_OR_ATTR", "\""}, "K $(P)", kOpenInValue},
+      {{"P", "TEXT", "@EvaluateExpression("}, "K $(P)", kCallInValue},
+      {{"P", "TEXT_OR_ATTR", "@Value(a(b)"}, "K $(P)", 0},
+      {{"P", "TEXT_ENCODED", "two words"}, "K $(P)", kNotEncoded},
+      {{"P", members, "A,\"1 OUTPUT X\",B,y"}, "K $(A)", kKeywordInValue},
   };
   RunTimeListener listener;
   for (const Case& c : cases) {

@@ -2,7 +2,9 @@
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/definition/CompiledTemplate.h>
 #include <transform/core/generation/OrderedSubstitution.h>
+#include <transform/core/generation/WrittenValues.h>
 
+#include <QRegularExpression>
 #include <gtest/gtest.h>
 
 #include <random>
@@ -231,6 +233,106 @@ TEST(Tokens, SinglePassEqualsOrder) {
     single += cfg->definition()->compiledTemplate && cfg->definition()->compiledTemplate->isPlain();
   }
   EXPECT_GT(single, 1500);  // else the single pass is not tried
+}
+
+// Texts that are tokens themselves, wherever they come from; and one text many times.
+TEST(Tokens, SinglePassEqualsOrderForEveryText) {
+  const QStringList texts{"n",
+                          "$(A)",
+                          "$(ORX_UUID)",
+                          "$(XFORMER_NAME_ENCODED)",
+                          "$(XFORMER_SCHEMA)",
+                          "$(INPUT_LINES)",
+                          "<dollarsign><leftparenthesis>A<rightparenthesis>"};
+  const QStringList lines{"F $(XFORMER_NAME_ENCODED) $(ORX_UUID) $(INPUT_LINES)",
+                          "$(XFORMER_SCHEMA) $(A) $(L)", "V $(ORX_PARM_VAL_LIST) $(XFORMER_NAME)"};
+  for (const QString& name : texts) {
+    for (const QString& value : texts) {
+      for (const QString& flow : texts) {
+        TestDefinition definition{{"IN"}, {}, {}, lines};
+        definition.parameters = {
+            {"XFORMER_NAME", "TEXT", name},
+            {"A", "TEXT_ENCODED", value},
+            {"L", "LOOKUP_LISTBOX k,<dollarsign><leftparenthesis>A<rightparenthesis>%l,m", "l k"}};
+        StepwiseCfg stepwise;
+        TransformerCfg single;
+        QStringList written;
+        for (TransformerCfg* cfg : {static_cast<TransformerCfg*>(&stepwise), &single}) {
+          configure(*cfg, definition);
+          cfg->addInputFeatureType("IN", flow);
+          cfg->setInputAttributes("IN", {"a$(A)"});
+          written << statementsOf(*cfg).join('|');
+        }
+        EXPECT_EQ(written[0].toStdString(), written[1].toStdString());
+      }
+    }
+  }
+  const QString large(100000, 'x');
+  const TestDefinition definition{{},
+                                  {},
+                                  {{"P", "TEXT", large}, {"Q", "TEXT", "$(R)"}, {"R", "TEXT", "r"}},
+                                  {QString("$(P) ").repeated(102), "$(Q)"}};
+  const QStringList statements = statementsOf(*makeCfg(definition));
+  EXPECT_EQ(statements, QStringList({QString(large + ' ').repeated(102).trimmed(), "r"}));
+}
+
+// Says in which order it is asked.
+class LoggingCfg : public TransformerCfg {
+ public:
+  QString getParameterValueForMappingFile(const QString& name, const TransformParamCfg* parameter,
+                                          MFBuffer& buffer) const override {
+    log += name.left(1);
+    return TransformerCfg::getParameterValueForMappingFile(name, parameter, buffer);
+  }
+  void substInputs(QStringList& lines) const override {
+    log += '<';
+    TransformerCfg::substInputs(lines);
+  }
+  void substOutputs(QStringList& lines) const override {
+    log += '>';
+    TransformerCfg::substOutputs(lines);
+  }
+  mutable QString log;
+};
+
+TEST(Tokens, PortsComeBeforeValues) {
+  LoggingCfg cfg;
+  configure(cfg, {{}, {}, {{"A", "TEXT", "$(B)"}, {"B", "TEXT", "b"}}, {"$(A) $(B)"}});
+  EXPECT_EQ(statementsOf(cfg), QStringList("b b"));
+  EXPECT_TRUE(cfg.log.startsWith("<>") && cfg.log.count('<') == 1) << cfg.log.toStdString();
+}
+
+TEST(Tokens, ValuesThatAreNotNeededNeverShow) {
+  const QStringList tokens{"$(A)", "$(C)", "$(XFORMER_NAME)", "$(ORX_UUID)", "$(XFORMER_NAME_ENCODED)", "x "};
+  std::mt19937 random(23);
+  int unwritten = 0;
+  for (int round = 0; round < 500; ++round) {
+    QStringList lines{round % 10 ? "F" : "F $(ORX_PARM_VAL_LIST)"};
+    for (unsigned i = random() % 5; i > 0; --i)
+      lines << "K " + replaceOne(tokens, random);
+    TestDefinition definition{{}, {}, {}, lines, false, round % 2 ? "G" : ""};
+    definition.parameters = {{"A", "TEXT", "a"},
+                             {"B", "GROUP A", "b"},
+                             {"C", "CHOICE k%l", "k", "C", {"k,stored"}},
+                             {"G", "ATTR_LIST", "g"},
+                             {"XFORMER_NAME", "TEXT", "n"}};
+    const auto written = [&] {
+      QStringList statements = statementsOf(*makeCfg(definition));
+      // The list for the workers holds every value.
+      return statements.replaceInStrings(QRegularExpression("TRANSFORMER_PARAMS:\\S*"), QString());
+    };
+    const QStringList before = written();
+    const auto cfg = makeCfg(definition);
+    const WrittenValues needed(*cfg, false);
+    for (TestParameter& parameter : definition.parameters) {
+      if (needed.contains(*cfg->getParameterByMacroName(parameter.name)))
+        continue;
+      ++unwritten;
+      parameter.value = "changed";
+      EXPECT_EQ(written(), before) << parameter.name.toStdString() << lines.join('|').toStdString();
+    }
+  }
+  EXPECT_GT(unwritten, 500);
 }
 
 }  // namespace

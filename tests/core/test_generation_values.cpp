@@ -1,7 +1,7 @@
 #include "GenerationSetup.h"
 #include <platform/orxparameter/MemberList.h>
 #include <platform/qorxcore/Lists.h>
-#include <transform/core/MacroText.h>
+#include <transform/text/MacroText.h>
 
 #include <QRegularExpression>
 #include <gtest/gtest.h>
@@ -26,7 +26,7 @@ TEST(Values, WhatIsWritten) {
   const Case cases[] = {
       {"TEXT", "a \"b\" c", "a \"b\" c"},
       {"TEXT", "orx_basicstring:x:y", "y"},
-      {"TEXT", "@Value(a) and", "@Value(a) and"},
+      {"TEXT", "@Value(a) and", "@EvaluateExpression(FDIV,STRING,P,@Value(a)<space>and)"},
       {"TEXT", "@Value(a)", "@EvaluateExpression(FDIV,STRING,P,@Value(a))"},
       {"TEXT_ENCODED", "a\\tb\\q", "a\tb\\q"},
       {"TEXT_ENCODED", "@Value<leftparenthesis>a<space>b<rightparenthesis>",

@@ -31,7 +31,11 @@ def encode(text):
 
 
 def decode(word):
-    return re.sub(r"<([a-z0-9]+)>", lambda found: NAMED.get(found[1], found[0]), word)
+    def text(found):
+        number = re.fullmatch("u([0-9a-f]{4,5})", found[1])
+        return chr(int(number[1], 16)) if number else NAMED.get(found[1], found[0])
+
+    return re.sub(r"<([a-z0-9]+)>", text, word)
 
 
 def call_end(text, start):

@@ -1,10 +1,10 @@
 #include "SpecialisedSetup.h"
 
 #include <platform/session/ORXSession.h>
-#include <transform/core/MacroText.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/specialised/TransformerCfgFactory.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MacroText.h>
 
 #include <QBuffer>
 #include <gtest/gtest.h>

@@ -350,4 +350,60 @@ TEST(CustomTranslation, InstancesLeaveTheParametersAroundThemAsTheyAre) {
   }
 }
 
+TEST(CustomTranslation, WhatNoStatementCanCarryIsRefused) {
+  const QString script = "GUI OPTIONAL TEXT_EDIT_TCL_PARM S Script";
+  const QStringList looping{"BLOCKED_LOOPING", "yes"};
+  const QStringList parallel{"PARALLELISM", "MODERATE"};
+  const struct {
+    const char* promise;
+    QString name;          // of the instance
+    QString port;          // its input
+    QStringList settings;  // of the custom transformer
+    QStringList values;    // of the instance
+    QStringList inner;     // values of an instance further in, which stands there when there are some
+    QStringList diagnostics;
+  } cases[] = {
+      {"an ordinary one", "Tidy Area", "MY IN", {}, {}, {}, {}},
+      {"without a script", "Tidy Area", "IN", {}, {"S", ""}, {"S", ""}, {}},
+      {"a script", "Tidy", "IN", {}, {"S", "return<space>1"}, {}, {}},
+      {"a blank before a script",
+       "Tidy Area",
+       "IN",
+       {},
+       {"S", "return<space>1"},
+       {},
+       {"unwritable-value Tidy Area"}},
+      {"a script further in",
+       "Tidy Area",
+       "IN",
+       {},
+       {},
+       {"S", "return<space>1"},
+       {"unwritable-value Tidy Area"}},
+      {"a loop", "Tidy", "IN", looping, {"ITERATION_COUNT_ATTR", "n"}, {}, {}},
+      {"a counter", "Tidy", "IN", looping, {"ITERATION_COUNT_ATTR", "my n"}, {}, {"unwritable-value Tidy"}},
+      {"the port of a loop", "Tidy", "MY IN", looping, {}, {}, {"unwritable-value Tidy"}},
+      {"a port beside workers", "Tidy", "FEATURE_TYPE", parallel, {}, {}, {"unwritable-value Tidy"}},
+      {"a group", "Tidy", "IN", parallel, {"ORX_PROCESS_GROUP_BY", "a\\\" b"}, {}, {"unwritable-value Tidy"}},
+      {"a port in quotes", "Tidy", "I\"N", {}, {}, {}, {"unwritable-value Tidy"}},
+      {"a name in quotes", "Tidy\"", "IN", {}, {}, {}, {"unwritable-value Tidy\""}},
+  };
+  for (const auto& test : cases) {
+    SmallWorkspace workspace;
+    const QStringList own{"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", test.name};
+    workspace.transformer(3, kInstance, own + test.values);
+    workspace.beginCustom("Cleaner", test.settings)
+        .parameter(script, "")
+        .port(1, test.port, "true")
+        .port(2, "L", "loop");
+    if (!test.inner.isEmpty())
+      workspace.transformer(5, kInstance,
+                            QStringList{"SUB_DOC_NAME", "Inner", "XFORMER_NAME", "I"} + test.inner);
+    workspace.endCustom().beginCustom("Inner").parameter(script, "").endCustom();
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.diagnostics, test.diagnostics)
+        << test.promise << outcome.texts.join('\n').toStdString();
+  }
+}
+
 }  // namespace

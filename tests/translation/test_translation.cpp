@@ -395,6 +395,32 @@ TEST(Translation, RefusesWhatItCannotTranslate) {
        }),
        {"unwritable-value N"}},
       {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "1 OUTPUT X"});
+       }),
+       {"unwritable-value N"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "a OUTPUT x FEATURE_TYPE y"});
+       }),
+       {"unwritable-value N"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "@EvaluateExpression("});
+       }),
+       {"unwritable-value N"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "\""});
+       }),
+       {"unwritable-value N"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "P"});
+       }),
+       {"unwritable-value N"}},
+      {with([](auto& w) {
+         w.transformer(7, "Copy", {"XFORMER_NAME", "a\\\" b"});
+       }),
+       {"unwritable-value a\\\" b"}},
+      {with([](auto& w) { w.reader(9, "a\\\" b").link(9, "fo 0", 3, "fi 0 INPUT"); }),
+       {"unwritable-value a\\\" b"}},
+      {with([](auto& w) {
          w.transformer(7, "Nothing", {})
              .transformer(8, "Copy", {"XFORMER_NAME", "C"})
              .link(3, "fo 8", 2, "fi 0");

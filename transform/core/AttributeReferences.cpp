@@ -3,8 +3,8 @@
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformParamCfg.h>
+#include <transform/core/ValueReferences.h>
 
-#include <algorithm>
 #include <vector>
 
 namespace {
@@ -12,88 +12,6 @@ namespace {
 const QLatin1Char kSeparator(',');
 // Lists of lists go no deeper; every level of a name costs a copy of it.
 constexpr int kDeepestList = 16;
-
-// The two forms of a reference differ in how its brackets are written.
-struct ReferenceForm {
-  QLatin1String mark;  // up to and with the opening bracket
-  QLatin1String open;
-  QLatin1String close;
-  bool isEncoded;
-};
-
-const ReferenceForm kPlainForm{kValueReference, QLatin1String("("), QLatin1String(")"), false};
-const ReferenceForm kEncodedForm{kValueReferenceEncoded, kEncodedLeftParenthesis, kEncodedRightParenthesis,
-                                 true};
-
-struct OpenBracket {
-  int nameStart;  // -1 for a bracket that opens no reference
-};
-
-QStringRef rest(const QString& text, int position) {
-  return text.midRef(position);
-}
-
-QString referenceName(const QString& text, int start, int end, bool isEncoded) {
-  QString name = text.mid(start, end - start);
-  if (isEncoded) {
-    name = QORXWwjdDecode(name);
-  }
-  if (name.size() >= 2 && name.startsWith(QLatin1Char('"')) && name.endsWith(QLatin1Char('"'))) {
-    name = name.mid(1, name.size() - 2);
-  }
-  return name;
-}
-
-void collectReferences(const QString& text, const ReferenceForm& form, QStringList& names) {
-  if (!text.contains(form.mark)) {
-    return;
-  }
-  const QChar markStart = form.mark.at(0);
-  const QChar openStart = form.open.at(0);
-  const QChar closeStart = form.close.at(0);
-  std::vector<OpenBracket> open;
-  std::vector<int> closes;
-  for (int i = 0; i < text.size();) {
-    const QChar c = text.at(i);
-    if (c == markStart && rest(text, i).startsWith(form.mark)) {
-      if (!open.empty()) {
-        open.back().nameStart = -1;
-      }
-      i += form.mark.size();
-      open.push_back({i});
-    } else if (c == openStart && rest(text, i).startsWith(form.open)) {
-      open.push_back({-1});
-      i += form.open.size();
-    } else if (c == closeStart && rest(text, i).startsWith(form.close)) {
-      if (!open.empty()) {
-        if (open.back().nameStart >= 0) {
-          names.append(referenceName(text, open.back().nameStart, i, form.isEncoded));
-        }
-        open.pop_back();
-      }
-      closes.push_back(i);
-      i += form.close.size();
-    } else {
-      ++i;
-    }
-  }
-  // A name with a bracket that is never closed ends at the first closing one.
-  for (const OpenBracket& bracket : open) {
-    const auto close = std::lower_bound(closes.begin(), closes.end(), bracket.nameStart);
-    if (bracket.nameStart >= 0 && close != closes.end()) {
-      names.append(referenceName(text, bracket.nameStart, *close, form.isEncoded));
-    }
-  }
-}
-
-bool isUnset(const QString& value) {
-  return value.isEmpty() || value == kUnusedValue;
-}
-
-bool holdsReference(const QString& value) {
-  return value.contains(kValueReference) || value.contains(kValueReferenceEncoded) ||
-         value.contains(kValueReferenceWord);
-}
 
 bool namesOneAttribute(const GUIType& type) {
   const QString& word = type.getType();
@@ -123,27 +41,15 @@ QString withoutIndexes(const QString& name) {
 
 }  // namespace
 
-QStringList valueReferences(const QString& text) {
-  QStringList names;
-  collectReferences(text, kPlainForm, names);
-  if (text.contains(kValueReferenceWord)) {
-    collectReferences(QString(text).replace(kValueReferenceWord, kValueReferenceEncoded), kEncodedForm,
-                      names);
-  } else {
-    collectReferences(text, kEncodedForm, names);
-  }
-  return names;
-}
-
 QStringList listedAttributeNames(const GUIType& type, const QString& value) {
-  if (isUnset(value) || value.startsWith(kConditionalPrefix)) {
+  if (isUnsetValue(value) || value.startsWith(kConditionalPrefix)) {
     return QStringList();
   }
   const QStringList pieces =
       namesOneAttribute(type) ? QStringList(value) : QORXSdfStringToList(value, kSeparator);
   QStringList names;
   for (const QString& piece : pieces) {
-    if (piece.isEmpty() || piece.contains(kMacroOpen) || holdsReference(piece)) {
+    if (piece.isEmpty() || piece.contains(kMacroOpen) || beginsValueReference(piece)) {
       continue;
     }
     const QString name = piece.startsWith(QLatin1Char('&')) ? piece.mid(1) : piece;
@@ -178,14 +84,17 @@ void AttributeReferences::addParameter(const TransformParamCfg& parameter, const
 }
 
 void AttributeReferences::addValue(const GUIType& type, const QString& value) {
-  if (isUnset(value)) {
+  if (isUnsetValue(value)) {
     return;
   }
-  const QStringList references = valueReferences(value);
-  for (const QString& name : references) {
-    add(name, false);
+  const std::vector<ValueReference> references = valueReferences(value);
+  for (const ValueReference& reference : references) {
+    // What a reference to a macro brings is only known when the mapping file runs.
+    if (!reference.word.contains(kMacroOpen)) {
+      add(reference.name, false);
+    }
   }
-  if (references.isEmpty() && type.getType().startsWith(kAttributeType)) {
+  if (references.empty() && type.getType().startsWith(kAttributeType)) {
     const bool mayBeNew = type.getConfigToken().contains(kAllowNew);
     const QStringList names = listedAttributeNames(type, value);
     for (const QString& name : names) {
@@ -195,8 +104,7 @@ void AttributeReferences::addValue(const GUIType& type, const QString& value) {
 }
 
 void AttributeReferences::add(const QString& name, bool mayBeNew) {
-  // What the value names is only known when the mapping file runs.
-  if (name.isEmpty() || name.contains(kMacroOpen)) {
+  if (name.isEmpty()) {
     return;
   }
   if (!m_known.contains(name)) {

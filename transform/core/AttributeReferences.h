@@ -18,10 +18,6 @@ class TransformParamCfg;
 void forEachPart(const TransformParamCfg& parameter, const QString& value,
                  const std::function<void(const GUIType& type, const QString& part)>& visit);
 
-// The names of the references "@Value(NAME)" in a text, in the order in which they end. Brackets inside a
-// name count when they are matched; of references inside one another only the innermost counts.
-QStringList valueReferences(const QString& text);
-
 // The names that a value lists as a whole, decoded: one for single attribute types, those between ","
 // otherwise. None for an unset or conditional value, and none that is only known at run time.
 QStringList listedAttributeNames(const GUIType& type, const QString& value);

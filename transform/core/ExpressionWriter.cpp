@@ -3,98 +3,18 @@
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/MacroText.h>
-
-#include <vector>
+#include <transform/core/ValueReferences.h>
+#include <transform/text/MacroText.h>
 
 namespace {
 
 const QLatin1String kFractionsMark("FDIV,");
 const QLatin1String kChoose("@Choose(");
-const QLatin1String kExpressionType("EXPRESSION");
 const QLatin1String kIntegerTypes("INT");
 const QLatin1String kFloatTypes("FLOAT");
 const QLatin1String kSliderTypes("RANGE_SLIDER");
 const QLatin1String kTextResult("STRING");
 const QLatin1Char kPartSeparator(';');
-
-struct Reference {
-  int begin;
-  int nameBegin;
-  int nameEnd;
-  int end;
-  bool isEncoded;
-};
-
-bool standsAt(const QString& text, int position, QLatin1String word) {
-  return text.midRef(position, word.size()) == word;
-}
-
-// The references of a text, in order. Brackets inside a name count when they are matched; of references
-// inside one another only the innermost is one; one that is never closed is text.
-std::vector<Reference> findReferences(const QString& text) {
-  std::vector<Reference> references;
-  struct Bracket {
-    int begin;  // of the reference; -1 for a bracket that opens none
-    int nameBegin;
-    bool isEncoded;
-  };
-  std::vector<Bracket> open;
-  const auto openReference = [&](int& position, QLatin1String mark, bool isEncoded) {
-    for (auto outer = open.rbegin(); outer != open.rend() && outer->begin >= 0; ++outer) {
-      outer->begin = -1;
-    }
-    open.push_back({position, position + mark.size(), isEncoded});
-    position += mark.size() - 1;
-  };
-  for (int i = 0; i < text.size(); ++i) {
-    switch (text.at(i).unicode()) {
-      case u'@':
-        if (standsAt(text, i, kValueReference)) {
-          openReference(i, kValueReference, false);
-        } else if (standsAt(text, i, kValueReferenceEncoded)) {
-          openReference(i, kValueReferenceEncoded, true);
-        }
-        break;
-      case u'(':
-        open.push_back({-1, i, false});
-        break;
-      case u'<':
-        if (standsAt(text, i, kValueReferenceWord)) {
-          openReference(i, kValueReferenceWord, true);
-        } else if (standsAt(text, i, kEncodedLeftParenthesis)) {
-          open.push_back({-1, i, true});
-        } else if (standsAt(text, i, kEncodedRightParenthesis) && !open.empty() && open.back().isEncoded) {
-          if (open.back().begin >= 0) {
-            references.push_back(
-                {open.back().begin, open.back().nameBegin, i, i + kEncodedRightParenthesis.size(), true});
-          }
-          open.pop_back();
-        }
-        break;
-      case u')':
-        if (!open.empty() && !open.back().isEncoded) {
-          if (open.back().begin >= 0) {
-            references.push_back({open.back().begin, open.back().nameBegin, i, i + 1, false});
-          }
-          open.pop_back();
-        }
-        break;
-      default:
-        break;
-    }
-  }
-  return references;
-}
-
-bool isWholeReference(const QString& value) {
-  if (!value.startsWith(kValueReference) && !value.startsWith(kValueReferenceEncoded) &&
-      !value.startsWith(kValueReferenceWord)) {
-    return false;
-  }
-  const std::vector<Reference> references = findReferences(value);
-  return references.size() == 1 && references.front().begin == 0 && references.front().end == value.size();
-}
 
 // Text with its references; everything else word-encoded, whatever it was before.
 QString body(const QString& text, bool encoded) {
@@ -104,16 +24,8 @@ QString body(const QString& text, bool encoded) {
   };
   QString result;
   int done = 0;
-  for (const Reference& reference : findReferences(text)) {
-    result += literal(done, reference.begin);
-    QString name = text.mid(reference.nameBegin, reference.nameEnd - reference.nameBegin);
-    if (reference.isEncoded) {
-      name = QORXWwjdDecode(name);
-    }
-    if (name.size() >= 2 && name.startsWith(QLatin1Char('"')) && name.endsWith(QLatin1Char('"'))) {
-      name = name.mid(1, name.size() - 2);
-    }
-    result += kValueReference + encodeAroundReferences(name) + QLatin1Char(')');
+  for (const ValueReference& reference : valueReferences(text)) {
+    result += literal(done, reference.begin) + kValueReference + reference.word + QLatin1Char(')');
     done = reference.end;
   }
   return result + literal(done, text.size());
@@ -145,11 +57,6 @@ QLatin1String expressionType(const QString& type, bool encoded) {
 
 }  // namespace
 
-bool ExpressionWriter::holdsReference(const QString& value) {
-  return value.contains(kValueReference) || value.contains(kValueReferenceEncoded) ||
-         value.contains(kValueReferenceWord);
-}
-
 bool ExpressionWriter::isComputed(const GUIType& type) {
   return !expressionType(type.getType(), false).startsWith(kTextResult);
 }
@@ -158,10 +65,12 @@ bool ExpressionWriter::needsWrapping(const GUIType& type, const QString& value) 
   if (value.startsWith(kConditionalPrefix)) {
     return true;
   }
-  if (!holdsReference(value) || type.getType().startsWith(kExpressionType)) {
+  if (!beginsValueReference(value) || type.getType().startsWith(kExpressionType)) {
     return false;
   }
-  return type.mayHoldAttributeReference() || isWholeReference(value);
+  // Bare in a statement, even what only begins like a reference is no text; wrapped it is.
+  return type.mayHoldAttributeReference() || isValueReference(value) ||
+         (!type.isNull() && !type.valueIsEncoded() && !valueReferences(value).empty());
 }
 
 QString ExpressionWriter::withStoredResults(const QString& value, const ChoiceList& choices) {

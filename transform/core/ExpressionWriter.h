@@ -21,14 +21,13 @@ class ORX_EXPORT ExpressionWriter {
   QString wrapCells(const QString& value, const QString& name, const MemberList& columns) const;
 
   // Whether the value depends on the feature: it is conditional, it is an attribute reference as a whole, or
-  // it holds one and the type may. Expressions are evaluated by their factory and stay as they are.
+  // it holds one and the type may, or has no encoding of its own. Expressions are evaluated by their factory
+  // and stay as they are; so are references inside the texts of other encoded types.
   static bool needsWrapping(const GUIType& type, const QString& value);
   // Whether what is wrapped for the type is a formula, whose result is a number.
   static bool isComputed(const GUIType& type);
   // A conditional value with the stored sides of the choices as its results; any other value as it is.
   static QString withStoredResults(const QString& value, const ChoiceList& choices);
-  // Whether the text holds an attribute reference, plain or encoded.
-  static bool holdsReference(const QString& value);
 
  private:
   const bool m_fractions;

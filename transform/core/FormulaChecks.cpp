@@ -8,7 +8,6 @@
 
 namespace {
 
-const QLatin1String kExpressionType("EXPRESSION");
 const QLatin1Char kPartSeparator(';');
 
 void add(QStringList& formulas, const QString& text, bool isEncoded) {

@@ -10,6 +10,15 @@ inline const QString kUnusedValue = QStringLiteral("<Unused>");
 // each is matched exactly.
 inline const QLatin1String kUnusedGroupBy("<UNUSED>");
 
+// Whether a parameter with the value has none.
+inline bool isUnsetValue(const QString& value) {
+  return value.isEmpty() || value == kUnusedValue;
+}
+// The same where the value may be that of a group-by parameter.
+inline bool isUnsetSetting(const QString& value) {
+  return isUnsetValue(value) || value == kUnusedGroupBy;
+}
+
 // Parameters that the system adds to transformers.
 inline const QLatin1String kIdentifierParameter("XFORMER_NAME");
 inline const QLatin1String kProcessCountParameter("ORX_PROCESS_COUNT");
@@ -30,6 +39,7 @@ inline const QLatin1String kAttributeType("ATTR");
 // Before the name of an attribute where a value may also be a text.
 inline const QLatin1Char kAttributeMark('&');
 inline const QLatin1String kNewAttributeType("NEW_ATTR");
+inline const QLatin1String kExpressionType("EXPRESSION");
 inline const QLatin1String kTextType("TEXT");
 inline const QLatin1String kTextEncodedType("TEXT_ENCODED");
 inline const QLatin1String kTextEditType("TEXT_EDIT");

@@ -1,8 +1,8 @@
 #include <platform/qorxcore/Lists.h>
 #include <transform/core/LookupChecks.h>
-#include <transform/core/MacroText.h>
-#include <transform/core/definition/TclText.h>
 #include <transform/core/generation/LookupWriters.h>
+#include <transform/text/TclText.h>
+#include <transform/text/TextPlaces.h>
 
 #include <QSet>
 
@@ -14,11 +14,11 @@ namespace {
 using namespace lookup_checks;
 
 bool fitsBraces(const QString& text) {
-  return isOneLine(text) && tcl_text::meansItselfInBraces(withoutReferences(text));
+  return TextPlaces::refuse(TextPlace::TclBraces, text) == 0;
 }
 
 bool fitsQuotes(const QString& text) {
-  return isOneLine(text) && tcl_text::meansItselfInQuotes(withoutReferences(text));
+  return TextPlaces::refuse(TextPlace::TclQuotes, text) == 0;
 }
 
 // A name that is one word of a macro line, of a reference and of a script.
@@ -137,22 +137,6 @@ bool mapsEverySelection(const ChoiceList& choices) {
 }  // namespace
 
 namespace lookup_checks {
-
-bool isOneLine(const QString& text) {
-  for (int i = 0; i < text.size(); ++i) {
-    const QChar c = text.at(i);
-    if (c == QLatin1Char('\n') || c == QLatin1Char('\r') || c.isNull()) {
-      return false;
-    }
-    if (c.isSurrogate()) {
-      if (!c.isHighSurrogate() || i + 1 == text.size() || !text.at(i + 1).isLowSurrogate()) {
-        return false;
-      }
-      ++i;
-    }
-  }
-  return true;
-}
 
 bool fitsFragment(const QString& text) {
   return fitsQuotes(text);

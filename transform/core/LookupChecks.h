@@ -21,13 +21,6 @@ ORX_EXPORT long refuseChoiceProcedure(const ChoiceList& choices, const QString& 
 // Whether a text means itself wherever it stands in a fragment.
 ORX_EXPORT bool fitsFragment(const QString& text);
 
-// Characters that no line of the mapping file can carry: line breaks, null characters, broken surrogate
-// pairs.
-ORX_EXPORT bool isOneLine(const QString& text);
-
-constexpr long kBreaksLine = 370720;
-constexpr long kUnclosedReference = 370721;
-constexpr long kEndsInBackslash = 370722;
 constexpr long kValueInScript = 370723;
 constexpr long kChoiceInScript = 370724;
 constexpr long kPromptInScript = 370725;

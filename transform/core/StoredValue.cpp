@@ -3,12 +3,6 @@
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformParamCfg.h>
 
-namespace {
-
-const QLatin1String kExpressionType("EXPRESSION");
-
-}  // namespace
-
 bool isMemberOf(const TransformParamCfg& record, const QString& name) {
   return record.isMultiParameter() && record.getName() != name;
 }

@@ -24,7 +24,7 @@ class ORX_EXPORT TransformParamCfg : public GUIType {
   // What setValue() is to be given for this record to hold `value`, which was stored in a record before.
   QString settable(const QString& value) const;
   // Empty or "<Unused>".
-  bool isUnset() const { return m_value.isEmpty() || m_value == kUnusedValue; }
+  bool isUnset() const { return isUnsetValue(m_value); }
 
   // The type and, unless empty or `""`, a blank and the configuration.
   QString getTypeWithConfig() const;

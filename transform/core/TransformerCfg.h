@@ -6,8 +6,8 @@
 // listener, the session and the directories set on it are not owned and must outlive it. Used by one thread
 // at a time.
 //
-// The virtual operations stand in the order of their slots, which callers compiled elsewhere rely on: add new
-// ones behind the last.
+// The virtual operations stand in the order of their slots, which callers compiled elsewhere rely on: none is
+// added.
 #pragma once
 
 #include <platform/Export.h>
@@ -35,6 +35,7 @@ class ConfiguredDefinition;
 class DefinitionDirectory;
 class IORXSession;
 class MFBuffer;
+class OrderedSubstitution;
 class ParameterSubstitution;
 class QTextStream;
 class TemplateExpansion;
@@ -218,10 +219,6 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   virtual void substOutputs(QStringList& lines) const;
   virtual void substParametersForToolTips(QStringList& lines) const;
   virtual void addAttributesToList(const AddAttributesInfo& info, QStringList& result) const;
-  // Whether substInputs() and substOutputs() are those of TransformerCfg, so that the ports may be filled in
-  // together with the parameters. The base answers for its own class alone, so every other class is asked
-  // step by step; one that overrides neither may answer `typeid(*this) == typeid(ThatClass)`.
-  virtual bool hasPlainPorts() const;
 
   // --- configuration ---------------------------------------------------------------------------------------
 
@@ -440,11 +437,20 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
 
   // The statements of this instance, without writing them. False when values insert each other without end.
   bool expandTemplate(MFBuffer& buffer, QStringList& lines);
-  bool expandInOrder(const ParameterSubstitution& values, QStringList& lines);
-  bool fillPorts(TemplateExpansion& expansion, const CompiledTemplate& compiled,
-                 const ParameterSubstitution& values) const;
-  void fillInstanceTokens(const std::function<bool(const QString& token)>& holds,
-                          const std::function<void(const QString& token, const QString& text)>& substitute);
+  bool expandInOrder(ParameterSubstitution& values, MFBuffer& buffer, QStringList& lines) const;
+  void substParameters(ParameterSubstitution& values, MFBuffer& buffer, QStringList& lines) const;
+  // The lines that are left; notes when a substitution would have grown beyond all measure.
+  QStringList takeLines(const OrderedSubstitution& ordered) const;
+  // Whether some text that is to be inserted holds a token itself, so that the order matters.
+  bool bringsTokens(const ParameterSubstitution& values) const;
+  void fillPorts(TemplateExpansion& expansion, const CompiledTemplate& compiled) const;
+  void forEachInputText(const std::function<void(const QString& token, const QString& text)>& visit) const;
+  // The type is null for an output that leaves no trace.
+  void forEachOutputText(const std::function<void(const QString& tag, const QString* featureType,
+                                                  const QString& functions)>& visit) const;
+  void fillInstanceTokens(
+      const std::function<bool(const QString& token)>& holds,
+      const std::function<void(const QString& token, const QString& text)>& substitute) const;
   QString lookedUp(MFBuffer& buffer, const QString& name, const TransformParamCfg& record,
                    const QString& value) const;
 
@@ -457,6 +463,7 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   PortTables m_ports;
   mutable std::shared_ptr<const AttributeUnion> m_attributeUnion;  // null until asked for
   mutable const AttributePassage* m_passage = nullptr;             // while attributes are on their way
+  mutable bool m_isTooLarge = false;                               // since statements were begun
   mutable bool m_tooltipAsHtml = false;                            // while a tooltip is filled in
   bool m_tellListener = true;                                      // clear while values are restored
   QString m_bannerImageName;

@@ -1,6 +1,5 @@
 // Everything but the mapping file, which is written in CompoundMappingFile.cpp.
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/core/MacroText.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
@@ -11,6 +10,7 @@
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
+#include <transform/text/TextPlaces.h>
 
 #include <QSet>
 
@@ -140,7 +140,7 @@ QStringList CompoundTransformerCfg::resolvedAttributes(const QStringList& attrib
       if (!hasParameter(parameter))
         return false;
       value = getParameterValue(parameter, UnpackLevel::Resolved);
-      isUnset = isUnset || value.isEmpty() || value == kUnusedValue;
+      isUnset = isUnset || isUnsetValue(value);
       if (isValueEncoded(parameter))
         value = QORXWwjdDecode(value);
       return true;
@@ -192,7 +192,7 @@ bool CompoundTransformerCfg::parmValueAffectsOutputAttrs(const QString& paramete
 bool CompoundTransformerCfg::validateParameter(const QString& parameter, QString& message) const {
   const QString value = getParameterValue(parameter);
   // Whether it may be empty, or is never asked for, is the same question for scripts as for all others.
-  const bool isScript = !isUnsetScript(value) && !getParameterPrompt(parameter).isEmpty();
+  const bool isScript = !isUnsetValue(value) && !getParameterPrompt(parameter).isEmpty();
   switch (isScript ? scriptLanguage(getParameterGUIType(parameter)) : ScriptLanguage::None) {
     case ScriptLanguage::Python:
       return canWritePythonParameter(QString(), parameter, value, message);
@@ -345,7 +345,7 @@ QString CompoundTransformerCfg::instantiationFault() const {
   if (!m_network)
     return TransformResString(custom_messages::kNoInstance, getName());
   QString fault = findNameFault(getName());
-  if (fault.isEmpty() && !isMacroName(makePrefixMacro(getVisualName())))
+  if (fault.isEmpty() && TextPlaces::refuse(TextPlace::MacroName, makePrefixMacro(getVisualName())) != 0)
     fault = findNameFault(getVisualName());
   return fault.isEmpty() ? findNestingFault(*m_network) : fault;
 }

@@ -75,6 +75,8 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   // line breaks, deferred references that never close, values that a fragment inside cannot carry. One
   // message per parameter.
   QHash<QString, QString> findUnwritableParameters() const;
+  // One message for each port whose name the statements cannot carry.
+  QStringList findUnwritablePorts() const;
   // A message for the user; empty when instances can be written.
   QString instantiationFault() const;
   // The caller sees to it that every deferred reference, "$[", in a value or script is closed;
@@ -105,6 +107,8 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   long refuseApart(const QString& parameter, const GUIType& type, const QString& stored) const;
   long refuseMacroValue(const QString& parameter, const QString& value,
                         std::optional<LookedUpParameters>& lookedUp) const;
+  long refuseSetting(const QString& parameter) const;
+  bool printsMacroNames() const;
   QString macroValue(const QString& parameter, const GUIType& type, const QString& prefixMacro) const;
   // What the AttributeSetters inside, at any depth, have as their "DEST_ATTR".
   QSet<QString> attributeSetterDestinations() const;

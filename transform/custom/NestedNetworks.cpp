@@ -1,4 +1,3 @@
-#include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
@@ -7,6 +6,7 @@
 #include <transform/custom/linked/CustomMessages.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
+#include <transform/text/TextPlaces.h>
 
 #include <QHash>
 #include <QSet>
@@ -91,9 +91,10 @@ QString circle(const std::vector<OpenNetwork>& open, const CompoundTransformerNe
 
 QString findNameFault(const QString& name) {
   // It is part of the prefix macro, and a field of the definition's opening line.
-  return isMacroName(makePrefixMacro(name)) && !name.contains(QLatin1Char(',')) && name == name.trimmed()
-             ? QString()
-             : TransformResString(custom_messages::kNoMacroName, name);
+  const bool fits = TextPlaces::refuse(TextPlace::MacroName, makePrefixMacro(name)) == 0 &&
+                    TextPlaces::refuse(TextPlace::HeaderField, name) == 0 &&
+                    TextPlaces::refuse(TextPlace::Word, name) == 0;
+  return fits ? QString() : TransformResString(custom_messages::kNoMacroName, name);
 }
 
 QString findNestingFault(CompoundTransformerNetwork& root) {

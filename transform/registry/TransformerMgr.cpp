@@ -5,6 +5,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/files/ProductFiles.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/registry/catalogue/CategoryTexts.h>
 #include <transform/registry/catalogue/PrototypeTable.h>
@@ -129,7 +130,7 @@ void TransformerMgr::loadCustomTransformer(const QString& path, int version, boo
   auto prototype = std::make_unique<CompoundTransformerCfg>(m_customFiles->keep(std::move(opened.network)),
                                                             CompoundTransformerCfg::Body::Deferred);
   prototype->setDefinitionDirectory(this);
-  if (QORXPrettyUpFileName(path).startsWith(QORXOrxHome() + QLatin1Char('/')))
+  if (isProductFile(path))
     prototype->setTransformerType(TransformerCfg::kBuiltIn);
   const PrototypeTable::Place place{prototype->getName(), prototype->getVersion(), prototype->tags(),
                                     prototype->isVisible(), QStringList()};

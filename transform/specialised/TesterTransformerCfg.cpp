@@ -1,7 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/core/AttributeReferences.h>
 #include <transform/core/Formula.h>
 #include <transform/core/FormulaChecks.h>
+#include <transform/core/ValueReferences.h>
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
@@ -62,10 +62,7 @@ const Comparison* findComparison(const QString& text) {
 
 // A whole reference as the name that it holds, since the attribute's value cannot tell whether it is there.
 QString attributeNameOf(const QString& encoded) {
-  const QString text = QORXWwjdDecode(encoded);
-  const QStringList names = valueReferences(text);
-  const bool isWhole = names.size() == 1 && text == kValueReference + names.first() + QLatin1Char(')');
-  return isWhole ? QORXWwjdEncode(names.first()) : encoded;
+  return isValueReference(encoded) ? valueReferences(encoded).front().word : encoded;
 }
 
 // Whether the formula joins numbers of tests by words, and there are as many; `message` says what is wrong.

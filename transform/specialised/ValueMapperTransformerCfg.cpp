@@ -67,7 +67,7 @@ bool ValueMapperTransformerCfg::validateParameter(const QString& parameter, QStr
   for (int row = 0; row < mapping.rowCount(); ++row) {
     const QString cell = mapping.cell(row, lookedUp);
     const QString value = QORXWwjdDecode(cell);
-    if (ExpressionWriter::holdsReference(cell)) {
+    if (beginsValueReference(cell)) {
       message = TransformResString(kDiffersByFeatureMessage, mapping.prompt(lookedUp));
       return false;
     }

@@ -20,6 +20,12 @@ inline const QLatin1String kIncludeStatement("INCLUDE");
 inline const QLatin1String kIncludeCustomStatement("INCLUDE_CUSTOM_TRANSFORMER_VER");
 inline const QLatin1String kIncludeBuiltInStatement("INCLUDE_BUILTIN_CUSTOM_TRANSFORMER_VER");
 
+// The clauses of a factory.
+inline const QLatin1String kInputKeyword("INPUT");
+inline const QLatin1String kOutputKeyword("OUTPUT");
+inline const QLatin1String kFeatureTypeKeyword("FEATURE_TYPE");
+inline const QLatin1String kFactoryNameKeyword("FACTORY_NAME");
+
 // Blocks of script lines.
 inline const QLatin1String kIncludePython("INCLUDE PYTHON");
 inline const QLatin1String kIncludeTcl("INCLUDE TCL");

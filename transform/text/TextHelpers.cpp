@@ -80,21 +80,6 @@ QString quotifyString(const QString& text, const QString& specials) {
   return QORXQuotifyString(text, specials);
 }
 
-QString quotifyStringForMF(const QString& text) {
-  static const QString kSpecials = QStringLiteral(" \t()\\\"");
-  QString quoted = QORXQuotifyString(text, kSpecials);
-  if (quoted.size() < 3 || !isWrappedInQuotes(quoted)) {
-    return quoted;
-  }
-  QString inner = quoted.mid(1, quoted.size() - 2);
-  inner.replace(kQuote, QLatin1String("\\\""));
-  int trailing = 0;
-  while (trailing < inner.size() && inner[inner.size() - 1 - trailing] == kBackslash) {
-    ++trailing;
-  }
-  return kQuote + inner + QString(trailing, kBackslash) + kQuote;
-}
-
 QString quotifyDefAttrName(const QString& name) {
   if (name.size() == 1 && name[0] == kQuote) {
     return QStringLiteral("\"\\\"\"");

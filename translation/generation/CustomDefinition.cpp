@@ -1,7 +1,6 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/LookupChecks.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/ParameterScopeListener.h>
 #include <transform/core/TransformerCfg.h>
@@ -15,7 +14,9 @@
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
+#include <transform/text/TextPlaces.h>
 #include <translation/generation/CustomDefinition.h>
 #include <translation/generation/FlowNames.h>
 #include <translation/generation/MFDeviceBuffer.h>
@@ -131,8 +132,12 @@ bool CustomDefinition::prepare(orx::Findings& diagnostics) {
   for (const Part& part : m_parts)
     check(part, diagnostics);
   for (const SubDocNetworkObj* node : m_network.nodes()) {
-    if (!lookup_checks::isOneLine(node->name()))
+    const long number = TextPlaces::refuse(TextPlace::Flow, node->name());
+    if (number == text_refusals::kBreaksLine)
       diagnostics.report(Rule::LineBreak, node->line(), m_network.getName(), {node->name().simplified()});
+    else if (number != 0 && node->kind() != SubDocNetworkObj::Kind::Transformer)
+      diagnostics.reportText(Rule::UnwritableValue, node->line(), m_network.getName(),
+                             TransformResString(number));
   }
   if (diagnostics.hasErrors())
     return false;
@@ -290,6 +295,8 @@ void CustomDefinition::check(const Part& part, orx::Findings& diagnostics) const
   const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(part.cfg.get());
   const QHash<QString, QString> faults =
       custom ? custom->findUnwritableParameters() : part.cfg->findUnwritableValues();
+  for (const QString& fault : custom ? custom->findUnwritablePorts() : QStringList())
+    diagnostics.reportText(Rule::UnwritableValue, part.node->line(), title(part), fault);
   const QHash<QString, QString> replaced = InnerNames::findReplacedParameters(
       part.node->name(), *part.node->getTransformer(),
       [this](const QString& name) { return m_network.hasParameter(name); });

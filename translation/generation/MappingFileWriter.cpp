@@ -1,6 +1,4 @@
 #include <platform/qorxcore/qorxcore.h>
-#include <transform/core/LookupChecks.h>
-#include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
@@ -8,6 +6,7 @@
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
+#include <transform/text/TextPlaces.h>
 #include <translation/ProgramVersion.h>
 #include <translation/generation/FlowNames.h>
 #include <translation/generation/MappingFileWriter.h>
@@ -209,20 +208,28 @@ void MappingFileWriter::pushAttributes() {
   }
 }
 
-void MappingFileWriter::checkText(const QString& text, const QString& what, int line, const QString& node) {
-  if (!MFBuffer::closesDeferredMacros(text))
+bool MappingFileWriter::checkText(const QString& text, const QString& what, int line, const QString& node) {
+  const bool isClosed = MFBuffer::closesDeferredMacros(text);
+  if (!isClosed)
     m_diagnostics.report(Rule::UnclosedReference, line, node, {what});
-  if (text.contains(QLatin1Char('\n')) || text.contains(QLatin1Char('\r')))
+  const bool isOneLine = TextPlaces::isOneLine(text);
+  if (!isOneLine)
     m_diagnostics.report(Rule::LineBreak, line, node, {what});
+  return isClosed && isOneLine;
+}
+
+void MappingFileWriter::checkWord(const QString& text, int line, const QString& node) {
+  if (!checkText(text, text, line, node))
+    return;
+  if (const long number = TextPlaces::refuse(TextPlace::Flow, text))
+    m_diagnostics.reportText(Rule::UnwritableValue, line, node, TransformResString(number));
 }
 
 void MappingFileWriter::checkParameter(const GlobalParameters::Parameter& parameter, const QString& value) {
-  checkText(value, parameter.name, parameter.line, QString());
-  long reason = 0;
-  if (!isMacroName(parameter.name))
-    reason = lookup_checks::kNameInMacro;
-  else if (value.endsWith(QLatin1Char('\\')))
-    reason = lookup_checks::kEndsInBackslash;
+  const bool isSound = checkText(value, parameter.name, parameter.line, QString());
+  long reason = TextPlaces::refuse(TextPlace::MacroName, parameter.name);
+  if (reason == 0 && isSound)
+    reason = TextPlaces::refuse(TextPlace::MacroValue, value);
   if (reason != 0)
     m_diagnostics.reportUnwritable(parameter.line, QString(), parameter.name, TransformResString(reason));
 }
@@ -237,11 +244,12 @@ void MappingFileWriter::check() {
   QSet<const CompoundTransformerNetwork*> checked;
   QSet<const ConfiguredDefinition*> sound;  // whose template needs no second look
   for (const WorkspaceNode& node : m_workspace.nodes) {
-    checkText(node.name, node.name, node.line, node.name);
     if (!node.isTransformer()) {
-      checkText(node.keyword, node.keyword, node.line, node.name);
+      checkWord(node.name, node.line, node.name);
+      checkWord(node.keyword, node.line, node.name);
       continue;
     }
+    checkText(node.name, node.name, node.line, node.name);
     if (!sound.contains(node.cfg->definition())) {
       const std::size_t before = m_diagnostics.all().size();
       for (const QString& line : node.cfg->getTemplateLines())
@@ -259,6 +267,8 @@ void MappingFileWriter::check() {
     }
     if (!nestingFault.isEmpty())
       m_diagnostics.reportText(Rule::Nesting, node.line, node.name, nestingFault);
+    for (const QString& fault : custom ? custom->findUnwritablePorts() : QStringList())
+      m_diagnostics.reportText(Rule::UnwritableValue, node.line, node.name, fault);
     const QHash<QString, QString> replaced = InnerNames::findReplacedParameters(
         node.name, *node.cfg, [this](const QString& name) { return m_workspace.parameters.find(name); });
     for (const QString& parameter : node.cfg->getParameters()) {

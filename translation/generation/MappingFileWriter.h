@@ -36,7 +36,9 @@ class MappingFileWriter {
   void pushAttributes();
   void check();
   void checkParameter(const GlobalParameters::Parameter& parameter, const QString& value);
-  void checkText(const QString& text, const QString& what, int line, const QString& node);
+  // False when something was reported.
+  bool checkText(const QString& text, const QString& what, int line, const QString& node);
+  void checkWord(const QString& text, int line, const QString& node);
 
   // The flow that leaves a link's source through its port.
   const QString& flowOf(int node, const QString& output) const;

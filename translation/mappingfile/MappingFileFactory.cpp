@@ -1,20 +1,15 @@
 #include <transform/core/Keywords.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/TextPlaces.h>
 #include <translation/mappingfile/MappingFileFactory.h>
 #include <translation/mappingfile/MappingFileFunctions.h>
 #include <translation/mappingfile/MappingFileReader.h>
 #include <translation/mappingfile/MappingFileReport.h>
 
-#include <algorithm>
-
 using orx::Rule;
 
 namespace {
 
-const QLatin1String kInput("INPUT");
-const QLatin1String kOutput("OUTPUT");
-const QLatin1String kFeatureType("FEATURE_TYPE");
-const QLatin1String kFactoryName("FACTORY_NAME");
 const QLatin1String kMetaParameters("FACTORY_META_PARAMS");
 const QLatin1String kWorkerKind("TransformFact");
 const QLatin1String kRunStatements("RUN:STATEMENTS");
@@ -35,13 +30,6 @@ bool isRoute(const QString& name) {
 }
 
 }  // namespace
-
-bool MappingFileFactory::isKey(const QStringRef& text) {
-  return !text.isEmpty() && std::all_of(text.begin(), text.end(), [](QChar c) {
-    return (c >= QLatin1Char('A') && c <= QLatin1Char('Z')) ||
-           (c >= QLatin1Char('0') && c <= QLatin1Char('9')) || c == QLatin1Char('_');
-  });
-}
 
 MappingFileFactory::MappingFileFactory(const MappingFileStatement& statement, MappingFileFlow& flow,
                                        MappingFileFunctions& functions, MappingFileReport& report)
@@ -71,7 +59,7 @@ bool MappingFileFactory::readHead(MappingFileWords& words) {
   words.setSettings(true);
   const bool isWhole = nextWord(words, domain) && domain.is(QLatin1String("*")) && nextWord(words, kind) &&
                        kind.kind == MappingFileWord::Kind::Bare && nextWord(words, keyword) &&
-                       keyword.is(kFactoryName) && nextWord(words, name);
+                       keyword.is(kFactoryNameKeyword) && nextWord(words, name);
   words.setSettings(false);
   if (!isWhole) {
     m_report.add(Rule::BadStatement, m_statement.line(), {QLatin1String(kForm)});
@@ -107,7 +95,7 @@ void MappingFileFactory::readSetting(const MappingFileWord& setting) {
   const int colon = setting.text.indexOf(QLatin1Char(':'));
   const int begin = setting.offset() + colon + 1;
   const int end = setting.offset() + setting.text.size();
-  if (colon <= 0 || !isKey(setting.text.left(colon))) {
+  if (colon <= 0 || !TextPlaces::isKey(setting.text.left(colon))) {
     expect(setting, kWorkerSettingForm);
   } else if (setting.is(kRunStatements)) {
     // The statements behind this one, not a definition.
@@ -123,8 +111,8 @@ bool MappingFileFactory::readPort(bool isInput, MappingFileWords& words, Mapping
                                   bool& hasWord) {
   MappingFileWord type;
   bool isWhole = nextWord(words, word);
-  if (isWhole && !word.is(kFeatureType))
-    isWhole = nextWord(words, word) && word.is(kFeatureType);
+  if (isWhole && !word.is(kFeatureTypeKeyword))
+    isWhole = nextWord(words, word) && word.is(kFeatureTypeKeyword);
   if (!isWhole || !nextWord(words, type)) {
     hasWord = false;
     return false;
@@ -153,8 +141,8 @@ void MappingFileFactory::readClauses(MappingFileWords& words) {
   bool isSettings = false;  // of a worker
   bool isValue = false;     // behind a key
   while (hasWord) {
-    const bool isInput = word.is(kInput);
-    if (isInput || word.is(kOutput)) {
+    const bool isInput = word.is(kInputKeyword);
+    if (isInput || word.is(kOutputKeyword)) {
       const MappingFileWord keyword = word;
       words.setSettings(false);
       isSettings = false;
@@ -177,7 +165,7 @@ void MappingFileFactory::readClauses(MappingFileWords& words) {
       expect(word, kOutputForm);
       isValue = true;
     } else if (!isValue) {
-      if (word.kind != MappingFileWord::Kind::Bare || !isKey(word.text))
+      if (word.kind != MappingFileWord::Kind::Bare || !TextPlaces::isKey(word.text))
         expect(word, kSettingForm);
       isValue = true;
     }

@@ -1,8 +1,8 @@
 // Reads one FACTORY_DEF statement word by word.
 #pragma once
 
+#include <transform/text/MappingFileWords.h>
 #include <translation/mappingfile/MappingFileFlow.h>
-#include <translation/mappingfile/MappingFileWords.h>
 
 #include <QString>
 
@@ -19,9 +19,6 @@ class MappingFileFactory {
   // Checks the statement and hands factory and feature types on to the flow. `words` stand behind the
   // keyword.
   void read(MappingFileWords& words);
-
-  // Whether the word can be the name of a setting: capital letters, digits and "_".
-  static bool isKey(const QStringRef& text);
 
   // Of a worker that runs a definition or is a loop of one: its name and version; 0 for any other factory.
   const QString& runTransformer() const { return m_transformer; }

@@ -1,4 +1,4 @@
-#include <transform/core/MacroText.h>
+#include <transform/text/MacroText.h>
 #include <translation/mappingfile/MappingFileFlow.h>
 #include <translation/mappingfile/MappingFileReport.h>
 

@@ -1,10 +1,10 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/text/MappingFileWords.h>
 #include <translation/mappingfile/MappingFileFunctions.h>
 #include <translation/mappingfile/MappingFileReader.h>
 #include <translation/mappingfile/MappingFileReferences.h>
 #include <translation/mappingfile/MappingFileReport.h>
 #include <translation/mappingfile/MappingFileScripts.h>
-#include <translation/mappingfile/MappingFileWords.h>
 
 using orx::Rule;
 

@@ -1,14 +1,15 @@
 #include <platform/orxparameter/orxparameter.h>
-#include <transform/core/MacroText.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MappingFileWords.h>
 #include <transform/text/TextHelpers.h>
+#include <transform/text/TextPlaces.h>
 #include <translation/mappingfile/MappingFileFactory.h>
 #include <translation/mappingfile/MappingFileFunctions.h>
 #include <translation/mappingfile/MappingFileReader.h>
 #include <translation/mappingfile/MappingFileReferences.h>
 #include <translation/mappingfile/MappingFileReport.h>
 #include <translation/mappingfile/MappingFileStatements.h>
-#include <translation/mappingfile/MappingFileWords.h>
 
 using orx::Rule;
 
@@ -127,7 +128,7 @@ void MappingFileStatements::checkOption(Part& part) {
   refer(part, 0, part.statement.text.size(), Use::Now);
   MappingFileWord name;
   MappingFileWord key;
-  if (!part.words.next(name) || !part.words.next(key) || !MappingFileFactory::isKey(key.text)) {
+  if (!part.words.next(name) || !part.words.next(key) || !TextPlaces::isKey(key.text)) {
     expect(part, "FACTORY_OPTION NAME KEY VALUE");
     return;
   }

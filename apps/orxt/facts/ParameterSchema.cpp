@@ -119,10 +119,6 @@ QJsonValue simpleValue(const GUIType& type, const QString& word, const ChoiceLis
   return ORX_isChoiceType(type) ? choices.toStored(text) : decoded(text);
 }
 
-bool isUnsetText(const QString& text) {
-  return text.isEmpty() || text == kUnusedValue || text == kUnusedGroupBy;
-}
-
 QJsonObject withComputed(const QJsonObject& schema, bool takesComputed) {
   // A text holds anything already.
   if (!takesComputed || schema.value(kType).toString() == kJsonText)
@@ -149,7 +145,7 @@ QJsonObject memberSchema(const GUIType& member, const QString& part) {
   const ChoiceList choices(member);
   QJsonObject schema = withComputed(simpleSchema(member, word, choices), member.mayHoldAttributeReference());
   describe(schema, member);
-  if (!isUnsetText(part))
+  if (!isUnsetSetting(part))
     schema.insert(kDefault, simpleValue(member, word, choices, part));
   return schema;
 }
@@ -168,7 +164,7 @@ QJsonObject membersValue(const TransformParamCfg& parameter, const QString& valu
   QJsonObject result;
   for (const GUIType& member : parameter.members().members()) {
     const QString part = parameter.members().memberValue(value, member.getName());
-    if (!isUnsetText(part)) {
+    if (!isUnsetSetting(part)) {
       result.insert(member.getName(), simpleValue(member, plainWord(member), ChoiceList(member), part));
     }
   }
@@ -184,7 +180,7 @@ QJsonArray rowsValue(const TransformParamCfg& parameter, const QString& value) {
     if (columns.empty())
       break;
     const GUIType& type = columns[column];
-    if (!isUnsetText(cell))
+    if (!isUnsetSetting(cell))
       row.insert(type.getName(), simpleValue(type, plainWord(type), ChoiceList(type), cell));
     column = (column + 1) % columns.size();
     if (column == 0) {
@@ -228,7 +224,7 @@ QJsonObject ParameterSchema::property(const TransformParamCfg& parameter) const 
     defaultValue = simpleValue(parameter, word, parameter.choices(), value);
   }
   describe(schema, parameter);
-  if (!isUnsetText(value))
+  if (!isUnsetSetting(value))
     schema.insert(kDefault, defaultValue);
   return schema;
 }

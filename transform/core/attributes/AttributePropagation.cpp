@@ -2,10 +2,11 @@
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/MacroText.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/ValueReferences.h>
 #include <transform/core/attributes/AttributePassage.h>
 #include <transform/text/GlobalMacros.h>
+#include <transform/text/MacroText.h>
 
 #include <QScopedValueRollback>
 #include <QSet>
@@ -250,8 +251,13 @@ void TransformerCfg::getAttributesByType(const QString& type, QStringList& attri
   attributes.clear();
   const auto add = [&](const GUIType& valueType, const QString& value) {
     if (valueType.getType().startsWith(type)) {
-      const QStringList references = valueReferences(value);
-      attributes += references.isEmpty() ? listedAttributeNames(valueType, value) : references;
+      const std::vector<ValueReference> references = valueReferences(value);
+      for (const ValueReference& reference : references) {
+        attributes.append(reference.name);
+      }
+      if (references.empty()) {
+        attributes += listedAttributeNames(valueType, value);
+      }
     }
   };
   for (const TransformParamCfg& record : m_parameters.records()) {

@@ -1,6 +1,9 @@
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/TokenScanner.h>
 #include <transform/core/definition/CompiledTemplate.h>
+#include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MappingFileWords.h>
+#include <transform/text/TextPlaces.h>
 
 #include <algorithm>
 
@@ -21,6 +24,7 @@ CompiledTemplate::CompiledTemplate(const QStringList& lines) : m_lines(lines) {
   m_compiled.reserve(static_cast<std::size_t>(lines.size()));
   for (const QString& line : lines) {
     compile(line);
+    addKeys(line);
     m_usesBracketValues = m_usesBracketValues || line.contains(kBracketValueMark);
   }
   for (int slot = 0; slot < slotCount() && m_hasOneLineClauses; ++slot) {
@@ -46,6 +50,40 @@ int CompiledTemplate::addSlot(const QString& name) {
     m_endsLine.push_back(false);
   }
   return slot;
+}
+
+// FACTORY_DEF * KIND FACTORY_NAME NAME CLAUSE..., FACTORY_OPTION NAME KEY VALUE. A template writes tokens and
+// single words, so keys and values take turns.
+void CompiledTemplate::addKeys(const QString& line) {
+  MappingFileWords words(line);
+  MappingFileWord word;
+  const auto skip = [&](int count) {
+    while (count-- > 0) {
+      words.next(word);
+    }
+  };
+  if (!words.next(word)) {
+    return;
+  }
+  const bool isOption = word.is(kFactoryOptionStatement);
+  if (!isOption && !word.is(kFactoryStatement)) {
+    return;
+  }
+  skip(isOption ? 1 : 4);
+  while (words.next(word)) {
+    if (word.is(kInputKeyword) || word.is(kOutputKeyword)) {
+      // A port may stand between, a type behind.
+      while (!word.is(kFeatureTypeKeyword) && words.next(word)) {
+      }
+      skip(1);
+    } else if (word.kind == MappingFileWord::Kind::Bare && TextPlaces::isKey(word.text)) {
+      m_keys.insert(word.text.toString());
+      if (isOption) {
+        return;
+      }
+      skip(1);
+    }
+  }
 }
 
 void CompiledTemplate::compile(const QString& line) {

@@ -5,6 +5,7 @@
 #pragma once
 
 #include <QHash>
+#include <QSet>
 #include <QString>
 #include <QStringList>
 
@@ -51,12 +52,15 @@ class CompiledTemplate {
   bool hasOneLineClauses() const { return m_hasOneLineClauses; }
   // Whether values in brackets are meant by " {*} ".
   bool usesBracketValues() const { return m_usesBracketValues; }
+  // The keys of the settings that the lines name themselves.
+  const QSet<QString>& keys() const { return m_keys; }
   // Whether the token ends some line.
   bool endsLine(int slot) const { return m_endsLine[static_cast<std::size_t>(slot)]; }
 
  private:
   int addSlot(const QString& name);
   void compile(const QString& line);
+  void addKeys(const QString& line);
 
   QStringList m_lines;
   QString m_text;
@@ -66,6 +70,7 @@ class CompiledTemplate {
   QStringList m_slotNames;
   std::vector<std::vector<int>> m_linesOf;
   std::vector<bool> m_endsLine;
+  QSet<QString> m_keys;
   bool m_isPlain = true;
   bool m_hasOneLineClauses = true;
   bool m_usesBracketValues = false;

@@ -1,5 +1,4 @@
 // The part of TransformerCfg that interprets a definition.
-#include <platform/qorxcore/OrxHome.h>
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
@@ -8,6 +7,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/definition/CompiledTemplate.h>
 #include <transform/core/definition/DependencyChecker.h>
+#include <transform/files/ProductFiles.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QSet>
@@ -99,8 +99,7 @@ void TransformerCfg::configure(const TransformerDefinition& definition, IORXSess
   m_definition = own;
   m_preserved.reset();
   m_attributeUnion.reset();
-  const bool isBuiltIn = definition.filePath.startsWith(QORXOrxHome() + QLatin1Char('/'));
-  m_transformerType = isBuiltIn ? kBuiltIn : kOrdinary;
+  m_transformerType = isProductFile(definition.filePath) ? kBuiltIn : kOrdinary;
   addDefinedParameters(own->fields, log);
   addDefaultParms();
 }

@@ -23,7 +23,7 @@ bool write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, 
         << QLatin1String("   TRANSFORMER_PARAMS:") + cfg.getTransformerParams()
         << QLatin1String(hasStatements ? "   RUN:STATEMENTS" : "   RUN:DEFINITION");
   const auto addSetting = [&lines](const char* key, const QString& value) {
-    if (!value.isEmpty() && value != kUnusedValue && value != kUnusedGroupBy) {
+    if (!isUnsetSetting(value)) {
       lines << QLatin1String("   ") + QLatin1String(key) + QLatin1Char(':') + quotifyStringForMF(value);
     }
   };

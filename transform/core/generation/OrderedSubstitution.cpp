@@ -34,15 +34,19 @@ OrderedSubstitution::OrderedSubstitution(const QStringList& lines)
     : m_lines(lines), m_removed(static_cast<std::size_t>(lines.size()), false) {
   for (int line = 0; line < m_lines.size(); ++line) {
     m_size += m_lines.at(line).size();
-    scan(line);
+    scan(line, true);
   }
   m_largestSize += m_size;
 }
 
-void OrderedSubstitution::scan(int line) {
+void OrderedSubstitution::scan(int line, bool countsTokens) {
   TokenScanner scanner(m_lines.at(line));
   while (scanner.next()) {
-    std::vector<int>& where = m_where[scanner.name().toString()];
+    const QString name = scanner.name().toString();
+    if (countsTokens) {
+      ++m_counts[name];
+    }
+    std::vector<int>& where = m_where[name];
     if (where.empty() || where.back() != line) {
       where.push_back(line);
     }
@@ -77,7 +81,7 @@ bool OrderedSubstitution::contains(const QString& token) const {
 
 void OrderedSubstitution::substitute(const QString& token, const QString& value) {
   const QString text = reference(token);
-  m_largestSize += kFactor * value.size();
+  m_largestSize += (kFactor + m_counts.take(token)) * value.size();
   const bool mayBringTokens = value.contains(QLatin1Char('$')) || m_hasOddTokens;
   for (const int line : candidates(token)) {
     if (!holds(line, text)) {
@@ -94,7 +98,7 @@ void OrderedSubstitution::substitute(const QString& token, const QString& value)
     if (isBlank(changed)) {
       remove(line);
     } else if (mayBringTokens) {
-      scan(line);
+      scan(line, false);
     }
   }
 }

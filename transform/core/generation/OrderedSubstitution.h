@@ -27,12 +27,13 @@ class OrderedSubstitution {
   QStringList lines() const;
 
  private:
-  // Texts that insert each other grow without end, so all lines together may grow to this and as many times
-  // each inserted text as the factor says.
+  // Texts that insert each other grow without end. So all lines together may grow by what stands in them from
+  // the start, each token as often as it does, by as many times each inserted text as the factor says, and by
+  // the allowance.
   static constexpr qint64 kAllowance = 1024 * 1024;
   static constexpr qint64 kFactor = 64;
 
-  void scan(int line);
+  void scan(int line, bool countsTokens);
   // The lines that may hold the token and did so when they were scanned, each once, in order.
   std::vector<int> candidates(const QString& token) const;
   bool holds(int line, const QString& reference) const;
@@ -42,6 +43,7 @@ class OrderedSubstitution {
   QStringList m_lines;
   std::vector<bool> m_removed;
   QHash<QString, std::vector<int>> m_where;
+  QHash<QString, int> m_counts;  // of the plain tokens that stood there from the start
   qint64 m_size = 0;
   qint64 m_largestSize = kAllowance;
   bool m_hasOddTokens = false;  // some line holds what only a token that is not plain can match

@@ -1,4 +1,5 @@
 #include <platform/qorxcore/Lists.h>
+#include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
@@ -7,39 +8,85 @@
 #include <transform/core/generation/OrderedSubstitution.h>
 #include <transform/core/generation/ParameterSubstitution.h>
 #include <transform/core/generation/TemplateExpansion.h>
+#include <transform/core/generation/WrittenValues.h>
 #include <transform/text/TextHelpers.h>
+#include <transform/text/TextPlaces.h>
+
+#include <algorithm>
 
 namespace {
 
-bool isUnset(const QString& value) {
-  return value.isEmpty() || value == kUnusedValue;
-}
-
-bool isNeeded(const TransformParamCfg& record, const CompiledTemplate& compiled) {
-  return record.isMultiParameter() || compiled.slotOf(record.getName()) != CompiledTemplate::kNoSlot ||
-         compiled.slotOf(kValueListToken) != CompiledTemplate::kNoSlot || record.choices().hasLookup();
+QStringList partsOf(const TransformParamCfg& record, const QString& value) {
+  return QORXSdfStringToList(value, record.members().separator());
 }
 
 }  // namespace
 
-bool ParameterSubstitution::hasValue(const TransformParamCfg& record) {
-  const QString& type = record.getType();
-  return !type.contains(QLatin1String("GROUP")) && !type.contains(QLatin1String("DIVIDER")) &&
-         !type.contains(QLatin1String("MESSAGE"));
-}
-
-void ParameterSubstitution::collect(MFBuffer& buffer, const CompiledTemplate* needed) {
-  m_entries.resize(m_records.size());
-  for (std::size_t position = 0; position < m_records.size(); ++position) {
-    if (!needed || isNeeded(m_records[position], *needed)) {
-      collect(position, buffer);
+ParameterSubstitution::ParameterSubstitution(const TransformerCfg& cfg,
+                                             const std::vector<TransformParamCfg>& records)
+    : m_cfg(cfg), m_records(records) {
+  for (const TransformParamCfg& record : records) {
+    if (record.isMultiParameter()) {
+      const QStringList parts =
+          partsOf(record, stripBasicStringInfo(cfg.getParameterValue(record.getName())));
+      for (int i = 0; i + 1 < parts.size(); i += 2) {
+        m_members.insert(parts.at(i));
+      }
     }
   }
 }
 
-void ParameterSubstitution::collectRest(MFBuffer& buffer) {
+bool ParameterSubstitution::isSubstituted(const QString& token) const {
+  return m_cfg.hasParameter(token) || m_members.contains(token) || token.startsWith(kInputTokenStart) ||
+         token.startsWith(kOutputTokenStart) || token == kUuidToken || token == kEncodedNameToken ||
+         token == kSchemaToken || token == kValueListToken;
+}
+
+bool ParameterSubstitution::isInert(const QString& text) const {
+  return TemplateExpansion::isInert(text, [this](const QString& name) { return isSubstituted(name); });
+}
+
+bool ParameterSubstitution::isInert(const TransformParamCfg& record) const {
+  const QString& name = record.getName();
+  const QString stored = m_cfg.getParameterValue(name);
+  if (!stored.contains(QLatin1Char('$')) && !record.choices().hasLookup() && name != kIdentifierParameter) {
+    return true;
+  }
+  const QString value = stripBasicStringInfo(stored);
+  // The identifier is also written decoded.
+  if (name == kIdentifierParameter && !isInert(m_cfg.getParameterValue(name, UnpackLevel::Decoded))) {
+    return false;
+  }
+  const ChoiceList& choices = record.choices();
+  QStringList parts(value);
+  if (record.isMultiParameter()) {
+    parts += partsOf(record, value);
+  } else if (choices.hasLookup()) {
+    parts += choices.toStored(value);
+    if (ORX_isListBoxType(record)) {
+      for (const QString& element : QORXSdfStringToList(value, QLatin1Char(' '))) {
+        parts += choices.toStored(element);
+      }
+    }
+  }
+  return std::all_of(parts.cbegin(), parts.cend(), [this](const QString& part) { return isInert(part); });
+}
+
+QString ParameterSubstitution::firstWithTokens() const {
+  const auto found = std::find_if(m_records.begin(), m_records.end(),
+                                  [this](const TransformParamCfg& record) { return !isInert(record); });
+  return found == m_records.end() ? QString() : found->getName();
+}
+
+bool ParameterSubstitution::bringsTokens() const {
+  return !firstWithTokens().isEmpty();
+}
+
+void ParameterSubstitution::collect(MFBuffer& buffer, bool onlyWritten) {
+  const WrittenValues written(m_cfg, /*bringsTokens=*/!onlyWritten);
+  m_entries.assign(m_records.size(), {});
   for (std::size_t position = 0; position < m_records.size(); ++position) {
-    if (!m_entries[position].isCollected) {
+    if (written.contains(m_records[position])) {
       collect(position, buffer);
     }
   }
@@ -49,40 +96,26 @@ void ParameterSubstitution::collect(std::size_t position, MFBuffer& buffer) {
   const TransformParamCfg& record = m_records[position];
   const QString name = record.getName();
   Entry& entry = m_entries[position];
-  entry.isCollected = true;
-  QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
+  const ConfiguredDefinition* definition = m_cfg.definition();
+  const CompiledTemplate* compiled = definition ? definition->compiledTemplate.get() : nullptr;
+  const auto add = [&](const QString& token, const QString& value, const GUIType* type, bool isListed) {
+    const bool isWord = compiled && type && type->valueIsEncoded();
+    entry.tokens.push_back(
+        {token, isWord ? TextPlaces::withoutKeyword(value, compiled->keys()) : value, isListed});
+  };
+  const QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
   if (record.isMultiParameter()) {
-    const QStringList parts = QORXSdfStringToList(value, record.members().separator());
+    const QStringList parts = partsOf(record, value);
     for (int i = 0; i + 1 < parts.size(); i += 2) {
-      entry.tokens.push_back({parts.at(i), parts.at(i + 1), true});
-      m_members.insert(parts.at(i));
+      add(parts.at(i), parts.at(i + 1), record.members().find(parts.at(i)), true);
     }
     return;
   }
-  if (isUnset(value) && record.getFlag(kGUITypeOmittable)) {
+  if (isUnsetValue(value) && record.getFlag(kGUITypeOmittable)) {
     entry.removesLines = true;
     return;
   }
-  const bool isListed = name != kIdentifierParameter && hasValue(record);
-  entry.tokens.push_back({name, std::move(value), isListed});
-}
-
-bool ParameterSubstitution::isSubstituted(const QString& token) const {
-  return m_cfg.hasParameter(token) || m_members.contains(token) || token.startsWith(kInputTokenStart) ||
-         token.startsWith(kOutputTokenStart) || token == kUuidToken || token == kEncodedNameToken ||
-         token == kSchemaToken || token == kValueListToken;
-}
-
-bool ParameterSubstitution::bringsTokens() const {
-  for (const Entry& entry : m_entries) {
-    for (const Token& token : entry.tokens) {
-      if (!TemplateExpansion::isInert(token.value,
-                                      [this](const QString& name) { return isSubstituted(name); })) {
-        return true;
-      }
-    }
-  }
-  return false;
+  add(name, value, &record, name != kIdentifierParameter && WrittenValues::hasValue(record));
 }
 
 void ParameterSubstitution::apply(OrderedSubstitution& lines) const {

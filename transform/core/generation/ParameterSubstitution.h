@@ -18,24 +18,22 @@ class TransformerCfg;
 class ParameterSubstitution {
  public:
   // Neither is owned; both outlive this object.
-  ParameterSubstitution(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records)
-      : m_cfg(cfg), m_records(records) {}
+  ParameterSubstitution(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records);
+
+  // Whether some value will hold the token of a parameter, of a port or of the instance, or a part of a
+  // token. Told from the stored values, the stored sides of choices included, before anything is written.
+  bool bringsTokens() const;
+  // The first parameter with such a value; empty when there is none.
+  QString firstWithTokens() const;
+  // Whether the text holds no such token.
+  bool isInert(const QString& text) const;
 
   // Asks for the values, in the order of the parameters; values may write statements into the buffer. With
-  // `needed`, only those are asked for whose token occurs in it, or that write statements.
-  void collect(MFBuffer& buffer, const CompiledTemplate* needed = nullptr);
-  // Asks for the values that were left out. They write nothing.
-  void collectRest(MFBuffer& buffer);
-
-  // Whether some value holds the token of a parameter, of a port or of the instance, or a part of a token.
-  bool bringsTokens() const;
-  bool isSubstituted(const QString& token) const;
+  // `onlyWritten`, only those are asked for that reach the statements of a template without inserted tokens.
+  void collect(MFBuffer& buffer, bool onlyWritten = false);
 
   void apply(OrderedSubstitution& lines) const;
   void apply(TemplateExpansion& expansion, const CompiledTemplate& compiled) const;
-
-  // Labels and frames of a dialog have none.
-  static bool hasValue(const TransformParamCfg& record);
 
   // What "$(ORX_PARM_VAL_LIST)" stands for.
   QString valueList() const;
@@ -47,11 +45,12 @@ class ParameterSubstitution {
     bool isListed;  // in the value list
   };
   struct Entry {
-    bool isCollected = false;
     bool removesLines = false;
     std::vector<Token> tokens;
   };
 
+  bool isSubstituted(const QString& token) const;
+  bool isInert(const TransformParamCfg& record) const;
   void collect(std::size_t position, MFBuffer& buffer);
 
   const TransformerCfg& m_cfg;

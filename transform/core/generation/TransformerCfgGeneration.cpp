@@ -5,20 +5,24 @@
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/MacroText.h>
+#include <transform/core/LookupChecks.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/attributes/PortTexts.h>
 #include <transform/core/definition/CompiledTemplate.h>
+#include <transform/core/generation/LookupDecision.h>
 #include <transform/core/generation/LookupWriters.h>
 #include <transform/core/generation/MultiProcessWriter.h>
 #include <transform/core/generation/OrderedSubstitution.h>
 #include <transform/core/generation/ParameterSubstitution.h>
 #include <transform/core/generation/TemplateExpansion.h>
 #include <transform/core/generation/ValueConversion.h>
+#include <transform/core/generation/WrittenValues.h>
 #include <transform/core/validation/MappingFileChecks.h>
-#include <transform/text/MFBuffer.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/text/NullBuffer.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QScopeGuard>
@@ -31,17 +35,6 @@ namespace {
 const QLatin1String kSchemaType("varchar(255)");
 const QLatin1String kUserTypedEnd("_USERTYPED)");
 const QLatin1String kNo("NO");
-const QLatin1String kChoiceType("CHOICE");
-
-// For statements that are only tried.
-class UnusedBuffer : public MFBuffer {
- public:
-  void write(const QByteArray&) override {}
-};
-
-bool isUnset(const QString& value) {
-  return value.isEmpty() || value == kUnusedValue;
-}
 
 }  // namespace
 
@@ -62,7 +55,7 @@ bool TransformerCfg::instantiate(MFBuffer& buffer, const QString&, bool inlineFl
     const QString groupBy = getParameterValue(groupByParameter);
     if (parallelism != kNoParallelism && parallelism != kNo && groupBy != kUnusedGroupBy) {
       // The factory is of no use without the statements that its workers run.
-      UnusedBuffer unused;
+      NullBuffer unused;
       unused.setReplaceDeferredMacros(true);
       const int count = m_instantiationCounter;
       if (!doInstantiate(unused, inlineFlag) ||
@@ -76,15 +69,12 @@ bool TransformerCfg::instantiate(MFBuffer& buffer, const QString&, bool inlineFl
   return doInstantiate(buffer, inlineFlag);
 }
 
-bool TransformerCfg::hasPlainPorts() const {
-  return typeid(*this) == typeid(TransformerCfg);
-}
-
 bool TransformerCfg::doInstantiate(MFBuffer& buffer, bool) {
   ensureBaseGuid();
   QStringList lines;
-  if (!expandTemplate(buffer, lines) ||
-      !std::all_of(lines.cbegin(), lines.cend(), &MFBuffer::closesDeferredMacros)) {
+  const bool isExpanded = expandTemplate(buffer, lines);
+  ++m_instantiationCounter;
+  if (!isExpanded || !std::all_of(lines.cbegin(), lines.cend(), &MFBuffer::closesDeferredMacros)) {
     return false;
   }
   for (const QString& line : std::as_const(lines)) {
@@ -94,59 +84,63 @@ bool TransformerCfg::doInstantiate(MFBuffer& buffer, bool) {
   return true;
 }
 
+// A class of its own may override the port steps, or write statements for any parameter.
 bool TransformerCfg::expandTemplate(MFBuffer& buffer, QStringList& lines) {
   const CompiledTemplate* compiled = configured().compiledTemplate.get();
   ParameterSubstitution values(*this, m_parameters.records());
-  if (compiled && compiled->isPlain() && compiled->hasOneLineClauses() && hasPlainPorts()) {
-    // A class of its own may write statements for any parameter.
-    values.collect(buffer, typeid(*this) == typeid(TransformerCfg) ? compiled : nullptr);
-    if (!values.bringsTokens()) {
-      TemplateExpansion expansion(*compiled);
-      if (fillPorts(expansion, *compiled, values)) {
-        values.apply(expansion, *compiled);
-        if (expansion.holds(compiled->slotOf(kValueListToken))) {
-          expansion.setValue(compiled->slotOf(kValueListToken), values.valueList());
-        }
-        fillInstanceTokens([&](const QString& token) { return expansion.holds(compiled->slotOf(token)); },
-                           [&](const QString& token, const QString& text) {
-                             expansion.setValue(compiled->slotOf(token), text);
-                           });
-        lines = expansion.lines();
-        return true;
-      }
+  if (compiled && compiled->isPlain() && compiled->hasOneLineClauses() &&
+      typeid(*this) == typeid(TransformerCfg) && !bringsTokens(values)) {
+    TemplateExpansion expansion(*compiled);
+    fillPorts(expansion, *compiled);
+    values.collect(buffer, /*onlyWritten=*/true);
+    values.apply(expansion, *compiled);
+    if (expansion.holds(compiled->slotOf(kValueListToken))) {
+      expansion.setValue(compiled->slotOf(kValueListToken), values.valueList());
     }
-    values.collectRest(buffer);
-    return expandInOrder(values, lines);
+    fillInstanceTokens([&](const QString& token) { return expansion.holds(compiled->slotOf(token)); },
+                       [&](const QString& token, const QString& text) {
+                         expansion.setValue(compiled->slotOf(token), text);
+                       });
+    lines = expansion.lines();
+    return true;
   }
-  values.collect(buffer);
-  return expandInOrder(values, lines);
+  return expandInOrder(values, buffer, lines);
 }
 
-bool TransformerCfg::expandInOrder(const ParameterSubstitution& values, QStringList& lines) {
+bool TransformerCfg::expandInOrder(ParameterSubstitution& values, MFBuffer& buffer,
+                                   QStringList& lines) const {
+  m_isTooLarge = false;
   lines = getTemplateLines();
   substInputs(lines);
   substOutputs(lines);
+  substParameters(values, buffer, lines);
   OrderedSubstitution ordered(lines);
-  const bool wantsList = ordered.contains(kValueListToken);
-  values.apply(ordered);
-  if (wantsList) {
-    ordered.substitute(kValueListToken, values.valueList());
-  }
   fillInstanceTokens([&](const QString& token) { return ordered.contains(token); },
                      [&](const QString& token, const QString& text) { ordered.substitute(token, text); });
-  lines = ordered.lines();
-  return !ordered.isTooLarge();
+  lines = takeLines(ordered);
+  return !m_isTooLarge;
+}
+
+QStringList TransformerCfg::takeLines(const OrderedSubstitution& ordered) const {
+  m_isTooLarge = m_isTooLarge || ordered.isTooLarge();
+  return ordered.lines();
+}
+
+bool TransformerCfg::bringsTokens(const ParameterSubstitution& values) const {
+  bool isInert = !values.bringsTokens();
+  forEachInputText([&](const QString&, const QString& text) { isInert = isInert && values.isInert(text); });
+  forEachOutputText([&](const QString&, const QString* featureType, const QString& functions) {
+    isInert = isInert && (!featureType || values.isInert(*featureType)) && values.isInert(functions);
+  });
+  return !isInert;
 }
 
 void TransformerCfg::fillInstanceTokens(
     const std::function<bool(const QString& token)>& holds,
-    const std::function<void(const QString& token, const QString& text)>& substitute) {
-  if (!m_baseGuid.isEmpty()) {
-    if (holds(kUuidToken)) {
-      substitute(kUuidToken, getParameterValue(kIdentifierParameter, UnpackLevel::Decoded) +
-                                 QLatin1Char('_') + m_baseGuid + QString::number(m_instantiationCounter));
-    }
-    ++m_instantiationCounter;
+    const std::function<void(const QString& token, const QString& text)>& substitute) const {
+  if (!m_baseGuid.isEmpty() && holds(kUuidToken)) {
+    substitute(kUuidToken, getParameterValue(kIdentifierParameter, UnpackLevel::Decoded) + QLatin1Char('_') +
+                               m_baseGuid + QString::number(m_instantiationCounter));
   }
   if (holds(kEncodedNameToken)) {
     substitute(kEncodedNameToken,
@@ -194,6 +188,11 @@ void TransformerCfg::removeOutputClause(QStringList& lines, const QString& tag, 
 
 void TransformerCfg::substParametersForMappingFile(MFBuffer& buffer, QStringList& lines) const {
   ParameterSubstitution values(*this, m_parameters.records());
+  substParameters(values, buffer, lines);
+}
+
+void TransformerCfg::substParameters(ParameterSubstitution& values, MFBuffer& buffer,
+                                     QStringList& lines) const {
   values.collect(buffer);
   OrderedSubstitution ordered(lines);
   const bool wantsList = ordered.contains(kValueListToken);
@@ -201,7 +200,7 @@ void TransformerCfg::substParametersForMappingFile(MFBuffer& buffer, QStringList
   if (wantsList) {
     ordered.substitute(kValueListToken, values.valueList());
   }
-  lines = ordered.lines();
+  lines = takeLines(ordered);
 }
 
 // --- ports
@@ -209,63 +208,62 @@ void TransformerCfg::substParametersForMappingFile(MFBuffer& buffer, QStringList
 
 void TransformerCfg::substInputs(QStringList& lines) const {
   OrderedSubstitution ordered(lines);
-  port_texts::InputTexts all;
-  QStringList tags;
-  getInputTags(tags);
-  for (const QString& tag : std::as_const(tags)) {
-    ordered.substitute(kInputTokenStart + tag + kInputTokenEnd, all.add(*this, m_ports, tag));
-  }
-  ordered.substitute(kInputLinesToken, all.text());
-  lines = ordered.lines();
+  forEachInputText([&](const QString& token, const QString& text) { ordered.substitute(token, text); });
+  lines = takeLines(ordered);
 }
 
 void TransformerCfg::substOutputs(QStringList& lines) const {
   OrderedSubstitution ordered(lines);
-  QStringList tags;
-  getOutputTags(tags);
-  for (const QString& tag : std::as_const(tags)) {
-    QString featureType;
-    if (port_texts::isOutputWritten(*this, tag, featureType)) {
-      ordered.substitute(kOutputTokenStart + tag + kFeatureTypeTokenEnd, quotifyStringForMF(featureType));
-      ordered.substitute(kOutputTokenStart + tag + kFunctionsTokenEnd,
-                         port_texts::outputFunctions(*this, tag));
+  forEachOutputText([&](const QString& tag, const QString* featureType, const QString& functions) {
+    if (featureType) {
+      ordered.substitute(kOutputTokenStart + tag + kFeatureTypeTokenEnd, *featureType);
+      ordered.substitute(kOutputTokenStart + tag + kFunctionsTokenEnd, functions);
     } else {
       ordered.removeOutputClause(tag, false);
     }
-  }
-  lines = ordered.lines();
+  });
+  lines = takeLines(ordered);
 }
 
-bool TransformerCfg::fillPorts(TemplateExpansion& expansion, const CompiledTemplate& compiled,
-                               const ParameterSubstitution& values) const {
-  const auto fill = [&](int slot, const QString& text) {
-    expansion.setValue(slot, text);
-    return TemplateExpansion::isInert(text, [&](const QString& name) { return values.isSubstituted(name); });
-  };
+void TransformerCfg::forEachInputText(
+    const std::function<void(const QString& token, const QString& text)>& visit) const {
   QStringList tags;
   getInputTags(tags);
   port_texts::InputTexts all;
-  bool isInert = true;
   for (const QString& tag : std::as_const(tags)) {
-    isInert = fill(compiled.slotOf(kInputTokenStart + tag + kInputTokenEnd), all.add(*this, m_ports, tag)) &&
-              isInert;
+    visit(kInputTokenStart + tag + kInputTokenEnd, all.add(*this, m_ports, tag));
   }
-  isInert = fill(compiled.slotOf(kInputLinesToken), all.text()) && isInert;
-  tags.clear();
+  visit(kInputLinesToken, all.text());
+}
+
+void TransformerCfg::forEachOutputText(
+    const std::function<void(const QString& tag, const QString* featureType, const QString& functions)>&
+        visit) const {
+  QStringList tags;
   getOutputTags(tags);
   for (const QString& tag : std::as_const(tags)) {
-    const QString start = kOutputTokenStart + tag;
-    const int typeSlot = compiled.slotOf(start + kFeatureTypeTokenEnd);
     QString featureType;
     if (port_texts::isOutputWritten(*this, tag, featureType)) {
-      isInert = fill(typeSlot, quotifyStringForMF(featureType)) && isInert;
-      isInert = fill(compiled.slotOf(start + kFunctionsTokenEnd), port_texts::outputFunctions(*this, tag)) &&
-                isInert;
+      const QString word = quotifyStringForMF(featureType);
+      visit(tag, &word, port_texts::outputFunctions(*this, tag));
+    } else {
+      visit(tag, nullptr, QString());
+    }
+  }
+}
+
+void TransformerCfg::fillPorts(TemplateExpansion& expansion, const CompiledTemplate& compiled) const {
+  forEachInputText(
+      [&](const QString& token, const QString& text) { expansion.setValue(compiled.slotOf(token), text); });
+  forEachOutputText([&](const QString& tag, const QString* featureType, const QString& functions) {
+    const int typeSlot = compiled.slotOf(kOutputTokenStart + tag + kFeatureTypeTokenEnd);
+    if (featureType) {
+      expansion.setValue(typeSlot, *featureType);
+      expansion.setValue(compiled.slotOf(kOutputTokenStart + tag + kFunctionsTokenEnd), functions);
     } else {
       expansion.removeLinesOf(typeSlot);
     }
-  }
-  return isInert;
+  });
 }
 
 QStringList TransformerCfg::getTransformFactoryInputLines() const {
@@ -295,7 +293,7 @@ QString TransformerCfg::textForMappingFile(QString value, const QString& name,
     return value.contains(kMacroOpen) ? quotifyString(value, QStringLiteral(" ")) : quotifyStringForMF(value);
   }
   const TransformParamCfg* record = parameter ? parameter : getParameterByMacroName(name);
-  if (!record || (isUnset(value) && record->getFlag(kGUITypeOmittable))) {
+  if (!record || (isUnsetValue(value) && record->getFlag(kGUITypeOmittable))) {
     return value;
   }
   const QString& type = record->getType();
@@ -321,35 +319,38 @@ QString TransformerCfg::textForMappingFile(QString value, const QString& name,
   if (record->mayHoldAttributeReference() || (!choices.isEmpty() && !choices.contains(value))) {
     value = getParameterValueForMappingFile(value, isEncoded, false);
   }
-  return choices.hasLookup() ? lookedUp(buffer, name, *record, value) : value;
+  return lookedUp(buffer, name, *record, value);
 }
 
 QString TransformerCfg::lookedUp(MFBuffer& buffer, const QString& name, const TransformParamCfg& record,
                                  const QString& value) const {
   const ChoiceList& choices = record.choices();
   const QString own = m_baseGuid + name;
-  const bool isListBox = ORX_isListBoxType(record);
-  const bool isRunTime = m_listener && m_listener->isRunTimeValue(*this, value);
-  const bool isProcedure = !isRunTime && record.getType().startsWith(kChoiceType);
+  const LookupKind kind = lookupKind(*this, record, value);
+  const bool writesFragment = kind == LookupKind::RunTime || kind == LookupKind::Procedure;
   // A text that would keep the buffer busy for ever is left to the caller's checks.
-  if ((isRunTime || isProcedure) && !mapping_file_checks::closesDeferredMacros(
-                                        choices, {value, record.getDescription(), getIdentifier()})) {
+  if (writesFragment && !mapping_file_checks::closesDeferredMacros(
+                            choices, {value, record.getDescription(), getIdentifier()})) {
     return value;
   }
-  if (isRunTime) {
-    const bool isOptional = record.getFlag(kGUITypeOptional);
-    if (isListBox) {
-      writeListBoxLookup(buffer, choices, value, record.getDescription(), own, isOptional);
-    } else {
-      writeChoiceBoxLookup(buffer, choices, value, record.getDescription(), own, isOptional);
+  switch (kind) {
+    case LookupKind::None:
+      return value;
+    case LookupKind::RunTime: {
+      const bool isOptional = record.getFlag(kGUITypeOptional);
+      if (ORX_isListBoxType(record)) {
+        writeListBoxLookup(buffer, choices, value, record.getDescription(), own, isOptional);
+      } else {
+        writeChoiceBoxLookup(buffer, choices, value, record.getDescription(), own, isOptional);
+      }
+      return kMacroOpen + own + QLatin1Char(')');
     }
-    return kMacroOpen + own + QLatin1Char(')');
+    case LookupKind::Procedure:
+      return writeChoiceLookupTclFunc(buffer, name, choices, value);
+    case LookupKind::Stored:
+      break;
   }
-  if (isProcedure) {
-    return ExpressionWriter::holdsReference(value) ? value
-                                                   : writeChoiceLookupTclFunc(buffer, name, choices, value);
-  }
-  if (!isListBox) {
+  if (!ORX_isListBoxType(record)) {
     return choices.toStored(value);
   }
   QStringList selected = QORXSdfStringToList(value, QLatin1Char(' '));
@@ -437,7 +438,7 @@ QString TransformerCfg::getTransformerParams() const {
   QString list;
   for (const TransformParamCfg& record : m_parameters.records()) {
     const QString& name = record.getName();
-    if (name == kIdentifierParameter || !ParameterSubstitution::hasValue(record)) {
+    if (name == kIdentifierParameter || !WrittenValues::hasValue(record)) {
       continue;
     }
     if (!list.isEmpty()) {
@@ -456,5 +457,18 @@ void TransformerCfg::writeMultiProcessTransformFact(MFBuffer& buffer, const QStr
 }
 
 QHash<QString, QString> TransformerCfg::findUnwritableValues() const {
-  return MappingFileChecks(*this, m_parameters.records()).find();
+  const ParameterSubstitution values(*this, m_parameters.records());
+  const bool inserts = bringsTokens(values);
+  QHash<QString, QString> messages = MappingFileChecks(*this, m_parameters.records(), inserts).find();
+  if (inserts) {
+    NullBuffer buffer;
+    ParameterSubstitution tried(*this, m_parameters.records());
+    QStringList lines;
+    if (!expandInOrder(tried, buffer, lines)) {
+      const QString culprit = values.firstWithTokens();
+      messages.insert(culprit.isEmpty() ? QString(kIdentifierParameter) : culprit,
+                      TransformResString(lookup_checks::kGrowsWithoutEnd));
+    }
+  }
+  return messages;
 }

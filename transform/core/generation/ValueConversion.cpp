@@ -1,24 +1,11 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/MacroText.h>
 #include <transform/core/generation/ValueConversion.h>
+#include <transform/text/MacroText.h>
+#include <transform/text/MappingFileWords.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {
-
-// The inverse of quotifyStringForMF().
-QString unquoted(const QString& text) {
-  if (text.size() < 2 || !text.startsWith(QLatin1Char('"')) || !text.endsWith(QLatin1Char('"'))) {
-    return text;
-  }
-  QString inner = text.mid(1, text.size() - 2);
-  int trailing = 0;
-  while (trailing < inner.size() && inner.at(inner.size() - 1 - trailing) == QLatin1Char('\\')) {
-    ++trailing;
-  }
-  inner.chop(trailing / 2);
-  return inner.replace(QLatin1String("\\\""), QLatin1String("\""));
-}
 
 QString toPlain(const QString& value, ValueEncoding from) {
   switch (from) {
@@ -27,7 +14,7 @@ QString toPlain(const QString& value, ValueEncoding from) {
     case ValueEncoding::UserString:
       return encodeUserString(value);
     case ValueEncoding::Quoted:
-      return unquoted(value);
+      return textOfWord(value);
     case ValueEncoding::Plain:
       break;
   }

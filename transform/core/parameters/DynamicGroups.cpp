@@ -19,7 +19,7 @@ constexpr long kGroupTitleMessage = 370663;
 constexpr int kMostGroups = 1000;
 
 QStringList groupNames(const QString& value) {
-  if (value.isEmpty() || value == kUnusedValue) {
+  if (isUnsetValue(value)) {
     return QStringList();
   }
   QStringList names = QORXSdfStringToList(value, QLatin1Char(','));

@@ -16,7 +16,7 @@ const QLatin1String kRowSeparator("; ");
 }  // namespace
 
 QString displayText(const GUIType& type, const ChoiceList& choices, const QString& value, bool isDecoded) {
-  if (value.isEmpty() || value == kUnusedValue) {
+  if (isUnsetValue(value)) {
     return QString();
   }
   if (type.getType().startsWith(kPasswordType)) {

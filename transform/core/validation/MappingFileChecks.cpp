@@ -7,13 +7,13 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/definition/CompiledTemplate.h>
+#include <transform/core/generation/LookupDecision.h>
 #include <transform/core/generation/LookupWriters.h>
-#include <transform/core/generation/OrderedSubstitution.h>
-#include <transform/core/generation/ParameterSubstitution.h>
 #include <transform/core/validation/MappingFileChecks.h>
-#include <transform/text/MFBuffer.h>
 #include <transform/text/MessageStrings.h>
+#include <transform/text/NullBuffer.h>
 #include <transform/text/TextHelpers.h>
+#include <transform/text/TextPlaces.h>
 
 #include <algorithm>
 #include <typeinfo>
@@ -21,14 +21,9 @@
 namespace {
 
 using namespace lookup_checks;
+using namespace text_refusals;
 
-const QLatin1String kChoiceType("CHOICE");
-
-// Takes statements that nobody wants.
-class NullBuffer : public MFBuffer {
- public:
-  void write(const QByteArray&) override {}
-};
+const QLatin1String kTclCall("@Tcl2(");
 
 bool isSelfClosed(const QString& text) {
   return MFBuffer::closesDeferredMacros(text);
@@ -47,108 +42,95 @@ bool closesDeferredMacros(const ChoiceList& choices, const QStringList& texts) {
 
 }  // namespace mapping_file_checks
 
-MappingFileChecks::MappingFileChecks(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records)
-    : m_cfg(cfg), m_records(records) {
-  NullBuffer buffer;
-  ParameterSubstitution values(cfg, records);
-  m_bringsTokens = std::any_of(records.begin(), records.end(),
-                               [](const auto& record) { return record.getValue().contains(kMacroOpen); });
-  if (m_bringsTokens) {
-    values.collect(buffer);
-    m_bringsTokens = values.bringsTokens();
-  }
-}
+MappingFileChecks::MappingFileChecks(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records,
+                                     bool bringsTokens)
+    : m_cfg(cfg), m_records(records), m_written(cfg, bringsTokens) {}
 
 QHash<QString, QString> MappingFileChecks::find() const {
   QHash<QString, QString> messages;
-  const ConfiguredDefinition* definition = m_cfg.definition();
-  const CompiledTemplate* compiled = definition ? definition->compiledTemplate.get() : nullptr;
-  const TransformParamCfg* withReference = nullptr;
   for (const TransformParamCfg& record : m_records) {
-    if (const long number = refuse(record, compiled)) {
+    if (const long number = refuse(record)) {
       messages.insert(record.getName(), TransformResString(number));
     }
-    if (!withReference && record.getValue().contains(kMacroOpen)) {
-      withReference = &record;
-    }
-  }
-  if (m_bringsTokens && withReference && growsWithoutEnd()) {
-    messages.insert(withReference->getName(), TransformResString(kGrowsWithoutEnd));
   }
   return messages;
 }
 
-bool MappingFileChecks::growsWithoutEnd() const {
-  NullBuffer buffer;
-  ParameterSubstitution values(m_cfg, m_records);
-  values.collect(buffer);
-  OrderedSubstitution lines(m_cfg.getTemplateLines());
-  values.apply(lines);
-  return lines.isTooLarge();
-}
-
-// These values go into the statement that divides the work, whatever the template says.
-bool MappingFileChecks::isMultiProcessSetting(const QString& name) const {
-  const ConfiguredDefinition* definition = m_cfg.definition();
-  return definition && !definition->fields.multiProcess.isEmpty() &&
-         (name == definition->fields.multiProcess || name == kProcessCountParameter ||
-          name == kGroupsOrderedParameter);
-}
-
-// A class of its own writes the tables that the template leaves out, in statements behind it.
-bool MappingFileChecks::isWrittenByRows(const TransformParamCfg& record,
-                                        const CompiledTemplate* compiled) const {
-  return record.isTable() && compiled && typeid(m_cfg) != typeid(TransformerCfg) &&
-         compiled->slotOf(record.getName()) == CompiledTemplate::kNoSlot;
-}
-
-bool MappingFileChecks::isReached(const TransformParamCfg& record, const CompiledTemplate* compiled) const {
-  // Without a template the values are written as macros.
-  return !compiled || m_bringsTokens || record.isMultiParameter() || isWrittenByRows(record, compiled) ||
-         isMultiProcessSetting(record.getName()) ||
-         compiled->slotOf(record.getName()) != CompiledTemplate::kNoSlot ||
-         (record.getName() == kIdentifierParameter &&
-          compiled->slotOf(kEncodedNameToken) != CompiledTemplate::kNoSlot) ||
-         (ParameterSubstitution::hasValue(record) &&
-          compiled->slotOf(kValueListToken) != CompiledTemplate::kNoSlot);
-}
-
-long MappingFileChecks::refuse(const TransformParamCfg& record, const CompiledTemplate* compiled) const {
+long MappingFileChecks::refuse(const TransformParamCfg& record) const {
   const QString& name = record.getName();
   const QString stored = stripBasicStringInfo(m_cfg.getParameterValue(name));
-  if (record.choices().hasLookup()) {
-    if (const long number = refuseLookup(record, stored)) {
-      return number;
-    }
+  if (const long number = refuseLookup(record, stored)) {
+    return number;
   }
-  if (!isReached(record, compiled)) {
+  if (!m_written.contains(record)) {
     return 0;
   }
   NullBuffer buffer;
   const QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
   // Each member and each cell stands in a place of its own.
-  const QStringList parts = record.isMultiParameter() || isWrittenByRows(record, compiled)
+  const QStringList parts = record.isMultiParameter() || m_written.isWrittenByRows(record)
                                 ? QORXSdfStringToList(value, record.members().separator())
                                 : QStringList(value);
-  if (!std::all_of(parts.cbegin(), parts.cend(), isOneLine)) {
+  if (!std::all_of(parts.cbegin(), parts.cend(), &TextPlaces::isOneLine)) {
     return kBreaksLine;
   }
   if (!std::all_of(parts.cbegin(), parts.cend(), isSelfClosed)) {
     return kUnclosedReference;
   }
-  const int slot = compiled ? compiled->slotOf(name) : CompiledTemplate::kNoSlot;
-  const bool endsLine = !compiled || m_bringsTokens || record.isMultiParameter() ||
-                        (slot != CompiledTemplate::kNoSlot && compiled->endsLine(slot));
   const auto endsInBackslash = [](const QString& part) { return part.endsWith(QLatin1Char('\\')); };
-  if (endsLine && std::any_of(parts.cbegin(), parts.cend(), endsInBackslash)) {
+  if (m_written.mayEndLine(record) && std::any_of(parts.cbegin(), parts.cend(), endsInBackslash)) {
     return kEndsInBackslash;
   }
-  return name == kIdentifierParameter ? refuseIdentifier(stored) : 0;
+  if (name == kIdentifierParameter) {
+    return refuseIdentifier(stored);
+  }
+  if (m_written.isWord(record)) {
+    if (const long number = TextPlaces::refuse(TextPlace::Word, value)) {
+      return number;
+    }
+  }
+  if (record.isMultiParameter()) {
+    return refuseMembers(record, stored, parts);
+  }
+  return m_written.isToken(record) ? refuseToken(record, stored, value) : 0;
+}
+
+long MappingFileChecks::refuseMembers(const TransformParamCfg& record, const QString& stored,
+                                      const QStringList& written) const {
+  const QStringList parts = QORXSdfStringToList(stored, record.members().separator());
+  for (int i = 0; i + 1 < written.size() && i + 1 < parts.size(); i += 2) {
+    const GUIType* member = record.members().find(parts.at(i));
+    const long number = member ? refuseToken(*member, parts.at(i + 1), written.at(i + 1)) : 0;
+    if (number != 0) {
+      return number;
+    }
+  }
+  return 0;
+}
+
+long MappingFileChecks::refuseToken(const GUIType& type, const QString& stored,
+                                    const QString& written) const {
+  // Calls that were made for the value are sound, and so is what a class of its own makes of it.
+  const bool isMade = typeid(m_cfg) != typeid(TransformerCfg) && written != stored;
+  if (isMade || ExpressionWriter::needsWrapping(type, stored) || written.startsWith(kTclCall)) {
+    return 0;
+  }
+  const ConfiguredDefinition* definition = m_cfg.definition();
+  const CompiledTemplate* compiled = definition ? definition->compiledTemplate.get() : nullptr;
+  static const QSet<QString> none;
+  const QSet<QString>& keys = compiled ? compiled->keys() : none;
+  const bool isExpression = type.getType().startsWith(kExpressionType);
+  if (type.valueIsEncoded() && !isExpression) {
+    return TextPlaces::refuseEncodedValue(written);
+  }
+  const bool mayCall = isExpression || type.getType() == kTableType;
+  return TextPlaces::refusePlainValue(written, keys,
+                                      mayCall ? TextPlaces::Calls::Allowed : TextPlaces::Calls::Refused);
 }
 
 long MappingFileChecks::refuseIdentifier(const QString& value) const {
   if (!value.contains(kMacroOpen)) {
-    return 0;
+    return TextPlaces::refuse(TextPlace::Word, value);
   }
   // Such a name is wrapped in quotes when it holds a blank itself, without a change to what stands inside.
   QString expanded = value;
@@ -162,17 +144,11 @@ long MappingFileChecks::refuseIdentifier(const QString& value) const {
 }
 
 long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QString& value) const {
-  if (((value.isEmpty() || value == kUnusedValue) && record.getFlag(kGUITypeOmittable)) ||
-      ExpressionWriter::needsWrapping(record, value)) {
+  const LookupKind kind = lookupKind(m_cfg, record, value);
+  if (kind != LookupKind::RunTime && kind != LookupKind::Procedure) {
     return 0;
   }
   const ChoiceList& choices = record.choices();
-  const bool isRunTime = m_cfg.listener() && m_cfg.listener()->isRunTimeValue(m_cfg, value);
-  const bool isProcedure =
-      !isRunTime && record.getType().startsWith(kChoiceType) && !ExpressionWriter::holdsReference(value);
-  if (!isRunTime && !isProcedure) {
-    return 0;
-  }
   const QString identifier = m_cfg.getIdentifier();
   if (!mapping_file_checks::closesDeferredMacros(choices, {value, record.getDescription(), identifier})) {
     return kUnclosedReference;
@@ -187,7 +163,7 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
       return kGrowsWithoutEnd;
     }
   }
-  if (isProcedure) {
+  if (kind == LookupKind::Procedure) {
     return refuseChoiceProcedure(choices, lookup.macro, lookup.value);
   }
   return ORX_isListBoxType(record) ? refuseListBox(choices, lookup) : refuseChoiceBox(choices, lookup);

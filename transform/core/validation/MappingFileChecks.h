@@ -2,6 +2,7 @@
 #pragma once
 
 #include <transform/core/TransformParamCfg.h>
+#include <transform/core/generation/WrittenValues.h>
 
 #include <QHash>
 #include <QString>
@@ -9,7 +10,6 @@
 
 #include <vector>
 
-class CompiledTemplate;
 class TransformerCfg;
 
 namespace mapping_file_checks {
@@ -21,26 +21,28 @@ bool closesDeferredMacros(const ChoiceList& choices, const QStringList& texts);
 
 class MappingFileChecks {
  public:
-  // Neither is owned; both outlive this object.
-  MappingFileChecks(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records);
+  // Neither is owned; both outlive this object. `bringsTokens` tells that values are inserted into each
+  // other.
+  MappingFileChecks(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records,
+                    bool bringsTokens);
 
   // Parameter name to the message that says why.
   QHash<QString, QString> find() const;
 
  private:
   // Message numbers, 0 for nothing to refuse.
-  long refuse(const TransformParamCfg& record, const CompiledTemplate* compiled) const;
+  long refuse(const TransformParamCfg& record) const;
   long refuseIdentifier(const QString& value) const;
   long refuseLookup(const TransformParamCfg& record, const QString& value) const;
+  // What stands where the template has the token of a parameter, or of a member.
+  long refuseToken(const GUIType& type, const QString& stored, const QString& written) const;
+  long refuseMembers(const TransformParamCfg& record, const QString& stored,
+                     const QStringList& written) const;
   // As the engine sees the text when it runs a fragment; false when that has no end.
   bool expandMacros(QString& text) const;
   long refuseChoices(const ChoiceList& choices) const;
-  bool isMultiProcessSetting(const QString& name) const;
-  bool isWrittenByRows(const TransformParamCfg& record, const CompiledTemplate* compiled) const;
-  bool isReached(const TransformParamCfg& record, const CompiledTemplate* compiled) const;
-  bool growsWithoutEnd() const;
 
   const TransformerCfg& m_cfg;
   const std::vector<TransformParamCfg>& m_records;
-  bool m_bringsTokens = false;
+  const WrittenValues m_written;
 };

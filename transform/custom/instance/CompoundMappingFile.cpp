@@ -1,10 +1,11 @@
 // What an instance of a custom transformer writes into the mapping file.
 #include <transform/core/LookupChecks.h>
-#include <transform/core/MacroText.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfgListener.h>
+#include <transform/core/ValueReferences.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/custom/instance/CustomTransformerStatement.h>
 #include <transform/custom/instance/InstancePrototype.h>
 #include <transform/custom/instance/LookedUpParameters.h>
@@ -14,6 +15,7 @@
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
+#include <transform/text/TextPlaces.h>
 
 #include <algorithm>
 #include <optional>
@@ -46,20 +48,16 @@ QString ownReference(const QString& value, const TransformerCfg& instance) {
 
 bool isIterationCount(const QString& value) {
   bool isNumber = false;
-  return value.isEmpty() || value == kUnusedValue || value.toInt(&isNumber) > 0 ||
+  return isUnsetValue(value) || value.toInt(&isNumber) > 0 ||
          isParameterReference(MFBuffer::withOrdinaryMacros(value));
 }
 
-// "@Value(NAME)" of a name or of an encoded reference; the name keeps its encoding.
+// "@Value(NAME)" of an encoded name or of a reference.
 QString attributeValueForm(const QString& value) {
-  if (value.isEmpty() || value == kUnusedValue || value.startsWith(kValueReference))
+  if (isUnsetValue(value) || value.startsWith(kValueReference))
     return value;
-  QString name = value;
-  if (name.startsWith(kValueReferenceEncoded) && name.endsWith(kEncodedRightParenthesis)) {
-    name = name.mid(kValueReferenceEncoded.size());
-    name.chop(kEncodedRightParenthesis.size());
-  }
-  return kValueReference + name + QLatin1Char(')');
+  const QString word = isValueReference(value) ? valueReferences(value).front().word : value;
+  return kValueReference + word + QLatin1Char(')');
 }
 
 bool areClosed(const std::vector<QStringList>& statements) {
@@ -181,7 +179,7 @@ QStringList CompoundTransformerCfg::parameterStatements(const QString& prefixMac
     const GUIType& type = getParameterGUIType(parameter);
     const QString stored = getParameterValue(parameter);
     const ScriptLanguage language = scriptLanguage(type);
-    if (language != ScriptLanguage::None && !isUnsetScript(stored)) {
+    if (language != ScriptLanguage::None && !isUnsetValue(stored)) {
       if (language == ScriptLanguage::Python)
         getPythonParameterLines(prefixMacro, parameter, stored, statements);
       else
@@ -229,7 +227,7 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
       lines.append(macroValue(parameter, type, prefix));
       if (lines.first().contains(QLatin1Char('\n')) || lines.first().contains(QLatin1Char('\r')))
         message = TransformResString(custom_messages::kLineBreak, parameter);
-    } else if (!isUnsetScript(stored)) {
+    } else if (!isUnsetValue(stored)) {
       const bool isPython = language == ScriptLanguage::Python;
       if (isPython ? canWritePythonParameter(prefix, parameter, stored, message)
                    : canWriteTclParameter(prefix, parameter, stored, message))
@@ -265,21 +263,83 @@ long CompoundTransformerCfg::refuseApart(const QString& parameter, const GUIType
       return custom_messages::kBadMaximum;
   }
   if (scriptLanguage(type) != ScriptLanguage::None)
-    return isUnsetScript(stored) ? 0 : custom_messages::kScriptForWorkers;
+    return isUnsetValue(stored) ? 0 : custom_messages::kScriptForWorkers;
   const TransformParamCfg* record = getParameterByMacroName(parameter);
   return record && record->getFlag(kGUITypeInstanceMacros) && !ownReference(stored, *this).isEmpty()
              ? custom_messages::kOwnReferenceForWorkers
              : 0;
 }
 
+// A Tcl script of the instance, or of one inside at any depth, prints the statement that sets its macro; the
+// macro's name begins with that of the instance.
+bool CompoundTransformerCfg::printsMacroNames() const {
+  const auto prints = [](const TransformerCfg& cfg) {
+    const QStringList names = cfg.getParameters();
+    return std::any_of(names.begin(), names.end(), [&](const QString& name) {
+      return scriptLanguage(cfg.getParameterGUIType(name)) == ScriptLanguage::Tcl &&
+             !isUnsetValue(cfg.getParameterValue(name));
+    });
+  };
+  if (prints(*this))
+    return true;
+  for (const CompoundTransformerNetwork* network :
+       m_network ? nestedNetworks(*m_network) : std::vector<CompoundTransformerNetwork*>()) {
+    const auto& inside = network->getTransformers();
+    if (std::any_of(inside.begin(), inside.end(),
+                    [&](const TransformerCfg* cfg) { return networkOf(cfg) && prints(*cfg); }))
+      return true;
+  }
+  return false;
+}
+
+// What the statement of a loop, or of several processes, carries beside the macros.
+long CompoundTransformerCfg::refuseSetting(const QString& parameter) const {
+  if (!m_network)
+    return 0;
+  const bool isOfLoop = parameter == kMaxLoopIterationsParameter || parameter == kIterationCountParameter;
+  if (isOfLoop && m_network->blockedLooping())
+    return TextPlaces::refuse(TextPlace::LoopSetting, getParameterValue(parameter, UnpackLevel::Decoded));
+  const bool hasGroupBy = hasParameter(kProcessGroupByParameter);
+  if (parameter != (hasGroupBy ? kProcessGroupByParameter : kIdentifierParameter))
+    return 0;
+  const ParallelSettings settings = parallelSettingsOf(*m_network, *this);
+  for (const QString& setting : {settings.groupBy, settings.parallelism, settings.processSetting}) {
+    if (const long number = TextPlaces::refuse(TextPlace::ParallelSetting, setting))
+      return number;
+  }
+  return 0;
+}
+
+QStringList CompoundTransformerCfg::findUnwritablePorts() const {
+  QStringList messages;
+  if (!m_network)
+    return messages;
+  // Loops and transform factories name the ports as they are.
+  const bool isBare = isRunApart(*m_network, *this);
+  for (const QString& port : m_network->getInputs() + m_network->getOutputs()) {
+    long number = TextPlaces::refuse(TextPlace::QuotedName, port);
+    if (number == 0 && isBare)
+      number = TextPlaces::refuse(TextPlace::Port, port);
+    // What is wrong with it wherever it stands is told where the definition is embedded.
+    const bool isEmbedded = m_network->getFileName().isEmpty();
+    if (number == text_refusals::kBreaksLine)
+      number = isEmbedded ? 0 : custom_messages::kLineBreak;
+    else if (number == text_refusals::kUnclosedReference)
+      number = isEmbedded ? 0 : custom_messages::kUnclosedReference;
+    if (number != 0)
+      messages.append(TransformResString(number, port));
+  }
+  return messages;
+}
+
 // The inside is written once for all instances, so what its fragments cannot carry is found here.
 long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QString& value,
                                               std::optional<LookedUpParameters>& lookedUp) const {
   const bool isName = parameter == kIdentifierParameter;
-  if (value.endsWith(QLatin1Char('\\')))
-    return lookup_checks::kEndsInBackslash;
-  if (!isMacroName(parameter))
-    return lookup_checks::kNameInMacro;
+  if (const long number = TextPlaces::refuse(TextPlace::MacroValue, value))
+    return number;
+  if (const long number = TextPlaces::refuse(TextPlace::MacroName, parameter))
+    return number;
   if (isName && value != value.trimmed())
     return custom_messages::kBlankAtEnd;
   if (getParameterValue(parameter).startsWith(kConditionalPrefix))
@@ -287,8 +347,12 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   QString expanded = MFBuffer::withOrdinaryMacros(value);
   const bool ends = !listener() || listener()->expandMacros(*this, expanded);
   // The name stands in quotes as it is.
-  if (isName && expanded.contains(QLatin1Char('"')))
+  if (isName && TextPlaces::refuse(TextPlace::QuotedName, expanded) != 0)
     return lookup_checks::kIdentifierInScript;
+  if (isName && TextPlaces::refuse(TextPlace::PrintedName, expanded) != 0 && printsMacroNames())
+    return text_refusals::kNoPrintedName;
+  if (const long number = refuseSetting(parameter))
+    return number;
   if ((ends && lookup_checks::fitsFragment(expanded)) || !m_network)
     return 0;
   if (!lookedUp)

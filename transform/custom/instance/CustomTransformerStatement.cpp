@@ -19,14 +19,14 @@ QString resolve(const QString& setting, const TransformerCfg& instance) {
   if (!record)
     return setting;
   const QString value = record->choices().toStored(instance.getParameterValue(name));
-  return value == kUnusedValue ? QString() : value;
+  return isUnsetValue(value) ? QString() : value;
 }
 
 QString resolveGroupBy(const QString& groupBy, const TransformerCfg& instance) {
   QString resolved = resolve(groupBy, instance);
   if (!isParameterReference(groupBy) && instance.hasParameter(kProcessGroupByParameter))
     resolved = instance.getParameterValue(kProcessGroupByParameter);
-  return resolved == kUnusedValue || resolved == kUnusedGroupBy ? QString() : resolved;
+  return isUnsetSetting(resolved) ? QString() : resolved;
 }
 
 void writeLoopFactory(MFBuffer& buffer, const CompoundTransformerNetwork& network,

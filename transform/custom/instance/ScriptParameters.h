@@ -14,8 +14,3 @@ inline ScriptLanguage scriptLanguage(const GUIType& type) {
     return ScriptLanguage::Tcl;
   return ScriptLanguage::None;
 }
-
-// A parameter without a script gets an empty macro in place of a script block.
-inline bool isUnsetScript(const QString& value) {
-  return value.isEmpty() || value == kUnusedValue;
-}

@@ -36,7 +36,6 @@ std::unique_ptr<TransformerCfg> makePrototype(const CatalogueEntry::Unread& unre
   std::unique_ptr<TransformerCfg> prototype(createTransformerCfg(fields.name, fields.version));
   prototype->configure(fields, unread.load->session);
   prototype->setDefinitionDirectory(unread.load->directory);
-  prototype->setTransformerType(unread.isBuiltIn ? TransformerCfg::kBuiltIn : TransformerCfg::kOrdinary);
   for (const auto& companion : unread.companions) {
     applyCompanion(*companion, *prototype);
   }

@@ -28,7 +28,6 @@ class CatalogueEntry {
     QByteArray bytes;  // as DefinitionFileParser::definitionAlone() takes them
     QString path;
     bool isAllowed = true;
-    bool isBuiltIn = false;
     std::shared_ptr<const DefinitionLoad> load;
     std::vector<std::shared_ptr<const CompanionEntry>> companions;  // in the order in which they came
   };

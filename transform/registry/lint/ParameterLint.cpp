@@ -1,6 +1,8 @@
 #include <platform/orxparameter/orxparameter.h>
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/StoredValue.h>
+#include <transform/core/ValueReferences.h>
 #include <transform/registry/lint/ParameterLint.h>
 #include <transform/registry/loading/DefinitionKeywords.h>
 
@@ -166,9 +168,10 @@ void ParameterLint::checkDefault(const LintedParameter& parameter) {
 
 void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType& type,
                                  const QString& value) {
-  const bool isUnset = value.isEmpty() || value == kUnusedValue || value == kUnusedGroupBy;
-  const bool isReference = type.mayHoldAttributeReference() &&
-                           (value.startsWith(kValueReference) || value.startsWith(QLatin1Char('&')));
+  const bool isUnset = isUnsetSetting(value);
+  const bool isMark = value.startsWith(kAttributeMark) && type.mayHoldAttributeReference();
+  const bool isReference = isMark ? withAttributeReference(type, value) != value
+                                  : type.mayHoldAttributeReference() && beginsValueReference(value);
   if (isUnset || isReference || hasNoValue(type) || value.contains(kMacroOpen)) {
     return;
   }
@@ -176,7 +179,9 @@ void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType
     add(Rule::BadDefault, parameter.defaultLine,
         QStringLiteral("Default of '%1': %2").arg(type.getName(), text));
   };
-  if (ORX_isChoiceType(type)) {
+  if (isMark) {
+    refuse(QStringLiteral("'%1' would be written as it stands; write @Value(%2)").arg(value, value.mid(1)));
+  } else if (ORX_isChoiceType(type)) {
     ChoiceList choices(type);
     for (const QString& line : m_definition.fields().parameterLookups.value(parameter.name)) {
       choices.addLookup(line);

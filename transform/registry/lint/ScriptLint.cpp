@@ -32,7 +32,7 @@ void ScriptLint::check(const LintedDefinition& definition, LintReport& report) {
     }
   }
   for (const LintedParameter& parameter : definition.parameters()) {
-    if (!parameter.defaultValue.isEmpty() && parameter.defaultValue != kUnusedValue) {
+    if (!isUnsetValue(parameter.defaultValue)) {
       checkDefault(parameter, {definition.file(), parameter.defaultLine, parameter.name}, report);
     }
   }

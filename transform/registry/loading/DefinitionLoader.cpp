@@ -1,4 +1,3 @@
-#include <platform/qorxcore/OrxHome.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/files/FolderListing.h>
 #include <transform/registry/catalogue/CategoryTexts.h>
@@ -46,7 +45,6 @@ void DefinitionLoader::loadFolder(const QString& folder) {
     return;
   }
   const QString start = folder + QLatin1Char('/');
-  const bool isBuiltIn = start.startsWith(QORXOrxHome() + QLatin1Char('/'));
   const QString companionEnd = m_load ? QLatin1String("-localized.") + m_load->language : QString();
   const auto isWantedCompanion = [&](const QString& name) {
     return m_load && name.endsWith(companionEnd) && isCompanionFileName(name);
@@ -54,7 +52,7 @@ void DefinitionLoader::loadFolder(const QString& folder) {
   QStringList companions;
   for (const QString& name : listing.names()) {
     if (isDefinitionFileName(name)) {
-      loadFile(start + name, isBuiltIn);
+      loadFile(start + name);
     } else if (isWantedCompanion(name)) {
       companions.append(start + name);
     }
@@ -70,7 +68,7 @@ void DefinitionLoader::loadFolder(const QString& folder) {
   }
 }
 
-void DefinitionLoader::loadFile(const QString& path, bool isBuiltIn) {
+void DefinitionLoader::loadFile(const QString& path) {
   const bool isOpen = m_file.open(path);
   if (isOpen && XMLComponentReader::isXMLWorkspace(m_file.bytes())) {
     m_loadCustom(path);
@@ -92,11 +90,11 @@ void DefinitionLoader::loadFile(const QString& path, bool isBuiltIn) {
   }
   noteLosses(path);
   for (IndexedDefinition& definition : m_index.definitions()) {
-    define(definition, path, isBuiltIn);
+    define(definition, path);
   }
 }
 
-void DefinitionLoader::define(IndexedDefinition& definition, const QString& path, bool isBuiltIn) {
+void DefinitionLoader::define(IndexedDefinition& definition, const QString& path) {
   const TransformerDefinition& facts = definition.facts;
   if (facts.name.isEmpty()) {
     return;
@@ -105,7 +103,7 @@ void DefinitionLoader::define(IndexedDefinition& definition, const QString& path
   const CatalogueEntry& entry = m_prototypes.add(
       {facts.name, facts.version, ConfiguredDefinition::tagsOf(facts.category), facts.visible && isAllowed,
        facts.aliases},
-      CatalogueEntry(facts.version, {std::move(definition.bytes), path, isAllowed, isBuiltIn, m_load, {}}));
+      CatalogueEntry(facts.version, {std::move(definition.bytes), path, isAllowed, m_load, {}}));
   // Its checks ask about the system as it is while loading.
   if (!facts.dependencyScripts.isEmpty()) {
     entry.prototype();

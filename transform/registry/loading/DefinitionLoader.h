@@ -30,10 +30,10 @@ class DefinitionLoader {
   const QStringList& errors() const { return m_errors; }
 
  private:
-  void loadFile(const QString& path, bool isBuiltIn);
+  void loadFile(const QString& path);
   void loadCompanion(const QString& path);
   bool readAll(const QString& path);
-  void define(IndexedDefinition& definition, const QString& path, bool isBuiltIn);
+  void define(IndexedDefinition& definition, const QString& path);
   // Tells what of the indexed file is lost.
   void noteLosses(const QString& path);
   void noteUnreadable(const QString& path, const QString& reason);

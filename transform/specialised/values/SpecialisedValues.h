@@ -1,14 +1,10 @@
 // What can be said about a stored value.
 #pragma once
 
-#include <transform/core/ExpressionWriter.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/ValueReferences.h>
 
 #include <QString>
-
-inline bool isUnsetValue(const QString& value) {
-  return value.isEmpty() || value == kUnusedValue;
-}
 
 inline bool refersToMacros(const QString& value) {
   return value.contains(kMacroOpen) || value.contains(kDeferredOpen);
@@ -16,6 +12,5 @@ inline bool refersToMacros(const QString& value) {
 
 // Whether only the running mapping file, or the feature, tells what it is.
 inline bool isOpenValue(const QString& value) {
-  return refersToMacros(value) || ExpressionWriter::holdsReference(value) ||
-         value.startsWith(kConditionalPrefix);
+  return refersToMacros(value) || beginsValueReference(value) || value.startsWith(kConditionalPrefix);
 }

@@ -1,5 +1,5 @@
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/core/MacroText.h>
+#include <transform/text/MacroText.h>
 
 #include <algorithm>
 #include <cstring>

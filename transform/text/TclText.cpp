@@ -1,4 +1,4 @@
-#include <transform/core/definition/TclText.h>
+#include <transform/text/TclText.h>
 
 #include <QByteArray>
 #include <QStringList>

@@ -1,9 +1,21 @@
-// Splits statements into words, and finds where function calls end. Linear in the size of the statement.
+// The words of a statement: how a text is read back from one, where the words of a statement end, where its
+// function calls do. All linear in the size of the text.
+//
+// The writer is quotifyStringForMF() in TextHelpers.h, whose form is fixed. It stands beside these in
+// MappingFileWords.cpp, for the three only make sense together.
 #pragma once
+
+#include <platform/Export.h>
 
 #include <QString>
 
-struct MappingFileWord {
+// Whether quotifyStringForMF() makes one word of the text that is read back as the text. It cannot carry a
+// backslash directly before a double quote: the quote might as well be the end of the word.
+ORX_EXPORT bool canBeWord(const QString& text);
+// The text that a word stands for: the inverse of quotifyStringForMF().
+ORX_EXPORT QString textOfWord(const QString& word);
+
+struct ORX_EXPORT MappingFileWord {
   enum class Kind { Bare, Quoted, Call };
 
   QStringRef text;  // with its quotes
@@ -17,7 +29,7 @@ struct MappingFileWord {
   QString value() const;
 };
 
-class MappingFileWords {
+class ORX_EXPORT MappingFileWords {
  public:
   // The text must outlive this object.
   explicit MappingFileWords(const QString& text, int from = 0) : m_text(text), m_position(from) {}
@@ -39,6 +51,6 @@ class MappingFileWords {
 };
 
 // The name of a call "@NAME(" that begins at the position; empty when none does.
-QStringRef mappingFileCallName(const QString& text, int position, int end);
+ORX_EXPORT QStringRef mappingFileCallName(const QString& text, int position, int end);
 // Behind the parenthesis that closes the one at `open`; -1 when none does before `end`.
-int endOfMappingFileCall(const QString& text, int open, int end);
+ORX_EXPORT int endOfMappingFileCall(const QString& text, int open, int end);

@@ -1,4 +1,6 @@
-#include <translation/mappingfile/MappingFileWords.h>
+#include <platform/qorxcore/Quoting.h>
+#include <transform/text/MappingFileWords.h>
+#include <transform/text/TextHelpers.h>
 
 namespace {
 
@@ -13,24 +15,51 @@ bool isNameCharacter(QChar c) {
   return c.unicode() < 0x80 && (c.isLetterOrNumber() || c == QLatin1Char('_'));
 }
 
+int backslashesAtEnd(const QString& text) {
+  int count = 0;
+  while (count < text.size() && text.at(text.size() - 1 - count) == kBackslash)
+    ++count;
+  return count;
+}
+
+// What stands between the quotes of a word, read.
+QString readInside(const QStringRef& inside) {
+  QString text;
+  text.reserve(inside.size());
+  for (int i = 0; i < inside.size(); ++i) {
+    const bool isEscape = inside.at(i) == kBackslash && i + 1 < inside.size() && inside.at(i + 1) == kQuote;
+    text += inside.at(isEscape ? ++i : i);
+  }
+  // Backslashes directly before the closing quote are doubled.
+  text.chop(backslashesAtEnd(text) / 2);
+  return text;
+}
+
 }  // namespace
+
+QString quotifyStringForMF(const QString& text) {
+  static const QString kSpecials = QStringLiteral(" \t()\\\"");
+  QString quoted = QORXQuotifyString(text, kSpecials);
+  if (quoted.size() < 3 || !quoted.startsWith(kQuote) || !quoted.endsWith(kQuote))
+    return quoted;
+  QString inner = quoted.mid(1, quoted.size() - 2);
+  inner.replace(kQuote, QLatin1String("\\\""));
+  return kQuote + inner + QString(backslashesAtEnd(inner), kBackslash) + kQuote;
+}
+
+bool canBeWord(const QString& text) {
+  return !text.contains(QLatin1String("\\\""));
+}
+
+QString textOfWord(const QString& word) {
+  const bool isQuoted = word.size() >= 2 && word.startsWith(kQuote) && word.endsWith(kQuote);
+  return isQuoted ? readInside(word.midRef(1, word.size() - 2)) : word;
+}
 
 QString MappingFileWord::value() const {
   if (kind != Kind::Quoted)
     return text.toString();
-  const QStringRef inside = text.mid(1, text.size() - (isClosed ? 2 : 1));
-  QString value;
-  value.reserve(inside.size());
-  for (int i = 0; i < inside.size(); ++i) {
-    const bool isEscape = inside.at(i) == kBackslash && i + 1 < inside.size() && inside.at(i + 1) == kQuote;
-    value += inside.at(isEscape ? ++i : i);
-  }
-  // Backslashes directly before the closing quote are doubled.
-  int doubled = 0;
-  while (doubled < value.size() && value.at(value.size() - 1 - doubled) == kBackslash)
-    ++doubled;
-  value.chop(doubled / 2);
-  return value;
+  return readInside(text.mid(1, text.size() - (isClosed ? 2 : 1)));
 }
 
 bool MappingFileWords::next(MappingFileWord& word) {
@@ -59,18 +88,14 @@ bool MappingFileWords::next(MappingFileWord& word) {
   return true;
 }
 
-// A backslash escapes a quote, unless it is itself one of the doubled backslashes before the closing quote.
+// One backslash escapes a quote; before the closing quote they are doubled, so there is an even number of
+// them.
 int MappingFileWords::endOfQuote(int open, MappingFileWord& word) const {
-  int backslashes = 0;
+  bool isEscaped = false;
   for (int i = open + 1; i < m_text.size(); ++i) {
-    if (m_text.at(i) == kBackslash) {
-      ++backslashes;
-      continue;
-    }
-    const bool isBeforeBlank = i + 1 == m_text.size() || isBlank(m_text.at(i + 1));
-    if (m_text.at(i) == kQuote && (backslashes == 0 || (backslashes % 2 == 0 && isBeforeBlank)))
+    if (m_text.at(i) == kQuote && !isEscaped)
       return i + 1;
-    backslashes = 0;
+    isEscaped = m_text.at(i) == kBackslash && !isEscaped;
   }
   word.isClosed = false;
   return m_text.size();

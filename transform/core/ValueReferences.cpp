@@ -1,0 +1,97 @@
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/ValueReferences.h>
+#include <transform/text/MacroText.h>
+
+namespace {
+
+// Which forms of brackets close each other.
+enum class Form { Plain, Encoded };
+
+struct Mark {
+  const QLatin1String& text;
+  Form form;
+  enum class Kind { Reference, Open, Close } kind;
+};
+
+// A longer mark stands before what it begins with.
+const Mark kMarks[] = {
+    {kValueReference, Form::Plain, Mark::Kind::Reference},
+    {kValueReferenceEncoded, Form::Encoded, Mark::Kind::Reference},
+    {kValueReferenceWord, Form::Encoded, Mark::Kind::Reference},
+    {kEncodedLeftParenthesis, Form::Encoded, Mark::Kind::Open},
+    {kEncodedRightParenthesis, Form::Encoded, Mark::Kind::Close},
+};
+const QLatin1String kLeftParenthesis("(");
+const QLatin1String kRightParenthesis(")");
+const Mark kLeft{kLeftParenthesis, Form::Plain, Mark::Kind::Open};
+const Mark kRight{kRightParenthesis, Form::Plain, Mark::Kind::Close};
+
+const Mark* markAt(const QString& text, int position) {
+  const QChar c = text.at(position);
+  if (c == QLatin1Char('('))
+    return &kLeft;
+  if (c == QLatin1Char(')'))
+    return &kRight;
+  if (c != QLatin1Char('@') && c != QLatin1Char('<'))
+    return nullptr;
+  for (const Mark& mark : kMarks) {
+    if (text.midRef(position, mark.text.size()) == mark.text)
+      return &mark;
+  }
+  return nullptr;
+}
+
+// A name may stand in quotes, which are no part of it.
+ValueReference makeReference(int begin, int end, const QString& inside, Form form) {
+  static const QString quote = QORXWwjdEncode(QStringLiteral("\""));
+  QString word = form == Form::Encoded ? reencodeAroundReferences(inside) : encodeAroundReferences(inside);
+  if (word.size() >= 2 * quote.size() && word.startsWith(quote) && word.endsWith(quote))
+    word = word.mid(quote.size(), word.size() - 2 * quote.size());
+  return {begin, end, QORXWwjdDecode(word), word};
+}
+
+}  // namespace
+
+std::vector<ValueReference> valueReferences(const QString& text) {
+  std::vector<ValueReference> references;
+  if (!beginsValueReference(text))
+    return references;
+  std::vector<Form> open;
+  // The reference that was opened last: an outer one counts no more. Its bracket is the one at this depth.
+  std::size_t depth = 0;
+  int begin = -1;
+  int nameBegin = 0;
+  for (int i = 0; i < text.size(); ++i) {
+    const Mark* mark = markAt(text, i);
+    if (!mark)
+      continue;
+    const int behind = i + mark->text.size();
+    if (mark->kind != Mark::Kind::Close) {
+      open.push_back(mark->form);
+      if (mark->kind == Mark::Kind::Reference) {
+        depth = open.size();
+        begin = i;
+        nameBegin = behind;
+      }
+    } else if (!open.empty() && open.back() == mark->form) {
+      if (begin >= 0 && open.size() == depth) {
+        references.push_back(makeReference(begin, behind, text.mid(nameBegin, i - nameBegin), mark->form));
+        begin = -1;
+      }
+      open.pop_back();
+    }
+    i = behind - 1;
+  }
+  return references;
+}
+
+bool isValueReference(const QString& text) {
+  const std::vector<ValueReference> references = valueReferences(text);
+  return references.size() == 1 && references.front().begin == 0 && references.front().end == text.size();
+}
+
+bool beginsValueReference(const QString& text) {
+  return text.contains(kValueReference) || text.contains(kValueReferenceEncoded) ||
+         text.contains(kValueReferenceWord);
+}

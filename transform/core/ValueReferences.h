@@ -1,0 +1,28 @@
+// The attribute references "@Value(NAME)" inside a value, in any of the forms in which they are stored:
+// plain, word-encoded, and word-encoded with "@" as it is. What is a reference is decided here alone.
+//
+// Brackets inside a name count when they are matched; of references inside one another only the innermost is
+// one; one that is never closed is text. So references never overlap.
+#pragma once
+
+#include <platform/Export.h>
+
+#include <QString>
+
+#include <vector>
+
+struct ValueReference {
+  int begin;
+  int end;
+  QString name;  // of the attribute
+  QString word;  // the name word-encoded, references to macros in it as they stand
+};
+
+// In the order of the text; linear in its size.
+ORX_EXPORT std::vector<ValueReference> valueReferences(const QString& text);
+
+// Whether the text is one reference, with nothing before or behind it.
+ORX_EXPORT bool isValueReference(const QString& text);
+
+// Whether some reference begins in the text, be it closed or not.
+ORX_EXPORT bool beginsValueReference(const QString& text);
