@@ -39,6 +39,10 @@ WorkspaceDocument::Reading WorkspaceDocument::readOpened(orx::Findings& diagnost
                                                          Versions versions) {
   m_form = WorkspaceFile::recognise(m_input.path());
   m_rawLines = RawLine::find(m_input.path());
+  for (const RawLine& line : m_rawLines) {
+    if (line.kind == RawLine::Kind::Conflict)
+      diagnostics.report(Rule::ConflictMark, line.line, QString(), {line.text});
+  }
   if (m_form == WorkspaceFile::Form::Versioned) {
     m_versions = VersionStore(m_input.path()).versions(error);
     if (!error.isEmpty())

@@ -11,6 +11,8 @@
 #include <translation/generation/MappingFileWriter.h>
 #include <translation/graph/ReferencedNames.h>
 #include <translation/graph/WorkspaceBuilder.h>
+#include <translation/validation/DocumentChecks.h>
+#include <translation/validation/FitChecks.h>
 #include <translation/validation/FlowChecks.h>
 #include <translation/validation/ValueChecks.h>
 
@@ -75,6 +77,7 @@ void Validation::run() {
   for (const ExternalDocNetwork* network : workspace->customTransformers())
     checkInside(*network, *workspace);
   checkParameterUse(*workspace);
+  fit_checks::checkParameters(m_reader, workspace->parameters, m_diagnostics);
 }
 
 Validation::Records Validation::byIdentifier(const ORXTValSlist<TransformerStruct>& list) {
@@ -111,6 +114,7 @@ void Validation::checkTransformers(const Workspace& workspace, bool isConnected)
     m_values.check({*node.cfg, *record, node.name, node.parameterLines,
                     isConnected && flow.knowsWhatArrives(static_cast<int>(number))},
                    knows, m_parameterNames);
+    fit_checks::checkTransformer(*node.cfg, node.parameterLines, node.name, m_diagnostics);
     checkAge(*node.cfg, node.line, node.name);
   }
 }
@@ -131,6 +135,7 @@ void Validation::checkInside(const ExternalDocNetwork& network, const Workspace&
     const TransformerCfg& cfg = *node->getTransformer();
     const QString title = network.getName() + QLatin1Char('/') + node->name();
     m_values.check({cfg, *record, title, node->parameterLines(), /*knowsWhatArrives=*/false}, knows, names);
+    fit_checks::checkTransformer(cfg, node->parameterLines(), title, m_diagnostics);
     checkAge(cfg, record->line, title);
   }
 }
@@ -249,6 +254,7 @@ ValidationReport validateWorkspace(const QString& fileName, TransformerSource& s
       break;
     case WorkspaceDocument::Reading::Done:
       Validation(document, source, settings, diagnostics).run();
+      checkDocument(document, diagnostics);
       break;
   }
   report.findings = settings.apply(inDocumentOrder(diagnostics));

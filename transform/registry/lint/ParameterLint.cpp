@@ -2,6 +2,7 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/StoredValue.h>
+#include <transform/core/ValueFit.h>
 #include <transform/core/ValueReferences.h>
 #include <transform/registry/lint/ParameterLint.h>
 #include <transform/registry/loading/DefinitionKeywords.h>
@@ -12,9 +13,6 @@ namespace {
 
 const QLatin1String kMessageType("MESSAGE");
 const QLatin1String kDividerType("DIVIDER");
-const QLatin1String kCheckBoxType("CHECKBOX");
-const QLatin1String kTicked("YES");
-const QLatin1String kNotTicked("NO");
 
 bool isGroup(const GUIType& type) {
   return type.getType().contains(QLatin1String("GROUP"));
@@ -27,14 +25,6 @@ bool hasNoValue(const GUIType& type) {
 
 bool hasEncodedForm(const GUIType& type) {
   return ORX_findGuiType(type.getType() + kEncodedSuffix) != nullptr;
-}
-
-bool isNumberType(const QString& type, QLatin1String word) {
-  return type == word || type == word + kOrAttributeSuffix;
-}
-
-bool isWholeNumberType(const QString& type) {
-  return isNumberType(type, QLatin1String("INT")) || isNumberType(type, QLatin1String("INTEGER"));
 }
 
 }  // namespace
@@ -150,11 +140,19 @@ void ParameterLint::checkGroup(const LintedParameter& parameter) {
 }
 
 void ParameterLint::checkDefault(const LintedParameter& parameter) {
+  const MemberList members(parameter.type);
+  if (parameter.type.getType() == kTableType && !members.members().empty()) {
+    const QStringList cells = QORXSdfStringToList(parameter.defaultValue, members.separator());
+    for (int i = 0; i < cells.size(); ++i) {
+      checkDefault(parameter, members.members()[static_cast<std::size_t>(i) % members.members().size()],
+                   cells[i]);
+    }
+    return;
+  }
   if (parameter.type.getType() != kMultiParameterType) {
     checkDefault(parameter, parameter.type, parameter.defaultValue);
     return;
   }
-  const MemberList members(parameter.type);
   const QStringList pieces = QORXSdfStringToList(parameter.defaultValue, members.separator());
   for (int i = 0; i + 1 < pieces.size(); i += 2) {
     if (const GUIType* member = members.find(pieces[i])) {
@@ -181,34 +179,15 @@ void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType
   };
   if (isMark) {
     refuse(QStringLiteral("'%1' would be written as it stands; write @Value(%2)").arg(value, value.mid(1)));
-  } else if (ORX_isChoiceType(type)) {
-    ChoiceList choices(type);
-    for (const QString& line : m_definition.fields().parameterLookups.value(parameter.name)) {
-      choices.addLookup(line);
-    }
-    const QStringList values =
-        ORX_isListBoxType(type) ? QORXStringToList(value, QLatin1Char(' ')) : QStringList(value);
-    for (const QString& one : values) {
-      // A list box may show a text with blanks, which then stands as it is.
-      if (!choices.contains(one) && !choices.contains(value)) {
-        refuse(QStringLiteral("'%1' is none of the choices").arg(one));
-      }
-    }
-  } else if (type.getType() == kCheckBoxType) {
-    const QStringList states = ORX_splitConfig(type.getConfigToken(), QLatin1Char('%'));
-    if (states.isEmpty() ? value != kTicked && value != kNotTicked : !states.contains(value)) {
-      refuse(QStringLiteral("'%1' is neither of the two values").arg(value));
-    }
-  } else if (isWholeNumberType(type.getType()) || isNumberType(type.getType(), QLatin1String("FLOAT"))) {
-    bool isNumber = false;
-    if (isWholeNumberType(type.getType())) {
-      value.toLongLong(&isNumber);
-    } else {
-      value.toDouble(&isNumber);
-    }
-    if (!isNumber) {
-      refuse(QStringLiteral("'%1' is no number").arg(value));
-    }
+    return;
+  }
+  ChoiceList choices(type);
+  for (const QString& line : m_definition.fields().parameterLookups.value(parameter.name)) {
+    choices.addLookup(line);
+  }
+  const ValueFit fit = ValueFit::of(type, choices, value);
+  if (!fit.fits()) {
+    refuse(fit.text());
   } else if (type.valueIsEncoded()) {
     // Lists are packed with commas, which are no part of the words.
     for (const QString& word : value.split(QLatin1Char(','))) {

@@ -1,0 +1,66 @@
+#include <tests/core/ConfigHelpers.h>
+#include <transform/core/ValueFit.h>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+using Misfit = ValueFit::Misfit;
+
+TEST(ValueFit, OnlyPlainValuesAreJudged) {
+  const struct {
+    const char* type;
+    const char* fitting;  // separated by "|"
+    const char* unfit;
+    Misfit misfit;
+  } cases[] = {
+      {"CHOICE Red%\"Deep Blue\"", "|<Unused>|Red|Deep Blue|$(COLOUR)|@Value(c)|ORX_CONDITIONAL:x|@Lower(x)",
+       "red| |Deep|@Lower", Misfit::Choice},
+      {"CHOICE \"\"", "anything", "", Misfit::None},
+      {"LOOKUP_CHOICE \"Deep Blue\",a<space>b%Red,R", "Deep Blue|a b|R", "a<space>b|Blue", Misfit::Choice},
+      {"LOOKUP_LISTBOX \"Deep Blue\",B%Red,R", "B R|\"Deep Blue\" R|Deep Blue|R", "B X|Deep", Misfit::Choice},
+      {"CHECKBOX", "YES|NO", "yes|1", Misfit::Choice},
+      {"CHECKBOX on%off", "on|off|$(X)", "YES|@Value", Misfit::Choice},
+      {"INT", "0|-12| 7 |+3|99999999999999999999|@Value(n)", "1.0|1e3|--1|-|x|&n|0x10|@Abs(1)",
+       Misfit::WholeNumber},
+      {"INTEGER_OR_ATTR", "&n|@Value(n)|@Abs(1)", "n", Misfit::WholeNumber},
+      {"FLOAT_OR_ATTR", "1|-.5|1e-3|2.|$(X)|&n", "1,5|inf|nan|1e999|1 2|n", Misfit::Number},
+      {"RANGE_SLIDER -1%2.5%1", "-1|2.5|0", "-1.01|3", Misfit::Range},
+      {"RANGE_SLIDER", "1e9", "many", Misfit::Number},
+      {"TEXT", "x|1", "", Misfit::None},
+  };
+  for (const auto& c : cases) {
+    const GUIType type = GUIType::fromTransformerTypeString(qs(c.type), qs("P"));
+    for (const QString& value : qs(c.fitting).split('|'))
+      EXPECT_TRUE(ValueFit::of(type, value).fits()) << c.type << ": " << value.toStdString();
+    for (const QString& value : qs(c.unfit).split('|', Qt::SkipEmptyParts)) {
+      const ValueFit fit = ValueFit::of(type, value);
+      EXPECT_EQ(fit.misfit, c.misfit) << c.type << ": " << value.toStdString();
+      EXPECT_TRUE(value.contains(fit.value));
+    }
+  }
+}
+
+TEST(ValueFit, PartsAreJudgedByTheirOwnTypes) {
+  const struct {
+    const char* type;
+    const char* value;
+    const char* misfits;
+  } cases[] = {
+      {"GUI_LINE_TABLE "
+       "<semicolon>,GUI<space>CHOICE<space>A<space>x<percentsign>y<space>First,GUI<space>INT<space>B<space>"
+       "Second",
+       "x;1;z;two;y", "First=z Second=two"},
+      {"MULTIPARAMETER <semicolon>,GUI<space>INT<space>A<space>First", "A;1.5;B;x", "First=1.5"},
+      {"MULTIPARAMETER <semicolon>,GUI<space>INT<space>A<space>First", "ORX_CONDITIONAL:A;1.5", ""},
+  };
+  for (const auto& c : cases) {
+    const TransformParamCfg parameter(GUIType::fromTransformerTypeString(qs(c.type), qs("P")));
+    QStringList found;
+    for (const ValueFit& fit : ValueFit::misfitsOf(parameter, qs(c.value)))
+      found.append(fit.prompt + '=' + fit.value);
+    EXPECT_EQ(found.join(' '), qs(c.misfits)) << c.value;
+  }
+}
+
+}  // namespace

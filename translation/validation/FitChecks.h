@@ -1,0 +1,24 @@
+// Judges values by what their types offer: choices by their entries, numbers by their kind and range.
+#pragma once
+
+#include <QString>
+
+class GlobalParameters;
+class IXMLComponentReader;
+class ParameterLines;
+class TransformerCfg;
+
+namespace orx {
+class Findings;
+}
+
+namespace fit_checks {
+
+// All parameters of a transformer; what its own validation refuses is left to that.
+void checkTransformer(const TransformerCfg& cfg, const ParameterLines& lines, const QString& title,
+                      orx::Findings& findings);
+// The global parameters of the workspace and those of its custom transformers, by their prompt lines.
+void checkParameters(const IXMLComponentReader& reader, const GlobalParameters& parameters,
+                     orx::Findings& findings);
+
+}  // namespace fit_checks
