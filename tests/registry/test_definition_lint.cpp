@@ -146,6 +146,11 @@ const Case kDefinitionCases[] = {
     {"bad-default", "A \"C D\"", "A C"},
     {"bad-default", "WIDTH;2.5", "WIDTH;wide"},
     {"bad-default", "STEPS;3", "STEPS;3.5"},
+    {"bad-default", "LISTBOX A%B%\"C D\"\nPARAMETER_PROMPT: Tests\nPARAMETER_DEFAULT: A \"C D\"",
+     "RANGE_SLIDER 0%1\nPARAMETER_PROMPT: Tests\nPARAMETER_DEFAULT: 2"},
+    {"bad-default", "LISTBOX A%B%\"C D\"\nPARAMETER_PROMPT: Tests\nPARAMETER_DEFAULT: A \"C D\"",
+     "GUI_LINE_TABLE <semicolon>,GUI<space>INT<space>N<space>N\nPARAMETER_PROMPT: Tests\n"
+     "PARAMETER_DEFAULT: 1;x"},
     {"bad-default", "two<space>words", "two words"},
     {"bad-statement", "FACTORY_OPTION $(XFORMER_NAME_ENCODED) RESULT",
      "  FACTORY_OPTION $(XFORMER_NAME_ENCODED) RESULT"},
