@@ -84,6 +84,7 @@ TEST(DocumentCommands, EndWithTheStatusThatFits) {
   write(folder.filePath("noise.orw"), QByteArray("\xff\x00\x1b[2J#!", 9).repeated(5000));
   write(folder.filePath("lossy.orw"), withLosses());
   write(folder.filePath("small.orw"), kSmall);
+  write(folder.filePath("conflict.orw"), QByteArray(kSmall) + "\n<<<<<<< ours\n");
   write(folder.filePath("other.orw"), "<FOO/>");
   write(folder.filePath("versions.ort"), kVersions);
   write(folder.filePath("hollow.ort"), "# ORW custom transformers\n");
@@ -110,6 +111,7 @@ TEST(DocumentCommands, EndWithTheStatusThatFits) {
       {{"format", "-i", "cut.orw"}, 1, "", "cut.orw:"},
       {{"format", "-i", "noise.orw"}, 1, "", "noise.orw: error: "},
       {{"format", "-i", "versions.ort"}, 1, "", "versions.ort: error: "},
+      {{"format", "--drop", "conflict.orw"}, 1, "", "<<<<<<< ours"},
       {{"format", "other.orw"}, 1, "", "FOO"},
       {{"format", "--drop", "other.orw"}, 0, "<WORKSPACE", "warning"},
       {{"format", "small.orw", "-o", "/dev/full"}, 3, "", "/dev/full"},
@@ -124,7 +126,7 @@ TEST(DocumentCommands, EndWithTheStatusThatFits) {
   EXPECT_EQ(readAll(folder.filePath("cut.orw")), cut);
   EXPECT_EQ(readAll(folder.filePath("small.orw")), QByteArray(kSmall));
   EXPECT_EQ(readAll(folder.filePath("versions.ort")), QByteArray(kVersions));
-  EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files | QDir::Hidden).size(), 8) << "a file was left behind";
+  EXPECT_EQ(QDir(folder.path()).entryList(QDir::Files | QDir::Hidden).size(), 9) << "a file was left behind";
 }
 
 TEST(DocumentCommands, TellTheFormOfAFileAlike) {

@@ -9,7 +9,7 @@ ExitStatus readDocument(WorkspaceDocument& document, const QString& fileName, Co
   console.show(diagnostics);
   switch (reading) {
     case WorkspaceDocument::Reading::Done:
-      return kExitDone;
+      return diagnostics.hasErrors() ? kExitRefused : kExitDone;
     case WorkspaceDocument::Reading::Refused:
       return kExitRefused;
     case WorkspaceDocument::Reading::Unreadable:
