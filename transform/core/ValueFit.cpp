@@ -3,6 +3,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/ValueFit.h>
+#include <transform/core/ValueReferences.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QHash>
@@ -29,13 +30,12 @@ const QLatin1String kNoProcesses("NO");
 
 // Whether the value is known as it stands.
 bool isPlain(const GUIType& type, const QString& value) {
-  if (value.isEmpty() || value == kUnusedValue || value == kUnusedGroupBy ||
-      value.startsWith(kConditionalPrefix) || value.contains(kMacroOpen) || !valueReferences(value).isEmpty())
+  if (isUnsetSetting(value) || value.startsWith(kConditionalPrefix) || value.contains(kMacroOpen) ||
+      !valueReferences(value).empty())
     return false;
   const bool isFunction = value.startsWith(QLatin1Char('@')) && value.endsWith(QLatin1Char(')'));
   const bool isEvaluated = type.mayHoldAttributeReference() || ORX_isChoiceType(type);
-  return !(isFunction && isEvaluated) &&
-         !(type.mayHoldAttributeReference() && value.startsWith(kAttributeMark));
+  return !(isFunction && isEvaluated);
 }
 
 bool isWholeNumber(const QString& text) {
