@@ -1,4 +1,5 @@
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MappingFileWords.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/text/TextPlaces.h>
@@ -114,13 +115,13 @@ TEST(TextPlaces, WhatMayStandThereIsReadBack) {
   };
   const Placed places[] = {
       {TextPlace::Word, "word", quoted("K ", " N"), word(1)},
-      {TextPlace::Flow, "flow", quoted("INPUT FEATURE_TYPE ", " OUTPUT"), word(2)},
+      {TextPlace::Name, "name", quoted("INPUT FEATURE_TYPE ", " OUTPUT"), word(2)},
       {TextPlace::ParallelSetting, "parallel setting", quoted("", " RUN:x"), word(0)},
       {TextPlace::Port, "port", between("INPUT ", " FEATURE_TYPE t"), word(1)},
       {TextPlace::LoopSetting, "loop setting", between("A:", " B:1"), word(0, 2)},
       {TextPlace::QuotedName, "quoted name", between("N \"id ", " Collector\" INPUT"),
        matched("^N \"id ([^\"]*) Collector\" INPUT$")},
-      {TextPlace::MacroName, "macro name", between("MACRO ", " v"), matched("^MACRO ([^\\s$()]+) v$")},
+      {TextPlace::MacroName, "macro name", between("MACRO ", " v"), word(1)},
       {TextPlace::PrintedName, "printed name", between("MACRO ", "_P v"), matched("^MACRO ([^ \t]*)_P v$")},
       {TextPlace::MacroValue, "macro value", between("MACRO n |", ""), matched("^MACRO n \\|(.*[^\\\\]|)$")},
       {TextPlace::TclBraces, "braces", between("set x {", "}"), tclValue},
@@ -146,6 +147,38 @@ TEST(TextPlaces, WhatMayStandThereIsReadBack) {
     EXPECT_GT(accepted, 400) << placed.name;
     EXPECT_GT(refused, 100) << placed.name;
   }
+}
+
+// The innermost reference is expanded first, and what it gives may be part of another one's name.
+QString expandFromInside(QString text) {
+  static const QRegularExpression innermost("\\$\\(([^ \t\n$()]+)\\)");
+  while (text.contains(innermost))
+    text.replace(innermost, "x");
+  return text;
+}
+
+TEST(MacroText, ReferencesAreFoundAsAnEngineExpandsThem) {
+  static const QStringList pieces{"$(", "$(", ")", ")", "$", "(", "[", "]", " ", "a", "<b>", "{}", "\n"};
+  std::mt19937 random(23);
+  int references = 0;
+  for (int round = 0; round < 20000; ++round) {
+    QString text;
+    for (unsigned left = random() % 12; left > 0; --left)
+      text += pieces.at(int(random() % unsigned(pieces.size())));
+    if (text.contains("$["))
+      continue;
+    EXPECT_EQ(withoutReferences(text), expandFromInside(text)) << text.toStdString();
+    EXPECT_EQ(blankReferences(text, macroReferences(text)).size(), text.size());
+    references += expandFromInside(text) != text;
+    // Deferred ones are the same in other brackets.
+    QString deferred = text;
+    deferred.replace("$(", "$[").replace(')', ']');
+    const QString closed = withoutReferences(text);
+    if (!text.contains(']') && !text.contains("$()")) {
+      EXPECT_EQ(closesDeferredReferences(deferred), !closed.contains("$(")) << text.toStdString();
+    }
+  }
+  EXPECT_GT(references, 800);
 }
 
 TEST(TextPlaces, PlainValuesBringNoClauses) {

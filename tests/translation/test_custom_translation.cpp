@@ -386,6 +386,8 @@ TEST(CustomTranslation, WhatNoStatementCanCarryIsRefused) {
       {"a port beside workers", "Tidy", "FEATURE_TYPE", parallel, {}, {}, {"unwritable-value Tidy"}},
       {"a group", "Tidy", "IN", parallel, {"ORX_PROCESS_GROUP_BY", "a\\\" b"}, {}, {"unwritable-value Tidy"}},
       {"a port in quotes", "Tidy", "I\"N", {}, {}, {}, {"unwritable-value Tidy"}},
+      {"a reference in a name", "Tidy$[P]", "IN", {}, {}, {}, {"unwritable-value Tidy$[P]"}},
+      {"a reference in a port", "Tidy", "I$(N)", {}, {}, {}, {"unwritable-value Cleaner"}},
       {"a name in quotes", "Tidy\"", "IN", {}, {}, {}, {"unwritable-value Tidy\""}},
   };
   for (const auto& test : cases) {

@@ -1,27 +1,10 @@
-#include <transform/core/Keywords.h>
 #include <transform/core/ParameterReferences.h>
+#include <transform/text/MacroText.h>
 
 namespace {
 
-// The next innermost reference at or behind `from`; false when there is none.
-bool findReference(const QString& text, int from, int& begin, int& end) {
-  for (int open = text.indexOf(kMacroOpen, from); open >= 0; open = text.indexOf(kMacroOpen, open)) {
-    int place = open + kMacroOpen.size();
-    while (place < text.size() && text.at(place) != QLatin1Char('$') && text.at(place) != QLatin1Char('(') &&
-           text.at(place) != QLatin1Char(')'))
-      ++place;
-    if (place < text.size() && text.at(place) == QLatin1Char(')')) {
-      begin = open;
-      end = place + 1;
-      return true;
-    }
-    open = place;
-  }
-  return false;
-}
-
-QString nameOf(const QString& text, int begin, int end) {
-  return text.mid(begin + kMacroOpen.size(), end - begin - kMacroOpen.size() - 1);
+bool counts(const MacroReference& reference) {
+  return reference.isClosed && !reference.isDeferred && !reference.hasInner;
 }
 
 }  // namespace
@@ -30,24 +13,20 @@ QString replaceParameterReferences(const QString& text,
                                    const std::function<bool(const QString&, QString&)>& replace) {
   QString replaced;
   int copied = 0;
-  int begin = 0;
-  int end = 0;
-  while (findReference(text, end, begin, end)) {
+  for (const MacroReference& reference : macroReferences(text)) {
     QString replacement;
-    if (!replace(nameOf(text, begin, end), replacement))
+    if (!counts(reference) || !replace(reference.name(text), replacement))
       continue;
-    replaced += text.midRef(copied, begin - copied);
+    replaced += text.midRef(copied, reference.begin - copied);
     replaced += replacement;
-    copied = end;
+    copied = reference.end;
   }
   return copied == 0 ? text : replaced + text.midRef(copied);
 }
 
 bool anyParameterReference(const QString& text, const std::function<bool(const QString&)>& matches) {
-  int begin = 0;
-  int end = 0;
-  while (findReference(text, end, begin, end)) {
-    if (matches(nameOf(text, begin, end)))
+  for (const MacroReference& reference : macroReferences(text)) {
+    if (counts(reference) && matches(reference.name(text)))
       return true;
   }
   return false;

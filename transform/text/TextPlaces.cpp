@@ -1,4 +1,3 @@
-#include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MappingFileWords.h>
@@ -50,7 +49,7 @@ bool closesCalls(const QString& text) {
 long refuseOneLine(TextPlace place, const QString& text) {
   switch (place) {
     case TextPlace::Word:
-    case TextPlace::Flow:
+    case TextPlace::Name:
     case TextPlace::ParallelSetting:
       return canBeWord(text) ? 0 : kNoWord;
     case TextPlace::Port:
@@ -80,8 +79,10 @@ long refuseOneLine(TextPlace place, const QString& text) {
 long TextPlaces::refuse(TextPlace place, const QString& text) {
   if (!isOneLine(text))
     return kBreaksLine;
+  if (place == TextPlace::Name && beginsMacroReference(text))
+    return kReferenceInName;
   const bool isScript = place == TextPlace::TclBraces || place == TextPlace::TclQuotes;
-  if (!isScript && !MFBuffer::closesDeferredMacros(text))
+  if (!isScript && !closesDeferredReferences(text))
     return kUnclosedReference;
   return refuseOneLine(place, text);
 }
@@ -89,7 +90,7 @@ long TextPlaces::refuse(TextPlace place, const QString& text) {
 long TextPlaces::refusePlainValue(const QString& text, const QSet<QString>& keys, Calls calls) {
   if (!isOneLine(text))
     return kBreaksLine;
-  if (!MFBuffer::closesDeferredMacros(text))
+  if (!closesDeferredReferences(text))
     return kUnclosedReference;
   MappingFileWords words(text);
   for (MappingFileWord word; words.next(word);) {
@@ -106,7 +107,7 @@ long TextPlaces::refusePlainValue(const QString& text, const QSet<QString>& keys
 long TextPlaces::refuseEncodedValue(const QString& text) {
   if (!isOneLine(text))
     return kBreaksLine;
-  if (!MFBuffer::closesDeferredMacros(text))
+  if (!closesDeferredReferences(text))
     return kUnclosedReference;
   return text.isEmpty() || (isBareWord(text) && closesCalls(text)) ? 0 : kNotEncoded;
 }

@@ -9,7 +9,8 @@
 
 enum class TextPlace {
   Word,             // quoted where it needs quotes, see MappingFileWords.h
-  Flow,             // the name of a feature type; such a word
+  Name,             // of a node, port, feature type or attribute, as a document gives it: such a word without
+                    // references, since it stands in several places, not all of which would expand them
   ParallelSetting,  // behind "KEY:"; such a word
   Port,             // between INPUT or OUTPUT and FEATURE_TYPE, as it is
   LoopSetting,      // behind "KEY:", as it is; may be empty
@@ -61,5 +62,6 @@ constexpr long kNoQuotedName = 370755;
 constexpr long kNoLoopSetting = 370756;
 constexpr long kNoPrintedName = 370757;
 constexpr long kNoHeaderField = 370758;
+constexpr long kReferenceInName = 370940;
 
 }  // namespace text_refusals

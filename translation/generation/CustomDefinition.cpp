@@ -132,12 +132,15 @@ bool CustomDefinition::prepare(orx::Findings& diagnostics) {
   for (const Part& part : m_parts)
     check(part, diagnostics);
   for (const SubDocNetworkObj* node : m_network.nodes()) {
-    const long number = TextPlaces::refuse(TextPlace::Flow, node->name());
+    const long number = TextPlaces::refuse(TextPlace::Name, node->name());
+    // What else a transformer's name cannot hold is found with its values.
+    const bool isFound =
+        node->kind() == SubDocNetworkObj::Kind::Transformer && number != text_refusals::kReferenceInName;
     if (number == text_refusals::kBreaksLine)
       diagnostics.report(Rule::LineBreak, node->line(), m_network.getName(), {node->name().simplified()});
-    else if (number != 0 && node->kind() != SubDocNetworkObj::Kind::Transformer)
+    else if (number != 0 && !isFound)
       diagnostics.reportText(Rule::UnwritableValue, node->line(), m_network.getName(),
-                             TransformResString(number));
+                             TransformResString(number, node->name()));
   }
   if (diagnostics.hasErrors())
     return false;

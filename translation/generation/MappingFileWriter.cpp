@@ -3,6 +3,7 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
@@ -221,8 +222,24 @@ bool MappingFileWriter::checkText(const QString& text, const QString& what, int 
 void MappingFileWriter::checkWord(const QString& text, int line, const QString& node) {
   if (!checkText(text, text, line, node))
     return;
-  if (const long number = TextPlaces::refuse(TextPlace::Flow, text))
-    m_diagnostics.reportText(Rule::UnwritableValue, line, node, TransformResString(number));
+  if (const long number = TextPlaces::refuse(TextPlace::Name, text))
+    m_diagnostics.reportText(Rule::UnwritableValue, line, node, TransformResString(number, text));
+}
+
+void MappingFileWriter::checkNoReference(const QString& name, int line, const QString& node) {
+  if (beginsMacroReference(name))
+    m_diagnostics.reportText(Rule::UnwritableValue, line, node,
+                             TransformResString(text_refusals::kReferenceInName, name));
+}
+
+// Names of attributes are written wherever they are asked for.
+void MappingFileWriter::checkAttributes(const WorkspaceNode& node) {
+  for (const QString& attribute : node.attributes)
+    checkNoReference(attribute, node.line, node.name);
+  for (const QStringList& attributes : node.exposed) {
+    for (const QString& attribute : attributes)
+      checkNoReference(attribute, node.line, node.name);
+  }
 }
 
 void MappingFileWriter::checkParameter(const GlobalParameters::Parameter& parameter, const QString& value) {
@@ -244,12 +261,14 @@ void MappingFileWriter::check() {
   QSet<const CompoundTransformerNetwork*> checked;
   QSet<const ConfiguredDefinition*> sound;  // whose template needs no second look
   for (const WorkspaceNode& node : m_workspace.nodes) {
+    checkAttributes(node);
     if (!node.isTransformer()) {
       checkWord(node.name, node.line, node.name);
       checkWord(node.keyword, node.line, node.name);
       continue;
     }
-    checkText(node.name, node.name, node.line, node.name);
+    if (checkText(node.name, node.name, node.line, node.name))
+      checkNoReference(node.name, node.line, node.name);
     if (!sound.contains(node.cfg->definition())) {
       const std::size_t before = m_diagnostics.all().size();
       for (const QString& line : node.cfg->getTemplateLines())

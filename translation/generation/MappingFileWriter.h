@@ -39,6 +39,8 @@ class MappingFileWriter {
   // False when something was reported.
   bool checkText(const QString& text, const QString& what, int line, const QString& node);
   void checkWord(const QString& text, int line, const QString& node);
+  void checkNoReference(const QString& name, int line, const QString& node);
+  void checkAttributes(const WorkspaceNode& node);
 
   // The flow that leaves a link's source through its port.
   const QString& flowOf(int node, const QString& output) const;

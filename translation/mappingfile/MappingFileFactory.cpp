@@ -43,10 +43,10 @@ void MappingFileFactory::expect(const MappingFileWord& word, const char* form) {
                {word.text.toString(), QLatin1String(form)});
 }
 
-bool MappingFileFactory::nextWord(MappingFileWords& words, MappingFileWord& word) {
+bool MappingFileFactory::nextWord(MappingFileWords& words, MappingFileWord& word, bool isName) {
   if (!words.next(word))
     return false;
-  m_functions.check(word);
+  m_functions.check(word, isName);
   return true;
 }
 
@@ -57,9 +57,10 @@ bool MappingFileFactory::readHead(MappingFileWords& words) {
   MappingFileWord name;
   // The name of the transformer may be quoted inside of the word.
   words.setSettings(true);
-  const bool isWhole = nextWord(words, domain) && domain.is(QLatin1String("*")) && nextWord(words, kind) &&
-                       kind.kind == MappingFileWord::Kind::Bare && nextWord(words, keyword) &&
-                       keyword.is(kFactoryNameKeyword) && nextWord(words, name);
+  const bool isWhole = nextWord(words, domain) && domain.is(QLatin1String("*")) &&
+                       nextWord(words, kind, true) && kind.kind == MappingFileWord::Kind::Bare &&
+                       nextWord(words, keyword) && keyword.is(kFactoryNameKeyword) &&
+                       nextWord(words, name, true);
   words.setSettings(false);
   if (!isWhole) {
     m_report.add(Rule::BadStatement, m_statement.line(), {QLatin1String(kForm)});
@@ -113,7 +114,7 @@ bool MappingFileFactory::readPort(bool isInput, MappingFileWords& words, Mapping
   bool isWhole = nextWord(words, word);
   if (isWhole && !word.is(kFeatureTypeKeyword))
     isWhole = nextWord(words, word) && word.is(kFeatureTypeKeyword);
-  if (!isWhole || !nextWord(words, type)) {
+  if (!isWhole || !nextWord(words, type, true)) {
     hasWord = false;
     return false;
   }
@@ -169,7 +170,7 @@ void MappingFileFactory::readClauses(MappingFileWords& words) {
         expect(word, kSettingForm);
       isValue = true;
     }
-    hasWord = nextWord(words, word);
+    hasWord = nextWord(words, word, isSettings);
   }
 }
 

@@ -25,7 +25,7 @@ class MappingFileFactory {
   int runVersion() const { return m_version; }
 
  private:
-  bool nextWord(MappingFileWords& words, MappingFileWord& word);
+  bool nextWord(MappingFileWords& words, MappingFileWord& word, bool isName = false);
   bool readHead(MappingFileWords& words);
   void readKind(const MappingFileWord& kind);
   void readSetting(const MappingFileWord& setting);

@@ -1,8 +1,8 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MappingFileWords.h>
 #include <translation/mappingfile/MappingFileFunctions.h>
 #include <translation/mappingfile/MappingFileReader.h>
-#include <translation/mappingfile/MappingFileReferences.h>
 #include <translation/mappingfile/MappingFileReport.h>
 #include <translation/mappingfile/MappingFileScripts.h>
 
@@ -44,7 +44,7 @@ const QStringList& characterNames() {
 }  // namespace
 
 MappingFileFunctions::MappingFileFunctions(const MappingFileStatement& statement,
-                                           const std::vector<MappingFileReference>& references,
+                                           const std::vector<MacroReference>& references,
                                            MappingFileReport& report)
     : m_statement(statement), m_text(blankReferences(statement.text, references)), m_report(report) {}
 
@@ -65,7 +65,7 @@ void MappingFileFunctions::reportCall(int begin, int end, const char* form) {
                {m_statement.text.mid(begin, end - begin), QLatin1String(form)});
 }
 
-void MappingFileFunctions::check(const MappingFileWord& word) {
+void MappingFileFunctions::check(const MappingFileWord& word, bool isName) {
   const int begin = word.offset();
   const int end = begin + word.text.size();
   if (!word.isClosed && word.kind != MappingFileWord::Kind::Call)
@@ -74,6 +74,13 @@ void MappingFileFunctions::check(const MappingFileWord& word) {
     m_report.add(Rule::GluedQuote, m_statement.lineAt(begin), {word.text.toString()});
   if (word.kind == MappingFileWord::Kind::Quoted)
     return;
+  if (!isName || word.kind == MappingFileWord::Kind::Call)
+    checkCalls(begin, end);
+  if (word.kind == MappingFileWord::Kind::Bare)
+    checkCharacterNames(begin, end);
+}
+
+void MappingFileFunctions::checkCalls(int begin, int end) {
   int i = begin;
   while ((i = find(QLatin1Char('@'), i, end)) >= 0) {
     const QStringRef name = mappingFileCallName(m_text, i, end);
@@ -95,8 +102,6 @@ void MappingFileFunctions::check(const MappingFileWord& word) {
     checkCall(name, i, close);
     i = close;
   }
-  if (word.kind == MappingFileWord::Kind::Bare)
-    checkCharacterNames(begin, end);
 }
 
 void MappingFileFunctions::checkCall(const QStringRef& name, int begin, int end) {

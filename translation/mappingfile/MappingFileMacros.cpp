@@ -36,10 +36,10 @@ bool isTemplateToken(const QString& name) {
 }  // namespace
 
 QString MappingFileMacros::expanded(const QString& name) const {
-  const std::vector<MappingFileReference> references = mappingFileReferences(name);
+  const std::vector<MacroReference> references = macroReferences(name);
   QString result;
   int done = 0;
-  for (const MappingFileReference& reference : references) {
+  for (const MacroReference& reference : references) {
     const auto value = reference.isClosed && !reference.isInside ? m_values.constFind(reference.name(name))
                                                                  : m_values.constEnd();
     if (value != m_values.constEnd()) {
@@ -88,14 +88,16 @@ bool MappingFileMacros::isKnown(const QString& name) const {
 }
 
 void MappingFileMacros::refer(const MappingFileStatement& statement,
-                              const std::vector<MappingFileReference>& references, int from, int to, Use use,
+                              const std::vector<MacroReference>& references, int from, int to, Use use,
                               int block, MappingFileReport& report) {
   bool saidOpen = false;
-  for (const MappingFileReference& reference : references) {
+  for (const MacroReference& reference : references) {
     if (reference.begin < from || reference.begin >= to)
       continue;
     const int line = statement.lineAt(reference.begin);
     const QString text = statement.text.mid(reference.begin, reference.end - reference.begin);
+    if (reference.isDeferred && !reference.isClosed)
+      continue;
     if (reference.isDeferred)
       report.add(Rule::DeferredReference, line, {text});
     else if (reference.isClosed)

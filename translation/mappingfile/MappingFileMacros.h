@@ -1,7 +1,7 @@
 // The macros that the statements of a mapping file set, and the references to them.
 #pragma once
 
-#include <translation/mappingfile/MappingFileReferences.h>
+#include <transform/text/MacroText.h>
 
 #include <QHash>
 #include <QSet>
@@ -31,8 +31,8 @@ class MappingFileMacros {
 
   // Notes the references of the statement from `from` up to `to`, and reports those that are none. `block` is
   // the definition that they stand in, or -1.
-  void refer(const MappingFileStatement& statement, const std::vector<MappingFileReference>& references,
-             int from, int to, Use use, int block, MappingFileReport& report);
+  void refer(const MappingFileStatement& statement, const std::vector<MacroReference>& references, int from,
+             int to, Use use, int block, MappingFileReport& report);
   // That the statement at `line` needs the macro.
   void need(const QString& name, int line, Use use, int block);
 

@@ -1,8 +1,8 @@
 #include <transform/scripts/PythonSyntax.h>
 #include <transform/scripts/TclSyntax.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/mappingfile/MappingFileReader.h>
-#include <translation/mappingfile/MappingFileReferences.h>
 #include <translation/mappingfile/MappingFileReport.h>
 #include <translation/mappingfile/MappingFileScripts.h>
 
@@ -31,7 +31,7 @@ int lineOf(const std::vector<int>& lines, int line) {
 void MappingFileScripts::checkTcl(const MappingFileStatement& statement, int begin, int end,
                                   MappingFileReport& report) {
   const QString part = statement.text.mid(begin, end - begin);
-  const QString script = blankReferences(part, mappingFileReferences(part));
+  const QString script = blankReferences(part, macroReferences(part));
   const TclFault fault = findTclFault(script);
   if (!fault.text.isEmpty()) {
     const int offset = QString::fromUtf8(script.toUtf8().left(fault.offset)).size();

@@ -7,7 +7,6 @@
 #include <translation/mappingfile/MappingFileFactory.h>
 #include <translation/mappingfile/MappingFileFunctions.h>
 #include <translation/mappingfile/MappingFileReader.h>
-#include <translation/mappingfile/MappingFileReferences.h>
 #include <translation/mappingfile/MappingFileReport.h>
 #include <translation/mappingfile/MappingFileStatements.h>
 
@@ -44,7 +43,7 @@ const QStringList& keywords() {
 // A statement with what its checks share.
 struct MappingFileStatements::Part {
   const MappingFileStatement& statement;
-  const std::vector<MappingFileReference>& references;
+  const std::vector<MacroReference>& references;
   MappingFileWords& words;  // behind the keyword
   MappingFileFunctions& functions;
 
@@ -65,7 +64,7 @@ void MappingFileStatements::refer(const Part& part, int from, int to, Use use) {
 void MappingFileStatements::check(const MappingFileStatement& statement) {
   endScript();
   m_hasStatements = m_hasStatements || block() < 0;
-  const std::vector<MappingFileReference> references = mappingFileReferences(statement.text);
+  const std::vector<MacroReference> references = macroReferences(statement.text);
   MappingFileFunctions functions(statement, references, m_report);
   MappingFileWords words(statement.text);
   MappingFileWord keyword;
@@ -230,7 +229,7 @@ void MappingFileStatements::checkTclStatement(Part& part) {
 void MappingFileStatements::checkScript(Part& part, int begin, int end) {
   m_macros.mention(
       blankReferences(part.statement.text, part.references, QLatin1Char(' ')).mid(begin, end - begin));
-  for (const MappingFileReference& reference : part.references) {
+  for (const MacroReference& reference : part.references) {
     // Whatever is no reference belongs to the script.
     if (reference.isClosed && !reference.isDeferred)
       m_macros.need(reference.name(part.statement.text), part.statement.lineAt(reference.begin),

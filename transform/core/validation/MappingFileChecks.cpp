@@ -10,6 +10,7 @@
 #include <transform/core/generation/LookupDecision.h>
 #include <transform/core/generation/LookupWriters.h>
 #include <transform/core/validation/MappingFileChecks.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/NullBuffer.h>
 #include <transform/text/TextHelpers.h>
@@ -74,7 +75,7 @@ long MappingFileChecks::refuse(const TransformParamCfg& record) const {
   if (!std::all_of(parts.cbegin(), parts.cend(), &TextPlaces::isOneLine)) {
     return kBreaksLine;
   }
-  if (!std::all_of(parts.cbegin(), parts.cend(), isSelfClosed)) {
+  if (!std::all_of(parts.cbegin(), parts.cend(), &closesDeferredReferences)) {
     return kUnclosedReference;
   }
   const auto endsInBackslash = [](const QString& part) { return part.endsWith(QLatin1Char('\\')); };

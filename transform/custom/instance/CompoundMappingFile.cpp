@@ -316,12 +316,14 @@ QStringList CompoundTransformerCfg::findUnwritablePorts() const {
     return messages;
   // Loops and transform factories name the ports as they are.
   const bool isBare = isRunApart(*m_network, *this);
+  // What is wrong with it wherever it stands is told where the definition is embedded.
+  const bool isEmbedded = m_network->getFileName().isEmpty();
   for (const QString& port : m_network->getInputs() + m_network->getOutputs()) {
-    long number = TextPlaces::refuse(TextPlace::QuotedName, port);
+    long number = isEmbedded ? 0 : TextPlaces::refuse(TextPlace::Name, port);
+    if (number == 0)
+      number = TextPlaces::refuse(TextPlace::QuotedName, port);
     if (number == 0 && isBare)
       number = TextPlaces::refuse(TextPlace::Port, port);
-    // What is wrong with it wherever it stands is told where the definition is embedded.
-    const bool isEmbedded = m_network->getFileName().isEmpty();
     if (number == text_refusals::kBreaksLine)
       number = isEmbedded ? 0 : custom_messages::kLineBreak;
     else if (number == text_refusals::kUnclosedReference)
