@@ -34,8 +34,13 @@ struct Maker {
     if (random() % 3 == 0)
       name += "(" + piece() + ")";
     name.remove('$');  // might make it a reference to a macro
+    QString stood = name;
+    if (random() % 4 == 0) {
+      name.remove('"').insert(int(random() % 2), QStringLiteral(")("));
+      stood = '"' + name + '"';
+    }
     text += QString(isEncoded && random() % 2 ? "<commercialat>" : "@") + "Value" + bracket("(") +
-            (isEncoded ? QORXWwjdEncode(name) : name) + bracket(")");
+            (isEncoded ? QORXWwjdEncode(stood) : stood) + bracket(")");
     plain += QChar(1) + name + QChar(2);
     names << name;
   }
@@ -48,7 +53,7 @@ struct Maker {
         case 1:  // text in brackets, or a reference that is none because it has one inside
           if (depth == 0)
             break;
-          put(random() % 2 ? "(" : "@Value(");
+          put(random() % 2 ? "(" : "@Value(x");
           make(depth - 1);
           if (!plain.endsWith(QChar(2)))
             reference();

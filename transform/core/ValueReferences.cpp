@@ -51,6 +51,17 @@ ValueReference makeReference(int begin, int end, const QString& inside, Form for
   return {begin, end, QORXWwjdDecode(word), word};
 }
 
+// Where the reference ends whose quoted name begins at `position`; -1 when no such name stands there.
+int endOfQuotedName(const QString& text, int position, Form form) {
+  const QLatin1String quote(form == Form::Encoded ? "<quotationmark>" : "\"");
+  if (text.midRef(position, quote.size()) != quote)
+    return -1;
+  const int closing = text.indexOf(quote, position + quote.size());
+  const QLatin1String& bracket = form == Form::Encoded ? kEncodedRightParenthesis : kRightParenthesis;
+  const bool isClosed = closing >= 0 && text.midRef(closing + quote.size(), bracket.size()) == bracket;
+  return isClosed ? closing + quote.size() + bracket.size() : -1;
+}
+
 }  // namespace
 
 std::vector<ValueReference> valueReferences(const QString& text) {
@@ -67,6 +78,14 @@ std::vector<ValueReference> valueReferences(const QString& text) {
     if (!mark)
       continue;
     const int behind = i + mark->text.size();
+    const int end = mark->kind == Mark::Kind::Reference ? endOfQuotedName(text, behind, mark->form) : -1;
+    if (end >= 0) {
+      const int bracket = mark->form == Form::Encoded ? kEncodedRightParenthesis.size() : 1;
+      references.push_back(makeReference(i, end, text.mid(behind, end - bracket - behind), mark->form));
+      begin = -1;
+      i = end - 1;
+      continue;
+    }
     if (mark->kind != Mark::Kind::Close) {
       open.push_back(mark->form);
       if (mark->kind == Mark::Kind::Reference) {

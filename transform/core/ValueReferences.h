@@ -1,8 +1,9 @@
 // The attribute references "@Value(NAME)" inside a value, in any of the forms in which they are stored:
 // plain, word-encoded, and word-encoded with "@" as it is. What is a reference is decided here alone.
 //
-// Brackets inside a name count when they are matched; of references inside one another only the innermost is
-// one; one that is never closed is text. So references never overlap.
+// Brackets inside a name count when they are matched, and not at all in a name in double quotes; of
+// references inside one another only the innermost is one; one that is never closed is text. So references
+// never overlap.
 #pragma once
 
 #include <platform/Export.h>
