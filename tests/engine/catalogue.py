@@ -1,16 +1,16 @@
 """What the definition files say: ports, parameters, and which key of which factory carries which parameter."""
 import glob
 import os
+import re
 
-from words import split
+from words import decode, split, unpack
 
 
 class Definition:
     def __init__(self):
         self.name, self.version, self.inputs, self.outputs = "", 0, [], []
-        self.aliases, self.parameters, self.hidden = {}, [], []
+        self.aliases, self.parameters = {}, []
         self.kind, self.statements = "", []
-        self.multiprocess = ""
 
     def keys_of(self, parameter):
         return [key for key, value in self.statements if value == f"$({parameter})"]
@@ -18,7 +18,12 @@ class Definition:
 
 class Parameter:
     def __init__(self, name):
-        self.name, self.flags, self.type, self.config, self.prompt, self.default = name, [], "", "", "", ""
+        self.name, self.flags, self.type, self.config = name, [], "", ""
+        self.lookup = []
+
+    def stored_side(self, text):
+        sides = (unpack(each) for each in self.lookup)
+        return next((decode(stored) for shown, stored in sides if shown == text), text)
 
     def read_type(self, text):
         words = text.split(" ")
@@ -65,16 +70,12 @@ def _definitions(text, kinds):
             current.name = value
         elif keyword == "VERSION:":
             current.version = int(value)
-        elif keyword == "MULTIPROCESS:":
-            current.multiprocess = value
         elif keyword == "PARAMETER_NAME:":
             current.parameters.append(Parameter(value))
         elif keyword == "PARAMETER_TYPE:":
             current.parameters[-1].read_type(value)
-        elif keyword == "PARAMETER_PROMPT:":
-            current.parameters[-1].prompt = value
-        elif keyword == "PARAMETER_DEFAULT:":
-            current.parameters[-1].default = value
+        elif keyword == "PARAMETER_LOOKUP:":
+            current.parameters[-1].lookup += unpack(value, "%")
     return result
 
 
@@ -94,3 +95,42 @@ def _template(definition, line, kinds):
             keys.add(words[at])
             definition.statements.append((words[at], words[at + 1]))
             at += 2
+
+
+TYPED = """TRANSFORMER_NAME: Typed%(name)s
+VERSION: 1
+CATEGORY: Tests
+INPUT_TAGS: INPUT
+OUTPUT_TAGS: OUTPUT
+PRESERVES_ATTRIBUTES: <ALL>
+PARAMETER_NAME: V
+PARAMETER_TYPE: %(type)s
+PARAMETER_PROMPT: Value
+PARAMETER_DEFAULT:
+PARAMETER_NAME: W
+PARAMETER_TYPE: TEXT_ENCODED
+PARAMETER_PROMPT: What stands behind
+PARAMETER_DEFAULT:
+PARAMETER_NAME: O
+PARAMETER_TYPE: OPTIONAL OMITTABLE %(type)s
+PARAMETER_PROMPT: Optional value
+PARAMETER_DEFAULT:
+TEMPLATE_START
+FACTORY_DEF * TypedFactory FACTORY_NAME $(XFORMER_NAME) $(INPUT_LINES) VALUE $(V) AFTER $(W) OUTPUT OUTPUT FEATURE_TYPE $(XFORMER_NAME_ENCODED)|OUTPUT
+FACTORY_OPTION $(XFORMER_NAME_ENCODED) LATER $(O)
+FACTORY_DEF * TeeFactory FACTORY_NAME $(XFORMER_NAME_ENCODED)|OUTPUT_Router INPUT FEATURE_TYPE $(XFORMER_NAME_ENCODED)|OUTPUT OUTPUT FEATURE_TYPE $(OUTPUT_OUTPUT_FTYPE) $(OUTPUT_OUTPUT_FUNCS)
+TEMPLATE_END
+"""
+
+
+def write_typed(reference, definitions, passive, folder):
+    """A definition for each type that the reference lists and no shipped definition has."""
+    used = {parameter.type for each in definitions for parameter in each.parameters}
+    with open(reference, encoding="utf-8") as file:
+        rows = re.findall(r"^\| `([A-Z_]+)` \| (yes|no) \| (?:yes|no) \|", file.read(), re.M)
+    for kind, takes_config in rows:
+        config = " 0%100%2" if kind.startswith("RANGE") else " A%B" if "CHOICE" in kind or "LISTBOX" in kind else \
+            " Any|*" if kind.startswith("FILE") else " X" if kind.startswith("NAMED") else ' ""'
+        if kind not in used and kind not in passive and "_PARM" not in kind:
+            with open(os.path.join(folder, f"Typed{kind}.ort"), "w", encoding="utf-8") as file:
+                file.write(TYPED % {"name": kind.replace("_", ""), "type": kind + config * (takes_config == "yes")})

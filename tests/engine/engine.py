@@ -111,7 +111,8 @@ class Run:
         if len(words) < 2 or not re.fullmatch("[A-Z0-9_]+", words[1].raw):
             raise Fault("no FACTORY_OPTION: " + rest[:80])
         name = self.macros.expand(words[0].raw)
-        owner = next((each for each in reversed(self.factories) if decode(name) == each.name), None)
+        owner = next((each for each in reversed(self.factories)
+                      if decode(name) in (each.name, decode(each.name))), None)
         if owner is None:
             raise Fault("an option for a factory that is not there: " + name)
         key = words[1].raw
@@ -161,14 +162,16 @@ class Run:
     def value(self, text, feature):
         return evaluate(text, feature, self.engine.tcl)
 
+    def unfed(self):
+        return [f"{made.name}: nothing flows in as {kind}" for made in self.factories if made.kind != "TeeFactory"
+                for port, kind, _ in made.inputs if made.reached and not any(made.reached.values())]
+
     def complaints(self, feature):
         """Everything that an engine would stumble over."""
         found = self.faults + [f"no such macro: {name}" for name in sorted(set(self.macros.unset))]
         found += ["no statement: " + body[:80] for body in self.unknown]
         for made in self.factories:
             if made.kind != "TeeFactory" and not made.kind.startswith("TransformFact:"):
-                found += [f"{made.name}: nothing flows in as {kind}" for _, kind, _ in made.inputs
-                          if not any(made.reached.values())]
                 for key, text in made.settings:
                     try:
                         self.value(text, feature)

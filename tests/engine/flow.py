@@ -2,7 +2,7 @@
 import re
 from collections import namedtuple
 
-from words import Fault, Word, quote_end, split, unquote
+from words import Fault, decode, split, unquote
 
 Input = namedtuple("Input", "port type filter")
 Output = namedtuple("Output", "port type functions")
@@ -25,23 +25,10 @@ class Factory:
                 tuple(re.match(r"@?\w*", f)[0] for f in o.functions) for o in self.outputs))
 
 
-def keyed_words(text):
-    """The words of a statement of several processes: a value in quotes belongs to the key before it."""
-    words = []
-    for word in split(text):
-        if words and word.start < words[-1].end:
-            continue
-        found = re.match(r'(?:TransformFact:[^:\s"]*:|[A-Z_]+:)(?=")', word.raw)
-        end = quote_end(text, word.start + found.end()) if found else word.end
-        words.append(Word(word.start, end or len(text), text[word.start:end or len(text)], bool(end) and word.closed
-                          or bool(found and end)))
-    return words
-
-
 def factory(text, macros, keys):
     """The factory of a FACTORY_DEF statement; `keys` gives the keys of a kind."""
     is_fact = re.match(r"\s*FACTORY_DEF\s+\*\s+TransformFact:", text)
-    words = keyed_words(text) if is_fact else split(text)
+    words = split(text, keyed=bool(is_fact))
     raw = [word.raw for word in words]
     if not all(word.closed for word in words):
         raise Fault("a quote or call has no end")
@@ -57,7 +44,7 @@ def factory(text, macros, keys):
         at = _meta(made, raw, macros)
     while at < len(raw):
         if raw[at] in ("INPUT", "OUTPUT"):
-            with_port = raw[at + 1:at + 2] != ["FEATURE_TYPE"] or raw[at + 2:at + 3] == ["FEATURE_TYPE"]
+            with_port = raw[at + 1:at + 2] != ["FEATURE_TYPE"]
             place = at + (2 if with_port else 1)
             if raw[place:place + 1] != ["FEATURE_TYPE"] or place + 1 >= len(raw):
                 raise Fault("a clause lacks its FEATURE_TYPE: " + text[words[at].start:][:80])
@@ -115,6 +102,6 @@ class Flow:
             made.reached.setdefault(port, set()).update(origins)
             reached |= origins
             self.taken.add(kind)
-        for port, kind, _ in made.outputs:
+        for _, kind, _ in made.outputs:
             self.types.setdefault(kind, set()).update(
-                reached if made.kind == "TeeFactory" else {(made.name, port)})
+                reached if made.kind == "TeeFactory" else {decode(kind)})

@@ -25,7 +25,7 @@ def main(home, samples):
         readers = {(t.get("KEYWORD"), t.get("FEATURE_TYPE_NAME")) for t in types if t.get("IS_SOURCE") == "true"}
         with open(path[:-3] + "mf", encoding="utf-8") as file:
             run = Run(engine, file.read(), readers)
-        faults = run.complaints(Feature())
+        faults = run.complaints(Feature()) + run.unfed()
         faults += [f"nothing arrives at the writer's {t.get('FEATURE_TYPE_NAME')}" for t in types
                    if t.get("IS_SOURCE") != "true" and t.get("ENABLED", "true") == "true" and
                    not run.arriving(t.get("KEYWORD"), t.get("FEATURE_TYPE_NAME"))]

@@ -57,21 +57,16 @@ class Tcl:
     """The two interpreters: `include` of INCLUDE, `each` of Tcl2 and @Tcl2."""
 
     def __init__(self):
-        self.child = self._start()
-
-    @staticmethod
-    def _start():
         with tempfile.NamedTemporaryFile("w", suffix=".tcl", delete=False) as file:
             file.write(CHILD)
-        child = subprocess.Popen(["tclsh", file.name], stdin=subprocess.PIPE, stdout=subprocess.PIPE, text=True)
-        child.script = file.name
-        return child
+        self.script = file.name
+        self.child = subprocess.Popen(["tclsh", self.script], stdin=subprocess.PIPE, stdout=subprocess.PIPE, text=True)
 
     def close(self):
         self.child.stdin.close()
         self.child.wait()
         self.child.stdout.close()
-        os.unlink(self.child.script)
+        os.unlink(self.script)
 
     def fresh(self):
         self.child.stdin.write("fresh\n")

@@ -68,16 +68,22 @@ def quote_end(text, start):
     return 0
 
 
-def split(text):
-    """The words of a statement with their places; `closed` is false where a quote or a call has no end."""
+KEYED = re.compile(r'(?:TransformFact:[^:\s"]*:|[A-Z_]+:)(?=")')
+
+
+def split(text, keyed=False):
+    """The words of a statement with their places; `closed` is false where a quote or a call has no end.
+
+    In statements of several processes, a value in quotes belongs to the key before it (`keyed`)."""
     found, at = [], 0
     while True:
         while at < len(text) and text[at] in BLANKS:
             at += 1
         if at == len(text):
             return found
-        if text[at] == '"':
-            end = quote_end(text, at) or -1
+        key = KEYED.match(text, at) if keyed else None
+        if key or text[at] == '"':
+            end = quote_end(text, key.end() if key else at) or -1
         elif re.match(r"@\w+\(", text[at:]):
             end = call_end(text, at)
         else:

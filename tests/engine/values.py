@@ -1,0 +1,192 @@
+"""Values for parameters of every type, and what each is to come back as."""
+import json
+from html import escape
+
+from catalogue import Parameter
+from words import decode, encode, pack, unpack
+
+# What is no text as it stands in a value that is not encoded, but a reference, a call or a mark.
+MEANS = ("$(", "$[", "@", "<U")
+NUMBERS = ["0", "1", "-3", "25", "100"]
+PASSIVE = ("DISCLOSUREGROUP", "GROUP", "NAMEDGROUP", "DIVIDER", "MESSAGE", "PUBLISHED_PARAMETER",
+           "PUBLISHED_PARAMETER_LIST", "TEXT_EDIT_PYTHON_PARM", "TEXT_EDIT_TCL_PARM")
+WITH_CONFIG = ("ATTR", "CHOICE", "LISTBOX", "LOOKUP", "CHECKBOX", "FILE", "NAMED", "RANGE", "TEXT_EDIT_PARM")
+
+
+class Value:
+    """A stored value, and what it is to come back as: None where nothing is to be compared."""
+
+    def __init__(self, stored, expected=None):
+        self.stored, self.expected = stored, expected
+
+
+def is_encoded(kind):
+    return kind.endswith("_ENCODED") or kind.startswith("TEXT_EDIT")
+
+
+def may_refer(kind):
+    return "_OR_ATTR" in kind
+
+
+def entries(parameter):
+    """Shown and stored sides of the choices."""
+    found = []
+    for entry in unpack(parameter.config, "%"):
+        sides = unpack(entry, ",") if parameter.type.startswith("LOOKUP_") else [entry]
+        found.append((sides[0], parameter.stored_side(sides[-1])))
+    return found
+
+
+def make(case, parameter, scope):
+    """None leaves the parameter to its default."""
+    rng, kind = case.random, parameter.type
+    if kind in PASSIVE or not kind:
+        return None
+    if "OPTIONAL" in parameter.flags and parameter.name != "LABEL" and rng.random() < 0.3:
+        return Value("", "")
+    if kind == "GUI_LINE_TABLE":
+        return table(case, parameter, scope)
+    if kind == "MULTIPARAMETER":
+        return multi(case, parameter, scope)
+    if "CHOICE" in kind or "LISTBOX" in kind or kind == "CHECKBOX":
+        return choice(case, parameter)
+    if kind.startswith(("INT", "FLOAT", "RANGE")):
+        return numeric(case, kind, scope)
+    if kind.startswith("EXPRESSION"):
+        return expression(case, scope)
+    if "ATTR" in kind.split("_") and "OR" not in kind.split("_"):
+        return attributes(case, kind, scope)
+    return text(case, kind, scope)
+
+
+def choice(case, parameter):
+    rng, kind = case.random, parameter.type
+    if kind == "CHECKBOX":
+        stored = rng.choice(parameter.config.split("%") if parameter.config else ["YES", "NO"])
+        return Value(stored, stored)
+    sides = entries(parameter)
+    if not sides:
+        return None
+    if "LISTBOX" in kind:
+        picked = rng.sample(sides, rng.randint(1, len(sides)))
+        at = rng.randrange(2)
+        return Value(pack([side[at] for side in picked], " "), pack([side[1] for side in picked], " "))
+    shown, stored = rng.choice(sides)
+    if rng.random() < 0.05:
+        wrong = case.text(stored, "choice")
+        return Value(wrong, stored if wrong == stored else None)
+    return Value(shown if parameter.lookup else rng.choice([shown, stored]), stored)
+
+
+def numeric(case, kind, scope):
+    rng = case.random
+    if rng.random() < 0.1:
+        wrong = case.text("1", "number")
+        return Value(wrong, None)
+    if may_refer(kind) and scope.referable and rng.random() < 0.4:
+        name = scope.referable[0]
+        return Value(reference(name, is_encoded(kind)), case.feature.get(name))
+    number = rng.choice(NUMBERS[3:])
+    return Value(number, number)
+
+
+def reference(name, encoded):
+    """The reference to an attribute as a person's tools write it: names that would end it stand in quotes."""
+    quoted = '"' + name.replace('"', '\\"') + '"' if any(char in '(){}"' for char in name) else name
+    whole = "(" + quoted + ")"
+    return "@Value" + (encode(whole) if encoded else whole)
+
+
+def text(case, kind, scope):
+    rng, encoded = case.random, is_encoded(kind)
+    macros = [(name, value) for name, of, _, value in scope.parameters
+              if (is_encoded(of) or of.endswith("_PARM")) == encoded and of != "FLOAT"]
+    meaning = case.text("t", kind)
+    if "XML" in kind:
+        meaning = f"<a>{escape(meaning)}</a>"
+    elif "JSON" in kind:
+        meaning = json.dumps(meaning)
+    stored = encode(meaning) if encoded else meaning
+    expected = None if not encoded and any(mark in meaning for mark in MEANS) else meaning
+    parts = [(stored, expected)]
+    if may_refer(kind) and scope.referable and rng.random() < 0.3:
+        name = rng.choice(scope.referable)
+        parts.insert(rng.randrange(2), (reference(name, encoded), case.feature.get(name)))
+        if not encoded:
+            parts = [(part, None) for part, _ in parts]
+    elif macros and rng.random() < 0.4:
+        name, value = rng.choice(macros)
+        parts.append((f"$({name})", ("macro", name)))
+    elif rng.random() < 0.1 and scope.referable and may_refer(kind):
+        return conditional(case, kind, scope)
+    values = [meaning for _, meaning in parts]
+    return Value("".join(part for part, _ in parts), None if None in values else values)
+
+
+def conditional(case, kind, scope):
+    name = case.random.choice(scope.referable)
+    limit = case.random.choice(["0", "99999"])
+    yes, no = case.text("yes", "conditional"), case.text("no", "conditional")
+    condition = "@Value(" + reference(name, False)[7:-1] + ") > " + limit
+    return Value("ORX_CONDITIONAL:" + ";".join(map(encode, (condition, yes, no))),
+                 [yes if float(case.feature.get(name)) > float(limit) else no])
+
+
+def expression(case, scope):
+    if not scope.referable:
+        formula = "1 = 2"
+    else:
+        name = case.random.choice(scope.referable)
+        formula = "@Value(" + reference(name, False)[7:-1] + ") = 3"
+    if case.random.random() < 0.3:
+        formula += ' or "' + case.text("t", "formula").replace('"', '""') + '" = "t"'
+    return Value(encode(formula), ("formula", formula))
+
+
+def attributes(case, kind, scope):
+    new = kind.startswith("NEW")
+    known = scope.attributes
+    names = [case.text("fresh", kind) if new or not known else case.random.choice(known)]
+    if "LIST" in kind:
+        names = list(dict.fromkeys(names + case.random.sample(known, min(len(known), case.random.randrange(3)))))
+        if is_encoded(kind):
+            packed = pack([encode(name) for name in names])
+            return Value(packed, ("list", names))
+        return Value(pack(names), None if any(m in n for m in MEANS for n in names) else ("list", names))
+    name = names[0]
+    if is_encoded(kind):
+        return Value(encode(name), [name])
+    return Value(name, None if any(mark in name for mark in MEANS) else [name])
+
+
+def members(parameter):
+    """The separator, and the columns of a table or the members of a multi-parameter."""
+    separator, *lines = unpack(parameter.config)
+    found = []
+    for line in map(decode, lines):
+        words = line.split(" ")[1:]
+        member = Parameter("")
+        while words[0] in ("OPTIONAL", "OMITTABLE"):
+            member.flags.append(words.pop(0))
+        member.type, member.name = words[0], words[1]
+        if member.type.startswith(WITH_CONFIG):
+            member.config = "" if words[2] == '""' else words[2]
+        found.append(member)
+    return decode(separator), found
+
+
+def table(case, parameter, scope):
+    separator, columns = members(parameter)
+    rows = case.random.randint(1, 2)
+    cells = [make(case, column, scope) or Value("", "") for column in columns * rows]
+    expected = [cell.expected for cell in cells]
+    return Value(pack([cell.stored for cell in cells], separator),
+                 None if None in expected else ("table", separator, [c.type for c in columns], expected))
+
+
+def multi(case, parameter, scope):
+    separator, parts = members(parameter)
+    values = [make(case, part, scope) for part in parts]
+    made = Value(pack([each for part, value in zip(parts, values) for each in (part.name, value.stored)], separator))
+    made.members = dict(zip((part.name for part in parts), zip(parts, values)))
+    return made

@@ -1,0 +1,323 @@
+"""Workspaces put together at random, each with a harmless twin, and what an engine must find in them."""
+import random
+import re
+from html import escape
+
+from functions import Feature
+from values import MEANS, NUMBERS, Value, make
+from words import decode, encode
+
+HOSTILE = [
+    "a b", " lead", "trail ", "two  blanks", "tab\there", '"', 'a"b', '"quoted"', 'a\\" b', "back\\", "c\\\\", "it's",
+    "(", ")", "f(x", ")(", "g(x)", ",", "a,b", ";", "%", "#", "# c", "{", "}", "{}", "}{", "[", "]", "$x", "$(", "$[",
+    '[puts "MACRO HIT 1"]', '"; puts "MACRO HIT 1"; #', "} ; puts {MACRO HIT 1}; {", "$(NOPE)", "$[NOPE]", "$(P1)",
+    "$(XFORMER_NAME)", "$(INPUT_LINES)", "@", "@Value(", "@Value(a)", "@EvaluateExpression(", "@Tcl2(x", "INPUT",
+    "OUTPUT", "FEATURE_TYPE", "1 OUTPUT X", "a OUTPUT x FEATURE_TYPE y", "FACTORY_DEF * TeeFactory", "MACRO HIT 1",
+    'INCLUDE [ puts "MACRO HIT 1" ]', "line\nbreak", "\r", "<space>", "<", ">", "é", "日本", "😀", "\u00a0", "\u3000",
+    "x" * 300, "END_INCLUDE", "# TRANSFORMER_END", "a|b", "a_OUTPUT", "%1", "&amp;", "0", "YES", "a:b", "\\n", "\\t",
+    "]]>", "a/b", "a.b{0}", "<Unused>"]
+# Not drawn while it is being mended: where a text stands, and which texts, as patterns.
+KNOWN = [
+    ("reader|writer|name|instance|port|custom|attribute|choice|[A-Z_]+$(?<!_ENCODED)", r"\$[([]"),
+    ("custom", r"[^\w ]"),
+    ("name|instance|attribute|[A-Z_]+$(?<!_ENCODED)", r"@\w+\("),
+    (".*_ENCODED", "^@Value"),
+]
+
+
+def element(name, attributes, inner=""):
+    text = "".join(f' {key}="{escape(value)}"' for key, value in attributes.items())
+    for char, entity in (("\n", "&#10;"), ("\r", "&#13;"), ("\t", "&#9;")):
+        text = text.replace(char, entity)
+    return f"<{name}{text}>{inner}</{name}>\n" if inner else f"<{name}{text}/>\n"
+
+
+def section(name, items):
+    return f"<{name}>\n" + "".join(items) + f"</{name}>\n"
+
+
+class Node:
+    def __init__(self, number, name):
+        self.number, self.name, self.values = number, name, {}
+        self.definition = self.custom = None
+        self.inputs, self.outputs = [], []
+
+
+class Scope:
+    """The workspace, or the inside of a custom transformer."""
+
+    def __init__(self, name=""):
+        self.name, self.nodes, self.links, self.parameters, self.ports = name, [], [], [], []
+        self.settings, self.names, self.numbers = {}, set(), 0
+        self.attributes, self.referable, self.readers, self.writers = [], [], [], []
+        self.loops, self.around = "", None
+
+    def number(self):
+        self.numbers += 1
+        return self.numbers
+
+
+class Case:
+    """`seed` decides everything; `tame` puts a harmless text in the place of each hostile one."""
+
+    def __init__(self, catalogue, seed, tame, skipped=(), dropped=()):
+        self.random, self.tame, self.skipped, self.seed = random.Random(seed), tame, set(skipped), seed
+        self.catalogue, self.feature, self.customs, self.used = catalogue, Feature(), [], []
+        self.rate = self.random.choice([0.03, 0.1, 0.3])
+        self.drawn = 0
+        self.main = Scope()
+        self._fill(self.main, 0)
+        self.linked = next((each for each in self.customs if each.around is self.main), None) \
+            if self.random.random() < 0.1 else None
+        if self.linked:
+            self.linked.name += f" {seed}{'t' if tame else 'h'}"
+        self.nodes = [(scope, node) for scope in [self.main, *self.customs] for node in scope.nodes]
+        for scope, node in (self.nodes[at] for at in dropped):
+            scope.nodes.remove(node)
+            scope.links = [link for link in scope.links if node not in (link[0], link[2])]
+
+    # --- texts
+
+    def text(self, plain="t", where="value"):
+        """A text: mostly harmless. Each draw has a number, so that single ones can be left out."""
+        hostile, at = self.random.random() < self.rate, self.random.randrange(len(HOSTILE))
+        self.drawn += 1
+        if not hostile or self.drawn in self.skipped or any(
+                re.match(known, where) and re.search(pattern, HOSTILE[at]) for known, pattern in KNOWN):
+            return plain
+        self.used.append((self.drawn, where, HOSTILE[at]))
+        return f"h{at}" if self.tame else HOSTILE[at]
+
+    def name(self, scope, plain, where):
+        text = self.text(plain, where)
+        if text in scope.names:
+            text += str(len(scope.names))
+        scope.names.add(text)
+        return text
+
+    # --- scopes
+
+    def _fill(self, scope, depth):
+        rng = self.random
+        for at in range(rng.randrange(3)):
+            self._parameter(scope, at)
+        if depth == 0:
+            for at in range(rng.randint(1, 2)):
+                node = Node(scope.number(), self.name(scope, f"reader{at}", "reader"))
+                node.outputs = [""]
+                scope.readers.append((node, self.text("DATA", "keyword") if rng.random() < 0.1 else "DATA"))
+            for at in range(3):
+                drawn = len(self.used)
+                scope.attributes.append(self.name(scope, f"attr{at}", "attribute"))
+                text = "".join(text for _, _, text in self.used[drawn:])
+                if not re.search(r"\((?!.*\))|^\)", text):  # a reference names only what closes its parentheses
+                    scope.referable.append(scope.attributes[-1])
+        else:
+            for at in range(rng.randint(1, 2)):
+                self._port(scope, f"IN{at}", "true")
+            for at in range(rng.randint(1, 2)):
+                self._port(scope, f"OUT{at}", "false")
+        if depth < 2:
+            for at in range(rng.choice([0, 0, 1]) if depth else rng.choice([0, 0, 1, 1, 2])):
+                self._custom(scope, depth)
+        for _ in range(rng.randint(1, 4) if depth == 0 else rng.randint(1, 2)):
+            self._place(scope)
+        for custom in [each for each in self.customs if each.around is scope]:
+            for _ in range(rng.randint(1, 2)):
+                self._place(scope, custom)
+        if depth == 0:
+            for at in range(rng.randint(1, 2)):
+                node = Node(scope.number(), self.name(scope, f"writer{at}", "writer"))
+                node.inputs = [""]
+                scope.writers.append((node, "OUT"))
+        self._connect(scope)
+
+    def _parameter(self, scope, at):
+        rng = self.random
+        scripts = ["SCRIPT", "TEXT_ENCODED"] if scope.name and not scope.loops else []
+        kind = rng.choice(["TEXT_ENCODED", "TEXT", "FLOAT", *scripts])
+        name = f"P{at}"
+        prompt = self.text("Prompt", "prompt")
+        value = self.constant(kind, prompt)
+        kind = value.kind if kind == "SCRIPT" else kind
+        scope.parameters.append((name, kind, prompt, value))
+
+    def constant(self, kind, seed_text="t"):
+        """A value of a parameter of a document."""
+        if kind == "FLOAT":
+            number = self.random.choice(NUMBERS)
+            return Value(number, number)
+        if kind == "SCRIPT":
+            text, python = self.text("t", "script"), self.random.random() < 0.5
+            code = (f"x = {text!r}\n# {text.splitlines()[0] if text.split() else ''}\nreturn 'v1'" if python else
+                    "set x [list %s]\nreturn v1" % encode(text))
+            value = Value(encode(code), "v1")
+            value.kind = "TEXT_EDIT_PYTHON_PARM" if python else "TEXT_EDIT_TCL_PARM"
+            return value
+        text = self.text("t", kind)
+        if kind == "TEXT_ENCODED":
+            return Value(encode(text), text)
+        return Value(text, None if any(mark in text for mark in MEANS) else text.strip(" \t"))
+
+    def _port(self, scope, plain, kind):
+        node = Node(scope.number(), self.name(scope, plain, "port"))
+        node.inputs, node.outputs = ([], [""]) if kind == "true" else ([""], [])
+        scope.ports.append((node, kind))
+
+    def _custom(self, around, depth):
+        rng = self.random
+        custom = Scope(self.name(self.main, f"Custom {len(self.customs)}", "custom"))
+        custom.around = around
+        custom.settings = {"VERSION": str(rng.randint(1, 3)), "CATEGORY": self.text("Mine", "category"),
+                           "GUID": self.text("{1234}", "guid") if rng.random() < 0.2 else "{1234}"}
+        self.customs.append(custom)
+        mode = rng.random()
+        custom.loops = "loop" if mode < 0.2 else "workers" if mode < 0.4 else ""
+        if mode < 0.2:
+            custom.settings["BLOCKED_LOOPING"] = "yes"
+        elif mode < 0.4:
+            custom.settings["PARALLELISM"] = rng.choice(["MINIMAL", "EXTREME"])
+            custom.settings["PARALLEL_GROUP_BY"] = (
+                self.text("attr", "parallel") if rng.random() < 0.2 else self.main.attributes[0])
+        self._fill(custom, depth + 1)
+        if custom.loops == "loop":
+            node = Node(custom.number(), "AGAIN")
+            node.inputs, node.outputs = [""], [""]
+            custom.ports.append((node, "loop"))
+            sources = [each for each in custom.nodes if each.outputs]
+            if sources:
+                source = rng.choice(sources)
+                custom.links.append((source, rng.choice(source.outputs), node, ""))
+                if source.inputs:
+                    custom.links.append((node, "", source, rng.choice(source.inputs)))
+
+    def _place(self, scope, custom=None):
+        rng = self.random
+        if custom:
+            node = Node(scope.number(), self.name(scope, f"Instance{scope.numbers}", "instance"))
+            node.custom = custom
+            node.inputs = [port.name for port, kind in custom.ports if kind == "true"]
+            node.outputs = [port.name for port, kind in custom.ports if kind == "false"]
+            for name, kind, _, default in custom.parameters:
+                node.values[name] = default if rng.random() < 0.3 else \
+                    self.constant("SCRIPT" if kind.endswith("_PARM") else kind)
+                if kind.endswith("_PARM"):
+                    node.values[name] = default
+            if custom.loops == "loop":
+                node.values["MAX_LOOP_ITERATIONS"] = Value(
+                    self.text("9", "loop setting") if rng.random() < 0.2 else rng.choice(NUMBERS[3:]))
+                node.values["ITERATION_COUNT_ATTR"] = Value(self.text("turn", "loop setting"))
+        else:
+            node = Node(scope.number(), self.name(scope, f"Node {scope.numbers}", "name"))
+            typed = rng.random() < 0.2
+            node.definition = rng.choice([each for each in self.catalogue if each.name.startswith("Typed") == typed])
+            node.inputs, node.outputs = list(node.definition.inputs), list(node.definition.outputs)
+            for parameter in node.definition.parameters:
+                value = make(self, parameter, scope)
+                if value is not None:
+                    node.values[parameter.name] = value
+        scope.nodes.append(node)
+
+    def _connect(self, scope):
+        """Every node is fed by what stands before it; outputs of documents and writers by anything."""
+        rng = self.random
+        before = [node for node, _ in scope.readers] + [node for node, kind in scope.ports if kind == "true"]
+        ends = [node for node, _ in scope.writers] + [node for node, kind in scope.ports if kind == "false"]
+        for node in scope.nodes + ends:
+            giving = [each for each in before if each.outputs]
+            for port in node.inputs:
+                for source in rng.sample(giving, min(len(giving), rng.choice([1, 1, 1, 2]))):
+                    scope.links.append((source, rng.choice(source.outputs), node, port))
+            if node not in ends:
+                before.append(node)
+
+    # --- the document
+
+    def document(self, embeds=True):
+        """The workspace; what is linked stands inside as well when it `embeds`."""
+        main, subs = self.main, ""
+        self.embeds = embeds
+        placed = {id(node.custom) for scope in [main, *self.customs] for node in scope.nodes}
+        for custom in self.customs:
+            inside = custom
+            while inside.around is not main and inside is not self.linked:
+                inside = inside.around
+            if id(custom) not in placed or inside is self.linked and not embeds:
+                continue
+            subs += element("SUBDOCUMENT", {"NAME": custom.name, **custom.settings}, self._sections(custom))
+        types = ""
+        for nodes, source in ((main.readers, "true"), (main.writers, "false")):
+            for node, keyword in nodes:
+                inner = "".join(element("FEAT_ATTRIBUTE", {"ATTR_NAME": name}) for name in main.attributes)
+                types += element("FEATURE_TYPE", {"IS_SOURCE": source, "FEATURE_TYPE_NAME": node.name,
+                                                  "KEYWORD": keyword, "IDENTIFIER": str(node.number)}, inner)
+        xml = ('<?xml version="1.0" encoding="UTF-8" ?>\n<WORKSPACE>\n' + section("FEATURE_TYPES", [types]) +
+               self._sections(main) + section("SUBDOCUMENTS", [subs]) + "</WORKSPACE>\n")
+        return "".join(f"#! {line}\n" for line in xml.split("\n") if line) + "#! START_HEADER\n#! END_HEADER\n"
+
+    def _sections(self, scope):
+        nodes = []
+        for node in scope.nodes:
+            values = {"XFORMER_NAME": node.name, **{key: value.stored for key, value in node.values.items()}}
+            linked = node.custom and node.custom is self.linked and not self.embeds
+            kind = {"TYPE": node.definition.name, "VERSION": str(node.definition.version)} if node.definition else {
+                "TYPE": node.custom.name if linked else "SubDocumentTransformer",
+                "VERSION": node.custom.settings["VERSION"]}
+            if node.custom and not linked:
+                values["SUB_DOC_NAME"] = node.custom.name
+            nodes.append(element("TRANSFORMER", {"IDENTIFIER": str(node.number), **kind}, "".join(
+                [element("OUTPUT_FEAT", {"NAME": each}) for each in node.outputs] +
+                [element("XFORM_PARM", {"PARM_NAME": key, "PARM_VALUE": value}) for key, value in values.items()])))
+        links = [element("FEAT_LINK", {
+            "IDENTIFIER": str(1000 + at), "SOURCE_NODE": str(a.number), "TARGET_NODE": str(b.number),
+            "SOURCE_PORT_DESC": f"fo {a.outputs.index(out)} {encode(out)}".strip(),
+            "TARGET_PORT_DESC": f"fi {b.inputs.index(into)} {encode(into)}".strip()})
+            for at, (a, out, b, into) in enumerate(scope.links)]
+        ports = [element("SUBDOCUMENT_IO", {"IDENTIFIER": str(node.number), "NAME": node.name, "IS_SOURCE": kind})
+                 for node, kind in scope.ports]
+        parameters = [element("GLOBAL_PARAMETER", {"GUI_LINE": f"GUI {kind} {name} {prompt}",
+                                                   "DEFAULT_VALUE": value.stored})
+                      for name, kind, prompt, value in scope.parameters]
+        return section("GLOBAL_PARAMETERS", parameters) + section("TRANSFORMERS", nodes) + (
+            section("SUBDOCUMENT_IOS", ports) if ports else "") + section("FEAT_LINKS", links)
+
+    # --- what an engine must find
+
+    def readers(self):
+        return {(keyword, node.name) for node, keyword in self.main.readers}
+
+    def instances(self):
+        """All plain transformers: their name to the engine, the node, and the scopes around it."""
+        def walk(scope, prefix, around):
+            for node in scope.nodes:
+                if node.custom:
+                    yield from walk(node.custom, prefix + node.name + "_", around + [(scope, node)])
+                else:
+                    yield prefix + node.name, node, scope, around
+        return walk(self.main, "", [])
+
+    def sources(self, scope, around, node, port):
+        """What is to arrive at a port, as the engine names it."""
+        found, pending, seen = set(), [(scope, around, node, port)], set()
+        while pending:
+            scope, around, node, port = pending.pop()
+            if (key := (*(id(each) for _, each in around), id(node), port)) in seen:
+                continue
+            seen.add(key)
+            for source, out, target, into in scope.links:
+                if target is not node or into != port:
+                    continue
+                prefix = "".join(each.name + "_" for _, each in around)
+                if source.custom:
+                    inner = next(each for each, kind in source.custom.ports if each.name == out and kind == "false")
+                    pending.append((source.custom, around + [(scope, source)], inner, ""))
+                elif source.definition:
+                    found.add(decode(prefix + encode(source.name) + "|" + encode(out)))
+                elif any(source is reader for reader, _ in scope.readers):
+                    found.add(("", source.name))
+                elif any(source is each and kind == "loop" for each, kind in scope.ports):
+                    pending.append((scope, around, source, ""))
+                else:
+                    outer, instance = around[-1]
+                    pending.append((outer, around[:-1], instance, source.name))
+        return found
