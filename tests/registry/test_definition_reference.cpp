@@ -36,33 +36,10 @@ QList<QStringList> tableUnder(const QString& heading) {
   return rows;
 }
 
-const char* kindName(KeywordKind kind) {
-  switch (kind) {
-    case KeywordKind::Text:
-      return "text";
-    case KeywordKind::Number:
-      return "number";
-    case KeywordKind::Flag:
-      return "flag";
-    case KeywordKind::List:
-      return "list";
-    case KeywordKind::EncodedList:
-      return "encoded list";
-    case KeywordKind::InputList:
-      return "input list";
-    case KeywordKind::Modes:
-      return "modes";
-    case KeywordKind::ParallelList:
-      return "line list";
-    case KeywordKind::Lookup:
-      return "lookup";
-    case KeywordKind::TagDescription:
-      return "tag and text";
-    case KeywordKind::NamePair:
-      return "name pair";
-  }
-  return "";
-}
+// In the order of KeywordKind.
+const char* const kKindNames[] = {"text",         "number",       "flag",     "list",
+                                  "encoded list", "input list",   "modes",    "line list",
+                                  "lookup",       "tag and text", "name pair"};
 
 // Of each row the cells that are compared.
 QStringList documented(const QString& heading, int cells) {
@@ -80,7 +57,7 @@ QStringList keywordRows(unsigned place) {
   QStringList rows;
   for (const DefinitionKeyword& keyword : definitionKeywords()) {
     if (keyword.places & place) {
-      rows.append(QString(keyword.word) + " | " + kindName(keyword.kind));
+      rows.append(QString(keyword.word) + " | " + kKindNames[int(keyword.kind)]);
     }
   }
   return rows;

@@ -22,26 +22,16 @@ TEST(RegistryAnswers, SerialisedTextsOfStrangers) {
                                          "PARAMETER_NAME: Q\nPARAMETER_TYPE: ATTR\n"));
   TransformerMgr& registry = folders.load();
   // Pieces put together at random: whatever is restored can be written and read again.
-  const QString pieces[] = {"NAME,T,VERSION,2,",
-                            "PARAMETER_VALUES",
-                            "INPUT_ATTRS",
-                            "OUTPUT_FUNCTIONS",
-                            ",",
-                            "\"",
-                            "\"\"",
-                            "P",
-                            "Q",
-                            "INPUT",
-                            "\n",
-                            " ",
-                            "&",
-                            QString(QChar(0xdc00))};
+  const QStringList pieces =
+      QString("NAME,T,VERSION,2,|PARAMETER_VALUES|INPUT_ATTRS|OUTPUT_FUNCTIONS|,|\"|\"\"|P|Q|INPUT|\n| |&")
+          .split('|') +
+      QStringList{QChar(0xdc00)};
   std::mt19937 random(5);
   int restored = 0;
   for (int i = 0; i < 3000; ++i) {
     QString text = pieces[0];
     for (std::size_t count = random() % 40; count > 0; --count)
-      text += pieces[random() % std::size(pieces)];
+      text += pieces[static_cast<int>(random() % static_cast<unsigned>(pieces.size()))];
     const Copy copy(registry.deserialize(text));
     if (!copy)
       continue;

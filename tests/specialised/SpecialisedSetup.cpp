@@ -1,31 +1,12 @@
 #include "SpecialisedSetup.h"
 
 #include <platform/session/ORXSession.h>
+#include <tests/support/TextBuffer.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/specialised/TransformerCfgFactory.h>
-#include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
 
-#include <QBuffer>
 #include <gtest/gtest.h>
-
-namespace {
-
-class TextBuffer : public MFBuffer {
- public:
-  TextBuffer() {
-    m_device.open(QIODevice::WriteOnly);
-    setDevice(&m_device);
-  }
-  ~TextBuffer() override { setDevice(nullptr); }
-  void write(const QByteArray& bytes) override { m_device.write(bytes); }
-  QString text() const { return QString::fromUtf8(m_device.data()); }
-
- private:
-  QBuffer m_device;
-};
-
-}  // namespace
 
 std::unique_ptr<TransformerCfg> makeSpecialised(const char* name, int version,
                                                 const std::vector<SpecialisedParameter>& parameters) {
