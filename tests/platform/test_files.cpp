@@ -128,17 +128,15 @@ TEST_F(AtomicFiles, FollowsLinksToFilesThatStandAndThatDoNot) {
   ASSERT_TRUE(QFile::link(text("../link"), path("sub/chain")));
   ASSERT_TRUE(QFile::link(text("missing"), path("dangling")));
   ASSERT_TRUE(QFile::link(text("loop"), path("loop")));
-  struct {
-    const char* name;
-    const char* target;
-  } const cases[] = {{"link", "target"}, {"sub/chain", "target"}, {"dangling", "missing"}};
-  for (const auto& each : cases) {
-    AtomicFile file(path(each.name));
-    ASSERT_TRUE(file.open()) << each.name;
-    file.device().write(each.name);
-    ASSERT_TRUE(file.commit()) << each.name;
-    EXPECT_TRUE(QFileInfo(path(each.name)).isSymLink());
-    EXPECT_EQ(contentOf(path(each.target)), each.name);
+  const std::tuple<const char*, const char*> cases[] = {
+      {"link", "target"}, {"sub/chain", "target"}, {"dangling", "missing"}};
+  for (const auto& [name, target] : cases) {
+    AtomicFile file(path(name));
+    ASSERT_TRUE(file.open()) << name;
+    file.device().write(name);
+    ASSERT_TRUE(file.commit()) << name;
+    EXPECT_TRUE(QFileInfo(path(name)).isSymLink());
+    EXPECT_EQ(contentOf(path(target)), name);
   }
   AtomicFile loop(path("loop"));
   EXPECT_FALSE(loop.open());
@@ -146,20 +144,17 @@ TEST_F(AtomicFiles, FollowsLinksToFilesThatStandAndThatDoNot) {
 
 TEST_F(AtomicFiles, NamesFileAndReasonWhenThePlaceIsNoGood) {
   put(path("file"), "x");
-  struct {
-    QString name;
-    int reason;
-  } const cases[] = {{path("missing/out.txt"), ENOENT},
-                     {path("file/out.txt"), ENOTDIR},
-                     {m_folder.path(), EISDIR},
-                     {m_folder.path() + QLatin1Char('/'), EISDIR},
-                     {QString(), ENOENT},
-                     {path("nul") + QChar(0), EINVAL},
-                     {path("") + QString(300, QLatin1Char('n')), ENAMETOOLONG}};
-  for (const auto& each : cases) {
-    AtomicFile file(each.name);
-    EXPECT_FALSE(file.open()) << qPrintable(each.name);
-    EXPECT_EQ(file.errorString(), each.name + QLatin1String(": ") + qt_error_string(each.reason));
+  const std::tuple<QString, int> cases[] = {{path("missing/out.txt"), ENOENT},
+                                            {path("file/out.txt"), ENOTDIR},
+                                            {m_folder.path(), EISDIR},
+                                            {m_folder.path() + QLatin1Char('/'), EISDIR},
+                                            {QString(), ENOENT},
+                                            {path("nul") + QChar(0), EINVAL},
+                                            {path("") + QString(300, QLatin1Char('n')), ENAMETOOLONG}};
+  for (const auto& [name, reason] : cases) {
+    AtomicFile file(name);
+    EXPECT_FALSE(file.open()) << qPrintable(name);
+    EXPECT_EQ(file.errorString(), name + QLatin1String(": ") + qt_error_string(reason));
     EXPECT_FALSE(file.commit());
     EXPECT_EQ(file.device().write("x"), -1);
   }
@@ -284,15 +279,13 @@ TEST_F(LineReaders, GivesLinesWithTheirPlaces) {
   put(path("lines"), QByteArray("one\r\n\n\xc3\xa4 \0x\nlast", 16));
   LineReader reader(path("lines"));
   ASSERT_TRUE(reader.open());
-  struct {
-    QByteArray line;
-    qint64 offset;
-  } const expected[] = {{"one", 0}, {"", 5}, {QByteArray("\xc3\xa4 \0x", 5), 6}, {"last", 12}};
+  const std::tuple<QByteArray, qint64> expected[] = {
+      {"one", 0}, {"", 5}, {QByteArray("\xc3\xa4 \0x", 5), 6}, {"last", 12}};
   qint64 number = 0;
-  for (const auto& each : expected) {
+  for (const auto& [line, offset] : expected) {
     ASSERT_TRUE(reader.next());
-    EXPECT_EQ(reader.line(), each.line);
-    EXPECT_EQ(reader.offset(), each.offset);
+    EXPECT_EQ(reader.line(), line);
+    EXPECT_EQ(reader.offset(), offset);
     EXPECT_EQ(reader.number(), ++number);
   }
   EXPECT_FALSE(reader.next());
@@ -300,17 +293,15 @@ TEST_F(LineReaders, GivesLinesWithTheirPlaces) {
 }
 
 TEST_F(LineReaders, BoundsTheLine) {
-  struct {
-    QByteArray content;
-    bool taken;
-  } const cases[] = {{"12345678\n", true},   {"12345678\r\n", true}, {"12345678", true},
-                     {"123456789\n", false}, {"123456789", false},   {"1234567890123\n", false}};
-  for (const auto& each : cases) {
-    put(path("long"), each.content);
+  const std::tuple<QByteArray, bool> cases[] = {{"12345678\n", true}, {"12345678\r\n", true},
+                                                {"12345678", true},   {"123456789\n", false},
+                                                {"123456789", false}, {"1234567890123\n", false}};
+  for (const auto& [content, taken] : cases) {
+    put(path("long"), content);
     LineReader reader(path("long"), 8);
     ASSERT_TRUE(reader.open());
-    EXPECT_EQ(reader.next(), each.taken) << each.content.constData();
-    EXPECT_EQ(reader.failed(), !each.taken);
+    EXPECT_EQ(reader.next(), taken) << content.constData();
+    EXPECT_EQ(reader.failed(), !taken);
     EXPECT_FALSE(reader.next());
   }
 }

