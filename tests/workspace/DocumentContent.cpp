@@ -8,23 +8,31 @@
 
 namespace {
 
-template <class List>
-auto toVector(const List& list) {
-  return std::vector<typename List::value_type>(list.begin(), list.end());
+// Of each list its table, its place here, in the reader and in the writer.
+template <class Visit>
+void eachList(const Visit& visit) {
+  using C = DocumentContent;
+  using R = IXMLComponentReader;
+  using W = XMLComponentWriter;
+  visit(tables::Dataset(), &C::datasets, &R::GetDatasetList, &W::addDataset);
+  visit(tables::DataType(), &C::dataTypes, &R::GetDataTypeList, &W::addDataType);
+  visit(tables::GeomType(), &C::geomTypes, &R::GetGeomTypeList, &W::addGeomType);
+  visit(tables::FeatureType(), &C::featureTypes, &R::GetFeatureTypeList, &W::addFeatureType);
 }
 
-DocumentSections sectionsOf(const IXMLComponentReader& reader, const QString& name) {
-  DocumentSections sections;
-  sections.parameters = reader.GetSubDocParms(name);
-  sections.globalParameters = toVector(reader.GetGlobalParameterList(name));
-  sections.comments = toVector(reader.GetCommentList(name));
-  sections.bookmarks = toVector(reader.GetBookmarkList(name));
-  sections.transformers = toVector(reader.GetTransformerList(name));
-  sections.ports = toVector(reader.GetSubDocumentIOList(name));
-  sections.featureLinks = toVector(reader.GetFeatureTypeLinkList(name));
-  sections.breakpoints = toVector(reader.GetBreakpointList(name));
-  sections.attributeLinks = toVector(reader.GetAttributeLinkList(name));
-  return sections;
+template <class Visit>
+void eachSection(const Visit& visit) {
+  using S = DocumentSections;
+  using R = IXMLComponentReader;
+  using W = XMLComponentWriter;
+  visit(tables::GlobalParameter(), &S::globalParameters, &R::GetGlobalParameterList, &W::addGlobalParameter);
+  visit(tables::Comment(), &S::comments, &R::GetCommentList, &W::addComment);
+  visit(tables::Bookmark(), &S::bookmarks, &R::GetBookmarkList, &W::addBookmark);
+  visit(tables::Transformer(), &S::transformers, &R::GetTransformerList, &W::addTransformer);
+  visit(tables::SubDocumentIO(), &S::ports, &R::GetSubDocumentIOList, &W::addSubDocumentIO);
+  visit(tables::FeatLink(), &S::featureLinks, &R::GetFeatureTypeLinkList, &W::addFeatureTypeLink);
+  visit(tables::Breakpoint(), &S::breakpoints, &R::GetBreakpointList, &W::addBreakpoint);
+  visit(tables::AttrLink(), &S::attributeLinks, &R::GetAttributeLinkList, &W::addAttributeLink);
 }
 
 DocumentSections randomSections(RandomRecords& random, const QString& name, int records) {
@@ -33,17 +41,10 @@ DocumentSections randomSections(RandomRecords& random, const QString& name, int 
     sections.parameters.insert(random.name(), random.text());
   if (!name.isEmpty())
     sections.parameters.insert(QStringLiteral("NAME"), name);
-  for (int i = 0; i < records; ++i) {
-    sections.globalParameters.push_back(random.record<tables::GlobalParameter>());
-    sections.comments.push_back(random.record<tables::Comment>());
-    sections.bookmarks.push_back(random.record<tables::Bookmark>());
-    sections.transformers.push_back(random.record<tables::Transformer>());
-    if (random.flag())
-      sections.ports.push_back(random.record<tables::SubDocumentIO>());
-    sections.featureLinks.push_back(random.record<tables::FeatLink>());
-    sections.breakpoints.push_back(random.record<tables::Breakpoint>());
-    sections.attributeLinks.push_back(random.record<tables::AttrLink>());
-  }
+  eachSection([&](auto table, auto list, auto, auto) {
+    for (int i = 0; i < records; ++i)
+      (sections.*list).push_back(random.record<decltype(table)>());
+  });
   return sections;
 }
 
@@ -54,12 +55,10 @@ DocumentContent randomContent(unsigned seed, int records) {
   DocumentContent content;
   const DocumentType types[] = {kWorkspaceDocument, kDataSourceDocument, kToolDocument, kTransformerDocument};
   content.type = types[random.below(4)];
-  for (int i = 0; i < records; ++i) {
-    content.datasets.push_back(random.record<tables::Dataset>());
-    content.dataTypes.push_back(random.record<tables::DataType>());
-    content.geomTypes.push_back(random.record<tables::GeomType>());
-    content.featureTypes.push_back(random.record<tables::FeatureType>());
-  }
+  eachList([&](auto table, auto list, auto, auto) {
+    for (int i = 0; i < records; ++i)
+      (content.*list).push_back(random.record<decltype(table)>());
+  });
   content.server = random.record<tables::ServerParameter>();
   content.documents[QString()] = randomSections(random, QString(), records);
   for (int i = 0; i < records; ++i) {
@@ -71,70 +70,51 @@ DocumentContent randomContent(unsigned seed, int records) {
 }
 
 void queueContent(const DocumentContent& content, XMLComponentWriter& writer) {
-  for (const auto& record : content.datasets)
-    writer.addDataset(record);
-  for (const auto& record : content.dataTypes)
-    writer.addDataType(record);
-  for (const auto& record : content.geomTypes)
-    writer.addGeomType(record);
-  for (const auto& record : content.featureTypes)
-    writer.addFeatureType(record);
+  eachList([&](auto, auto list, auto, auto add) {
+    for (const auto& record : content.*list)
+      (writer.*add)(record);
+  });
   writer.setServerParameters(content.server);
   for (const QString& name : QStringList(QString()) + content.subDocuments) {
     const DocumentSections& sections = content.documents.at(name);
     writer.setMiscParms(name, sections.parameters);
-    for (const auto& record : sections.globalParameters)
-      writer.addGlobalParameter(name, record);
-    for (const auto& record : sections.comments)
-      writer.addComment(name, record);
-    for (const auto& record : sections.bookmarks)
-      writer.addBookmark(name, record);
-    for (const auto& record : sections.transformers)
-      writer.addTransformer(name, record);
-    for (const auto& record : sections.ports)
-      writer.addSubDocumentIO(name, record);
-    for (const auto& record : sections.featureLinks)
-      writer.addFeatureTypeLink(name, record);
-    for (const auto& record : sections.breakpoints)
-      writer.addBreakpoint(name, record);
-    for (const auto& record : sections.attributeLinks)
-      writer.addAttributeLink(name, record);
+    eachSection([&](auto, auto list, auto, auto add) {
+      for (const auto& record : sections.*list)
+        (writer.*add)(name, record);
+    });
   }
 }
 
 DocumentContent contentOf(const IXMLComponentReader& reader) {
   DocumentContent content;
   content.type = reader.GetDocumentType();
-  content.datasets = toVector(reader.GetDatasetList());
-  content.dataTypes = toVector(reader.GetDataTypeList());
-  content.geomTypes = toVector(reader.GetGeomTypeList());
-  content.featureTypes = toVector(reader.GetFeatureTypeList());
   content.server = reader.GetServerParameters();
   content.subDocuments = reader.GetSubDocList();
-  for (const QString& name : QStringList(QString()) + content.subDocuments)
-    content.documents[name] = sectionsOf(reader, name);
+  eachList([&](auto, auto list, auto get, auto) {
+    for (const auto& record : (reader.*get)())
+      (content.*list).push_back(record);
+  });
+  for (const QString& name : QStringList(QString()) + content.subDocuments) {
+    DocumentSections& sections = content.documents[name];
+    sections.parameters = reader.GetSubDocParms(name);
+    eachSection([&](auto, auto list, auto get, auto) {
+      for (const auto& record : (reader.*get)(name))
+        (sections.*list).push_back(record);
+    });
+  }
   return content;
 }
 
 void expectSame(const DocumentContent& left, const DocumentContent& right) {
   EXPECT_EQ(left.type, right.type);
-  EXPECT_TRUE(left.datasets == right.datasets);
-  EXPECT_TRUE(left.dataTypes == right.dataTypes);
-  EXPECT_TRUE(left.geomTypes == right.geomTypes);
-  EXPECT_TRUE(left.featureTypes == right.featureTypes);
   EXPECT_TRUE(left.server == right.server);
   EXPECT_EQ(left.subDocuments, right.subDocuments);
+  eachList([&](auto, auto list, auto, auto) { EXPECT_TRUE(left.*list == right.*list); });
   for (const auto& [name, sections] : left.documents) {
+    const DocumentSections& one = sections;
     const DocumentSections& other = right.documents.at(name);
-    EXPECT_EQ(sections.parameters, other.parameters);
-    EXPECT_TRUE(sections.globalParameters == other.globalParameters);
-    EXPECT_TRUE(sections.comments == other.comments);
-    EXPECT_TRUE(sections.bookmarks == other.bookmarks);
-    EXPECT_TRUE(sections.transformers == other.transformers);
-    EXPECT_TRUE(sections.ports == other.ports);
-    EXPECT_TRUE(sections.featureLinks == other.featureLinks);
-    EXPECT_TRUE(sections.breakpoints == other.breakpoints);
-    EXPECT_TRUE(sections.attributeLinks == other.attributeLinks);
+    EXPECT_EQ(one.parameters, other.parameters);
+    eachSection([&](auto, auto list, auto, auto) { EXPECT_TRUE(one.*list == other.*list); });
   }
 }
 

@@ -3,18 +3,10 @@
 #include <cmath>
 
 double RandomRecords::real() {
-  switch (below(5)) {
-    case 0:
-      return below(2000) - 1000;
-    case 1:
-      return std::uniform_real_distribution<double>(-1e6, 1e6)(m_engine);
-    case 2:
-      return std::ldexp(std::uniform_real_distribution<double>(-1, 1)(m_engine), below(2000) - 1000);
-    case 3:
-      return 0.1 * below(100);
-    default:
-      return 0;
-  }
+  const double choices[] = {
+      0, below(2000) - 1000.0, 0.1 * below(100), std::uniform_real_distribution<double>(-1e6, 1e6)(m_engine),
+      std::ldexp(std::uniform_real_distribution<double>(-1, 1)(m_engine), below(2000) - 1000)};
+  return choices[below(5)];
 }
 
 QString RandomRecords::text() {
@@ -23,28 +15,11 @@ QString RandomRecords::text() {
   const int length = below(12) == 0 ? 0 : below(200) == 0 ? 20000 : below(20);
   QString text(QLatin1String(""));
   while (text.size() < length) {
-    switch (below(6)) {
-      case 0:
-        text += special[below(special.size())];
-        break;
-      case 1:
-        text += QChar(0xa0 + below(0x60));
-        break;
-      case 2:
-        text += QChar(0x100 + below(0xd800 - 0x100));
-        break;
-      case 3:
-        text += QChar(0xe000 + below(0xfffe - 0xe000));
-        break;
-      case 4: {
-        const uint code = 0x10000u + static_cast<uint>(below(0x100000));
-        text += QChar(QChar::highSurrogate(code));
-        text += QChar(QChar::lowSurrogate(code));
-        break;
-      }
-      default:
-        text += QChar(' ' + below(95));
-    }
+    const uint beyond = 0x10000u + static_cast<uint>(below(0x100000));
+    const QString choices[] = {special.at(below(special.size())),    QChar(0xa0 + below(0x60)),
+                               QChar(0x100 + below(0xd800 - 0x100)), QChar(0xe000 + below(0xfffe - 0xe000)),
+                               QString::fromUcs4(&beyond, 1),        QChar(' ' + below(95))};
+    text += choices[below(6)];
   }
   return text;
 }

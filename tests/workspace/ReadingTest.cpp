@@ -147,17 +147,6 @@ TEST(Reading, SubDocumentsConstantsAndRootAttributes) {
   EXPECT_EQ(ports[1].key, 9);
 }
 
-TEST(Reading, RootElementsGiveTheDocumentType) {
-  const std::pair<const char*, DocumentType> cases[] = {{"<WORKSPACE/>", kWorkspaceDocument},
-                                                        {"<DATASOURCE/>", kDataSourceDocument},
-                                                        {"<ETL_TOOL/>", kToolDocument},
-                                                        {"<TRANSFORMER/>", kTransformerDocument},
-                                                        {"<Workspace/>", kUnknownDocument}};
-  for (const auto& [bytes, type] : cases)
-    EXPECT_EQ(readBytes(bytes)->GetDocumentType(), type) << bytes;
-  EXPECT_EQ(XMLComponentReader().GetDocumentType(), kUnknownDocument);
-}
-
 TEST(Reading, WorkspaceFilesAreRecognisedByTheirFirstBytes) {
   const std::pair<QByteArray, bool> cases[] = {{"#! <WORKSPACE\n", true},
                                                {"# ORW custom transformers\n", true},

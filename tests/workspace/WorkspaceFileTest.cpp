@@ -1,5 +1,4 @@
 #include "DocumentContent.h"
-#include <platform/qorxcore/Language.h>
 #include <transform/workspace/DocumentCopy.h>
 #include <transform/workspace/RawLines.h>
 #include <transform/workspace/VersionStore.h>
@@ -251,7 +250,6 @@ TEST(RawLines, StrayLinesAndMarksOfMerges) {
 }
 
 TEST(LossReport, NamesEachLossWithItsLine) {
-  QORXSetLanguage("en");
   const ScratchFile file(
       "#! <OTHER A='kept'>\n"
       "#! <CONSTANTS><CONSTANT CONST_VALUE='1'/>\n"
@@ -297,16 +295,4 @@ TEST(LossReport, NamesEachLossWithItsLine) {
             "14 the element DATASETS is not known here\n"
             "15 there is an earlier sub-document of the name s\n"
             "15 the element T is not known here");
-  const struct {
-    const char* language;
-    const char* first;
-  } translations[] = {
-      {"de", "aus dem Wurzelelement OTHER würde WORKSPACE"},
-      {"fr", "l’élément racine OTHER deviendrait WORKSPACE"},
-  };
-  for (const auto& translation : translations) {
-    QORXSetLanguage(translation.language);
-    EXPECT_EQ(report.losses().front().describe().toStdString(), translation.first);
-  }
-  QORXSetLanguage("en");
 }
