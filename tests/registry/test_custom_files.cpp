@@ -87,11 +87,8 @@ TEST(CustomTransformerFiles, AreTransformersLikeOthers) {
 }
 
 TEST(CustomTransformerFiles, VersionsAreFoundOnDemand) {
-  const struct {
-    std::vector<std::pair<int, int>> versions;  // the first of the file is the last given
-    int asked;
-    int found;
-  } cases[] = {
+  // `versions`: the first of the file is the last given
+  const std::tuple<std::vector<std::pair<int, int>>, int, int> cases[] = {
       {{{1, 1}, {3, 1}}, ITransformerMgr::NEWEST_VERSION, 3},
       {{{1, 1}, {3, 1}}, 1, 1},
       {{{1, 1}, {3, 1}}, 2, -1},
@@ -101,19 +98,16 @@ TEST(CustomTransformerFiles, VersionsAreFoundOnDemand) {
       {{{1, 18286}, {3, 18287}}, ITransformerMgr::NEWEST_VERSION, 1},
       {{{1, 18286}, {3, 18287}}, 3, -1},
   };
-  for (const auto& test : cases) {
+  for (const auto& [versions, asked, found] : cases) {
     RegistryFolders folders;
-    customFile(folders, "Cleaner.ort", test.versions);
+    customFile(folders, "Cleaner.ort", versions);
     EXPECT_EQ(folders.load().transformerVersions("Cleaner"), (QList<int>{1, 3}));
-    EXPECT_EQ(versionOf(TransformerMgr::getTransformerMgr(), test.asked), test.found) << test.asked;
+    EXPECT_EQ(versionOf(TransformerMgr::getTransformerMgr(), asked), found) << asked;
   }
 }
 
 TEST(CustomTransformerFiles, TheBuildIsFoundInEveryFormOfXml) {
-  const struct {
-    const char* attribute;
-    bool isTooNew;
-  } cases[] = {
+  const std::tuple<const char*, bool> cases[] = {
       {"LAST_SAVE_BUILD='99999'", true},
       {"LAST_SAVE_BUILD = \"99999\"", true},
       {"LAST_SAVE_BUILD\n=\n\n' 99999 '", true},
@@ -124,16 +118,15 @@ TEST(CustomTransformerFiles, TheBuildIsFoundInEveryFormOfXml) {
       {"LAST_SAVE_BUILD='1'><!-- <A LAST_SAVE_BUILD='99999'/> --", false},
       {"LAST_SAVE_BUILD='&&&&'", false},
   };
-  for (const auto& test : cases) {
+  for (const auto& [attribute, isTooNew] : cases) {
     RegistryFolders folders;
     QByteArray text = document("OUT", 1);
-    text.replace("LAST_SAVE_BUILD=\"1\"", test.attribute);
+    text.replace("LAST_SAVE_BUILD=\"1\"", attribute);
     QString error;
     const QString path = folders.path("home/transformers/Cleaner.ort");
     folders.define("Other.ort", definitionText("Other", 1));
     ASSERT_TRUE(VersionStore(path).insert({"Cleaner", "1", "Mine"}, {"note <a \"b"}, text, error));
-    EXPECT_EQ(versionOf(folders.load(), ITransformerMgr::NEWEST_VERSION), test.isTooNew ? -1 : 1)
-        << test.attribute;
+    EXPECT_EQ(versionOf(folders.load(), ITransformerMgr::NEWEST_VERSION), isTooNew ? -1 : 1) << attribute;
   }
 }
 
@@ -157,13 +150,9 @@ TEST(CustomTransformerFiles, RefusedOnesAreListed) {
   EXPECT_EQ(refused.path, newer);
   EXPECT_EQ(refused.version, 9);
   EXPECT_FALSE(refused.isDuplicate);
-  const struct {
-    int version;
-    bool ignored;
-  } cases[] = {{2, true}, {9, true}, {3, false}, {-1, true}, {-2, true}};
-  for (const auto& test : cases)
-    EXPECT_EQ(registry.isTransformerIgnored(ORXString("Cleaner"), test.version), test.ignored)
-        << test.version;
+  const std::tuple<int, bool> cases[] = {{2, true}, {9, true}, {3, false}, {-1, true}, {-2, true}};
+  for (const auto& [version, ignored] : cases)
+    EXPECT_EQ(registry.isTransformerIgnored(ORXString("Cleaner"), version), ignored) << version;
 }
 
 TEST(CustomTransformerFiles, OneOfANewerBuildSaysSo) {
@@ -171,17 +160,13 @@ TEST(CustomTransformerFiles, OneOfANewerBuildSaysSo) {
   const QString path = customFile(folders, "C.ort", {{9, 99999}});
   const QString other = customFile(folders, "D.ort", {{7, 99999}});
   TransformerMgr& registry = folders.load();
-  const struct {
-    const char* name;
-    int version;
-    QString refusedFile;
-  } cases[] = {{"Cleaner", 9, path}, {"Cleaner", -1, path}, {"Cleaner", 7, other},
-               {"Cleaner", 3, {}},   {"Nothing", 9, {}},    {"Other", 1, {}}};
-  for (const auto& test : cases) {
-    const Copy copy(registry.getTransformer(test.name, test.version));
+  const std::tuple<const char*, int, QString> cases[] = {{"Cleaner", 9, path},  {"Cleaner", -1, path},
+                                                         {"Cleaner", 7, other}, {"Cleaner", 3, {}},
+                                                         {"Nothing", 9, {}},    {"Other", 1, {}}};
+  for (const auto& [name, version, refusedFile] : cases) {
+    const Copy copy(registry.getTransformer(name, version));
     const QString reason = registry.refusalReason();
-    EXPECT_TRUE(test.refusedFile.isEmpty() ? reason.isEmpty() : reason.contains(test.refusedFile))
-        << test.name << test.version;
+    EXPECT_TRUE(refusedFile.isEmpty() ? reason.isEmpty() : reason.contains(refusedFile)) << name << version;
   }
 }
 

@@ -85,11 +85,8 @@ TEST(Loading, BadFilesCostNothingElse) {
   QByteArray manyLines = lost;
   for (const QByteArray line = "VERSION: 1\n"; manyLines.size() < 3000000;)
     manyLines += line;
-  const struct {
-    const char* name;
-    QByteArray content;
-    QStringList told;  // what the error says beside the path; none: nothing is lost
-  } cases[] = {
+  // `told`: what the error says beside the path; none: nothing is lost
+  const std::tuple<const char*, QByteArray, QStringList> cases[] = {
       {"bad.ort", binary, {"belong to no definition"}},
       {"bad.ort", lost + "TEMPLATE_START\nnever ends\n", {"'Lost'", "TEMPLATE_END"}},
       {"bad.ort", lost + "TOOLTIP_START\n" + definitionText("Swallowed", 1), {"'Lost'"}},
@@ -104,18 +101,18 @@ TEST(Loading, BadFilesCostNothingElse) {
       {"bad.txt", definitionText("Text", 1), {}},
       {"bad-localized.xx", definitionText("Companion", 1), {}},
   };
-  for (const auto& c : cases) {
-    SCOPED_TRACE(std::string(c.name) + " " + c.content.left(40).toStdString());
+  for (const auto& [name, content, told] : cases) {
+    SCOPED_TRACE(std::string(name) + " " + content.left(40).toStdString());
     RegistryFolders folders;
     folders.define("a.ort", definitionText("A", 1));
-    const QString path = folders.define(QString::fromLatin1(c.name), c.content);
+    const QString path = folders.define(QString::fromLatin1(name), content);
     folders.define("z.ort", definitionText("Z", 1));
     TransformerMgr& registry = folders.load();
     EXPECT_TRUE(registry.isLoaded());
     EXPECT_EQ(registry.transformerNames(), (QStringList{"A", "Z"}));
     EXPECT_TRUE(Copy(registry.getTransformer("Z", 1)));
-    ASSERT_EQ(registry.errors().size(), c.told.isEmpty() ? 0 : 1) << registry.lastError().toStdString();
-    for (const QString& text : c.told)
+    ASSERT_EQ(registry.errors().size(), told.isEmpty() ? 0 : 1) << registry.lastError().toStdString();
+    for (const QString& text : told)
       EXPECT_TRUE(registry.lastError().contains(text) && registry.lastError().contains(path))
           << registry.lastError().toStdString();
   }

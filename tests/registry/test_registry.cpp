@@ -65,21 +65,18 @@ TEST(Registry, Versions) {
   folders.define("a.ort", definitionText("T", 5) + definitionText("T", 2) +
                               definitionText("Far", 2000000000) + definitionText("Odd", -7));
   TransformerMgr& registry = folders.load();
-  struct Case {
-    const char* name;
-    int asked;
-    int got;  // -1: none
-  };
-  const Case cases[] = {{"T", -1, 5},           {"T", -2, 2},  {"T", 5, 5},
-                        {"T", 3, -1},           {"T", -3, -1}, {"t", -1, -1},
-                        {"", -1, -1},           {"U", -2, -1}, {"Far", -2, 2000000000},
-                        {"Far", -1, 2000000000}};
-  for (const Case& c : cases) {
-    SCOPED_TRACE(std::string(c.name) + " " + std::to_string(c.asked));
-    const Copy copy(registry.getTransformer(QString::fromLatin1(c.name), c.asked));
-    EXPECT_EQ(copy ? copy->getVersion() : -1, c.got);
-    EXPECT_EQ(registry.transformerExists(QString::fromLatin1(c.name), c.asked), c.got != -1);
-    EXPECT_EQ(copy ? copy->getIdentifier() : QString::fromLatin1(c.name), c.name);
+  // `got`: -1: none
+  const std::tuple<const char*, int, int> cases[] = {
+      {"T", -1, 5},           {"T", -2, 2},  {"T", 5, 5},
+      {"T", 3, -1},           {"T", -3, -1}, {"t", -1, -1},
+      {"", -1, -1},           {"U", -2, -1}, {"Far", -2, 2000000000},
+      {"Far", -1, 2000000000}};
+  for (const auto& [name, asked, got] : cases) {
+    SCOPED_TRACE(std::string(name) + " " + std::to_string(asked));
+    const Copy copy(registry.getTransformer(QString::fromLatin1(name), asked));
+    EXPECT_EQ(copy ? copy->getVersion() : -1, got);
+    EXPECT_EQ(registry.transformerExists(QString::fromLatin1(name), asked), got != -1);
+    EXPECT_EQ(copy ? copy->getIdentifier() : QString::fromLatin1(name), name);
   }
   EXPECT_EQ(registry.currentTransformerVersion("T"), 5);
   EXPECT_EQ(registry.currentTransformerVersion("U"), -1);
@@ -118,23 +115,19 @@ TEST(Registry, Aliases) {
   folders.define("b.ort",
                  definitionText("Middle", 9, "ALIASES: Far") + definitionText("Circle", 3, "ALIASES: Loop"));
   TransformerMgr& registry = folders.load();
-  struct Case {
-    const char* asked;
-    int version;
-    const char* name;  // null: none
-  };
-  const Case cases[] = {{"Old", -1, "A"},       {"Old", 1, "A"},      {"Old", 7, nullptr},
-                        {"Shared", -2, "A"},    {"Far", 9, "Middle"}, {"Far", 1, "B"},
-                        {"Far", 8, nullptr},    {"Hidden", 1, "H"},   {"Circle", 4, "Loop"},
-                        {"Circle", 5, nullptr}, {"Loop", 3, "Circle"}};
-  for (const Case& c : cases) {
-    SCOPED_TRACE(std::string(c.asked) + " " + std::to_string(c.version));
-    const Copy copy(registry.getTransformer(QString::fromLatin1(c.asked), c.version));
-    EXPECT_EQ(copy != nullptr, c.name != nullptr);
-    EXPECT_EQ(registry.transformerExists(QString::fromLatin1(c.asked), c.version), c.name != nullptr);
-    if (copy && c.name) {
-      EXPECT_EQ(copy->getName(), c.name);
-      EXPECT_EQ(copy->getRequestedAlias(), c.asked);
+  // `name`: null: none
+  const std::tuple<const char*, int, const char*> cases[] = {
+      {"Old", -1, "A"},      {"Old", 1, "A"},        {"Old", 7, nullptr},  {"Shared", -2, "A"},
+      {"Far", 9, "Middle"},  {"Far", 1, "B"},        {"Far", 8, nullptr},  {"Hidden", 1, "H"},
+      {"Circle", 4, "Loop"}, {"Circle", 5, nullptr}, {"Loop", 3, "Circle"}};
+  for (const auto& [asked, version, name] : cases) {
+    SCOPED_TRACE(std::string(asked) + " " + std::to_string(version));
+    const Copy copy(registry.getTransformer(QString::fromLatin1(asked), version));
+    EXPECT_EQ(copy != nullptr, name != nullptr);
+    EXPECT_EQ(registry.transformerExists(QString::fromLatin1(asked), version), name != nullptr);
+    if (copy && name) {
+      EXPECT_EQ(copy->getName(), name);
+      EXPECT_EQ(copy->getRequestedAlias(), asked);
     }
   }
   EXPECT_EQ(Copy(registry.getTransformer("A", 1))->getRequestedAlias(), "");
@@ -150,11 +143,7 @@ TEST(Registry, Aliases) {
 }
 
 TEST(Registry, ExceptionList) {
-  struct Case {
-    const char* text;
-    std::set<std::string> refused;
-  };
-  const Case cases[] = {
+  const std::tuple<const char*, std::set<std::string>> cases[] = {
       {"XFORMER_NAME|PLATFORM|SHOULD_CREATE_TRANSFORMER\nA|ALL|NO\nB|WIN64|NO\nC|WINDOWS|no\nD|MAC|NO\n",
        {"A", "B", "C"}},
       {"SHOULD_CREATE_TRANSFORMER|X|PLATFORM|XFORMER_NAME\r\nYES||ALL|A\r\nNO||ALL|B\r\nNO||ALL\r\n|z|ALL|B",
@@ -163,18 +152,18 @@ TEST(Registry, ExceptionList) {
       {"XFORMER_NAME|PLATFORM|SHOULD_CREATE_TRANSFORMER\nA|ALL|NO\nA|ALL|YES\nB|ALL|\n", {}},
       {"", {}},
   };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.text);
+  for (const auto& [text, refused] : cases) {
+    SCOPED_TRACE(text);
     RegistryFolders folders;
     for (const char* name : {"A", "B", "C", "D"}) {
       folders.define(QString::fromLatin1(name) + QLatin1String(".ort"), definitionText(name, 1));
     }
-    folders.write("home/pluginsinfo/transformer/exceptions.db", c.text);
+    folders.write("home/pluginsinfo/transformer/exceptions.db", text);
     TransformerMgr& registry = folders.load();
     for (const char* name : {"A", "B", "C", "D"}) {
       const Copy copy(registry.getTransformer(QString::fromLatin1(name), 1));
       ASSERT_TRUE(copy);
-      EXPECT_EQ(copy->platformSupported(), c.refused.count(name) == 0) << name;
+      EXPECT_EQ(copy->platformSupported(), refused.count(name) == 0) << name;
     }
     // The list is read for a session alone.
     registry.loadTransformers(nullptr);

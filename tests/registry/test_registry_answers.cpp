@@ -63,11 +63,8 @@ TEST(RegistryAnswers, ValidationAsksForConnectionsAndMembers) {
   folders.write("home/connections.list", "# shipped\nParcel Store\nwell<space>known\n");
   folders.write("user/orx/connections.list", QString::fromUtf8(" Straßen \n").toUtf8());
   const Copy copy(folders.load().getTransformer("T", 1));
-  const struct {
-    const char* parameter;
-    const char* value;
-    const char* refused;  // what the message names; null: accepted
-  } cases[] = {
+  // `refused`: what the message names; null: accepted
+  const std::tuple<const char*, const char*, const char*> cases[] = {
       {"STORE", "orx://?connection=Parcel%20Store", nullptr},
       {"STORE", "orx://x?a=b&connection=well%20known", nullptr},
       {"STORE", "orx:<solidus><solidus>?connection=Stra%C3%9Fen", nullptr},
@@ -78,12 +75,11 @@ TEST(RegistryAnswers, ValidationAsksForConnectionsAndMembers) {
       {"PACK", "N;;T;x", "Count"},
       {"PACK", "M;;N;1", nullptr},
   };
-  for (const auto& test : cases) {
-    copy->setParameterValue(test.parameter, QString::fromUtf8(test.value), false);
+  for (const auto& [parameter, value, refused] : cases) {
+    copy->setParameterValue(parameter, QString::fromUtf8(value), false);
     QString message;
-    EXPECT_EQ(copy->validateParameter(test.parameter, message), test.refused == nullptr) << test.value;
-    EXPECT_TRUE(test.refused ? message.contains(test.refused) : message.isEmpty())
-        << test.value << message.toStdString();
+    EXPECT_EQ(copy->validateParameter(parameter, message), refused == nullptr) << value;
+    EXPECT_TRUE(refused ? message.contains(refused) : message.isEmpty()) << value << message.toStdString();
   }
 }
 

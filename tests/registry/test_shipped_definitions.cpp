@@ -237,64 +237,95 @@ TEST_P(ShippedInEnglish, OlderVersionsUpgrade) {
   EXPECT_GT(upgrades, 0);
 }
 
+// Asked about good and bad values alike, every shipped transformer stays as it was, and says the same again.
+TEST_P(ShippedInEnglish, StayAsTheyAreWhenValidated) {
+  const QStringList values =
+      QString("1||<Unused>|@Value(gone)|a b;\"c,{d|no/such.file|orx://x?connection=none|$(NOWHERE)$[")
+          .split('|');
+  int refusals = 0;
+  forEach([&](TransformerCfg& cfg) {
+    QStringList names = cfg.getParameters();
+    for (int round = -1; round < values.size(); ++round) {
+      for (const QString& parameter : round < 0 ? QStringList() : names)
+        cfg.setParameterValue(parameter, values.at(round), true);
+      names = cfg.getParameters();
+      const auto before = cfg.serialize();
+      QString first;
+      QHash<QString, QString> messages;
+      const bool isValid = cfg.validateParameters(first);
+      EXPECT_EQ(cfg.validateParameters(names, messages), isValid);
+      EXPECT_EQ(names, cfg.getParameters());
+      EXPECT_EQ(messages.isEmpty(), isValid);
+      EXPECT_TRUE(isValid || messages.values().contains(first)) << first.toStdString();
+      EXPECT_EQ(cfg.serialize(), before) << round;
+      refusals += messages.size();
+    }
+  });
+  EXPECT_GT(refusals, 100);
+}
+
+// Each class that the factory knows has definitions to serve.
+TEST_P(ShippedInEnglish, DefineWhatTheFactoryNames) {
+  for (const TransformerCfgRule& rule : transformerCfgRules()) {
+    for (const QLatin1String name : rule.names) {
+      const QList<int> versions = registry().transformerVersions(name);
+      EXPECT_TRUE(std::any_of(versions.begin(), versions.end(), [&](int v) { return rule.versions.hold(v); }))
+          << name.data() << " from version " << rule.versions.first;
+    }
+  }
+}
+
 // Every operation that asks something, and one instantiation, of every shipped definition.
 TEST_P(ShippedDefinitions, AnswerEveryQuestion) {
   TransformerMgr& manager = registry();
   EXPECT_EQ(manager.lastError(), "");
   ASSERT_GT(manager.transformerNames().size(), 20);
-  for (const QString& name : manager.transformerNames()) {
-    for (const int version : manager.transformerVersions(name)) {
-      SCOPED_TRACE(name.toStdString() + " version " + std::to_string(version));
-      const std::unique_ptr<TransformerCfg> cfg(manager.getTransformer(name, version));
-      ASSERT_TRUE(cfg);
-      EXPECT_EQ(cfg->getName(), name);
-      EXPECT_EQ(cfg->getVersion(), version);
-      EXPECT_EQ(cfg->transformerType(), TransformerCfg::kBuiltIn);
-      EXPECT_EQ(cfg->getIdentifier(), cfg->getLocalizedName());
-      EXPECT_FALSE(cfg->tags().isEmpty());
-      EXPECT_FALSE(cfg->getDescriptionLines().isEmpty());
-      EXPECT_FALSE(cfg->getChangeLog().isEmpty());
-      EXPECT_FALSE(manager.changeLog(cfg.get()).isEmpty());
-      const QStringList inputs = inputsOf(*cfg);
-      const QStringList outputs = outputsOf(*cfg);
-      EXPECT_EQ(inputs.isEmpty(), cfg->getIsSource());
-      EXPECT_FALSE(inputs.isEmpty() && outputs.isEmpty());
-      for (const QString& tag : inputs) {
-        EXPECT_FALSE(cfg->getTagDescription(tag).isEmpty()) << tag.toStdString();
-        cfg->addInputFeatureType(tag, QStringLiteral("in_") + tag);
-        cfg->setInputAttributes(tag, {QStringLiteral("id"), QStringLiteral("part{}.name")});
-      }
-      for (const QString& tag : outputs) {
-        EXPECT_FALSE(cfg->getTagDescription(tag).isEmpty()) << tag.toStdString();
-        cfg->setOutputFeatureType(tag, QStringLiteral("out_") + tag);
-        EXPECT_EQ(cfg->getOutputAttributes(tag).removeDuplicates(), 0);
-      }
-      for (const QString& parameter : cfg->getParameters()) {
-        EXPECT_TRUE(cfg->getParameterGUIType(parameter).isKnown()) << parameter.toStdString();
-        EXPECT_FALSE(cfg->getSupportedValueTypes(parameter).isEmpty() && cfg->canEditParm(parameter));
-        cfg->getParameterDisplayValue(parameter);
-        cfg->getAttributeNamesInValue(parameter);
-        cfg->getShowParameter(parameter);
-        cfg->getGuiLine(parameter);
-        cfg->getDefaultMacroLine(parameter);
-      }
-      QStringList tooltip;
-      cfg->getTooltipLines(tooltip, true);
-      EXPECT_FALSE(tooltip.isEmpty());
-      EXPECT_TRUE(cfg->findUnwritableValues().isEmpty());
-      TextBuffer buffer;
-      EXPECT_TRUE(cfg->instantiate(buffer, QString()));
-      buffer.flush();
-      const QString text = buffer.text();
-      EXPECT_FALSE(text.isEmpty());
-      for (const QString& tag : outputs) {
-        EXPECT_TRUE(text.contains(QStringLiteral("out_") + tag)) << tag.toStdString();
-      }
-      for (const QString& tag : inputs) {
-        EXPECT_TRUE(text.contains(QStringLiteral("in_") + tag)) << tag.toStdString();
-      }
+  forEach([&](TransformerCfg& cfg) {
+    EXPECT_EQ(cfg.transformerType(), TransformerCfg::kBuiltIn);
+    EXPECT_EQ(cfg.getIdentifier(), cfg.getLocalizedName());
+    EXPECT_FALSE(cfg.tags().isEmpty());
+    EXPECT_FALSE(cfg.getDescriptionLines().isEmpty());
+    EXPECT_FALSE(cfg.getChangeLog().isEmpty());
+    EXPECT_FALSE(manager.changeLog(&cfg).isEmpty());
+    const QStringList inputs = inputsOf(cfg);
+    const QStringList outputs = outputsOf(cfg);
+    EXPECT_EQ(inputs.isEmpty(), cfg.getIsSource());
+    EXPECT_FALSE(inputs.isEmpty() && outputs.isEmpty());
+    for (const QString& tag : inputs) {
+      EXPECT_FALSE(cfg.getTagDescription(tag).isEmpty()) << tag.toStdString();
+      cfg.addInputFeatureType(tag, QStringLiteral("in_") + tag);
+      cfg.setInputAttributes(tag, {QStringLiteral("id"), QStringLiteral("part{}.name")});
     }
-  }
+    for (const QString& tag : outputs) {
+      EXPECT_FALSE(cfg.getTagDescription(tag).isEmpty()) << tag.toStdString();
+      cfg.setOutputFeatureType(tag, QStringLiteral("out_") + tag);
+      EXPECT_EQ(cfg.getOutputAttributes(tag).removeDuplicates(), 0);
+    }
+    for (const QString& parameter : cfg.getParameters()) {
+      EXPECT_TRUE(cfg.getParameterGUIType(parameter).isKnown()) << parameter.toStdString();
+      EXPECT_FALSE(cfg.getSupportedValueTypes(parameter).isEmpty() && cfg.canEditParm(parameter));
+      cfg.getParameterDisplayValue(parameter);
+      cfg.getAttributeNamesInValue(parameter);
+      cfg.getShowParameter(parameter);
+      cfg.getGuiLine(parameter);
+      cfg.getDefaultMacroLine(parameter);
+    }
+    QStringList tooltip;
+    cfg.getTooltipLines(tooltip, true);
+    EXPECT_FALSE(tooltip.isEmpty());
+    EXPECT_TRUE(cfg.findUnwritableValues().isEmpty());
+    TextBuffer buffer;
+    EXPECT_TRUE(cfg.instantiate(buffer, QString()));
+    buffer.flush();
+    const QString text = buffer.text();
+    EXPECT_FALSE(text.isEmpty());
+    for (const QString& tag : outputs) {
+      EXPECT_TRUE(text.contains(QStringLiteral("out_") + tag)) << tag.toStdString();
+    }
+    for (const QString& tag : inputs) {
+      EXPECT_TRUE(text.contains(QStringLiteral("in_") + tag)) << tag.toStdString();
+    }
+  });
   ORXStringArray categories;
   manager.getCategories(categories);
   EXPECT_EQ(ORXToQStringList(categories), manager.getCategories());
@@ -316,59 +347,4 @@ TEST(ShippedResources, PassTheirChecks) {
     ADD_FAILURE() << finding.file.toStdString() << ":" << finding.line << ": " << finding.text.toStdString()
                   << " [" << orx::ruleRow(finding.rule).name.data() << "]";
   }
-}
-
-// Each class that the factory knows has definitions to serve.
-TEST(ShippedResources, DefineWhatTheFactoryNames) {
-  qputenv("ORX_HOME", kResources.toUtf8());
-  TransformerMgr& manager = TransformerMgr::getTransformerMgr();
-  ORXSession session;
-  manager.loadTransformers(&session);
-  for (const TransformerCfgRule& rule : transformerCfgRules()) {
-    for (const QLatin1String name : rule.names) {
-      const QList<int> versions = manager.transformerVersions(name);
-      EXPECT_TRUE(std::any_of(versions.begin(), versions.end(), [&](int v) { return rule.versions.hold(v); }))
-          << name.data() << " from version " << rule.versions.first;
-    }
-  }
-}
-
-// Asked about good and bad values alike, every shipped transformer stays as it was, and says the same again.
-TEST(ShippedResources, StayAsTheyAreWhenValidated) {
-  qputenv("ORX_HOME", kResources.toUtf8());
-  TransformerMgr& manager = TransformerMgr::getTransformerMgr();
-  ORXSession session;
-  manager.loadTransformers(&session);
-  const QStringList values = {QStringLiteral("1"),
-                              QString(),
-                              QStringLiteral("<Unused>"),
-                              QStringLiteral("@Value(gone)"),
-                              QStringLiteral("a b;\"c,{d"),
-                              QStringLiteral("no/such.file"),
-                              QStringLiteral("orx://x?connection=none"),
-                              QStringLiteral("$(NOWHERE)$[")};
-  int refusals = 0;
-  for (const QString& name : manager.transformerNames()) {
-    for (const int version : manager.transformerVersions(name)) {
-      SCOPED_TRACE(name.toStdString() + " version " + std::to_string(version));
-      const std::unique_ptr<TransformerCfg> cfg(manager.getTransformer(name, version));
-      QStringList names = cfg->getParameters();
-      for (int round = -1; round < values.size(); ++round) {
-        for (const QString& parameter : round < 0 ? QStringList() : names)
-          cfg->setParameterValue(parameter, values.at(round), true);
-        names = cfg->getParameters();
-        const auto before = cfg->serialize();
-        QString first;
-        QHash<QString, QString> messages;
-        const bool isValid = cfg->validateParameters(first);
-        EXPECT_EQ(cfg->validateParameters(names, messages), isValid);
-        EXPECT_EQ(names, cfg->getParameters());
-        EXPECT_EQ(messages.isEmpty(), isValid);
-        EXPECT_TRUE(isValid || messages.values().contains(first)) << first.toStdString();
-        EXPECT_EQ(cfg->serialize(), before) << round;
-        refusals += messages.size();
-      }
-    }
-  }
-  EXPECT_GT(refusals, 100);
 }
