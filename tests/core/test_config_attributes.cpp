@@ -35,45 +35,24 @@ std::unique_ptr<TransformerCfg> makePropagating(const PropagationCase& c) {
 }
 
 TEST(ConfigAttributes, Propagation) {
+  const char* const kAll = "a|l{}|l{}.x|b|l{}.y";
+  const char* const kAdded = "n 1|p|q|pre_p|pre_q";
+  const char* const toLists = "$(LIST){}.count OUT:$(LIST){}.$(MANY) $(EMPTY){}.count";
+  const std::vector<const char*> collect{"OUT DROP", "OUT COLLECT OTHER m{}", "OUT COLLECT OTHER $(EMPTY)"};
   const PropagationCase cases[] = {
       {"nothing said", "", "", {}, "", ""},
       {"none", "<NONE>", "", {}, "", ""},
-      {"all, each once, by the order of the inputs",
-       "<ALL>",
-       "",
-       {},
-       "a|l{}|l{}.x|b|l{}.y",
-       "a|l{}|l{}.x|b|l{}.y"},
-      {"one output", "OUT", "", {}, "a|l{}|l{}.x|b|l{}.y", ""},
-      {"an output from inputs", "OUT:OTHER REST:IN REST:OTHER", "", {}, "b|a|l{}.y", "a|l{}|l{}.x|b|l{}.y"},
+      {"all, each once, in order", "<ALL>", "", {}, kAll, kAll},
+      {"one output", "OUT", "", {}, kAll, ""},
+      {"an output from inputs", "OUT:OTHER REST:IN REST:OTHER", "", {}, "b|a|l{}.y", kAll},
       {"names", "=b =nobody", "", {}, "b", "b"},
       {"added everywhere and at one output", "", "c OUT:d NOWHERE:e c", {}, "c|d|NOWHERE:e", "c|NOWHERE:e"},
-      {"added by parameters",
-       "",
-       "$(NEW) $(MANY) $(EMPTY) $(NOBODY) pre_$(MANY)",
-       {},
-       "n 1|p|q|pre_p|pre_q",
-       "n 1|p|q|pre_p|pre_q"},
-      {"added to lists",
-       "",
-       "$(LIST){}.count OUT:$(LIST){}.$(MANY) $(EMPTY){}.count",
-       {},
-       "l{}.count|l{}.p|l{}.q",
-       "l{}.count"},
-      {"lists dropped", "<ALL>", "", {"OUT DROP"}, "a|b", "a|l{}|l{}.x|b|l{}.y"},
-      {"an output's own action after that of all",
-       "<ALL>",
-       "",
-       {"REST KEEP", "<ALL> DROP"},
-       "a|b",
-       "a|l{}|l{}.x|b|l{}.y"},
-      {"collected",
-       "OUT:IN",
-       "",
-       {"OUT DROP", "OUT COLLECT OTHER m{}", "OUT COLLECT OTHER $(EMPTY)"},
-       "a|m{}.b|m{}.a|m{}.l{}.y",
-       ""},
-      {"exploded", "<ALL>", "", {"OUT EXPLODE $(LIST)"}, "a|x|b|y", "a|l{}|l{}.x|b|l{}.y"},
+      {"added by parameters", "", "$(NEW) $(MANY) $(EMPTY) $(NOBODY) pre_$(MANY)", {}, kAdded, kAdded},
+      {"added to lists", "", toLists, {}, "l{}.count|l{}.p|l{}.q", "l{}.count"},
+      {"lists dropped", "<ALL>", "", {"OUT DROP"}, "a|b", kAll},
+      {"an output's own action wins", "<ALL>", "", {"REST KEEP", "<ALL> DROP"}, "a|b", kAll},
+      {"collected", "OUT:IN", "", collect, "a|m{}.b|m{}.a|m{}.l{}.y", ""},
+      {"exploded", "<ALL>", "", {"OUT EXPLODE $(LIST)"}, "a|x|b|y", kAll},
   };
   for (const PropagationCase& c : cases) {
     const auto cfg = makePropagating(c);
@@ -89,30 +68,6 @@ TEST(ConfigAttributes, ParametersOfTheRulesAffectTheOutput) {
   EXPECT_FALSE(cfg->parmValueAffectsOutputAttrs(qs("MANY")));
   cfg->updatePreservesAttributes(words("=a"));
   EXPECT_EQ(cfg->getOutputAttributes(qs("REST")), QStringList({qs("a"), qs("n 1")}));
-}
-
-TEST(ConfigAttributes, SubclassesChangeSingleSteps) {
-  struct Prefixing : TransformerCfg {
-    void transformAttr(const QString& attribute, QStringList& result, const QString& in,
-                       const QString& out) const override {
-      QStringList passed;
-      TransformerCfg::transformAttr(attribute, passed, in, out);
-      for (const QString& name : passed) {
-        result << qs("p_") + name;
-      }
-    }
-    void addAdditionalAttrsFromParameter(const QString& parameter, const QString&, const QString&,
-                                         QStringList& result) const override {
-      result << qs("from_") + parameter;
-    }
-  };
-  TransformerDefinition definition = makeDefinition({{"NEW", "NEW_ATTR"}});
-  definition.preservesAttributes = words("OUT:IN");
-  definition.attributesAdded = words("$(NEW)");
-  Prefixing cfg;
-  cfg.configure(definition);
-  cfg.setInputAttributes({{qs("IN"), words("a b")}, {qs("OTHER"), words("c")}});
-  EXPECT_EQ(cfg.getOutputAttributes(qs("OUT")), words("p_a p_b from_NEW"));
 }
 
 TEST(ConfigAttributes, ManyAttributesTakeTimeInProportion) {

@@ -49,13 +49,11 @@ TEST(ConfigDependencies, AnswersOfScripts) {
 }
 
 TEST(ConfigDependencies, TheFirstAnswerCounts) {
-  const DependencyChecker::Verdict verdict =
-      DependencyChecker::check({qs("set a {}"), qs("return first"), qs("return second")});
-  EXPECT_EQ(verdict.message, qs("first"));
-  EXPECT_TRUE(DependencyChecker::check(
-                  {qs("set kept 1; return {}"), qs("if {[catch {set kept}]} {return {}}; return shared")})
-                  .isMet)
-      << "scripts do not see each other";
+  EXPECT_EQ(DependencyChecker::check({qs("set a {}"), qs("return first"), qs("return second")}).message,
+            qs("first"));
+  const QStringList separate{qs("set kept 1; return {}"),
+                             qs("if {[catch {set kept}]} {return {}}; return shared")};
+  EXPECT_TRUE(DependencyChecker::check(separate).isMet) << "scripts do not see each other";
 }
 
 TEST(ConfigDependencies, TheVerdictIsRecordedAndTold) {
@@ -74,67 +72,24 @@ TEST(ConfigDependencies, TheVerdictIsRecordedAndTold) {
 // Each would reach the system, or never end, or take all memory, or crash the interpreter.
 TEST(ConfigDependencies, HarmfulScriptsAreStopped) {
   const QString deep(5000, QLatin1Char('['));
-  const QString longWord(5000, QLatin1Char('x'));
-  const QStringList scripts = {
-      qs("exec ls"),
-      qs("open /etc/passwd"),
-      qs("source /etc/passwd"),
-      qs("file delete /tmp/x"),
-      qs("socket localhost 1"),
-      qs("load x.so"),
-      qs("cd /"),
-      qs("glob *"),
-      qs("exit"),
-      qs("interp create"),
-      qs("interp invokehidden {} exec ls"),
-      qs("rename set x"),
-      qs("namespace eval ::tcl {}"),
-      qs("after 1000000"),
-      qs("vwait x"),
-      qs("package require x"),
-      qs("trace add variable x write y"),
-      qs("info commands"),
-      qs("encoding names"),
-      qs("uplevel 1 {}"),
-      qs("::tcl::string::repeat a 1000000000"),
-      qs("string repeat a 2000000000"),
-      qs("regexp a b"),
-      qs("lsearch -regexp a b"),
-      qs("switch -regex a {a b}"),
-      qs("binary format a1000000000 x"),
-      qs("format %1000000000d 1"),
-      qs("lrepeat 1000000000 a"),
-      qs("clock seconds"),
-      qs("chan names"),
-      qs("::tcl::mathop::** 2 100000000"),
-      qs("::tcl::file::delete x"),
-      qs("::tcl::clock::add 1"),
-      qs("while 1 {}"),
-      qs("while 1 {catch {error x}}"),
-      qs("for {} 1 {} {set a 1}"),
-      qs("set f {if 1 $f}; if 1 $f"),
-      qs("set x a; while 1 {append x $x}"),
-      qs("set x a; while 1 {set x $x$x}"),
-      qs("while 1 {lappend x a a a a a a a a}"),
-      qs("switch -r a {a b}"),
-      qs("proc f {} {}"),
-      qs("::oo::class create a"),
-      qs("::tcl::unsupported::assemble {push 1}"),
-      qs("set l a; while 1 {lappend l {*}$l}"),
-      qs("set l a; while 1 {catch {expr {\"$l$l\"}} l; append l $l}"),
-      qs("expr {2**100000000}"),
-      qs("expr {1<<1000000000}"),
-      qs("set x 7; while 1 {set x [expr {$x*$x}]}"),
-      qs("string match *a*a*a*a*a*b ") + QString(500, QLatin1Char('a')),
-      qs("set x ") + longWord,
-      qs("while 1 { catch { while 1 {} } }"),
-      deep,
-      qs("if 1 {") + deep,
-      qs("set x ") + QString(100000, QLatin1Char('y')),
-      QString(20, QLatin1Char('{')),
-      qs("set a("),
-      qs("expr {((((("),
-  };
+  QStringList scripts =
+      qs("exec ls|open /etc/passwd|source /etc/passwd|file delete /tmp/x|socket localhost 1|load x.so|cd /"
+         "|glob *|exit|interp create|interp invokehidden {} exec ls|rename set x|namespace eval ::tcl {}"
+         "|after 1000000|vwait x|package require x|trace add variable x write y|info commands"
+         "|encoding names|uplevel 1 {}|::tcl::string::repeat a 1000000000|string repeat a 2000000000"
+         "|regexp a b|lsearch -regexp a b|switch -regex a {a b}|binary format a1000000000 x"
+         "|format %1000000000d 1|lrepeat 1000000000 a|clock seconds|chan names"
+         "|::tcl::mathop::** 2 100000000|::tcl::file::delete x|::tcl::clock::add 1|while 1 {}"
+         "|while 1 {catch {error x}}|for {} 1 {} {set a 1}|set f {if 1 $f}; if 1 $f"
+         "|set x a; while 1 {append x $x}|set x a; while 1 {set x $x$x}|while 1 {lappend x a a a a a a a a}"
+         "|switch -r a {a b}|proc f {} {}|::oo::class create a|::tcl::unsupported::assemble {push 1}"
+         "|set l a; while 1 {lappend l {*}$l}|set l a; while 1 {catch {expr {\"$l$l\"}} l; append l $l}"
+         "|expr {2**100000000}|expr {1<<1000000000}|set x 7; while 1 {set x [expr {$x*$x}]}"
+         "|while 1 { catch { while 1 {} } }|set a(|expr {(((((")
+          .split(QLatin1Char('|'));
+  scripts << qs("string match *a*a*a*a*a*b ") + QString(500, QLatin1Char('a'))
+          << qs("set x ") + QString(5000, QLatin1Char('x')) << deep << qs("if 1 {") + deep
+          << qs("set x ") + QString(100000, QLatin1Char('y')) << QString(20, QLatin1Char('{'));
   for (const QString& script : scripts) {
     QElapsedTimer timer;
     timer.start();

@@ -171,38 +171,6 @@ TEST_F(ConfigValidation, MissingNamesAreCutAtOneHundredCharacters) {
   EXPECT_EQ(message, TransformResString(370607, quoted.left(100)));
 }
 
-TEST_F(ConfigValidation, RefusalsInEveryLanguage) {
-  TransformerCfg cfg;
-  cfg.configure(makeDefinition({{"VALUE", "TEXT", "Size", ""},
-                                {"REFERENCE", "ATTR", "A", "gone"},
-                                {"FILE", "FILEMUSTEXIST", "F", "no.txt"},
-                                {"CONNECTION", "TEXT", "C", "orx://x?connection=n"}}));
-  const struct {
-    const char* language;
-    QStringList messages;
-  } cases[] = {
-      {"en",
-       {"The parameter 'Size' needs a value.", "These attributes do not reach the transformer: 'gone'",
-        "The file 'no.txt' does not exist or is a folder.", "There is no connection named 'n'."}},
-      {"de",
-       {"Der Parameter 'Size' braucht einen Wert.", "Diese Attribute erreichen den Transformer nicht: 'gone'",
-        "Die Datei 'no.txt' existiert nicht oder ist ein Ordner.",
-        "Es gibt keine Verbindung mit dem Namen 'n'."}},
-      {"fr",
-       {"Le paramètre 'Size' exige une valeur.", "Ces attributs n’atteignent pas le transformateur : 'gone'",
-        "Le fichier 'no.txt' n’existe pas ou est un dossier.", "Il n’existe aucune connexion nommée 'n'."}},
-  };
-  for (const auto& test : cases) {
-    QORXSetLanguage(qs(test.language));
-    QStringList names = words("VALUE REFERENCE FILE CONNECTION");
-    QHash<QString, QString> messages;
-    EXPECT_FALSE(cfg.validateParameters(names, messages));
-    for (int i = 0; i < names.size(); ++i) {
-      EXPECT_EQ(messages.value(names.at(i)), test.messages.at(i)) << test.language;
-    }
-  }
-}
-
 // A registry may list other members than the type itself.
 TEST_F(ConfigValidation, AsksItsDirectory) {
   TransformerCfg cfg;

@@ -17,68 +17,13 @@ namespace {
 
 using Entry = QPair<QString, QString>;
 
-const QStringList kTexts{"plain",
-                         "two words",
-                         "{",
-                         "}",
-                         "{}",
-                         "}{",
-                         "a}b{c",
-                         "{a}",
-                         "\"",
-                         "a\"b",
-                         "\"q\"",
-                         "$",
-                         "$x",
-                         "$(Q)",
-                         "$5",
-                         "[",
-                         "]",
-                         "[x]",
-                         "[exit]",
-                         ";",
-                         "a;b",
-                         "#",
-                         "#{",
-                         "a\\",
-                         "\\{",
-                         "\\",
-                         "\\\\",
-                         "a\\nb",
-                         "C:\\dir",
-                         "a\nb",
-                         "a\r",
-                         "-exact",
-                         "--",
-                         "-",
-                         "default",
-                         "",
-                         " lead",
-                         "trail ",
-                         "'",
-                         "%1",
-                         "\u00e9 \u20ac",
-                         "a\tb",
-                         "}} ; exit ; {",
-                         "$finalVal",
-                         "B",
-                         "Bb",
-                         "aB",
-                         "b2",
-                         "B c d",
-                         "aB c",
-                         "e B",
-                         " B",
-                         "c",
-                         "x)",
-                         "(x",
-                         "a b\\",
-                         "$(",
-                         "$()",
-                         "*",
-                         "?",
-                         "\"a b",
-                         QString(QChar(0xd800))};
+const QStringList kTexts =
+    QString(
+        "plain~two words~{~}~{}~}{~a}b{c~{a}~\"~a\"b~\"q\"~$~$x~$(Q)~$5~[~]~[x]~[exit]~;~a;b~#~#{"
+        "~a\\~\\{~\\~\\\\~a\\nb~C:\\dir~a\nb~a\r~-exact~--~-~default~~ lead~trail ~'~%1~é €~a\tb"
+        "~}} ; exit ; {~$finalVal~B~Bb~aB~b2~B c d~aB c~e B~ B~c~x)~(x~a b\\~$(~$()~*~?~\"a b")
+        .split('~')
+    << QString(QChar(0xd800));
 
 ChoiceList choicesOf(const QVector<Entry>& entries) {
   ChoiceList choices;
@@ -290,57 +235,6 @@ TEST(Lookups, ChoiceProcedureRefusesExactlyWhatGoesWrong) {
   }
   EXPECT_GT(counts.refused, 50);
   EXPECT_GT(counts.written, 100);
-}
-
-TEST(Lookups, TextsOfTheFragments) {
-  const ChoiceList choices = choicesOf({{"Red", "r"}, {"Pale Blue", "b"}});
-  const auto lines = [&](const std::function<void(MFBuffer&)>& write) {
-    TextBuffer buffer;
-    write(buffer);
-    QStringList result;
-    for (QString line : buffer.text().split('\n', Qt::SkipEmptyParts)) {
-      if (line.endsWith('\\')) {
-        line.chop(2);
-      }
-      while (line.endsWith(' ')) {
-        line.chop(1);
-      }
-      result << line;
-    }
-    return result.join('\n').toStdString();
-  };
-  BoxLookup lookup{"$(V)", "Colour", "g1_C", "T1", false};
-  EXPECT_EQ(lines([&](MFBuffer& b) { lookup_writers::writeChoiceBox(b, choices, lookup); }),
-            "INCLUDE [ switch {$(V)} {\n"
-            "  {Red} { puts \"MACRO g1_C r\"; }\n"
-            "  {Pale Blue} { puts \"MACRO g1_C b\"; }\n"
-            "  {} { puts_real \"T1 - 'Colour' must be given a value.\"; exit 1; }\n"
-            "  {default} { puts \"MACRO g1_C $(V)\"; }\n"
-            "} ]");
-  EXPECT_EQ(lines([&](MFBuffer& b) { lookup_writers::writeListBox(b, choices, lookup); }),
-            "INCLUDE [ set lookupMap {};\n"
-            "append lookupMap {Red} { } {r};\n"
-            "append lookupMap { } {\"Pale Blue\"} { } {b};\n"
-            " if { {$(V)} == {} } { puts_real \"T1 - 'Colour' must be given a value.\"; exit 1; };\n"
-            " set finalVal [string map $lookupMap {$(V)}];\n"
-            " puts \"MACRO g1_C $finalVal \";\n"
-            "]");
-  lookup.isOptional = true;
-  EXPECT_NE(lines([&](MFBuffer& b) {
-              lookup_writers::writeChoiceBox(b, choices, lookup);
-            }).find("\n  {} { puts \"MACRO g1_C \"; }\n"),
-            std::string::npos);
-  QString call;
-  EXPECT_EQ(
-      lines([&](MFBuffer& b) { call = lookup_writers::writeChoiceProcedure(b, choices, "g1_C", "Red"); }),
-      "Tcl2 proc g1_C { curAttrValue } {\n"
-      "  switch $curAttrValue {\n"
-      "  {Red} { return {r}; }\n"
-      "  {Pale Blue} { return {b}; }\n"
-      "};\n"
-      "return $curAttrValue;\n"
-      "}");
-  EXPECT_EQ(call, "@Tcl2(g1_C {Red} )");
 }
 
 TEST(Lookups, WhichFormAValueTakes) {

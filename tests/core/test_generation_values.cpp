@@ -96,17 +96,6 @@ TEST(Values, MembersAndCells) {
                          "@EvaluateExpression(FDIV,INT,T.B,@Value(z))"}));
 }
 
-TEST(Values, Identifier) {
-  const QVector<QPair<QString, QString>> cases{
-      {"plain", "plain"},   {"two words", "\"two words\""}, {"a\"b", "\"a\\\"b\""},
-      {"c\\", "\"c\\\\\""}, {"$(P)_x", "$(P)_x"},           {"$(P) \\x", "\"$(P) \\x\""},
-      {"", "\"\""}};
-  for (const auto& c : cases) {
-    const auto cfg = makeCfg({{}, {}, {{"XFORMER_NAME", "TEXT", c.first}}, {}});
-    EXPECT_EQ(valueOf(*cfg, "XFORMER_NAME").toStdString(), c.second.toStdString());
-  }
-}
-
 TEST(Values, EncodingAroundReferences) {
   const QVector<QPair<QString, QString>> cases{
       {"a b", "a<space>b"},
@@ -210,25 +199,11 @@ TEST(Values, SeveralProcesses) {
 }
 
 TEST(Values, HostileTextsComeToAnEnd) {
-  const QStringList pieces{"@Value(",
-                           ")",
-                           "@Value<leftparenthesis>",
-                           "<rightparenthesis>",
-                           "$(",
-                           "$[",
-                           "]",
-                           "(",
-                           "\"",
-                           "ORX_CONDITIONAL:",
-                           ";",
-                           "<",
-                           "orx_basicstring:",
-                           "\\",
-                           "a",
-                           " ",
-                           "P",
-                           "\n",
-                           ","};
+  const QStringList pieces = QString(
+                                 "@Value(|)|@Value<leftparenthesis>|<rightparenthesis>|$(|$[|]|(|\"|ORX_"
+                                 "CONDITIONAL:|;|<|orx_basicstring:|\\"
+                                 "|a| |P|\n|,")
+                                 .split('|');
   std::mt19937 random(3);
   for (int round = 0; round < 1500; ++round) {
     QString value = round % 3 ? QString() : QString("ORX_CONDITIONAL:");
