@@ -1,7 +1,7 @@
 #include "CustomFixtures.h"
 
 QStringList names(const QString& text) {
-  return text.isEmpty() ? QStringList() : text.split(QLatin1Char(','));
+  return text.isEmpty() ? QStringList() : text.split(',');
 }
 
 TransformerDefinition passing(const QString& type, const QString& outputs, const QString& added) {
@@ -9,9 +9,9 @@ TransformerDefinition passing(const QString& type, const QString& outputs, const
   definition.name = type;
   definition.version = 1;
   definition.featureHolding = 1;
-  definition.inputTags = QStringList{QStringLiteral("IN")};
+  definition.inputTags = QStringList{"IN"};
   definition.outputTags = names(outputs);
-  definition.preservesAttributes = QStringList{QStringLiteral("<ALL>")};
+  definition.preservesAttributes = QStringList{"<ALL>"};
   definition.attributesAdded = names(added);
   return definition;
 }
@@ -55,29 +55,26 @@ void assemble(OpenNetwork& network, const QStringList& lines, CompoundTransforme
   QHash<QString, int> numbers;
   int number = 0;
   for (const QString& line : lines) {
-    const QStringList words = line.split(QLatin1Char(' '));
+    const QStringList words = line.split(' ');
     const QString& keyword = words.at(0);
-    if (words.value(1) == QLatin1String("->")) {
-      network.addLink(numbers.value(words.at(0), -1), QStringLiteral("OUT"), numbers.value(words.at(2), -1),
-                      QStringLiteral("IN"));
+    if (words.value(1) == "->") {
+      network.addLink(numbers.value(words.at(0), -1), "OUT", numbers.value(words.at(2), -1), "IN");
       continue;
     }
     const QString name = words.at(1);
     const QString list = words.value(2);
-    if (keyword == QLatin1String("in"))
+    if (keyword == "in")
       network.addInput(name, number, number);
-    else if (keyword == QLatin1String("out"))
+    else if (keyword == "out")
       network.addOutput(name, number, kOutgoingArriving, {}, number);
-    else if (keyword == QLatin1String("own"))
+    else if (keyword == "own")
       network.addOutput(name, number, kOutgoingOwnList, names(list), number);
-    else if (keyword == QLatin1String("loop"))
+    else if (keyword == "loop")
       network.addLoop(name, number);
-    else if (keyword == QLatin1String("use"))
+    else if (keyword == "use")
       network.addTransformer(new CompoundTransformerCfg(inner), {}, number);
     else
-      network.addTransformer(
-          configured(passing(QStringLiteral("Adder"), QStringLiteral("OUT"), list), name).release(), {},
-          number);
+      network.addTransformer(configured(passing("Adder", "OUT", list), name).release(), {}, number);
     numbers.insert(name, number++);
   }
   network.doneAdding(true);
@@ -102,10 +99,10 @@ QString TextBuffer::text() const {
 
 QStringList TextBuffer::lines() const {
   QStringList kept;
-  for (QString line : text().split(QLatin1Char('\n'))) {
-    if (line.endsWith(QLatin1Char('\\')))
+  for (QString line : text().split('\n')) {
+    if (line.endsWith('\\'))
       line.chop(1);
-    while (line.endsWith(QLatin1Char(' ')))
+    while (line.endsWith(' '))
       line.chop(1);
     if (!line.isEmpty())
       kept.append(line);
@@ -120,15 +117,13 @@ QString attribute(const char* name, const QString& value) {
 }
 
 QString parameter(const QString& name, const QString& value) {
-  return QLatin1String("<XFORM_PARM") + attribute("PARM_NAME", name) + attribute("PARM_VALUE", value) +
-         QLatin1String("/>");
+  return QLatin1String("<XFORM_PARM") + attribute("PARM_NAME", name) + attribute("PARM_VALUE", value) + "/>";
 }
 
 }  // namespace
 
 QByteArray documentXml(const std::vector<DocumentText>& documents) {
-  QString xml =
-      QStringLiteral("<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n<TRANSFORMER>\n<SUBDOCUMENTS>\n");
+  QString xml = "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n<TRANSFORMER>\n<SUBDOCUMENTS>\n";
   for (const DocumentText& document : documents) {
     QString settings;
     QString parameters;
@@ -139,74 +134,66 @@ QByteArray documentXml(const std::vector<DocumentText>& documents) {
     QHash<QString, int> numbers;
     int number = 0;
     for (const QString& line : document.lines) {
-      const QStringList words = line.split(QLatin1Char(' '));
+      const QStringList words = line.split(' ');
       const QString& keyword = words.at(0);
       const QString name = words.value(1);
-      const QString rest = QStringList(words.mid(2)).join(QLatin1Char(' '));
-      if (name == QLatin1String("->")) {
+      const QString rest = QStringList(words.mid(2)).join(' ');
+      if (name == "->") {
         links += QStringLiteral("<FEAT_LINK IDENTIFIER=\"%1\" SOURCE_NODE=\"%2\" TARGET_NODE=\"%3\"")
                      .arg(100 + number++)
                      .arg(numbers.value(words.at(0), 999))
                      .arg(numbers.value(words.at(2), 999)) +
                  attribute("SOURCE_PORT_DESC", QStringLiteral("fo 0 ") + words.value(3)) +
-                 attribute("TARGET_PORT_DESC", QStringLiteral("fi 0 ") + words.value(4)) +
-                 QLatin1String("/>\n");
+                 attribute("TARGET_PORT_DESC", QStringLiteral("fi 0 ") + words.value(4)) + "/>\n";
         continue;
       }
-      if (keyword == QLatin1String("raw")) {
-        links += line.mid(4) + QLatin1Char('\n');
+      if (keyword == "raw") {
+        links += line.mid(4) + '\n';
         continue;
       }
-      if (keyword == QLatin1String("set")) {
+      if (keyword == "set") {
         settings += attribute(qPrintable(name), rest);
         continue;
       }
-      if (keyword == QLatin1String("gui")) {
-        const QStringList parts = line.mid(4).split(QStringLiteral(" | "));
+      if (keyword == "gui") {
+        const QStringList parts = line.mid(4).split(" | ");
         parameters += QLatin1String("<GLOBAL_PARAMETER") + attribute("GUI_LINE", parts.at(0)) +
-                      attribute("DEFAULT_VALUE", parts.value(1)) + QLatin1String("/>\n");
+                      attribute("DEFAULT_VALUE", parts.value(1)) + "/>\n";
         continue;
       }
-      if (keyword == QLatin1String("parm")) {
-        bodies[name] += parameter(words.at(2), QStringList(words.mid(3)).join(QLatin1Char(' ')));
+      if (keyword == "parm") {
+        bodies[name] += parameter(words.at(2), QStringList(words.mid(3)).join(' '));
         continue;
       }
       numbers.insert(name, number);
-      const bool isPort = keyword == QLatin1String("in") || keyword == QLatin1String("out") ||
-                          keyword == QLatin1String("own") || keyword == QLatin1String("loop");
+      const bool isPort = keyword == "in" || keyword == "out" || keyword == "own" || keyword == "loop";
       if (isPort) {
         ports += QStringLiteral("<SUBDOCUMENT_IO IDENTIFIER=\"%1\"").arg(number) + attribute("NAME", name) +
-                 attribute("IS_SOURCE", keyword == QLatin1String("in")     ? QStringLiteral("true")
-                                        : keyword == QLatin1String("loop") ? QStringLiteral("loop")
-                                                                           : QStringLiteral("false")) +
-                 attribute("ATTR_MODE",
-                           keyword == QLatin1String("own") ? QStringLiteral("1") : QStringLiteral("0")) +
-                 QLatin1Char('>');
+                 attribute("IS_SOURCE", keyword == "in"     ? "true"
+                                        : keyword == "loop" ? "loop"
+                                                            : "false") +
+                 attribute("ATTR_MODE", keyword == "own" ? "1" : "0") + '>';
         for (const QString& listed : names(rest))
-          ports += QLatin1String("<XFORM_ATTR") + attribute("ATTR_NAME", listed) + QLatin1String("/>");
-        ports += QLatin1String("</SUBDOCUMENT_IO>\n");
+          ports += QLatin1String("<XFORM_ATTR") + attribute("ATTR_NAME", listed) + "/>";
+        ports += "</SUBDOCUMENT_IO>\n";
       } else {
-        const bool isNested = keyword == QLatin1String("use");
-        const QString type = isNested ? QStringLiteral("SubDocumentTransformer") : rest;
+        const bool isNested = keyword == "use";
+        const QString type = isNested ? "SubDocumentTransformer" : rest;
         transformers.append(QStringLiteral("<TRANSFORMER IDENTIFIER=\"%1\" VERSION=\"1\"").arg(number) +
-                            attribute("TYPE", type) + QLatin1Char('>') +
-                            parameter(QStringLiteral("XFORMER_NAME"), name));
-        bodies[name] += isNested ? parameter(QStringLiteral("SUB_DOC_NAME"), rest) : QString();
+                            attribute("TYPE", type) + QLatin1Char('>') + parameter("XFORMER_NAME", name));
+        bodies[name] += isNested ? parameter("SUB_DOC_NAME", rest) : QString();
         transformers.last() += QLatin1Char('\x01') + name;
       }
       ++number;
     }
-    xml += QLatin1String("<SUBDOCUMENT") + attribute("NAME", document.name) + settings + QLatin1String(">\n");
-    xml += QLatin1String("<GLOBAL_PARAMETERS>\n") + parameters +
-           QLatin1String("</GLOBAL_PARAMETERS>\n<TRANSFORMERS>\n");
+    xml += QLatin1String("<SUBDOCUMENT") + attribute("NAME", document.name) + settings + ">\n";
+    xml += QLatin1String("<GLOBAL_PARAMETERS>\n") + parameters + "</GLOBAL_PARAMETERS>\n<TRANSFORMERS>\n";
     for (const QString& transformer : qAsConst(transformers)) {
       const int mark = transformer.indexOf(QLatin1Char('\x01'));
-      xml += transformer.left(mark) + bodies.value(transformer.mid(mark + 1)) +
-             QLatin1String("</TRANSFORMER>\n");
+      xml += transformer.left(mark) + bodies.value(transformer.mid(mark + 1)) + "</TRANSFORMER>\n";
     }
     xml += QLatin1String("</TRANSFORMERS>\n<SUBDOCUMENT_IOS>\n") + ports +
-           QLatin1String("</SUBDOCUMENT_IOS>\n<FEAT_LINKS>\n") + links +
-           QLatin1String("</FEAT_LINKS>\n</SUBDOCUMENT>\n");
+           QLatin1String("</SUBDOCUMENT_IOS>\n<FEAT_LINKS>\n") + links + "</FEAT_LINKS>\n</SUBDOCUMENT>\n";
   }
-  return (xml + QLatin1String("</SUBDOCUMENTS>\n</TRANSFORMER>\n")).toUtf8();
+  return (xml + "</SUBDOCUMENTS>\n</TRANSFORMER>\n").toUtf8();
 }

@@ -21,7 +21,7 @@
 QStringList names(const QString& text);
 
 // One input IN and the outputs given; what arrives passes, `added` (tokens of a definition) comes on top.
-TransformerDefinition passing(const QString& type, const QString& outputs = QStringLiteral("OUT"),
+TransformerDefinition passing(const QString& type, const QString& outputs = "OUT",
                               const QString& added = QString());
 std::unique_ptr<TransformerCfg> configured(const TransformerDefinition& definition,
                                            const QString& identifier = QString());
@@ -39,7 +39,7 @@ class Definitions : public TransformerSource {
 // A network that opens its building operations.
 class OpenNetwork : public ExternalDocNetwork {
  public:
-  explicit OpenNetwork(const QString& name = QStringLiteral("Net"), int version = 1);
+  explicit OpenNetwork(const QString& name = "Net", int version = 1);
 
   using CompoundTransformerNetwork::addInput;
   using CompoundTransformerNetwork::addLink;

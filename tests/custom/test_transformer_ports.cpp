@@ -45,32 +45,31 @@ const PortCase kPortCases[] = {
 };
 
 TEST(TransformerPorts, AreFoundByNameElseByNumber) {
-  TransformerDefinition definition = passing(QStringLiteral("Ports"), QStringLiteral("X,Y"));
+  TransformerDefinition definition = passing("Ports", "X,Y");
   definition.version = 4;
-  definition.inputTags = names(QStringLiteral("A:Alpha,B"));
-  definition.dynamicInputTags = names(QStringLiteral("D"));
-  definition.tagMapping =
-      names(QStringLiteral("2:I:Oldest=Old,4:I:Old=B,2:I:D=A,4:O:First=X,2:O:Gone=Nothing"));
+  definition.inputTags = names("A:Alpha,B");
+  definition.dynamicInputTags = names("D");
+  definition.tagMapping = names("2:I:Oldest=Old,4:I:Old=B,2:I:D=A,4:O:First=X,2:O:Gone=Nothing");
   const std::unique_ptr<TransformerCfg> cfg = configured(definition);
   for (const PortCase& test : kPortCases) {
     TransformerStruct record;
     record.version = test.version;
-    record.inputFtOrder = QLatin1String(test.inputOrder);
-    for (const QString& output : names(QLatin1String(test.outputFeats))) {
+    record.inputFtOrder = test.inputOrder;
+    for (const QString& output : names(test.outputFeats)) {
       record.outputFeats.push_back({});
       record.outputFeats.back().name = output;
     }
     const TransformerPorts ports(record, *cfg);
-    const QString name = QLatin1String(test.name);
+    const QString name = test.name;
     const QString tag = test.isOutput ? ports.output(test.number, name) : ports.input(test.number, name);
-    EXPECT_EQ(tag, QString(QLatin1String(test.tag))) << test.promise;
+    EXPECT_EQ(tag, QString(test.tag)) << test.promise;
     EXPECT_EQ(tag.isNull(), *test.tag == '\0') << test.promise;
   }
 }
 
 TEST(TransformerPorts, ExposedAttributesStandAtTheirOutput) {
-  TransformerDefinition definition = passing(QStringLiteral("Ports"), QStringLiteral("X,Y"));
-  definition.tagMapping = names(QStringLiteral("O:First=X"));
+  TransformerDefinition definition = passing("Ports", "X,Y");
+  definition.tagMapping = names("O:First=X");
   TransformerStruct record;
   for (const char* output : {"Y", "First"}) {
     record.outputFeats.push_back({});
@@ -84,8 +83,8 @@ TEST(TransformerPorts, ExposedAttributesStandAtTheirOutput) {
     record.attributes.push_back(attribute);
   }
   const auto exposed = TransformerPorts(record, *configured(definition)).exposedAttributes(record);
-  EXPECT_EQ(exposed.value(QStringLiteral("X")), names(QStringLiteral("a1,a2,a3")));
-  EXPECT_EQ(exposed.value(QStringLiteral("Y")), names(QStringLiteral("a0,a2,a3")));
+  EXPECT_EQ(exposed.value("X"), names("a1,a2,a3"));
+  EXPECT_EQ(exposed.value("Y"), names("a0,a2,a3"));
 }
 
 }  // namespace
