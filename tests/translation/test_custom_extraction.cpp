@@ -121,68 +121,35 @@ TEST_F(Extraction, IsReadBackIdentical) {
   }
 }
 
-TEST_F(Extraction, NestedDefinitionsStandInFrontAsBlocks) {
-  read(document());
-  CustomExtraction extraction(reader, headerLines, source);
-  bool isPrepared = false;
-  rulesOf(extraction, "Outer", isPrepared);
-  const QStringList lines = extraction.definition();
-  EXPECT_EQ(lines.value(0), QString("# TRANSFORMER_BEGIN Inner,1,,"));
-  const int end = lines.indexOf("# TRANSFORMER_END");
-  ASSERT_GT(end, 0);
-  for (int i = 0; i <= end; ++i)
-    EXPECT_TRUE(lines.at(i).startsWith('#')) << lines.at(i).toStdString();
-  EXPECT_EQ(lines.mid(end + 1).filter("INCLUDE_CUSTOM_TRANSFORMER_VER Inner:1").size(), 2);
-  EXPECT_EQ(lines.mid(end + 1).filter("TRANSFORMER_BEGIN").size(), 0);
-}
-
 TEST_F(Extraction, FindsWhatTheWorkspaceWouldHaveToGive) {
   const QString script = QORXWwjdEncode("ORX_MacroValues['GLOBAL'] + 'x'");
+  using Change = std::function<void(SmallWorkspace&)>;
+  const auto value = [](const QString& text) -> Change {
+    return [=](SmallWorkspace& w) { w.transformer(7, "Copy", {"VALUE", text}); };
+  };
+  const auto parameter = [](const QString& guiLine, const QString& text) -> Change {
+    return [=](SmallWorkspace& w) { w.parameter(guiLine, text); };
+  };
+  const Change nested = [](SmallWorkspace& w) {
+    w.transformer(7, kInstance, {"SUB_DOC_NAME", "In"}).endCustom();
+    w.beginCustom("In").transformer(3, "Copy", {"VALUE", "$(GLOBAL)"});
+  };
   const struct {
     const char* promise;
-    std::function<void(SmallWorkspace&)> inside;
+    Change inside;
     QStringList needed;
   } cases[] = {
-      {"nothing", [](SmallWorkspace&) {}, {}},
-      {"a value",
-       [](auto& w) {
-         w.transformer(7, "Copy", {"VALUE", "x$(GLOBAL)"});
-       },
-       {"GLOBAL"}},
-      {"a deferred one",
-       [](auto& w) {
-         w.transformer(7, "Copy", {"VALUE", "$[GLOBAL]"});
-       },
-       {"GLOBAL"}},
-      {"an encoded one",
-       [](auto& w) {
-         w.transformer(7, "Copy", {"VALUE", QORXWwjdEncode("$[GLOBAL]")});
-       },
-       {"GLOBAL"}},
-      {"a macro of the header",
-       [](auto& w) {
-         w.transformer(7, "Copy", {"VALUE", "$(HEADER_SET)"});
-       },
-       {"HEADER_SET"}},
-      {"each once, in the workspace's order",
-       [](auto& w) {
-         w.transformer(7, "Copy", {"VALUE", "$(GLOBAL)$(HEADER_SET)$(GLOBAL)"});
-       },
-       {"HEADER_SET", "GLOBAL"}},
-      {"a default", [](auto& w) { w.parameter("GUI TEXT D D", "$(GLOBAL)"); }, {"GLOBAL"}},
-      {"a script", [&](auto& w) { w.parameter("GUI TEXT_EDIT_PYTHON_PARM S S", script); }, {"GLOBAL"}},
-      {"a parameter of its own", [](auto& w) { w.parameter("GUI TEXT GLOBAL G", "$(GLOBAL)"); }, {}},
-      {"in one that stands inside",
-       [](auto& w) {
-         w.transformer(7, kInstance, {"SUB_DOC_NAME", "In"}).endCustom();
-         w.beginCustom("In").transformer(3, "Copy", {"VALUE", "$(GLOBAL)"});
-       },
-       {"GLOBAL"}},
-      {"macros that are always there",
-       [](auto& w) {
-         w.transformer(7, "Copy", {"VALUE", "$(ORX_HOME)"});
-       },
-       {}},
+      {"nothing", value(""), {}},
+      {"a value", value("x$(GLOBAL)"), {"GLOBAL"}},
+      {"a deferred one", value("$[GLOBAL]"), {"GLOBAL"}},
+      {"an encoded one", value(QORXWwjdEncode("$[GLOBAL]")), {"GLOBAL"}},
+      {"a macro of the header", value("$(HEADER_SET)"), {"HEADER_SET"}},
+      {"each once, in their order", value("$(GLOBAL)$(HEADER_SET)$(GLOBAL)"), {"HEADER_SET", "GLOBAL"}},
+      {"a default", parameter("GUI TEXT D D", "$(GLOBAL)"), {"GLOBAL"}},
+      {"a script", parameter("GUI TEXT_EDIT_PYTHON_PARM S S", script), {"GLOBAL"}},
+      {"a parameter of its own", parameter("GUI TEXT GLOBAL G", "$(GLOBAL)"), {}},
+      {"in one that stands inside", nested, {"GLOBAL"}},
+      {"macros that are always there", value("$(ORX_HOME)"), {}},
   };
   for (const auto& test : cases) {
     SmallWorkspace workspace;

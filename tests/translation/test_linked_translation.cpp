@@ -7,6 +7,8 @@
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceFile.h>
 
+#include <QDir>
+
 namespace {
 // -----------------------------------------------------------------------------------
 
@@ -114,80 +116,62 @@ TEST_F(LinkedTranslation, EqualNamesMeanEqualDefinitions) {
 
 TEST_F(LinkedTranslation, TellsWhatDoesNotFit) {
   const QString all = folders.path("home/transformers");
+  using Make = std::function<void()>;
+  const auto changed = [&](const char* from, const char* to) -> Make {
+    return [=] { store(tidyDocument().replace(from, to)); };
+  };
+  const auto build = [&](int number) -> Make { return [=] { store(tidyDocument(number)); }; };
+  const Make broken = [&] { store("<?xml version=\"1.0\"?>\n<TRANSFORMER>\n"); };
+  const Make hollow = [&] { storeBody({}); };
+  const Make secret = [&] { storeBody(enciphered(tidyDocument())); };
+  const Make circle = [&] {
+    store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Mess\""));
+    store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Tidy\"").replace("\"Tidy\" L", "\"Mess\" L"),
+          "Mess");
+  };
+  const Make chain = [&] {
+    for (int level = 0; level < 66; ++level) {
+      const QString name = level == 0 ? QString("Tidy") : QString("Link%1").arg(level);
+      const QString next = level == 65 ? "TYPE=\"Other\"" : QString("TYPE=\"Link%1\"").arg(level + 1);
+      store(QString(tidyDocument())
+                .replace("TYPE=\"Other\"", next)
+                .replace("\"Tidy\"", '"' + name + '"')
+                .toUtf8(),
+            name);
+    }
+  };
   const struct {
     const char* promise;
-    std::function<void()> make;
+    Make make;
     const char* version;
-    QStringList diagnostics;  // inside an embedded one each is a fault of that, at the node AROUND/T
-    QStringList inText;       // of the first
+    const char* diagnostic;  // inside an embedded one it is a fault of that, at the node AROUND/T
+    QStringList inText;      // of the first
   } cases[] = {
-      {"fits", [&] { store(tidyDocument()); }, "1", {}, {}},
-      {"missing", [] {}, "4", {"unknown-transformer T"}, {"'Tidy'", "4", all, folders.path("extra")}},
-      {"version missing", [&] { store(tidyDocument()); }, "2", {"unknown-version T"}, {"'Tidy'", "2", "1"}},
-      {"newer build",
-       [&] { store(tidyDocument(18287)); },
-       "1",
-       {"custom-transformer-fault T"},
-       {"'Tidy'", file}},
-      {"input gone",
-       [&] { store(tidyDocument().replace("NAME=\"IN\"", "NAME=\"INTO\"")); },
-       "1",
-       {"unknown-input T"},
-       {file, "'IN'", "INTO"}},
-      {"output gone",
-       [&] { store(tidyDocument().replace("NAME=\"OUT\"", "NAME=\"DONE\"")); },
-       "1",
-       {"unknown-output T"},
-       {file, "'OUT'", "DONE"}},
-      {"parameter gone",
-       [&] { store(tidyDocument().replace("LIMIT", "BOUND")); },
-       "1",
-       {"unknown-parameter T"},
-       {file, "'LIMIT'"}},
-      {"inside at fault",
-       [&] { store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Gone\"")); },
-       "1",
-       {"unknown-transformer Tidy/Gone_3"},
-       {"'Gone'"}},
-      {"body broken",
-       [&] { store("<?xml version=\"1.0\"?>\n<TRANSFORMER>\n"); },
-       "1",
-       {"custom-transformer-fault T"},
-       {"'Tidy'", file}},
-      {"body missing", [&] { storeBody({}); }, "1", {"custom-transformer-fault T"}, {"'Tidy'", file}},
-      {"body enciphered",
-       [&] { storeBody(enciphered(tidyDocument())); },
-       "1",
-       {"custom-transformer-fault T"},
-       {"'Tidy'", file, "decipher"}},
-      {"inside itself",
-       [&] { store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Tidy\"")); },
-       "1",
-       {"nesting Tidy/Tidy_3"},
-       {"Tidy > Tidy"}},
-      {"by way of another file",
-       [&] {
-         store(tidyDocument().replace("TYPE=\"Other\"", "TYPE=\"Mess\""));
-         store(tidyDocument()
-                   .replace("TYPE=\"Other\"", "TYPE=\"Tidy\"")
-                   .replace("NAME=\"Tidy\"", "NAME=\"Mess\""),
-               "Mess");
-       },
-       "1",
-       {"nesting T"},
-       {"Tidy > Mess > Tidy"}},
+      {"fits", build(1), "1", "", {}},
+      {"missing", [] {}, "4", "unknown-transformer T", {"'Tidy'", "4", all, folders.path("extra")}},
+      {"version missing", build(1), "2", "unknown-version T", {"'Tidy'", "2", "1"}},
+      {"newer build", build(18287), "1", "custom-transformer-fault T", {"'Tidy'", file}},
+      {"input", changed("=\"IN\"", "=\"INTO\""), "1", "unknown-input T", {file, "'IN'", "INTO"}},
+      {"output", changed("=\"OUT\"", "=\"DONE\""), "1", "unknown-output T", {file, "'OUT'", "DONE"}},
+      {"parameter", changed("LIMIT", "BOUND"), "1", "unknown-parameter T", {file, "'LIMIT'"}},
+      {"inside", changed("=\"Other\"", "=\"Gone\""), "1", "unknown-transformer Tidy/Gone_3", {"'Gone'"}},
+      {"body broken", broken, "1", "custom-transformer-fault T", {"'Tidy'", file}},
+      {"body missing", hollow, "1", "custom-transformer-fault T", {"'Tidy'", file}},
+      {"enciphered", secret, "1", "custom-transformer-fault T", {"'Tidy'", file, "decipher"}},
+      {"inside itself", changed("=\"Other\"", "=\"Tidy\""), "1", "nesting Tidy/Tidy_3", {"Tidy > Tidy"}},
+      {"by way of another file", circle, "1", "nesting T", {"Tidy > Mess > Tidy"}},
+      {"a chain of files", chain, "1", "nesting T", {"64"}},
   };
   for (const auto& test : cases) {
     for (const bool isInside : {false, true}) {
-      for (const char* linked : {"extra/Tidy.ort", "extra/Mess.ort"})
-        QFile::remove(folders.path(linked));
+      QDir extra(folders.path("extra"));
+      for (const QString& linked : extra.entryList({"*.ort"}))
+        extra.remove(linked);
       test.make();
       const Outcome outcome = translate(workspace(isInside, test.version), folders.load());
-      QStringList expected = test.diagnostics;
-      if (isInside && expected.contains("nesting T"))
-        expected = QStringList{"nesting A"};
-      else if (isInside && !expected.isEmpty() && !expected.first().contains('/'))
-        expected.first().replace(" T", " Around/T");
+      QStringList expected = QString(test.diagnostic).split('|', Qt::SkipEmptyParts);
+      if (isInside && !QString(test.diagnostic).contains('/'))
+        expected.replaceInStrings(" T", expected.contains("nesting T") ? " A" : " Around/T");
       EXPECT_EQ(outcome.diagnostics, expected) << test.promise << isInside;
       EXPECT_EQ(outcome.result, expected.isEmpty() ? TranslationResult::Done : TranslationResult::Refused);
       for (const QString& part : test.inText)

@@ -1,8 +1,28 @@
-#include <platform/qorxcore/qorxcore.h>
 #include <tests/support/QtPrinters.h>
 #include <tests/translation/TranslatedWorkspace.h>
 
 namespace {
+
+using Change = std::function<void(SmallWorkspace&)>;
+
+Change node(const QString& type, const QStringList& parameters, const QStringList& extra = {}, int id = 7) {
+  return [=](SmallWorkspace& w) { w.transformer(id, type, parameters, extra); };
+}
+Change valued(const QString& value) {
+  return node("Copy", {"XFORMER_NAME", "N", "VALUE", value});
+}
+Change linked(int from, const QString& output, int to, const QString& input) {
+  return [=](SmallWorkspace& w) { w.link(from, output, to, input); };
+}
+Change parameter(const QString& guiLine, const QString& value) {
+  return [=](SmallWorkspace& w) { w.parameter(guiLine, value); };
+}
+Change reading(const QString& name) {
+  return [=](SmallWorkspace& w) { w.reader(9, name).link(9, "fo 0", 3, "fi 0 INPUT"); };
+}
+Change port(const QString& name) {
+  return [=](SmallWorkspace& w) { w.port(9, name, "false").link(3, "fo 0", 9, "fi 0"); };
+}
 
 SmallWorkspace copyBetween() {
   SmallWorkspace workspace;
@@ -83,19 +103,6 @@ TEST(Translation, SourcesOfOneInputStandInTheirOrder) {
   }
 }
 
-TEST(Translation, PortsAreThoseThatTheRecordMeans) {
-  SmallWorkspace workspace;
-  workspace.transformer(1, "Copy", {"XFORMER_NAME", "C"}, {},
-                        "<OUTPUT_FEAT NAME=\"REST\"/>\n<OUTPUT_FEAT NAME=\"OUTPUT\"/>\n");
-  workspace.transformer(2, "Join", {"XFORMER_NAME", "J"});
-  workspace.link(1, "fo 0", 2, "fi 1").link(1, "fo 0 OUTPUT", 2, "fi 0 LEFT");
-  const Outcome outcome = translate(workspace);
-  EXPECT_EQ(outcome.diagnostics, QStringList());
-  // The alias of RIGHT is what stands in the mapping file.
-  EXPECT_TRUE(outcome.text.contains("INPUT LEFT FEATURE_TYPE C_OUTPUT INPUT R FEATURE_TYPE C_REST"))
-      << outcome.text.toStdString();
-}
-
 TEST(Translation, DisabledNodesAndLinksAreLeftOut) {
   SmallWorkspace workspace = copyBetween();
   workspace.transformer(4, "NoSuchThing", {"XFORMER_NAME", "D"}, {"ENABLED", "false"});
@@ -119,16 +126,6 @@ TEST(Translation, AttributeLinksCopyAttributes) {
   EXPECT_FALSE(text.contains("(id,id)"));
 }
 
-TEST(Translation, RunTimeLookupsComeBeforeTheStatementThatUsesThem) {
-  SmallWorkspace workspace;
-  workspace.parameter("GUI TEXT Speed Prompt", "Fast")
-      .transformer(1, "Pick", {"XFORMER_NAME", "P", "MODE", "$(Speed)"});
-  const QString text = translate(workspace).text;
-  const int lookup = text.indexOf("INCLUDE [ switch {$(Speed)} {");
-  EXPECT_GT(lookup, 0) << text.toStdString();
-  EXPECT_GT(text.indexOf("PickFactory"), lookup);
-}
-
 // A custom transformer with a parameter, an inner "Copy" and an output fed by two inner ports.
 SmallWorkspace withCustom(const std::function<void(SmallWorkspace&)>& change = {}) {
   SmallWorkspace workspace;
@@ -146,123 +143,6 @@ SmallWorkspace withCustom(const std::function<void(SmallWorkspace&)>& change = {
     change(workspace);
   workspace.endCustom();
   return workspace;
-}
-
-TEST(Translation, AnEmbeddedCustomTransformerIsDefinedOnceAndIncludedByEachInstance) {
-  SmallWorkspace workspace = withCustom();
-  workspace.transformer(4, "SubDocumentTransformer", {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", "Second"});
-  workspace.link(1, "fo 0", 4, "fi 0 IN");
-  const Outcome outcome = translate(workspace);
-  EXPECT_EQ(outcome.diagnostics, QStringList());
-  EXPECT_EQ(outcome.text.count("# TRANSFORMER_BEGIN Cleaner,1,Mine,"), 1) << outcome.text.toStdString();
-  EXPECT_EQ(outcome.text.count("# TRANSFORMER_END\n"), 1);
-  EXPECT_EQ(outcome.text.count("INCLUDE_CUSTOM_TRANSFORMER_VER Cleaner:1\n"), 2);
-  for (const char* statement :
-       {"# FACTORY_DEF * CopyFactory FACTORY_NAME $(Cleaner_WORKSPACE_NAME)_C INPUT INPUT FEATURE_TYPE "
-        "\"$(Cleaner_WORKSPACE_NAME)_IN\" ",
-        "P $($(Cleaner_WORKSPACE_NAME)_LIMIT)\n",
-        "OUTPUT FEATURE_TYPE \"$(Cleaner_WORKSPACE_NAME)_C_OUTPUT\" ",
-        "INPUT FEATURE_TYPE \"$(Cleaner_WORKSPACE_NAME)_C_REST\" ",
-        "OUTPUT FEATURE_TYPE \"$(Cleaner_WORKSPACE_NAME)_OUT\"\n", "MACRO Cleaner_WORKSPACE_NAME First\n",
-        "MACRO $(Cleaner_WORKSPACE_NAME)_LIMIT 7\n", "MACRO Cleaner_WORKSPACE_NAME Second\n",
-        "MACRO $(Cleaner_WORKSPACE_NAME)_LIMIT 5\n",
-        "INPUT FEATURE_TYPE Parcels OUTPUT FEATURE_TYPE First_IN\n",
-        "INPUT FEATURE_TYPE First_OUT OUTPUT FEATURE_TYPE First_OUT_OUT\n",
-        "INPUT FEATURE_TYPE First_OUT_OUT OUTPUT FEATURE_TYPE Flooded\n"})
-    EXPECT_TRUE(outcome.text.contains(statement)) << statement << "\n" << outcome.text.toStdString();
-  EXPECT_LT(outcome.text.indexOf("# TRANSFORMER_END"), outcome.text.indexOf("MACRO Cleaner_WORKSPACE_NAME"));
-}
-
-TEST(Translation, ReferencesInsideACustomTransformerReachTheParameterThatTheyMean) {
-  const struct {
-    const char* value;
-    const char* written;
-  } cases[] = {
-      {"$(LIMIT)", "P $($(Cleaner_WORKSPACE_NAME)_LIMIT)\n"},
-      {"$[LIMIT]", "P $($(Cleaner_WORKSPACE_NAME)_LIMIT)\n"},
-      {"x$(LIMIT)y$(GLOBAL)", "P x$($(Cleaner_WORKSPACE_NAME)_LIMIT)y$(GLOBAL)\n"},
-      {"$(ORX_HOME)", "P $(ORX_HOME)\n"},
-  };
-  for (const auto& test : cases) {
-    SmallWorkspace workspace = withCustom([&](SmallWorkspace& inner) {
-      inner.transformer(5, "Copy", {"XFORMER_NAME", "Other", "VALUE", test.value});
-    });
-    workspace.parameter("GUI TEXT GLOBAL Prompt", "1");
-    const Outcome outcome = translate(workspace);
-    EXPECT_EQ(outcome.diagnostics, QStringList()) << test.value;
-    EXPECT_TRUE(outcome.text.contains(test.written)) << test.written << "\n" << outcome.text.toStdString();
-  }
-}
-
-TEST(Translation, ALookupInsideACustomTransformerMayTakeAGlobalParameter) {
-  SmallWorkspace workspace = withCustom([&](SmallWorkspace& inner) {
-    inner.transformer(5, "Pick", {"XFORMER_NAME", "Picked", "MODE", "$(SPEED)"});
-  });
-  workspace.parameter("GUI TEXT SPEED Prompt", "Fast");
-  const Outcome outcome = translate(workspace);
-  EXPECT_EQ(outcome.diagnostics, QStringList());
-  EXPECT_TRUE(outcome.text.contains("# INCLUDE [ switch {$(SPEED)} {")) << outcome.text.toStdString();
-}
-
-TEST(Translation, ALoopingCustomTransformerIsWrittenAsALoop) {
-  SmallWorkspace workspace;
-  workspace.reader(1, "Parcels")
-      .transformer(3, "SubDocumentTransformer",
-                   {"SUB_DOC_NAME", "Looper", "XFORMER_NAME", "L", "MAX_LOOP_ITERATIONS", "4"});
-  workspace.link(1, "fo 0", 3, "fi 0 IN");
-  workspace.beginCustom("Looper", {"BLOCKED_LOOPING", "yes"});
-  workspace.port(1, "IN", "true").port(2, "OUT", "false").port(4, "AGAIN", "loop");
-  workspace.transformer(3, "Copy", {"XFORMER_NAME", "C"});
-  workspace.link(1, "fo 0", 3, "fi 0 INPUT")
-      .link(4, "fo 0", 3, "fi 0 INPUT")
-      .link(3, "fo 0 OUTPUT", 2, "fi 0");
-  workspace.link(3, "fo 1 REST", 4, "fi 0").endCustom();
-  const Outcome outcome = translate(workspace);
-  EXPECT_EQ(outcome.diagnostics, QStringList());
-  for (const char* statement :
-       {"FACTORY_DEF * TransformFact:1:Looper FACTORY_NAME L ", "LOOPBACK_INPUT_TAG:AGAIN ",
-        "LOOPBACK_OUTPUT_TAG:INCOMPLETE ", "MAX_LOOP_ITERATIONS:4 ",
-        "INPUT INPUT FEATURE_TYPE \"$(Looper_WORKSPACE_NAME)_AGAIN\" ",
-        "INPUT FEATURE_TYPE \"$(Looper_WORKSPACE_NAME)_C_REST\" OUTPUT FEATURE_TYPE "
-        "\"$(Looper_WORKSPACE_NAME)_INCOMPLETE\"\n"})
-    EXPECT_TRUE(outcome.text.contains(statement)) << statement << "\n" << outcome.text.toStdString();
-}
-
-TEST(Translation, RefusesFaultyCustomTransformers) {
-  const struct {
-    SmallWorkspace workspace;
-    QStringList diagnostics;
-  } cases[] = {
-      {withCustom([](auto& w) {
-         w.transformer(9, "Nothing", {"XFORMER_NAME", "N"});
-       }),
-       {"unknown-transformer Cleaner/N"}},
-      {withCustom([](auto& w) { w.link(1, "fo 0", 77, "fi 0"); }), {"dangling-link Cleaner"}},
-      {withCustom([](auto& w) { w.link(3, "fo 0 OUTPUT", 3, "fi 0 INPUT"); }), {"cycle Cleaner"}},
-      {withCustom([](auto& w) {
-         w.transformer(9, "Copy", {"XFORMER_NAME", "N", "VALUE", "$[x"});
-       }),
-       {"unwritable-value Cleaner/N"}},
-      {withCustom([](auto& w) {
-         w.transformer(9, "Broken", {"XFORMER_NAME", "N"});
-       }),
-       {"not-written Cleaner/N"}},
-      {withCustom([](auto& w) { w.port(9, "A\nB", "false").link(3, "fo 0", 9, "fi 0"); }),
-       {"line-break Cleaner"}},
-      {withCustom([](auto& w) { w.port(9, "IN", "false"); }), {"duplicate-name Cleaner/IN"}},
-  };
-  for (const auto& test : cases) {
-    const Outcome outcome = translate(test.workspace);
-    EXPECT_EQ(outcome.diagnostics.mid(0, 1), test.diagnostics);
-    EXPECT_EQ(outcome.result, TranslationResult::Refused);
-    EXPECT_EQ(outcome.text, QString());
-  }
-  for (const char* name : {"Cleaner (2)", "A,B", "A$B", "A "}) {
-    SmallWorkspace workspace;
-    workspace.transformer(3, "SubDocumentTransformer", {"SUB_DOC_NAME", name, "XFORMER_NAME", "First"});
-    workspace.beginCustom(name, {}).endCustom();
-    EXPECT_EQ(translate(workspace).diagnostics.mid(0, 1), QStringList("nesting First")) << name;
-  }
 }
 
 TEST(Translation, MacrosInLookupsAreJudgedByTheirValues) {
@@ -336,121 +216,77 @@ TEST(Translation, LookupsInsideCustomTransformersAreJudgedByTheInstances) {
   }
 }
 
-TEST(Translation, RefusesWhatItCannotTranslate) {
-  const auto with = [](const std::function<void(SmallWorkspace&)>& change) {
-    SmallWorkspace workspace = copyBetween();
-    change(workspace);
-    return workspace;
+void expectRefused(const SmallWorkspace& workspace, const QStringList& diagnostics) {
+  const Outcome outcome = translate(workspace);
+  EXPECT_EQ(outcome.diagnostics.mid(0, diagnostics.size()), diagnostics);
+  EXPECT_EQ(outcome.result, TranslationResult::Refused);
+  EXPECT_EQ(outcome.text, QString());
+}
+
+TEST(Translation, RefusesFaultyCustomTransformers) {
+  const std::pair<Change, const char*> cases[] = {
+      {node("Nothing", {"XFORMER_NAME", "N"}, {}, 9), "unknown-transformer Cleaner/N"},
+      {linked(1, "fo 0", 77, "fi 0"), "dangling-link Cleaner"},
+      {linked(3, "fo 0 OUTPUT", 3, "fi 0 INPUT"), "cycle Cleaner"},
+      {valued("$[x"), "unwritable-value Cleaner/N"},
+      {node("Broken", {"XFORMER_NAME", "N"}), "not-written Cleaner/N"},
+      {port("A\nB"), "line-break Cleaner"},
+      {port("IN"), "duplicate-name Cleaner/IN"},
   };
-  const struct {
+  for (const auto& [change, diagnostic] : cases)
+    expectRefused(withCustom(change), {diagnostic});
+  for (const char* name : {"Cleaner (2)", "A,B", "A$B", "A "}) {
     SmallWorkspace workspace;
-    QStringList diagnostics;
-  } cases[] = {
-      {with([](auto& w) {
-         w.transformer(7, "Nothing", {"XFORMER_NAME", "N"});
-       }),
-       {"unknown-transformer N"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "N"}, {"VERSION", "9"});
-       }),
-       {"unknown-version N"}},
-      {with([](auto& w) {
-         w.transformer(7, "SubDocumentTransformer", {"XFORMER_NAME", "N"});
-       }),
-       {"custom-transformer N"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"COLOUR", "red"});
-       }),
-       {"unknown-parameter Copy_7"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "C"});
-       }),
-       {"duplicate-name C"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", QString("x").repeated(1030)})
-             .transformer(8, "Copy", {"XFORMER_NAME", QString("x").repeated(1031)});
-       }),
-       {"duplicate-name " + QString("x").repeated(1023)}},
-      {with([](auto& w) {
-         w.transformer(1, "Copy", {"XFORMER_NAME", "N"});
-       }),
-       {"duplicate-number N"}},
-      {with([](auto& w) { w.link(3, "fo 0 OUTPUT", 77, "fi 0"); }), {"dangling-link "}},
-      {with([](auto& w) { w.link(2, "fo 0", 3, "fi 0 INPUT"); }), {"bad-port Flooded"}},
-      {with([](auto& w) { w.link(3, "xo 0 OUTPUT", 2, "fi 0"); }), {"bad-port C"}},
-      {with([](auto& w) { w.link(3, "fo 0 OUTPUT", 2, "fo 0"); }), {"bad-port Flooded"}},
-      {with([](auto& w) { w.link(1, "fo 0", 3, "fi 0 MIDDLE"); }), {"unknown-input C"}},
-      {with([](auto& w) { w.link(3, "fo 2", 2, "fi 0"); }), {"unknown-output C"}},
-      {with([](auto& w) { w.link(3, "fo 1 REST", 3, "fi 0 INPUT"); }), {"cycle C"}},
-      {with([](auto& w) { w.parameter("nonsense", ""); }), {"bad-prompt-line "}},
-      {with([](auto& w) { w.parameter("GUI TEXT A P", "$[B"); }), {"unclosed-reference "}},
-      {with([](auto& w) { w.parameter("GUI TEXT A P", "a\nb"); }), {"line-break "}},
-      {with([](auto& w) { w.parameter("GUI TEXT A P", "a\\"); }), {"unwritable-value "}},
-      {with([](auto& w) { w.parameter("GUI TEXT \"A B\" P", "a"); }), {"unwritable-value "}},
-      {with([](auto& w) { w.parameter("GUI TEXT A<u000a>B P", "a"); }), {"unwritable-value "}},
-      {with([](auto& w) { w.reader(9, "$[B]$[").link(9, "fo 0", 3, "fi 0 INPUT"); }),
-       {"unclosed-reference $[B]$["}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "$[x"});
-       }),
-       {"unwritable-value N"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "1 OUTPUT X"});
-       }),
-       {"unwritable-value N"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "a OUTPUT x FEATURE_TYPE y"});
-       }),
-       {"unwritable-value N"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "@EvaluateExpression("});
-       }),
-       {"unwritable-value N"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "\""});
-       }),
-       {"unwritable-value N"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "N", "VALUE", "P"});
-       }),
-       {"unwritable-value N"}},
-      {with([](auto& w) {
-         w.transformer(7, "Copy", {"XFORMER_NAME", "a\\\" b"});
-       }),
-       {"unwritable-value a\\\" b"}},
-      {with([](auto& w) { w.reader(9, "a\\\" b").link(9, "fo 0", 3, "fi 0 INPUT"); }),
-       {"unwritable-value a\\\" b"}},
-      {with([](auto& w) {
-         w.transformer(7, "Nothing", {})
-             .transformer(8, "Copy", {"XFORMER_NAME", "C"})
-             .link(3, "fo 8", 2, "fi 0");
-       }),
-       {"unknown-transformer Nothing_7", "duplicate-name C", "unknown-output C"}},
-  };
-  for (const auto& test : cases) {
-    const Outcome outcome = translate(test.workspace);
-    EXPECT_EQ(outcome.diagnostics, test.diagnostics);
-    EXPECT_EQ(outcome.result, TranslationResult::Refused);
-    EXPECT_EQ(outcome.text, QString());
+    workspace.transformer(3, "SubDocumentTransformer", {"SUB_DOC_NAME", name, "XFORMER_NAME", "First"});
+    expectRefused(workspace.beginCustom(name, {}).endCustom(), {"nesting First"});
   }
 }
 
-TEST(Translation, EveryRuleHasItsTextInEveryLanguage) {
-  int place = 0;
-  for (const orx::RuleRow& rule : orx::ruleTable()) {
-    EXPECT_EQ(static_cast<int>(rule.rule), place++);
-    if (rule.message == 0)
-      continue;
-    QStringList texts;
-    for (const char* language : {"en", "de", "fr"}) {
-      QORXSetLanguage(language);
-      orx::Findings diagnostics("f");
-      diagnostics.report(rule.rule, 1, "n");
-      texts << diagnostics.all().front().text;
-    }
-    QORXSetLanguage("en");
-    EXPECT_FALSE(texts.contains(QString())) << rule.name.latin1();
-    EXPECT_EQ(texts.removeDuplicates(), 0) << rule.name.latin1();
+TEST(Translation, RefusesWhatItCannotTranslate) {
+  const QString tooLong = QString("x").repeated(1030);
+  const std::pair<Change, QStringList> cases[] = {
+      {node("Nothing", {"XFORMER_NAME", "N"}), {"unknown-transformer N"}},
+      {node("Copy", {"XFORMER_NAME", "N"}, {"VERSION", "9"}), {"unknown-version N"}},
+      {node("SubDocumentTransformer", {"XFORMER_NAME", "N"}), {"custom-transformer N"}},
+      {node("Copy", {"COLOUR", "red"}), {"unknown-parameter Copy_7"}},
+      {node("Copy", {"XFORMER_NAME", "C"}), {"duplicate-name C"}},
+      {[&](SmallWorkspace& w) {
+         node("Copy", {"XFORMER_NAME", tooLong})(w);
+         node("Copy", {"XFORMER_NAME", tooLong + "x"}, {}, 8)(w);
+       },
+       {"duplicate-name " + tooLong.left(1023)}},
+      {node("Copy", {"XFORMER_NAME", "N"}, {}, 1), {"duplicate-number N"}},
+      {linked(3, "fo 0 OUTPUT", 77, "fi 0"), {"dangling-link "}},
+      {linked(2, "fo 0", 3, "fi 0 INPUT"), {"bad-port Flooded"}},
+      {linked(3, "xo 0 OUTPUT", 2, "fi 0"), {"bad-port C"}},
+      {linked(3, "fo 0 OUTPUT", 2, "fo 0"), {"bad-port Flooded"}},
+      {linked(1, "fo 0", 3, "fi 0 MIDDLE"), {"unknown-input C"}},
+      {linked(3, "fo 2", 2, "fi 0"), {"unknown-output C"}},
+      {linked(3, "fo 1 REST", 3, "fi 0 INPUT"), {"cycle C"}},
+      {parameter("nonsense", ""), {"bad-prompt-line "}},
+      {parameter("GUI TEXT A P", "$[B"), {"unclosed-reference "}},
+      {parameter("GUI TEXT A P", "a\nb"), {"line-break "}},
+      {parameter("GUI TEXT A P", "a\\"), {"unwritable-value "}},
+      {parameter("GUI TEXT \"A B\" P", "a"), {"unwritable-value "}},
+      {parameter("GUI TEXT A<u000a>B P", "a"), {"unwritable-value "}},
+      {reading("$[B]$["), {"unclosed-reference $[B]$["}},
+      {reading("a\\\" b"), {"unwritable-value a\\\" b"}},
+      {valued("$[x"), {"unwritable-value N"}},
+      {valued("a OUTPUT x FEATURE_TYPE y"), {"unwritable-value N"}},
+      {valued("@EvaluateExpression("), {"unwritable-value N"}},
+      {valued("P"), {"unwritable-value N"}},
+      {node("Copy", {"XFORMER_NAME", "a\\\" b"}), {"unwritable-value a\\\" b"}},
+      {[](SmallWorkspace& w) {
+         node("Nothing", {})(w);
+         node("Copy", {"XFORMER_NAME", "C"}, {}, 8)(w);
+         w.link(3, "fo 8", 2, "fi 0");
+       },
+       {"unknown-transformer Nothing_7", "duplicate-name C", "unknown-output C"}},
+  };
+  for (const auto& [change, diagnostics] : cases) {
+    SmallWorkspace workspace = copyBetween();
+    change(workspace);
+    expectRefused(workspace, diagnostics);
   }
 }
 
@@ -504,25 +340,6 @@ TEST(Translation, TruncatedDocumentsAreRefused) {
               TranslationResult::Refused)
         << length;
     EXPECT_TRUE(diagnostics.hasErrors()) << length;
-  }
-}
-
-TEST(Translation, TheSameDocumentGivesTheSameBytes) {
-  QString first;
-  for (int run = 0; run < 3; ++run) {
-    QTemporaryDir folder;
-    SmallSource source;
-    SmallWorkspace workspace = copyBetween();
-    workspace.parameter("GUI TEXT Speed Prompt", "Fast")
-        .transformer(8, "Pick", {"XFORMER_NAME", "P", "MODE", "$(Speed)"});
-    const QString file = workspace.save(folder, QString("name%1.orw").arg(run));
-    orx::Findings diagnostics(file);
-    QString error;
-    const QString output = folder.filePath("out");
-    ASSERT_EQ(translateWorkspace({file, output, {}}, source, diagnostics, error), TranslationResult::Done);
-    if (run == 0)
-      first = readAll(output);
-    EXPECT_EQ(readAll(output), first);
   }
 }
 
