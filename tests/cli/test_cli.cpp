@@ -4,9 +4,6 @@
 
 #include <QDir>
 #include <QFile>
-#include <QJsonArray>
-#include <QJsonDocument>
-#include <QJsonObject>
 #include <QTemporaryDir>
 #include <gtest/gtest.h>
 
@@ -69,15 +66,6 @@ TEST(CommandLine, GeneratesManyWorkspacesAtOnce) {
     EXPECT_EQ(readAll(out.filePath(name)), readAll(sample(name))) << name.toStdString();
 }
 
-TEST(CommandLine, StandardOutputThatTakesNothingIsAnError) {
-  for (const QStringList& arguments :
-       {QStringList{"transformers", "list"}, QStringList{"generate", samples().first()}}) {
-    const Outcome run = orxt(arguments, QString(), "/dev/full");
-    EXPECT_EQ(run.status, 3) << arguments.join(' ').toStdString();
-    EXPECT_NE(run.err, QString());
-  }
-}
-
 TEST(CommandLine, WithoutItsHomeADiagnosticStillTellsWhatIsMeant) {
   const QByteArray home = qgetenv("ORX_HOME");
   qputenv("ORX_HOME", "/nowhere");
@@ -88,23 +76,6 @@ TEST(CommandLine, WithoutItsHomeADiagnosticStillTellsWhatIsMeant) {
   EXPECT_TRUE(lossy.err.contains("370768 OTHER WORKSPACE")) << lossy.err.toStdString();
   EXPECT_EQ(run.status, 1);
   EXPECT_TRUE(run.err.contains("unknown-transformer AreaClipper")) << run.err.toStdString();
-}
-
-TEST(CommandLine, TheCatalogueAsJson) {
-  const Outcome list = orxt({"transformers", "list", "--json", "--lang", "de"});
-  const QJsonArray entries = QJsonDocument::fromJson(list.out.toUtf8()).array();
-  EXPECT_GE(entries.size(), 20);
-  QString previous;
-  for (const QJsonValue& entry : entries) {
-    const QString name = entry.toObject().value("name").toString();
-    EXPECT_LT(previous, name);
-    previous = name;
-    EXPECT_FALSE(entry.toObject().value("summary").toString().isEmpty()) << name.toStdString();
-  }
-  const Outcome show = orxt({"transformers", "show", "GeometryBufferer", "--json"});
-  const QJsonObject shown = QJsonDocument::fromJson(show.out.toUtf8()).object();
-  EXPECT_EQ(shown.value("name").toString(), QString("GeometryBufferer"));
-  EXPECT_FALSE(shown.value("parameters").toArray().isEmpty());
 }
 
 }  // namespace

@@ -184,8 +184,9 @@ TEST(DocumentCommands, TellTheFormOfAFileAlike) {
 }
 
 TEST(DocumentCommands, StandardOutputThatTakesNothingIsAnError) {
-  for (const char* const command : {"info", "format"}) {
-    const Outcome run = orxt({command, samples().first()}, QString(), "/dev/full");
+  for (const char* const command : {"info", "format", "generate", "transformers list"}) {
+    const QStringList arguments = QString(command).split(' ') + samples().mid(0, *command != 't');
+    const Outcome run = orxt(arguments, QString(), "/dev/full");
     EXPECT_EQ(run.status, 3) << command;
     EXPECT_TRUE(run.err.contains("standard output")) << run.err.toStdString();
   }

@@ -249,21 +249,12 @@ TEST(ScriptBlocks, ExactText) {
                                 "if value == None:", "  return { macroName : '' }",
                                 "else:", "  return { macroName : str(value) }", "END_INCLUDE"}));
   lines.clear();
-  getPythonParameterLines("", "P", "", lines);
-  EXPECT_EQ(lines.mid(0, 4),
-            (QStringList{"INCLUDE PYTHON", "def ParamFunc():", "value = ParamFunc()", "macroName = 'P'"}));
-  lines.clear();
   getTclParameterLines("PRE", "P", QORXWwjdEncode("  set a $ORX_MacroValues(A)\n\n\t$a "), lines);
   EXPECT_EQ(lines,
             (QStringList{"INCLUDE TCL", "proc ParamFunc {} {", " upvar ORX_MacroValues ORX_MacroValues",
                          "set a $ORX_MacroValues($ORX_MacroValues(PRE)_A)", "", "return $a", "}",
                          "set macroName \"$ORX_MacroValues(PRE)_P\"",
                          "puts \"MACRO $macroName [ParamFunc]\" ", "END_INCLUDE"}));
-  lines.clear();
-  getTclParameterLines("", "P", "", lines);
-  EXPECT_EQ(lines,
-            (QStringList{"INCLUDE TCL", "proc ParamFunc {} {", " upvar ORX_MacroValues ORX_MacroValues", "}",
-                         "puts \"MACRO P [ParamFunc]\" ", "END_INCLUDE"}));
 }
 
 TEST(ScriptBlocks, NamesCannotBreakOut) {
