@@ -3,6 +3,7 @@
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/ScriptParameters.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MessageStrings.h>
@@ -45,6 +46,9 @@ class Validation {
   void checkTransformers(const Workspace& workspace, bool isConnected);
   void checkInside(const ExternalDocNetwork& network, const Workspace& workspace);
   void checkAge(const TransformerCfg& cfg, int line, const QString& title);
+  void checkParameterValues(const Workspace& workspace);
+  void checkParameterValue(const Workspace& workspace, const GlobalParameterStruct& parameter,
+                           const GUIType& type, const QString& document);
   void checkParameterUse(const Workspace& workspace);
   void collectReferences(ReferencedNames& names) const;
   bool isKnown(const GlobalParameters& parameters, const QString& name) const;
@@ -76,6 +80,7 @@ void Validation::run() {
   checkTransformers(*workspace, writer.isConnected());
   for (const ExternalDocNetwork* network : workspace->customTransformers())
     checkInside(*network, *workspace);
+  checkParameterValues(*workspace);
   checkParameterUse(*workspace);
   fit_checks::checkParameters(m_reader, workspace->parameters, m_diagnostics);
 }
@@ -200,6 +205,28 @@ void Validation::collectReferences(ReferencedNames& names) const {
     }
     for (const ConstantStruct& constant : m_reader.GetConstantList(document))
       names.add(constant.constValue);
+  }
+}
+
+// A parameter's value is expanded where the parameter is referred to; inside a custom transformer its own
+// parameters have other names.
+void Validation::checkParameterValues(const Workspace& workspace) {
+  for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList()) {
+    for (const GlobalParameterStruct& parameter : m_reader.GetGlobalParameterList(document)) {
+      const GUIType type = GUIType::fromGuiLine(parameter.guiLine);
+      if (scriptLanguage(type) == ScriptLanguage::None)
+        checkParameterValue(workspace, parameter, type, document);
+    }
+  }
+}
+
+void Validation::checkParameterValue(const Workspace& workspace, const GlobalParameterStruct& parameter,
+                                     const GUIType& type, const QString& document) {
+  for (const QString& name : ReferencedNames::inValue(parameter.defaultValue)) {
+    if (!isKnown(workspace.parameters, name))
+      m_diagnostics.reportParameter(
+          Rule::UnknownReference, parameter.line, document, type.getName(),
+          type.getName() + QLatin1String(": ") + m_values.referenceText(name, m_parameterNames));
   }
 }
 

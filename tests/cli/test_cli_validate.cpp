@@ -52,7 +52,7 @@ TEST(Validate, EndsWithTheStatusThatFits) {
       {{"references.orw", "--rule", "missing-file=off"},
        1,
        7,
-       "Workspaces: 1. Errors: 1, warnings: 4, hints: 2.\n"},
+       "Workspaces: 1. Errors: 4, warnings: 1, hints: 2.\n"},
       {{"loose-ends.orw", "--rule", "unfed-input=hint", "--rule", "unfed-input=error", "-q"}, 1, 2, ""},
       {{"cycle.orw", "--rule", "cycle=warning"}, 2, 1, ""},
       {{"cycle.orw", "--rule", "cycle=off"}, 2, 1, ""},

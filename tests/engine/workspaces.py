@@ -18,9 +18,6 @@ HOSTILE = [
     "]]>", "a/b", "a.b{0}", "<Unused>"]
 # Not drawn while it is being mended: where a text stands, and which texts, as patterns.
 KNOWN = [
-    ("reader|writer|name|instance|port|custom|attribute|choice|[A-Z_]+$(?<!_ENCODED)", r"\$[([]"),
-    ("custom", r"[^\w ]"),
-    ("name|instance|attribute|[A-Z_]+$(?<!_ENCODED)", r"@\w+\("),
     (".*_ENCODED", "^@Value"),
 ]
 

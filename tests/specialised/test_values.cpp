@@ -210,11 +210,12 @@ TEST(Values, TextsInXmlAndJson) {
   }
   const char* const xml = "XMLTemplater";
   for (const ValueCase& c : std::vector<ValueCase>{
-           {"XMLUpdater", "UPDATES= a ;REMOVE;gone;XML", "", "a;REMOVE;\"\";XML"},
+           {"XMLUpdater", "UPDATES=a;REMOVE;gone;XML", "", "a;REMOVE;\"\";XML"},
+           {"XMLUpdater", "UPDATES= a ;REMOVE;gone;XML", "370714|1|370713| a "},
            {"XMLUpdater", "UPDATES=$a;REPLACE;x;TEXT", "", ""},
-           {"JSONUpdater", "UPDATES=$.a.b;REPLACE;1;JSON", "", "a.b;REPLACE;1;JSON"},
+           {"JSONUpdater", "UPDATES=$.a.b;REPLACE;1;JSON", "", "<dollarsign>.a.b;REPLACE;1;JSON"},
            {"JSONUpdater", "UPDATES=`<dollarsign><leftsquarebracket>0<rightsquarebracket>;REPLACE;1;JSON", "",
-            "<leftsquarebracket>0<rightsquarebracket>;REPLACE;1;JSON"},
+            "<dollarsign><leftsquarebracket>0<rightsquarebracket>;REPLACE;1;JSON"},
            {"JSONUpdater", "UPDATES=@Value(a);REPLACE;@Value(b);JSON", "", "{PATH:a};REPLACE;{VALUE:b};JSON"},
            {xml, "SUB_TEMPLATES=P;<x/>text<y/>;Q_2;@Template(P)", ""},
            {xml, "SUB_TEMPLATES=P;</x><x>", "P: 370708|1"},

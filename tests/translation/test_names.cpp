@@ -50,7 +50,8 @@ TEST(ReferencedNames, AreFoundHoweverTheyAreWritten) {
     EXPECT_TRUE(names.contains(name)) << name;
   for (const char* name : {"UNCLOSED", "NOWHERE", "a"})
     EXPECT_FALSE(names.contains(name)) << name;
-  EXPECT_EQ(ReferencedNames::inValue("$(B) $(A) $(B) $(ls -l) $[C] $() $(1)"), (QStringList{"B", "A", "C"}));
+  EXPECT_EQ(ReferencedNames::inValue("$(B) $(A) $(B) $(ls -l) $[C] $() $(1)"),
+            (QStringList{"B", "A", "C", "1"}));
 }
 
 }  // namespace

@@ -4,8 +4,8 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/ScriptParameters.h>
 #include <transform/custom/instance/InstancePrototype.h>
-#include <transform/custom/instance/ScriptParameters.h>
 #include <transform/custom/linked/CustomMessages.h>
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/MessageStrings.h>

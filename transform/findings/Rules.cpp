@@ -58,7 +58,7 @@ const std::vector<RuleRow>& ruleTable() {
       {Rule::UnusedParameter, QLatin1String("unused-parameter"), Severity::Hint, RuleKind::Judgement, 370864},
       {Rule::UnusedCustomTransformer, QLatin1String("unused-custom-transformer"), Severity::Hint,
        RuleKind::Judgement, 370870},
-      {Rule::UnknownReference, QLatin1String("unknown-reference"), Severity::Warning, RuleKind::Judgement,
+      {Rule::UnknownReference, QLatin1String("unknown-reference"), Severity::Error, RuleKind::Judgement,
        370865},
       {Rule::ConflictMark, QLatin1String("conflict-mark"), Severity::Error, RuleKind::Judgement, 371314},
       {Rule::MalformedValue, QLatin1String("malformed-value"), Severity::Error, RuleKind::Judgement, 371317},

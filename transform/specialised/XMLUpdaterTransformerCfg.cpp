@@ -56,7 +56,7 @@ bool isPath(const QString& path, bool isJson) {
 
 // In JSON "$" stands for the root, which every path begins at.
 QString fromRoot(const QString& encodedPath, bool isJson) {
-  QString path = QORXWwjdDecode(encodedPath).trimmed();
+  QString path = QORXWwjdDecode(encodedPath);
   if (isJson && path.startsWith(kJsonRoot)) {
     const bool hasSteps = path.size() > 1;
     path.remove(0, hasSteps && path.at(1) == QLatin1Char('.')   ? 2
@@ -123,10 +123,6 @@ QString XMLUpdaterTransformerCfg::getParameterValueForMappingFile(const QString&
     return TransformerCfg::getParameterValueForMappingFile(name, parameter, buffer);
   }
   for (int row = 0; row < updates.rowCount(); ++row) {
-    const QString path = updates.cell(row, kPath);
-    if (!isOpenValue(path)) {
-      updates.setCell(row, kPath, QORXWwjdEncode(fromRoot(path, m_isJson)));
-    }
     if (updates.cell(row, kAction) == kRemove) {
       updates.setCell(row, kValue, QString());
     }

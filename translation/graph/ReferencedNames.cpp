@@ -3,19 +3,12 @@
 #include <transform/text/MFBuffer.h>
 #include <translation/graph/ReferencedNames.h>
 
-#include <algorithm>
-
 namespace {
 
 const QLatin1String kScriptTable("ORX_MacroValues");
 
 bool isWordCharacter(QChar c) {
   return c.isLetterOrNumber() || c == QLatin1Char('_') || c == QLatin1Char('-') || c == QLatin1Char('.');
-}
-
-bool isParameterName(const QString& name) {
-  return !name.isEmpty() && (name.at(0).isLetter() || name.at(0) == QLatin1Char('_')) &&
-         std::all_of(name.begin(), name.end(), isWordCharacter);
 }
 
 QString withOrdinaryReferences(const QString& text) {
@@ -47,7 +40,7 @@ QStringList ReferencedNames::inValue(const QString& value) {
   QStringList names;
   QSet<QString> seen;
   anyParameterReference(withOrdinaryReferences(value), [&](const QString& name) {
-    if (isParameterName(name) && !seen.contains(name)) {
+    if (!seen.contains(name)) {
       seen.insert(name);
       names.append(name);
     }

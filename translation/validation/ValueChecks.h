@@ -35,6 +35,8 @@ class ValueChecks {
 
   // `names` are those that references may be told to mean.
   void check(const Node& node, const Knows& knows, const QStringList& names);
+  // What is to be said about a reference that leads nowhere.
+  QString referenceText(const QString& name, const QStringList& names);
 
  private:
   // The fixed text around the argument of a message, by which a refusal's rule is told.
@@ -60,7 +62,6 @@ class ValueChecks {
   // Whether a finding of the rule counts as much as one about a reference.
   bool standsForReferences(orx::Rule rule) const;
   void reportReferences(const Node& node, LooseReferences& loose, const QStringList& names);
-  QString referenceText(const QString& name, const QStringList& names);
   // Empty when no name comes near.
   QString suggestion(const QString& name, const QStringList& candidates);
   orx::Rule ruleOf(const QString& message) const;

@@ -112,8 +112,9 @@ long MappingFileChecks::refuseMembers(const TransformParamCfg& record, const QSt
 long MappingFileChecks::refuseToken(const GUIType& type, const QString& stored,
                                     const QString& written) const {
   // Calls that were made for the value are sound, and so is what a class of its own makes of it.
-  const bool isMade = typeid(m_cfg) != typeid(TransformerCfg) && written != stored;
-  if (isMade || ExpressionWriter::needsWrapping(type, stored) || written.startsWith(kTclCall)) {
+  const bool isMade =
+      written != stored && (typeid(m_cfg) != typeid(TransformerCfg) || written.startsWith(kTclCall));
+  if (isMade || ExpressionWriter::needsWrapping(type, stored)) {
     return 0;
   }
   const ConfiguredDefinition* definition = m_cfg.definition();

@@ -3,6 +3,7 @@
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/ScriptParameters.h>
 #include <transform/custom/instance/InnerTransformerListener.h>
 
 namespace {
@@ -39,8 +40,8 @@ QString InnerTransformerListener::resolve(const QString& value) const {
     left.replacements = 0;
   int length = value.size();
   const QString resolved = replaceParameterReferences(value, [&](const QString& name, QString& replacement) {
-    if (!m_network.hasParameter(name) || left.depth > CompoundTransformerNetwork::kDeepestNesting ||
-        ++left.replacements > kMostReplacements)
+    if (!m_network.hasParameter(name) || isScript(name) ||
+        left.depth > CompoundTransformerNetwork::kDeepestNesting || ++left.replacements > kMostReplacements)
       return false;
     replacement = valueOf(name);
     length += replacement.size();
@@ -48,6 +49,11 @@ QString InnerTransformerListener::resolve(const QString& value) const {
   });
   --left.depth;
   return resolved;
+}
+
+// What a script gives is known when it has run, not before.
+bool InnerTransformerListener::isScript(const QString& parameter) const {
+  return scriptLanguage(m_network.getParameterInfo(parameter)->type) != ScriptLanguage::None;
 }
 
 bool InnerTransformerListener::isScopeParameter(const QString& name) const {

@@ -15,6 +15,7 @@ class InnerTransformerListener : public ParameterScopeListener {
 
  protected:
   bool isScopeParameter(const QString& name) const override;
+  bool isScript(const QString& parameter) const;
   // References to published parameters become the values that these have in the instance that asked last, or
   // their defaults when none did.
   QString resolve(const QString& value) const override;
