@@ -79,29 +79,22 @@ class AtomicFiles : public testing::Test {
   QTemporaryDir m_folder;
 };
 
-TEST_F(AtomicFiles, AppearsWhenCommitted) {
-  AtomicFile file(path("new.txt"));
-  ASSERT_TRUE(file.open()) << qPrintable(file.errorString());
-  const QByteArray large(300 * 1000, 'x');
-  file.device().write("head\n");
-  file.device().write(large);
-  EXPECT_FALSE(QFile::exists(path("new.txt")));
-  ASSERT_TRUE(file.commit()) << qPrintable(file.errorString());
-  EXPECT_EQ(contentOf(path("new.txt")), "head\n" + large);
-  EXPECT_EQ(entries(), QStringList{text("new.txt")});
-  EXPECT_FALSE(file.commit());
-}
-
-TEST_F(AtomicFiles, LeavesTheOldFileWithoutCommit) {
-  put(path("old.txt"), "old");
-  {
-    AtomicFile file(path("old.txt"));
-    ASSERT_TRUE(file.open());
-    file.device().write(QByteArray(100 * 1000, 'n'));
-    EXPECT_EQ(contentOf(path("old.txt")), "old");
+TEST_F(AtomicFiles, AppearsWhenCommittedAndNeverWithout) {
+  put(path("old"), "old");
+  for (const char* name : {"new", "old"}) {
+    const QByteArray before = contentOf(path(name));
+    const QByteArray large(300 * 1000, 'x');
+    for (const bool isCommitted : {false, true}) {
+      AtomicFile file(path(name));
+      ASSERT_TRUE(file.open()) << qPrintable(file.errorString());
+      file.device().write("head\n");
+      file.device().write(large);
+      EXPECT_EQ(contentOf(path(name)), before);
+      EXPECT_TRUE(!isCommitted || (file.commit() && !file.commit()));
+    }
+    EXPECT_EQ(contentOf(path(name)), "head\n" + large);
   }
-  EXPECT_EQ(contentOf(path("old.txt")), "old");
-  EXPECT_EQ(entries(), QStringList{text("old.txt")});
+  EXPECT_EQ(entries(), (QStringList{text("new"), text("old")}));
 }
 
 TEST_F(AtomicFiles, KeepsPermissions) {

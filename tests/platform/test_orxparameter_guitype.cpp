@@ -75,45 +75,38 @@ TEST(GUIType, ParsingAndWritingAreInverse) {
 }
 
 TEST(GUIType, ReadsPromptLines) {
-  struct Case {
-    const char* line;
-    const char* type;
-    const char* name;
-    const char* config;
-    const char* prompt;
-    unsigned flags;
-    const char* written;  // null: the line itself
-  };
-  const Case cases[] = {
-      {"GUI TEXT XFORMER_NAME Name:", "TEXT", "XFORMER_NAME", "", "Name:", 0, nullptr},
-      {"GUI CHOICE MODE \"No Parallelism\"%Minimal Process mode:", "CHOICE", "MODE",
-       "\"No Parallelism\"%Minimal", "Process mode:", 0, nullptr},
-      {"GUI OMITTABLE INSTANCE_MACROS OPTIONAL INT N A number", "INT", "N", "", "A number",
-       kGUITypeOptional | kGUITypeOmittable | kGUITypeInstanceMacros,
-       "GUI OPTIONAL OMITTABLE INSTANCE_MACROS INT N A number"},
-      {"GUI  OPTIONAL\tATTR   A\tALLOW_NEW  Pick one\r\n", "ATTR", "A", "ALLOW_NEW", " Pick one",
-       kGUITypeOptional, "GUI OPTIONAL ATTR A ALLOW_NEW  Pick one"},
-      {"GUI NAMEDGROUP NO_EDIT DYNGROUP_1 A%B Group", "NAMEDGROUP NO_EDIT", "DYNGROUP_1", "A%B", "Group", 0,
-       nullptr},
-      {"GUI NAMEDGROUP G NO_EDIT Group", "NAMEDGROUP", "G", "\"NO_EDIT\"", "Group", 0,
-       "GUI NAMEDGROUP G \"NO_EDIT\" Group"},
-      {"GUI NAMEDGROUP \"NO_EDIT\" \"\" Group", "NAMEDGROUP", "NO_EDIT", "", "Group", 0, nullptr},
-      {"GUI LISTBOX L", "LISTBOX", "L", "", "", 0, "GUI LISTBOX L \"\""},
-      {"GUI CHOICE C \"open%B Prompt", "CHOICE", "C", "\"\"\"open\"%B", "Prompt", 0,
-       "GUI CHOICE C \"\"\"open\"%B Prompt"},
-      {"GUI WIBBLE W a%b Prompt", "WIBBLE", "W", "", "a%b Prompt", 0, nullptr},
-      {"GUI TEXT \"two words\"x Prompt", "TEXT", "\"two", "", "words\"x Prompt", 0,
-       "GUI TEXT \"\"\"two\" words\"x Prompt"},
-  };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.line);
-    const GUIType type = GUIType::fromGuiLine(u8(c.line));
-    EXPECT_EQ(type.getType(), u8(c.type));
-    EXPECT_EQ(type.getName(), u8(c.name));
-    EXPECT_EQ(type.getConfigToken(), u8(c.config));
-    EXPECT_EQ(type.getDescription(), u8(c.prompt));
-    EXPECT_EQ(type.getFlags(), c.flags);
-    EXPECT_EQ(type.getAsString(), u8(c.written ? c.written : c.line));
+  // `written`: null: the line itself
+  const std::tuple<const char*, const char*, const char*, const char*, const char*, unsigned, const char*>
+      cases[] = {
+          {"GUI TEXT XFORMER_NAME Name:", "TEXT", "XFORMER_NAME", "", "Name:", 0, nullptr},
+          {"GUI CHOICE MODE \"No Parallelism\"%Minimal Process mode:", "CHOICE", "MODE",
+           "\"No Parallelism\"%Minimal", "Process mode:", 0, nullptr},
+          {"GUI OMITTABLE INSTANCE_MACROS OPTIONAL INT N A number", "INT", "N", "", "A number",
+           kGUITypeOptional | kGUITypeOmittable | kGUITypeInstanceMacros,
+           "GUI OPTIONAL OMITTABLE INSTANCE_MACROS INT N A number"},
+          {"GUI  OPTIONAL\tATTR   A\tALLOW_NEW  Pick one\r\n", "ATTR", "A", "ALLOW_NEW", " Pick one",
+           kGUITypeOptional, "GUI OPTIONAL ATTR A ALLOW_NEW  Pick one"},
+          {"GUI NAMEDGROUP NO_EDIT DYNGROUP_1 A%B Group", "NAMEDGROUP NO_EDIT", "DYNGROUP_1", "A%B", "Group",
+           0, nullptr},
+          {"GUI NAMEDGROUP G NO_EDIT Group", "NAMEDGROUP", "G", "\"NO_EDIT\"", "Group", 0,
+           "GUI NAMEDGROUP G \"NO_EDIT\" Group"},
+          {"GUI NAMEDGROUP \"NO_EDIT\" \"\" Group", "NAMEDGROUP", "NO_EDIT", "", "Group", 0, nullptr},
+          {"GUI LISTBOX L", "LISTBOX", "L", "", "", 0, "GUI LISTBOX L \"\""},
+          {"GUI CHOICE C \"open%B Prompt", "CHOICE", "C", "\"\"\"open\"%B", "Prompt", 0,
+           "GUI CHOICE C \"\"\"open\"%B Prompt"},
+          {"GUI WIBBLE W a%b Prompt", "WIBBLE", "W", "", "a%b Prompt", 0, nullptr},
+          {"GUI TEXT \"two words\"x Prompt", "TEXT", "\"two", "", "words\"x Prompt", 0,
+           "GUI TEXT \"\"\"two\" words\"x Prompt"},
+      };
+  for (const auto& [line, wantedType, name, config, prompt, flags, written] : cases) {
+    SCOPED_TRACE(line);
+    const GUIType type = GUIType::fromGuiLine(u8(line));
+    EXPECT_EQ(type.getType(), u8(wantedType));
+    EXPECT_EQ(type.getName(), u8(name));
+    EXPECT_EQ(type.getConfigToken(), u8(config));
+    EXPECT_EQ(type.getDescription(), u8(prompt));
+    EXPECT_EQ(type.getFlags(), flags);
+    EXPECT_EQ(type.getAsString(), u8(written ? written : line));
   }
   for (const char* line : {"", "GUI", "GUI ", "GUI TEXT", "GUI TEXT  ", "GUI OPTIONAL TEXT", " GUI TEXT A p",
                            "gui TEXT A p", "GUITEXT A p", "GUI\tTEXT A p", "GUI OPTIONAL OMITTABLE"}) {
@@ -122,13 +115,7 @@ TEST(GUIType, ReadsPromptLines) {
 }
 
 TEST(GUIType, ReadsTypeTexts) {
-  struct Case {
-    const char* text;
-    const char* type;
-    const char* config;
-    const char* written;
-  };
-  const Case cases[] = {
+  const std::tuple<const char*, const char*, const char*, const char*> cases[] = {
       {"TEXT", "TEXT", "", "TEXT"},
       {" OMITTABLE  OPTIONAL FLOAT ", "FLOAT", "", "OPTIONAL OMITTABLE FLOAT"},
       {"CHOICE \"\"", "CHOICE", "", "CHOICE"},
@@ -141,12 +128,12 @@ TEST(GUIType, ReadsTypeTexts) {
       {"WIBBLE a b", "WIBBLE", "\"a b\"", "WIBBLE \"a b\""},
       {"CHOICE \"a\nb\"", "CHOICE", "\"a<u000a>b\"", "CHOICE \"a<u000a>b\""},
   };
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.text);
-    const GUIType type = GUIType::fromTransformerTypeString(u8(c.text), u8("N"), u8("P"));
-    EXPECT_EQ(type.getType(), u8(c.type));
-    EXPECT_EQ(type.getConfigToken(), u8(c.config));
-    EXPECT_EQ(type.getTypeText(), u8(c.written));
+  for (const auto& [text, wantedType, config, written] : cases) {
+    SCOPED_TRACE(text);
+    const GUIType type = GUIType::fromTransformerTypeString(u8(text), u8("N"), u8("P"));
+    EXPECT_EQ(type.getType(), u8(wantedType));
+    EXPECT_EQ(type.getConfigToken(), u8(config));
+    EXPECT_EQ(type.getTypeText(), u8(written));
     EXPECT_EQ(type.getName(), u8("N"));
     EXPECT_EQ(type.getDescription(), u8("P"));
   }
@@ -185,21 +172,17 @@ TEST(ConfigToken, PiecesComeBackUnquoted) {
 
 // Content made to hurt: must end soon, with a result that survives being written and read.
 TEST(GUIType, HostileTextEndsInAResult) {
-  const int size = 150000;
-  const QString heads[] = {u8("GUI CHOICE C "), u8("GUI "), u8("GUI TEXT "), u8("GUI MULTIPARAMETER M "),
-                           u8("GUI OPTIONAL TEXT N ")};
-  const char* const parts[] = {"\"",           "\"\"", "\",",     "%",         ",",  " ",
-                               "\"a,\"\"b c,", "<",    "<u000a>", "OPTIONAL ", "\n", "\\"};
   QElapsedTimer timer;
   timer.start();
-  for (const QString& head : heads) {
-    for (const char* part : parts) {
-      const QString line = head + u8(part).repeated(size / int(qstrlen(part)));
+  for (const char* head :
+       {"GUI CHOICE C ", "GUI ", "GUI TEXT ", "GUI MULTIPARAMETER M ", "GUI OPTIONAL TEXT N "}) {
+    for (const QString& part :
+         QString("\"|\"\"|\",|%|,| |\"a,\"\"b c,|<|<u000a>|OPTIONAL |\n|\\").split('|')) {
+      const QString line = head + part.repeated(150000 / part.size());
       const GUIType type = GUIType::fromGuiLine(line);
-      const GUIType again = GUIType::fromGuiLine(type.getAsString());
-      EXPECT_EQ(again, type) << qPrintable(head) << part;
+      EXPECT_EQ(GUIType::fromGuiLine(type.getAsString()), type) << head << qPrintable(part);
       const GUIType text = GUIType::fromTransformerTypeString(line.mid(4));
-      EXPECT_EQ(GUIType::fromTransformerTypeString(text.getTypeText()), text) << qPrintable(head) << part;
+      EXPECT_EQ(GUIType::fromTransformerTypeString(text.getTypeText()), text) << head << qPrintable(part);
     }
   }
   EXPECT_LT(timer.elapsed(), 20000);

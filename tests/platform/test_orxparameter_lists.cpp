@@ -147,13 +147,7 @@ TEST(MemberList, FaultyConfigurations) {
 }
 
 TEST(MemberList, SettingOnePartLeavesTheOthersAlone) {
-  struct Case {
-    const char* value;
-    const char* member;
-    const char* part;
-    const char* result;
-  };
-  const Case cases[] = {
+  const std::tuple<const char*, const char*, const char*, const char*> cases[] = {
       {"", "A", "1", "A;1"},
       {"A;1;B;2", "A", "x;y", "A;\"x;y\";B;2"},
       {"A;1;B;2", "B", "", "A;1;B;\"\""},
@@ -170,11 +164,11 @@ TEST(MemberList, SettingOnePartLeavesTheOthersAlone) {
       {"A;1", "A", " two\nlines\" ", "A;\" two\nlines\"\" \""},
   };
   const MemberList list(multiParameter(QLatin1Char(';'), "GUI TEXT A a", "GUI TEXT B b"));
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.value);
-    const QString result = list.withMemberValue(u8(c.value), u8(c.member), u8(c.part));
-    EXPECT_EQ(result, u8(c.result));
-    EXPECT_EQ(list.memberValue(result, u8(c.member)), u8(c.part));
+  for (const auto& [value, member, part, wantedResult] : cases) {
+    SCOPED_TRACE(value);
+    const QString result = list.withMemberValue(u8(value), u8(member), u8(part));
+    EXPECT_EQ(result, u8(wantedResult));
+    EXPECT_EQ(list.memberValue(result, u8(member)), u8(part));
   }
   EXPECT_EQ(list.memberValue(u8("A;1;B;2"), u8("1")), QString());
   EXPECT_EQ(list.memberValue(u8("A;1;B"), u8("B")), QString());

@@ -110,23 +110,19 @@ TEST_F(Utilities, MessagesComeInTheCurrentLanguageElseInEnglish) {
       "tab\n-7\tseven\n"
       "6\t");
   put("home/messages/de.msg", "1\t\xc3\xa4ins\n2\t\n");
-  struct {
-    const char* language;
-    long number;
-    bool known;
-    const char* message;
-  } const cases[] = {{"en", 1, true, "one"},   {"de", 1, true, "\xc3\xa4ins"},
-                     {"de", 2, true, "two"},   {"de", 3, true, "line\nbreak \\ and \\t"},
-                     {"fr", 4, true, "a\tb"},  {"en", 5, false, ""},
-                     {"en", 6, false, ""},     {"de", 99, false, ""},
-                     {"en", -7, true, "seven"}};
+  const std::tuple<const char*, long, bool, const char*> cases[] = {
+      {"en", 1, true, "one"},   {"de", 1, true, "\xc3\xa4ins"},
+      {"de", 2, true, "two"},   {"de", 3, true, "line\nbreak \\ and \\t"},
+      {"fr", 4, true, "a\tb"},  {"en", 5, false, ""},
+      {"en", 6, false, ""},     {"de", 99, false, ""},
+      {"en", -7, true, "seven"}};
   const ORXLocalizedMessageDatabase database;
-  for (const auto& each : cases) {
-    QORXSetLanguage(text(each.language));
+  for (const auto& [language, number, known, wantedMessage] : cases) {
+    QORXSetLanguage(text(language));
     QORXString message;
     message.assign(text("left over"));
-    EXPECT_EQ(database.getMessage(each.number, message), each.known) << each.number;
-    EXPECT_EQ(message.toQString(), text(each.message)) << each.number;
+    EXPECT_EQ(database.getMessage(number, message), known) << number;
+    EXPECT_EQ(message.toQString(), text(wantedMessage)) << number;
   }
 }
 
@@ -137,23 +133,6 @@ TEST_F(Utilities, MessagesMayStandElsewhereOrNowhere) {
   EXPECT_EQ(message.toQString(), text("elsewhere"));
   EXPECT_FALSE(ORXLocalizedMessageDatabase(path("missing")).getMessage(1, message));
   EXPECT_TRUE(message.toQString().isEmpty());
-}
-
-TEST_F(Utilities, DecipheringIsTheHostsBusiness) {
-  EXPECT_FALSE(ORW_hasDecipherRoutine());
-  EXPECT_FALSE(ORW_decryptWorkspace(text("in"), text("out")));
-  QStringList asked;
-  ORW_setDecipherRoutine([&asked](const QString& fileName, const QString& plainCopy) {
-    asked << fileName << plainCopy;
-    return fileName == text("in");
-  });
-  EXPECT_TRUE(ORW_hasDecipherRoutine());
-  EXPECT_TRUE(ORW_decryptWorkspace(text("in"), text("out")));
-  EXPECT_FALSE(ORW_decryptWorkspace(text("other"), text("out")));
-  EXPECT_EQ(asked, (QStringList{text("in"), text("out"), text("other"), text("out")}));
-  ORW_setDecipherRoutine({});
-  EXPECT_FALSE(ORW_hasDecipherRoutine());
-  EXPECT_FALSE(ORW_decryptWorkspace(text("in"), text("out")));
 }
 
 }  // namespace

@@ -51,18 +51,6 @@ TEST(WordEncoding, EveryCodePointComesBackAndIsOneToken) {
   }
 }
 
-TEST(WordEncoding, LoneSurrogatesComeBackInEveryNeighbourhood) {
-  const QChar units[] = {QChar(0xd800), QChar(0xdbff), QChar(0xdc00), QChar(0xdfff), QLatin1Char('a')};
-  for (const QChar first : units) {
-    for (const QChar second : units) {
-      for (const QChar third : units) {
-        const QString plain = QString(first) + second + third;
-        EXPECT_EQ(QORXWwjdDecode(QORXWwjdEncode(plain)), plain) << plain.toUtf8().toHex().constData();
-      }
-    }
-  }
-}
-
 TEST(WordEncoding, LeavesWhatIsNoReference) {
   for (const char* text :
        {"<Unused>", "<BLANK>", "<", "<>", "<<<<", "<u>", "<u12>", "<u000A>", "<u110000>", "<u0000041>",
