@@ -45,11 +45,8 @@ TEST(HostileDocument, EachIsRefusedWithItsMessage) {
   const QByteArray bomb =
       "<!DOCTYPE w [<!ENTITY a 'xxxxxxxxxx'><!ENTITY b '&a;&a;&a;&a;&a;&a;&a;&a;'>"
       "<!ENTITY c '&b;&b;&b;&b;&b;&b;&b;&b;'>]><WORKSPACE A='&c;'/>";
-  const struct {
-    const char* name;
-    QByteArray bytes;
-    const char* message;  // empty: accepted
-  } cases[] = {
+  // `message`: empty: accepted
+  const std::tuple<const char*, QByteArray, const char*> cases[] = {
       {"document type", "\n<!DOCTYPE w>\n<WORKSPACE/>",
        "line 2 and column 9.\nError message is: A document type"},
       {"external subset", "<!DOCTYPE w SYSTEM 'http://x/y'><WORKSPACE/>",
@@ -91,14 +88,14 @@ TEST(HostileDocument, EachIsRefusedWithItsMessage) {
        "line 1 and column"},
       {"fault in front of a document type", "<WORKSPACE A=1>\n<!DOCTYPE w>", "around line 1 and column 14."},
   };
-  for (const auto& item : cases) {
-    const std::string message = readingError(item.bytes).toStdString();
-    if (*item.message == '\0') {
-      EXPECT_EQ(message, "") << item.name;
+  for (const auto& [name, bytes, wantedMessage] : cases) {
+    const std::string message = readingError(bytes).toStdString();
+    if (*wantedMessage == '\0') {
+      EXPECT_EQ(message, "") << name;
     } else {
-      EXPECT_NE(message.find(item.message), std::string::npos) << item.name << ": " << message;
-      EXPECT_EQ(message.rfind("General workspace parse error", 0), 0u) << item.name;
-      EXPECT_NE(message.find("\n\nPlease contact"), std::string::npos) << item.name;
+      EXPECT_NE(message.find(wantedMessage), std::string::npos) << name << ": " << message;
+      EXPECT_EQ(message.rfind("General workspace parse error", 0), 0u) << name;
+      EXPECT_NE(message.find("\n\nPlease contact"), std::string::npos) << name;
     }
   }
 }

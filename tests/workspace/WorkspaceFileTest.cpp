@@ -226,10 +226,8 @@ TEST(VersionStore, OpeningLinesAndPlacesThatAreOff) {
 }
 
 TEST(RawLines, StrayLinesAndMarksOfMerges) {
-  const struct {
-    QByteArray bytes;
-    const char* found;  // line and, for a conflict, "!"
-  } cases[] = {
+  // `found`: line and, for a conflict, "!"
+  const std::tuple<QByteArray, const char*> cases[] = {
       {"note\n#! <W/>\n\nmore\n#! START_HEADER\nMACRO A 1\n=======\n#! END_HEADER\n#! x\nbehind\n", ""},
       {"#! <W\n\n#!\n  two \n#!A='1'\n#! />\n", "4 5"},
       {"#! <W\n<<<<<<< a\n#! A='1'\n|||||||\r\n=======\n#! A='2'\n>>>>>>> b\n#! />\n=======\n",
@@ -237,14 +235,14 @@ TEST(RawLines, StrayLinesAndMarksOfMerges) {
       {"<W\n<<<<<<<\nA='1'\n=======\n>>>>>>>\n/>", "2! 4! 5!"},
       {"#! START_HEADER\n<<<<<<<<\n>>>>>>>\n=======\n", "3!"},
   };
-  for (const auto& test : cases) {
+  for (const auto& [bytes, wantedFound] : cases) {
     for (const bool isWide : {false, true}) {
-      const QString text = QString::fromLatin1(test.bytes);
-      const ScratchFile file(isWide ? QTextCodec::codecForName("UTF-16BE")->fromUnicode(text) : test.bytes);
+      const QString text = QString::fromLatin1(bytes);
+      const ScratchFile file(isWide ? QTextCodec::codecForName("UTF-16BE")->fromUnicode(text) : bytes);
       QStringList found;
       for (const RawLine& line : RawLine::find(file.name()))
         found.append(QString::number(line.line) + (line.kind == RawLine::Kind::Conflict ? "!" : ""));
-      EXPECT_EQ(found.join(' ').toStdString(), test.found) << test.bytes.toStdString();
+      EXPECT_EQ(found.join(' ').toStdString(), wantedFound) << bytes.toStdString();
     }
   }
 }

@@ -6,22 +6,6 @@ namespace {
 
 const QString kMain;
 
-// Takes so many bytes and then fails.
-class FailingDevice : public QIODevice {
- public:
-  explicit FailingDevice(qint64 room) : m_room(room) { open(QIODevice::WriteOnly | QIODevice::Unbuffered); }
-
- protected:
-  qint64 readData(char*, qint64) override { return -1; }
-  qint64 writeData(const char*, qint64 size) override {
-    m_room -= size;
-    return m_room < 0 ? -1 : size;
-  }
-
- private:
-  qint64 m_room;
-};
-
 class ShoutingWriter : public XMLComponentWriter {
  public:
   using XMLComponentWriter::XMLComponentWriter;
@@ -199,18 +183,6 @@ TEST(Writer, WhatCannotBeReadBackIsRefusedBeforeAnythingIsWritten) {
       EXPECT_EQ(refusal, "") << item.name;
     else
       EXPECT_NE(refusal.find(item.refusal), std::string::npos) << item.name << ": " << refusal;
-  }
-}
-
-TEST(Writer, AFailingDeviceShowsInTheStreamsState) {
-  const DocumentContent content = randomContent(5, 3);
-  const qint64 size = written(content).size();
-  for (const qint64 room : {qint64(0), size / 2, size - 1, size}) {
-    FailingDevice device(room);
-    XMLComponentWriter writer(&device, content.type);
-    queueContent(content, writer);
-    writer.writeDocument();
-    EXPECT_EQ(writer.stream().status() == QTextStream::Ok, room == size) << room;
   }
 }
 
