@@ -62,24 +62,12 @@ TEST(ParameterFetcher, EarliestVersionKeepsReferences) {
 
 TEST(ParameterFetcher, EntriesNameMacros) {
   const auto cfg = makeFetcher(3);
-  const char* const cases[][2] = {{"$(X)", "X"},
-                                  {"\"$(X)\"", "X"},
-                                  {"{$(X)}", "X"},
-                                  {"\"$(X)}", "X"},
-                                  {"{$(X)\"", "X"},
-                                  {"$()", ""},
-                                  {"{$()}", ""},
-                                  {"{Log File}", ""},
-                                  {"X", ""},
-                                  {"", ""},
-                                  {"Log File", "ORX_LOG_FILE"},
-                                  {"\"$X\"", ""},
-                                  {"{}", ""},
-                                  {"'$(X)'", ""},
-                                  {"$(A)$(B)", "A)$(B"}};
-  for (const auto& [entry, macro] : cases) {
-    EXPECT_EQ(asFetcher(*cfg).macroNameFromMacroDef(entry), macro) << entry;
-  }
+  const QString cases =
+      "$(X)=X|\"$(X)\"=X|{$(X)}=X|\"$(X)}=X|{$(X)\"=X|$()=|{$()}=|{Log File}=|X=|=|Log "
+      "File=ORX_LOG_FILE|\"$X\"=|{}=|"
+      "'$(X)'=|$(A)$(B)=A)$(B";
+  for (const QString& c : cases.split('|'))
+    EXPECT_EQ(c.section('=', 0, 0) + '=' + asFetcher(*cfg).macroNameFromMacroDef(c.section('=', 0, 0)), c);
   EXPECT_EQ(asFetcher(*makeFetcher(1)).attrListSeparator(), ",");
   EXPECT_EQ(asFetcher(*makeFetcher(2)).attrListSeparator(), ",");
   EXPECT_EQ(asFetcher(*cfg).attrListSeparator(), " ");
@@ -163,13 +151,9 @@ TEST(ParameterFetcher, UpgradesGatherTheList) {
 
 // A workspace whose features get two parameters, one of which a later transformer uses.
 TEST(ParameterFetcher, WorksInAWorkspace) {
-  struct Case {
-    int version;
-    QStringList parameters;
-    const char* rules;      // what is found
-    const char* statement;  // that is written
-  };
-  const Case cases[] = {
+  // `rules`: what is found
+  // `statement`: that is written
+  const std::tuple<int, QStringList, const char*, const char*> cases[] = {
       {3, {"ATTR_LIST", "$(TOWN) $(LIMIT)"}, "", "PARAMETERS {$(TOWN)} {$(LIMIT)}"},
       {2, {"ATTR_LIST", "$(TOWN),$(LIMIT)"}, "newer-version", "PARAMETERS \"$(TOWN)\",\"$(LIMIT)\""},
       {3, {"ATTR_LIST", "$(LIMIT)"}, "unused-parameter", "PARAMETERS $(LIMIT)"},
@@ -181,15 +165,15 @@ TEST(ParameterFetcher, WorksInAWorkspace) {
   };
   makeShipped("ParameterFetcher");
   TransformerMgr& registry = TransformerMgr::getTransformerMgr();
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.parameters.join(' ').toStdString());
+  for (const auto& [version, parameters, wantedRules, statement] : cases) {
+    SCOPED_TRACE(parameters.join(' ').toStdString());
     SmallWorkspace workspace;
     workspace.parameter("GUI TEXT_ENCODED TOWN Town", "Ulm")
         .parameter("GUI INT LIMIT Limit", "7")
         .reader(1, "Parcels", {"id"})
         .writer(2, "Out")
-        .transformer(3, "ParameterFetcher", QStringList{"XFORMER_NAME", "Fetch"} + c.parameters,
-                     {"VERSION", QString::number(c.version)})
+        .transformer(3, "ParameterFetcher", QStringList{"XFORMER_NAME", "Fetch"} + parameters,
+                     {"VERSION", QString::number(version)})
         .transformer(4, "ExpressionEvaluator",
                      {"EXPRESSION", "@Value<leftparenthesis>LIMIT<rightparenthesis>+1"}, {"VERSION", "1"})
         .link(1, "fo 0 Parcels", 3, "fi 0 INPUT")
@@ -202,17 +186,17 @@ TEST(ParameterFetcher, WorksInAWorkspace) {
       rules << orx::ruleRow(finding.rule).name;
     }
     rules.removeAll("dropped-features");
-    EXPECT_EQ(rules.join(' '), c.rules);
+    EXPECT_EQ(rules.join(' '), wantedRules);
     orx::Findings diagnostics(file);
     QString error;
     const QString output = folder.filePath("out.mf");
     translateWorkspace({file, output, {}}, registry, diagnostics, error);
     QFile written(output);
-    if (*c.statement && written.open(QIODevice::ReadOnly)) {
-      EXPECT_TRUE(QString::fromUtf8(written.readAll())
-                      .contains(QString("FACTORY_OPTION Fetch ") + c.statement + "\n"));
+    if (*statement && written.open(QIODevice::ReadOnly)) {
+      EXPECT_TRUE(
+          QString::fromUtf8(written.readAll()).contains(QString("FACTORY_OPTION Fetch ") + statement + "\n"));
     } else {
-      EXPECT_STREQ(c.statement, "");
+      EXPECT_STREQ(statement, "");
     }
   }
 }

@@ -1,7 +1,5 @@
 // What the classes change about ports, attributes and statements.
 #include "SpecialisedSetup.h"
-#include <transform/specialised/XMLTemplaterTransformerCfg.h>
-#include <transform/specialised/XMLUpdaterTransformerCfg.h>
 
 #include <gtest/gtest.h>
 
@@ -107,14 +105,4 @@ TEST(Templaters, SubTemplatesAreInputs) {
   circle.chop(1);
   EXPECT_TRUE(
       refusalOf(*makeShippedWith("XMLTemplater", circle.constData()), "SUB_TEMPLATES").contains("'T0'"));
-}
-
-TEST(TwoLanguages, TheFlagTellsThemApart) {
-  for (const bool isJson : {false, true}) {
-    const auto templater = makeShipped(isJson ? "JSONTemplater" : "XMLTemplater");
-    const auto updater = makeShipped(isJson ? "JSONUpdater" : "XMLUpdater");
-    EXPECT_EQ(dynamic_cast<XMLTemplaterTransformerCfg&>(*templater).isJson(), isJson);
-    EXPECT_EQ(dynamic_cast<XMLUpdaterTransformerCfg&>(*updater).isJson(), isJson);
-    EXPECT_EQ(refusalOf(*templater, "ROOT_TEMPLATE"), "") << "the default";
-  }
 }
