@@ -10,8 +10,14 @@
 
 namespace {
 
+QByteArray parameter(const QByteArray& name, const QByteArray& type, const QByteArray& prompt,
+                     const QByteArray& value) {
+  return "PARAMETER_NAME: " + name + "\nPARAMETER_TYPE: " + type + "\nPARAMETER_PROMPT: " + prompt +
+         "\nPARAMETER_DEFAULT:" + (value.isEmpty() ? "" : " ") + value + '\n';
+}
+
 // Nothing in it is worth a word. Each case below spoils one piece.
-const char* const kSound =
+const QByteArray kSound =
     "# A definition.\n"
     "TRANSFORMER_NAME: Sound\n"
     "VERSION: 2\n"
@@ -30,40 +36,18 @@ const char* const kSound =
     "PARAMETER_MAPPING: 1:OLD=TEXT\n"
     "TAG_MAPPING: 2:O:GOOD=DONE\n"
     "DEPENDENCY: if {![orx_fileExists /]} {return [join {no root}]}\n"
-    "MULTIPROCESS: GROUP_BY\n"
-    "PARAMETER_NAME: TEXT\n"
-    "PARAMETER_TYPE: TEXT_OR_ATTR_ENCODED\n"
-    "PARAMETER_PROMPT: Text\n"
-    "PARAMETER_DEFAULT: two<space>words\n"
-    "PARAMETER_NAME: RESULT\n"
-    "PARAMETER_TYPE: OPTIONAL OMITTABLE NEW_ATTR_ENCODED\n"
-    "PARAMETER_PROMPT: Result\n"
-    "PARAMETER_DEFAULT:\n"
-    "PARAMETER_NAME: GROUP_BY\n"
-    "PARAMETER_TYPE: OPTIONAL OMITTABLE ATTR_LIST_ENCODED\n"
-    "PARAMETER_PROMPT: Group By\n"
-    "PARAMETER_DEFAULT: <UNUSED>\n"
-    "PARAMETER_NAME: MODE\n"
-    "PARAMETER_TYPE: LOOKUP_CHOICE \"All of it\",ALL%Some,SOME\n"
-    "PARAMETER_PROMPT: Mode\n"
-    "PARAMETER_DEFAULT: ALL\n"
-    "PARAMETER_NAME: FRAME\n"
-    "PARAMETER_TYPE: OPTIONAL GROUP MODE%RESULT\n"
-    "PARAMETER_PROMPT: Frame\n"
-    "PARAMETER_DEFAULT:\n"
-    "PARAMETER_NAME: SIZE\n"
-    "PARAMETER_TYPE: MULTIPARAMETER "
-    "<semicolon>,GUI<space>FLOAT<space>WIDTH<space>Width,GUI<space>INT<space>STEPS<space>Steps\n"
-    "PARAMETER_PROMPT: Size\n"
-    "PARAMETER_DEFAULT: WIDTH;2.5;STEPS;3\n"
-    "PARAMETER_NAME: TESTS\n"
-    "PARAMETER_TYPE: LISTBOX A%B%\"C D\"\n"
-    "PARAMETER_PROMPT: Tests\n"
-    "PARAMETER_DEFAULT: A \"C D\"\n"
-    "PARAMETER_NAME: SCRIPT\n"
-    "PARAMETER_TYPE: OPTIONAL OMITTABLE TEXT_EDIT_PYTHON\n"
-    "PARAMETER_PROMPT: Script\n"
-    "PARAMETER_DEFAULT: a<space>=<space>1\n"
+    "MULTIPROCESS: GROUP_BY\n" +
+    parameter("TEXT", "TEXT_OR_ATTR_ENCODED", "Text", "two<space>words") +
+    parameter("RESULT", "OPTIONAL OMITTABLE NEW_ATTR_ENCODED", "Result", "") +
+    parameter("GROUP_BY", "OPTIONAL OMITTABLE ATTR_LIST_ENCODED", "Group By", "<UNUSED>") +
+    parameter("MODE", "LOOKUP_CHOICE \"All of it\",ALL%Some,SOME", "Mode", "ALL") +
+    parameter("FRAME", "OPTIONAL GROUP MODE%RESULT", "Frame", "") +
+    parameter("SIZE",
+              "MULTIPARAMETER "
+              "<semicolon>,GUI<space>FLOAT<space>WIDTH<space>Width,GUI<space>INT<space>STEPS<space>Steps",
+              "Size", "WIDTH;2.5;STEPS;3") +
+    parameter("TESTS", "LISTBOX A%B%\"C D\"", "Tests", "A \"C D\"") +
+    parameter("SCRIPT", "OPTIONAL OMITTABLE TEXT_EDIT_PYTHON", "Script", "a<space>=<space>1") +
     "DESCRIPTION_START\nWhat it does.\nDESCRIPTION_END\n"
     "TOOLTIP_START\n$(TEXT) $(WIDTH)\nTOOLTIP_END\n"
     "CHANGE_LOG_START\nFirst.\nCHANGE_LOG_END\n"

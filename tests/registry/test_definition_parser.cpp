@@ -1,4 +1,3 @@
-#include <tests/registry/AwkwardDefinitions.h>
 #include <tests/registry/DefinitionFields.h>
 #include <transform/registry/loading/CompanionFileParser.h>
 #include <transform/registry/loading/DefinitionFileParser.h>
@@ -6,42 +5,28 @@
 #include <transform/registry/loading/DefinitionKeywords.h>
 
 #include <QBuffer>
+#include <QDirIterator>
+#include <QFile>
 #include <gtest/gtest.h>
 
 namespace {
 
-DefinitionFileParser parse(const QByteArray& text) {
+template <class Parser = DefinitionFileParser, class... Name>
+Parser parse(const QByteArray& text, const Name&... name) {
   QBuffer buffer;
   buffer.setData(text);
   buffer.open(QIODevice::ReadOnly);
-  DefinitionFileParser parser;
-  EXPECT_TRUE(parser.parse(buffer, QStringLiteral("f.ort"))) << parser.errorString().toStdString();
+  Parser parser;
+  EXPECT_TRUE(parser.parse(buffer, name...)) << parser.errorString().toStdString();
   return parser;
 }
 
 // The fields of a definition with this header.
 TransformerDefinition fieldsOf(const QByteArray& header) {
-  const DefinitionFileParser parser = parse(header + "\nTEMPLATE_START\nTEMPLATE_END\n");
+  const DefinitionFileParser parser = parse(header + "\nTEMPLATE_START\nTEMPLATE_END\n", "f.ort");
   EXPECT_EQ(parser.definitions().size(), 1u);
   return parser.definitions().empty() ? TransformerDefinition()
                                       : DefinitionFileParser::interpret(parser.definitions().front());
-}
-
-CompanionFileParser parseCompanion(const QByteArray& text) {
-  QBuffer buffer;
-  buffer.setData(text);
-  buffer.open(QIODevice::ReadOnly);
-  CompanionFileParser parser;
-  EXPECT_TRUE(parser.parse(buffer));
-  return parser;
-}
-
-QStringList list(std::initializer_list<const char*> items) {
-  QStringList result;
-  for (const char* item : items) {
-    result.append(QString::fromUtf8(item));
-  }
-  return result;
 }
 
 }  // namespace
@@ -53,24 +38,27 @@ TEST(DefinitionParser, Lists) {
     QStringList expected;
   };
   const Case cases[] = {
-      {"INPUT_TAGS: A  B\nINPUT_TAGS: C", &TransformerDefinition::inputTags, list({"A", "B", "C"})},
+      {"INPUT_TAGS: A  B\nINPUT_TAGS: C", &TransformerDefinition::inputTags, (QStringList{"A", "B", "C"})},
       {"INPUT_TAGS: <NO_INPUT>", &TransformerDefinition::inputTags, {}},
-      {"INPUT_TAGS: <NO_INPUT>\nINPUT_TAGS: A <NO_INPUT>", &TransformerDefinition::inputTags, list({"A"})},
+      {"INPUT_TAGS: <NO_INPUT>\nINPUT_TAGS: A <NO_INPUT>", &TransformerDefinition::inputTags,
+       (QStringList{"A"})},
       {"VERSION: 1", &TransformerDefinition::inputTags, {}},
-      {"OUTPUT_TAGS: <BLANK> X", &TransformerDefinition::outputTags, list({"", "X"})},
+      {"OUTPUT_TAGS: <BLANK> X", &TransformerDefinition::outputTags, (QStringList{"", "X"})},
       {"OUTPUT_TAGS: A<space>B <NO_INPUT>", &TransformerDefinition::outputTags,
-       list({"A<space>B", "<NO_INPUT>"})},
-      {"DYNAMIC_INPUT_TAGS: A<space>B <BLANK>", &TransformerDefinition::dynamicInputTags, list({"A B", ""})},
-      {"TAG_MAPPING: I:A=B", &TransformerDefinition::tagMapping, list({":", "I:A=B"})},
-      {"TAG_MAPPING I:A=B", &TransformerDefinition::tagMapping, list({"I:A=B"})},
+       (QStringList{"A<space>B", "<NO_INPUT>"})},
+      {"DYNAMIC_INPUT_TAGS: A<space>B <BLANK>", &TransformerDefinition::dynamicInputTags,
+       (QStringList{"A B", ""})},
+      {"TAG_MAPPING: I:A=B", &TransformerDefinition::tagMapping, (QStringList{":", "I:A=B"})},
+      {"TAG_MAPPING I:A=B", &TransformerDefinition::tagMapping, (QStringList{"I:A=B"})},
       {"LIST_ACTION: A KEEP\nLIST_ACTION: B DROP", &TransformerDefinition::listActions,
-       list({"A KEEP", "B DROP"})},
-      {"DEPENDENCY: a b\nDEPENDENCY: c", &TransformerDefinition::dependencyScripts, list({"a b", "c"})},
+       (QStringList{"A KEEP", "B DROP"})},
+      {"DEPENDENCY: a b\nDEPENDENCY: c", &TransformerDefinition::dependencyScripts,
+       (QStringList{"a b", "c"})},
       {"PARAMETER_NAME: A\nPARAMETER_NAME: B\nPARAMETER_NAME: C\nPARAMETER_DEFAULT: 1",
-       &TransformerDefinition::parameterDefaults, list({"1", "", ""})},
+       &TransformerDefinition::parameterDefaults, (QStringList{"1", "", ""})},
       {"PARAMETER_NAME: A\nPARAMETER_PROMPT: 1\nPARAMETER_PROMPT: 2",
-       &TransformerDefinition::parameterPrompts, list({"1", "2"})},
-      {"ALIASES: X\nALIASES: X Y", &TransformerDefinition::aliases, list({"X", "X", "Y"})},
+       &TransformerDefinition::parameterPrompts, (QStringList{"1", "2"})},
+      {"ALIASES: X\nALIASES: X Y", &TransformerDefinition::aliases, (QStringList{"X", "X", "Y"})},
       {"transformer_name: T\ninput_tags: A", &TransformerDefinition::inputTags, {}},
   };
   for (const Case& c : cases) {
@@ -116,8 +104,8 @@ TEST(DefinitionParser, LookupsAndTagDescriptions) {
       "PARAMETER_LOOKUP: lost\nPARAMETER_NAME: A\nPARAMETER_NAME: B\nPARAMETER_LOOKUP: x,1\n"
       "PARAMETER_TYPE: CHOICE x\nPARAMETER_LOOKUP: y,2\nTAG_DESCRIPTION IN: all   that  comes\n"
       "TAG_DESCRIPTION ALONE\nTAG_DESCRIPTION OUT: one\nTAG_DESCRIPTION OUT two");
-  EXPECT_EQ(fields.parameterLookups.keys(), list({"B"}));
-  EXPECT_EQ(fields.parameterLookups.value("B"), list({"x,1", "y,2"}));
+  EXPECT_EQ(fields.parameterLookups.keys(), (QStringList{"B"}));
+  EXPECT_EQ(fields.parameterLookups.value("B"), (QStringList{"x,1", "y,2"}));
   EXPECT_EQ(fields.tagDescriptions.size(), 2);
   EXPECT_EQ(fields.tagDescriptions.value("IN"), "all that comes");
   EXPECT_EQ(fields.tagDescriptions.value("OUT"), "two");
@@ -136,44 +124,47 @@ TEST(DefinitionParser, BlocksAndTheirEnds) {
       "CATEGORY_DESCRIPTION_START My Group\nsecond\nCATEGORY_DESCRIPTION_END\n"
       "TRANSFORMER_NAME: Third\n"
       "TEMPLATE_START\nnever ends";
-  const DefinitionFileParser parser = parse(text);
+  const DefinitionFileParser parser = parse(text, "f.ort");
   ASSERT_EQ(parser.definitions().size(), 2u);
   const TransformerDefinition first = DefinitionFileParser::interpret(parser.definitions()[0]);
   EXPECT_EQ(first.name, "First");
   EXPECT_EQ(first.filePath, "f.ort");
-  EXPECT_EQ(first.descriptionLines, list({"one", "", "# two", "three"}));
-  EXPECT_EQ(first.templateLines, list({"  indented", "", "# kept", " TEMPLATE_END"}));
+  EXPECT_EQ(first.descriptionLines, (QStringList{"one", "", "# two", "three"}));
+  EXPECT_EQ(first.templateLines, (QStringList{"  indented", "", "# kept", " TEMPLATE_END"}));
   const TransformerDefinition second = DefinitionFileParser::interpret(parser.definitions()[1]);
   EXPECT_EQ(second.name, "") << "nothing is left of the definition before";
   EXPECT_EQ(second.version, 2);
   EXPECT_TRUE(second.descriptionLines.isEmpty());
   ASSERT_EQ(parser.categories().size(), 2u);
   EXPECT_EQ(parser.categories()[0].name, "My Group");
-  EXPECT_EQ(parser.categories()[1].texts(), list({"second"}));
+  EXPECT_EQ(parser.categories()[1].texts(), (QStringList{"second"}));
   EXPECT_EQ(parser.unfinished().header.size(), 1u);
   EXPECT_EQ(parser.openBlockLine(), 27);
 }
 
-// The index finds the same definitions, and their bytes alone give them whole.
+// The index finds the same definitions, and their bytes alone give them whole: also where files are awkward.
 TEST(DefinitionIndex, AgreesWithTheParser) {
-  for (const QByteArray& text : awkwardDefinitions()) {
-    SCOPED_TRACE(text.toStdString());
-    const DefinitionFileParser parser = parse(text);
+  QDirIterator files(ORX_SOURCE_DIR "/fuzz/corpus/definitions", {"*.ort"});
+  std::size_t found = 0;
+  while (files.hasNext()) {
+    QFile file(files.next());
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    SCOPED_TRACE(file.fileName().toStdString());
+    const QByteArray text = file.readAll();
+    const auto parser = parse(text, "f.ort");
     DefinitionIndex index;
     index.read(text);
     ASSERT_EQ(index.definitions().size(), parser.definitions().size());
+    found += index.definitions().size();
     for (std::size_t i = 0; i < parser.definitions().size(); ++i) {
       const TransformerDefinition whole = DefinitionFileParser::interpret(parser.definitions()[i]);
       const TransformerDefinition& facts = index.definitions()[i].facts;
-      const TransformerDefinition alone =
-          DefinitionFileParser::definitionAlone(index.definitions()[i].bytes, QStringLiteral("f.ort"));
-      EXPECT_EQ(facts.name, whole.name);
-      EXPECT_EQ(facts.version, whole.version);
-      EXPECT_EQ(facts.category, whole.category);
-      EXPECT_EQ(facts.aliases, whole.aliases);
-      EXPECT_EQ(facts.visible, whole.visible);
-      EXPECT_EQ(facts.dependencyScripts, whole.dependencyScripts);
-      EXPECT_TRUE(definitionFields(alone) == definitionFields(whole));
+      EXPECT_TRUE(definitionFields(whole) == definitionFields(DefinitionFileParser::definitionAlone(
+                                                 index.definitions()[i].bytes, QStringLiteral("f.ort"))));
+      EXPECT_TRUE(std::tie(facts.name, facts.version, facts.category, facts.aliases, facts.visible,
+                           facts.dependencyScripts) == std::tie(whole.name, whole.version, whole.category,
+                                                                whole.aliases, whole.visible,
+                                                                whole.dependencyScripts));
     }
     ASSERT_EQ(index.categories().size(), parser.categories().size());
     for (std::size_t i = 0; i < parser.categories().size(); ++i) {
@@ -181,6 +172,7 @@ TEST(DefinitionIndex, AgreesWithTheParser) {
       EXPECT_EQ(index.categories()[i].texts(), parser.categories()[i].texts());
     }
   }
+  EXPECT_GT(found, 20u);
 }
 
 TEST(DefinitionParser, NoKeywordHidesAnother) {
@@ -192,7 +184,7 @@ TEST(DefinitionParser, NoKeywordHidesAnother) {
 }
 
 TEST(CompanionParser, EntriesEndWithTheNextName) {
-  const CompanionFileParser parser = parseCompanion(
+  const CompanionFileParser parser = parse<CompanionFileParser>(
       "PARAMETER_PROMPT: too early\n"
       "CATEGORY_NAME: Attributes,Attribute, auch Listen\nCATEGORY_NAME: nothing\n"
       "TRANSFORMER_NAME: A\nVERSION: 2\nLOCALIZED_NAME: Ä\nPARAMETER_NAME: P\nPARAMETER_NAME: Q\n"
@@ -210,8 +202,8 @@ TEST(CompanionParser, EntriesEndWithTheNextName) {
       entries << "tag " + tag.name + '|' + tag.text;
     entries << "lines " + (entry.descriptionLines + QStringList("/") + entry.changeLog).join('|');
   }
-  EXPECT_EQ(entries, list({"A|2|Ä", "prompt P|", "prompt Q|Frage", "tag IN|der Eingang", "lines Text|/",
-                           "B|-|", "lines /|Neu"}));
+  EXPECT_EQ(entries, (QStringList{"A|2|Ä", "prompt P|", "prompt Q|Frage", "tag IN|der Eingang",
+                                  "lines Text|/", "B|-|", "lines /|Neu"}));
   ASSERT_EQ(parser.categoryNames().size(), 1u);
   EXPECT_EQ(parser.categoryNames()[0].localizedName, "Attribute, auch Listen");
   EXPECT_EQ(parser.strayLines().size(), 4u);

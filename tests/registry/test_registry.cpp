@@ -12,14 +12,6 @@ namespace {
 
 using Copy = std::unique_ptr<TransformerCfg>;
 
-QStringList list(std::initializer_list<const char*> items) {
-  QStringList result;
-  for (const char* item : items) {
-    result.append(QString::fromUtf8(item));
-  }
-  return result;
-}
-
 class LanguageGuard {
  public:
   explicit LanguageGuard(const char* language) : m_before(QORXLanguage()) {
@@ -42,7 +34,7 @@ TEST(Registry, LaterFoldersAndFilesReplace) {
   folders.define("sub/c.ort", definitionText("Sub", 0));
   const QString extra = folders.write("extra/e.ort", definitionText("Same", 3, "CATEGORY: Extra"));
   TransformerMgr& registry = folders.load();
-  EXPECT_EQ(registry.transformerNames(), list({"Same", "Twice", "Sub"}));
+  EXPECT_EQ(registry.transformerNames(), (QStringList{"Same", "Twice", "Sub"}));
   EXPECT_EQ(registry.transformerVersions("Same"), (QList<int>{2, 3}));
   EXPECT_EQ(Copy(registry.getTransformer("Same", -1))->getFileName(), extra);
   EXPECT_EQ(Copy(registry.getTransformer("Same", -1))->transformerType(), TransformerCfg::kOrdinary);
@@ -54,8 +46,8 @@ TEST(Registry, LaterFoldersAndFilesReplace) {
   registry.getDefinitionFileName(ORXString("Unknown"), file);
   EXPECT_EQ(ORXToQString(file), "");
   // An older version is in no category; the name stays where a newer definition put it before.
-  EXPECT_EQ(registry.getCategories(), list({"First", "A", "B", "Extra"}));
-  EXPECT_EQ(registry.getCategoryTransformers("Extra"), list({"Same"}));
+  EXPECT_EQ(registry.getCategories(), (QStringList{"First", "A", "B", "Extra"}));
+  EXPECT_EQ(registry.getCategoryTransformers("Extra"), (QStringList{"Same"}));
   EXPECT_EQ(registry.getCategoryTransformers("Older"), QStringList());
   EXPECT_EQ(folders.load().transformerNames().size(), 3) << "a second load begins anew";
 }
@@ -98,7 +90,7 @@ TEST(Registry, Versions) {
     next->getName(name);
     names.append(ORXToQString(name));
   }
-  EXPECT_EQ(names, list({"T", "Far", "Odd"}));
+  EXPECT_EQ(names, (QStringList{"T", "Far", "Odd"}));
   EXPECT_EQ(face.getNextTransformer(), nullptr);
   face.resetIteration();
   EXPECT_TRUE(std::unique_ptr<ITransformerCfg>(face.getNextTransformer()));
@@ -135,11 +127,11 @@ TEST(Registry, Aliases) {
   EXPECT_EQ(registry.getTransformerNameFromAlias("B"), "");
   EXPECT_EQ(registry.currentTransformerVersion("Old"), -1);
   EXPECT_EQ(registry.getVisibleTransformerAliases(),
-            list({"A", "Circle", "Far", "Loop", "Middle", "Old", "Shared", "zwei"}));
+            (QStringList{"A", "Circle", "Far", "Loop", "Middle", "Old", "Shared", "zwei"}));
   EXPECT_TRUE(registry.isVisibleAlias("Shared"));
   EXPECT_FALSE(registry.isVisibleAlias("A")) << "a visible transformer's own name";
   EXPECT_FALSE(registry.isVisibleAlias("Hidden"));
-  EXPECT_EQ(registry.visibleTransformerNames(), list({"A", "B", "Loop", "C", "Middle", "Circle"}));
+  EXPECT_EQ(registry.visibleTransformerNames(), (QStringList{"A", "B", "Loop", "C", "Middle", "Circle"}));
 }
 
 TEST(Registry, ExceptionList) {
@@ -212,16 +204,16 @@ TEST(Registry, CompanionsOfTheLanguage) {
     EXPECT_EQ(registry.getLocalizedCategoryName("Attributes"), "Merkmale");
     EXPECT_EQ(registry.getCategoryNameFromLocalizedCategoryName("Merkmale"), "Attributes");
     EXPECT_EQ(registry.getCategoryNameFromLocalizedCategoryName("Attributes"), "Attributes");
-    EXPECT_EQ(registry.getCategoryTransformers("Merkmale"), list({"T", "U"}));
+    EXPECT_EQ(registry.getCategoryTransformers("Merkmale"), (QStringList{"T", "U"}));
     EXPECT_TRUE(registry.getCategoryDesc("Attributes", lines));
-    EXPECT_EQ(lines, list({"über Merkmale"}));
+    EXPECT_EQ(lines, (QStringList{"über Merkmale"}));
   }
   const LanguageGuard english("en");
   TransformerMgr& registry = folders.load();
   EXPECT_EQ(Copy(registry.getTransformer("T", 2))->getLocalizedName(), "T");
   EXPECT_EQ(registry.getLocalizedCategoryName("Attributes"), "Attributes");
   EXPECT_TRUE(registry.getCategoryDesc("Attributes", lines));
-  EXPECT_EQ(lines, list({"about them"}));
+  EXPECT_EQ(lines, (QStringList{"about them"}));
   EXPECT_FALSE(registry.getCategoryDesc("Merkmale", lines));
   EXPECT_FALSE(registry.getCategoryDesc("Empty", lines));
 }
