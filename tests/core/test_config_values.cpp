@@ -1,5 +1,4 @@
 #include <tests/core/ConfigHelpers.h>
-#include <tests/core/GenerationSetup.h>
 #include <transform/core/TransformerCfgListener.h>
 
 #include <gtest/gtest.h>
@@ -45,19 +44,6 @@ TEST(ConfigValues, StoredForms) {
     cfg.configure(makeDefinition({{"P", c.type}}));
     EXPECT_TRUE(cfg.setParameterValue(qs("P"), qs(c.set), true));
     EXPECT_EQ(cfg.getParameterValue(qs("P")), qs(c.stored)) << c.type << " " << c.set;
-  }
-}
-
-TEST(ConfigValues, StoredReferencesAreWrittenAsReferences) {
-  TextBuffer buffer;
-  for (const char* type : {"TEXT_OR_ATTR_ENCODED", "TEXT_EDIT_SQL_OR_ATTR"}) {
-    TransformerCfg cfg;
-    cfg.configure(makeDefinition({{"P", type, "P"}}));
-    cfg.setParameterValue(qs("P"), qs("&a"), true);
-    const QString written =
-        cfg.getParameterValueForMappingFile(qs("P"), cfg.getParameterByMacroName(qs("P")), buffer);
-    EXPECT_TRUE(written.startsWith(qs("@EvaluateExpression(FDIV,"))) << written.toStdString();
-    EXPECT_TRUE(written.contains(qs("@Value(a)"))) << written.toStdString();
   }
 }
 
@@ -221,12 +207,6 @@ TEST(ConfigValues, RecordsStayPutWhileValuesChange) {
   EXPECT_EQ(record->getName(), qs("B"));
   EXPECT_TRUE(record->choices().contains(qs("b")));
   EXPECT_EQ(record->getTypeWithConfig(), qs("CHOICE a%b"));
-  record->setTypeFromGUILine(qs("GUI OPTIONAL LISTBOX OTHER c%d Other prompt"));
-  EXPECT_EQ(record->getName(), qs("B"));
-  EXPECT_EQ(record->getTypeWithConfig(), qs("LISTBOX c%d"));
-  EXPECT_TRUE(record->getFlag(kGUITypeOptional));
-  record->setTypeFromGUILine(qs("CHOICE \"\""));
-  EXPECT_EQ(record->getTypeWithConfig(), qs("CHOICE"));
 
   TransformParamCfg looked(GUIType::fromTransformerTypeString(qs("CHOICE a%b"), qs("C")), {qs("a,1")});
   looked.setTypeFromGUILine(qs("CHOICE a%b"));

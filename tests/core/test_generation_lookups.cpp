@@ -277,59 +277,6 @@ TEST(Lookups, WhichFormAValueTakes) {
   }
 }
 
-// Knows the values of all macros.
-class KnowingListener : public RunTimeListener {
- public:
-  explicit KnowingListener(const QMap<QString, QString>& macros) : m_macros(macros) {}
-  bool expandMacros(const TransformerCfg&, QString& text) const override {
-    text = ::expandMacros(text, m_macros);
-    return true;
-  }
-
- private:
-  const QMap<QString, QString> m_macros;
-};
-
-// What is not refused looks up what it should with the macros in their places.
-TEST(Lookups, KnownMacrosFitOrAreRefused) {
-  const QStringList macros{"A", "{x} y", "", "}", "{", "\"", "a\\", "[exit]", "$x", "a;b", "#", "{\"}"};
-  const QStringList types{"LOOKUP_CHOICE A,a%B$(G),b", "LOOKUP_LISTBOX A,a", "CHOICE A"};
-  int refused = 0;
-  for (const QString& macro : macros) {
-    for (const QString& type : types) {
-      for (const bool inPrompt : {false, true}) {
-        KnowingListener listener(QMap<QString, QString>{{"G", macro}});
-        const QString value = type.startsWith("CHOICE") ? "$[G]" : "$(G)";
-        const auto cfg = makeCfg({{},
-                                  {},
-                                  {{"P", type, inPrompt ? "$(Gx)" : value, inPrompt ? "$(G)" : "Prompt",
-                                    type.startsWith("CHOICE") ? QStringList("A,a") : QStringList()}},
-                                  {"K $(P)"}});
-        cfg->setListener(&listener);
-        if (!cfg->findUnwritableValues().isEmpty()) {
-          ++refused;
-          continue;
-        }
-        TestEngine engine({{"G", macro}, {"Gx", ""}});
-        const QStringList statements = statementsOf(*cfg);
-        engine.run(statements);
-        const std::string what = (macro + ' ' + type).toStdString();
-        if (macro.isEmpty() || inPrompt) {
-          // A missing value is told with the prompt as it is.
-          EXPECT_TRUE(engine.error.isEmpty() || engine.error == "exit") << what;
-        } else if (type.startsWith("CHOICE")) {
-          EXPECT_EQ(engine.call(statements.last().mid(2)), macro == "A" ? "a" : macro) << what;
-        } else {
-          EXPECT_EQ(engine.macros.value("g1P"), macro == "A" ? "a" : macro) << what;
-        }
-        EXPECT_TRUE(engine.error.isEmpty() || engine.error == "exit")
-            << what << ' ' << engine.error.toStdString();
-      }
-    }
-  }
-  EXPECT_GT(refused, 0);
-}
-
 TEST(Lookups, FaultsAreFoundBeforeWriting) {
   using namespace lookup_checks;
   using namespace text_refusals;

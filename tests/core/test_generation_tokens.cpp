@@ -77,13 +77,6 @@ TEST(Tokens, InstanceTokens) {
   EXPECT_EQ(first.value(5), "E $(ENGINE)");
 }
 
-TEST(Tokens, Schema) {
-  const auto cfg = makeCfg({{"IN"}, {}, {}, {"$(XFORMER_SCHEMA)"}});
-  cfg->setInputAttributes("IN", {"a b", "list{}.x", "c"});
-  EXPECT_EQ(statementsOf(*cfg), QStringList("a<space>b,varchar<leftparenthesis>255<rightparenthesis>,c,"
-                                            "varchar<leftparenthesis>255<rightparenthesis>"));
-}
-
 TEST(Tokens, ValuesThatHoldTokens) {
   const RunTimeListener listener;
   struct Case {

@@ -80,120 +80,80 @@ void assemble(OpenNetwork& network, const QStringList& lines, CompoundTransforme
   network.doneAdding(true);
 }
 
-TextBuffer::TextBuffer() {
-  m_device.open(QIODevice::ReadWrite);
-  setDevice(&m_device);
-}
-
-TextBuffer::~TextBuffer() {
-  setDevice(nullptr);
-}
-
-void TextBuffer::write(const QByteArray& bytes) {
-  m_device.write(bytes);
-}
-
-QString TextBuffer::text() const {
-  return QString::fromUtf8(m_device.data());
-}
-
-QStringList TextBuffer::lines() const {
-  QStringList kept;
-  for (QString line : text().split('\n')) {
-    if (line.endsWith('\\'))
-      line.chop(1);
-    while (line.endsWith(' '))
-      line.chop(1);
-    if (!line.isEmpty())
-      kept.append(line);
-  }
-  return kept;
-}
-
 namespace {
 
-QString attribute(const char* name, const QString& value) {
-  return QStringLiteral(" %1=\"%2\"").arg(QLatin1String(name), value.toHtmlEscaped());
+// An element with attributes given as name, value, name, value.
+QString element(const QString& name, const QStringList& attributes, const QString& inner = QString()) {
+  QString text = '<' + name;
+  for (int i = 0; i + 1 < attributes.size(); i += 2)
+    text += ' ' + attributes.at(i) + "=\"" + attributes.at(i + 1).toHtmlEscaped() + '"';
+  return text + '>' + inner + "</" + name + ">\n";
 }
 
 QString parameter(const QString& name, const QString& value) {
-  return QLatin1String("<XFORM_PARM") + attribute("PARM_NAME", name) + attribute("PARM_VALUE", value) + "/>";
+  return element("XFORM_PARM", {"PARM_NAME", name, "PARM_VALUE", value});
 }
 
 }  // namespace
 
 QByteArray documentXml(const std::vector<DocumentText>& documents) {
-  QString xml = "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n<TRANSFORMER>\n<SUBDOCUMENTS>\n";
+  QString all;
   for (const DocumentText& document : documents) {
-    QString settings;
-    QString parameters;
-    QString ports;
-    QString links;
-    QStringList transformers;
-    QHash<QString, QString> bodies;
+    QStringList settings{"NAME", document.name};
+    QString parameters, transformers, ports, links;
+    QHash<QString, QString> values;
     QHash<QString, int> numbers;
-    int number = 0;
+    int count = 0;
+    for (const QString& line : document.lines.filter("parm ")) {
+      const QStringList words = line.split(' ');
+      values[words.value(1)] += parameter(words.value(2), QStringList(words.mid(3)).join(' '));
+    }
     for (const QString& line : document.lines) {
       const QStringList words = line.split(' ');
       const QString& keyword = words.at(0);
       const QString name = words.value(1);
       const QString rest = QStringList(words.mid(2)).join(' ');
+      const QString number = QString::number(count);
       if (name == "->") {
-        links += QStringLiteral("<FEAT_LINK IDENTIFIER=\"%1\" SOURCE_NODE=\"%2\" TARGET_NODE=\"%3\"")
-                     .arg(100 + number++)
-                     .arg(numbers.value(words.at(0), 999))
-                     .arg(numbers.value(words.at(2), 999)) +
-                 attribute("SOURCE_PORT_DESC", QStringLiteral("fo 0 ") + words.value(3)) +
-                 attribute("TARGET_PORT_DESC", QStringLiteral("fi 0 ") + words.value(4)) + "/>\n";
-        continue;
-      }
-      if (keyword == "raw") {
+        links +=
+            element("FEAT_LINK", {"IDENTIFIER", QString::number(100 + links.size()), "SOURCE_NODE",
+                                  QString::number(numbers.value(keyword, 999)), "TARGET_NODE",
+                                  QString::number(numbers.value(words.at(2), 999)), "SOURCE_PORT_DESC",
+                                  "fo 0 " + words.value(3), "TARGET_PORT_DESC", "fi 0 " + words.value(4)});
+      } else if (keyword == "raw") {
         links += line.mid(4) + '\n';
-        continue;
-      }
-      if (keyword == "set") {
-        settings += attribute(qPrintable(name), rest);
-        continue;
-      }
-      if (keyword == "gui") {
+      } else if (keyword == "set") {
+        settings << name << rest;
+      } else if (keyword == "gui") {
         const QStringList parts = line.mid(4).split(" | ");
-        parameters += QLatin1String("<GLOBAL_PARAMETER") + attribute("GUI_LINE", parts.at(0)) +
-                      attribute("DEFAULT_VALUE", parts.value(1)) + "/>\n";
-        continue;
-      }
-      if (keyword == "parm") {
-        bodies[name] += parameter(words.at(2), QStringList(words.mid(3)).join(' '));
-        continue;
-      }
-      numbers.insert(name, number);
-      const bool isPort = keyword == "in" || keyword == "out" || keyword == "own" || keyword == "loop";
-      if (isPort) {
-        ports += QStringLiteral("<SUBDOCUMENT_IO IDENTIFIER=\"%1\"").arg(number) + attribute("NAME", name) +
-                 attribute("IS_SOURCE", keyword == "in"     ? "true"
-                                        : keyword == "loop" ? "loop"
-                                                            : "false") +
-                 attribute("ATTR_MODE", keyword == "own" ? "1" : "0") + '>';
-        for (const QString& listed : names(rest))
-          ports += QLatin1String("<XFORM_ATTR") + attribute("ATTR_NAME", listed) + "/>";
-        ports += "</SUBDOCUMENT_IO>\n";
-      } else {
+        parameters += element("GLOBAL_PARAMETER", {"GUI_LINE", parts.at(0), "DEFAULT_VALUE", parts.value(1)});
+      } else if (keyword == "t" || keyword == "use") {
         const bool isNested = keyword == "use";
-        const QString type = isNested ? "SubDocumentTransformer" : rest;
-        transformers.append(QStringLiteral("<TRANSFORMER IDENTIFIER=\"%1\" VERSION=\"1\"").arg(number) +
-                            attribute("TYPE", type) + QLatin1Char('>') + parameter("XFORMER_NAME", name));
-        bodies[name] += isNested ? parameter("SUB_DOC_NAME", rest) : QString();
-        transformers.last() += QLatin1Char('\x01') + name;
+        transformers += element(
+            "TRANSFORMER",
+            {"IDENTIFIER", number, "VERSION", "1", "TYPE", isNested ? "SubDocumentTransformer" : rest},
+            parameter("XFORMER_NAME", name) + (isNested ? parameter("SUB_DOC_NAME", rest) : "") +
+                values.value(name));
+        numbers.insert(name, count++);
+      } else if (keyword != "parm") {
+        QString listed;
+        for (const QString& attribute : names(rest))
+          listed += element("XFORM_ATTR", {"ATTR_NAME", attribute});
+        ports += element("SUBDOCUMENT_IO",
+                         {"IDENTIFIER", number, "NAME", name, "IS_SOURCE",
+                          keyword == "in"     ? "true"
+                          : keyword == "loop" ? "loop"
+                                              : "false",
+                          "ATTR_MODE", keyword == "own" ? "1" : "0"},
+                         listed);
+        numbers.insert(name, count++);
       }
-      ++number;
     }
-    xml += QLatin1String("<SUBDOCUMENT") + attribute("NAME", document.name) + settings + ">\n";
-    xml += QLatin1String("<GLOBAL_PARAMETERS>\n") + parameters + "</GLOBAL_PARAMETERS>\n<TRANSFORMERS>\n";
-    for (const QString& transformer : qAsConst(transformers)) {
-      const int mark = transformer.indexOf(QLatin1Char('\x01'));
-      xml += transformer.left(mark) + bodies.value(transformer.mid(mark + 1)) + "</TRANSFORMER>\n";
-    }
-    xml += QLatin1String("</TRANSFORMERS>\n<SUBDOCUMENT_IOS>\n") + ports +
-           QLatin1String("</SUBDOCUMENT_IOS>\n<FEAT_LINKS>\n") + links + "</FEAT_LINKS>\n</SUBDOCUMENT>\n";
+    all += element("SUBDOCUMENT", settings,
+                   element("GLOBAL_PARAMETERS", {}, parameters) + element("TRANSFORMERS", {}, transformers) +
+                       element("SUBDOCUMENT_IOS", {}, ports) + element("FEAT_LINKS", {}, links));
   }
-  return (xml + "</SUBDOCUMENTS>\n</TRANSFORMER>\n").toUtf8();
+  return ("<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n" +
+          element("TRANSFORMER", {}, element("SUBDOCUMENTS", {}, all)))
+      .toUtf8();
 }

@@ -2,14 +2,13 @@
 // put together by hand, documents from short descriptions, and a buffer that keeps what is written.
 #pragma once
 
+#include <tests/support/TextBuffer.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerDefinition.h>
 #include <transform/core/TransformerSource.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/ExternalDocNetwork.h>
-#include <transform/text/MFBuffer.h>
 
-#include <QBuffer>
 #include <QHash>
 #include <QString>
 #include <QStringList>
@@ -59,19 +58,6 @@ class OpenNetwork : public ExternalDocNetwork {
 // Puts a network together from lines such as "in A", "out B", "own B x,y", "loop L", "pass P", "add P x,y",
 // "use P" (an instance of `inner`), "P -> B". Node numbers follow the lines; ports are IN and OUT.
 void assemble(OpenNetwork& network, const QStringList& lines, CompoundTransformerNetwork* inner = nullptr);
-
-class TextBuffer : public MFBuffer {
- public:
-  TextBuffer();
-  ~TextBuffer() override;
-  void write(const QByteArray& bytes) override;
-  QString text() const;
-  // Physical lines, without the columns of continued ones and the empty lines behind statements.
-  QStringList lines() const;
-
- private:
-  QBuffer m_device;
-};
 
 // The XML of a document of custom transformers. Each is described by lines as for assemble(), "use P NAME"
 // for a nested one, "gui LINE | DEFAULT" for a parameter, "set NAME VALUE" for a setting, "parm P NAME VALUE"

@@ -149,24 +149,6 @@ TEST_F(DocumentNetwork, TellsWhatIsWrongAndBuildsTheRest) {
   }
 }
 
-TEST_F(DocumentNetwork, LibraryBuildsEachDefinitionOnce) {
-  read({{"Outer", split("in A;out O;use ONE Inner;use TWO Inner;parm ONE NAME first;parm TWO NAME second;"
-                        "A -> ONE  X;ONE -> TWO Y X;TWO -> O Y")},
-        {"Inner",
-         split("gui GUI TEXT NAME Name | none;in X;out Y;t T Adder;parm T ATTR $(NAME);X -> T;T -> Y OUT")}});
-  SubDocumentLibrary library(reader, &definitions);
-  std::unique_ptr<TransformerCfg> instance = library.makeTransformer("Outer", 1);
-  ASSERT_NE(instance, nullptr);
-  ASSERT_EQ(library.networks().size(), 2U);
-  EXPECT_EQ(library.networks().front()->getName(), "Inner");
-  EXPECT_TRUE(library.networks().back()->problems().empty());
-  instance->setInputAttributes("A", {"a"});
-  EXPECT_EQ(instance->getOutputAttributes("O"), names("a,first,second"));
-  EXPECT_NE(library.makeTransformer("Adder", 1), nullptr);
-  EXPECT_EQ(library.makeTransformer("None", 1), nullptr);
-  EXPECT_EQ(library.refusalReason(), QString());
-}
-
 // What stands two levels deep answers for the instance.
 TEST_F(DocumentNetwork, InstancesAnswerForWhatStandsInside) {
   TransformerDefinition creator = passing("Creator");

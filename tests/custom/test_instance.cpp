@@ -1,7 +1,6 @@
 // What an instance of a custom transformer answers and writes.
 #include "CustomFixtures.h"
 #include <platform/qorxcore/qorxcore.h>
-#include <tests/text/ScriptRunners.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 
@@ -27,39 +26,18 @@ QStringList linesFrom(const QStringList& lines, const QString& start) {
   return lines.filter(QRegularExpression(QLatin1Char('^') + QRegularExpression::escape(start)));
 }
 
-TEST(Instance, WritesALoopFactoryInPlaceOfMacros) {
+TEST(Instance, ALoopIsIncludedWhereItIsNotWrittenInline) {
   LoopingNetwork network("Looper", 2);
-  assemble(network, {"in START", "in Side In", "in Back", "out DONE", "loop Back"});
-  network.addInput("Side In", 77, 3);
-  network.doneAdding(true);
+  assemble(network, {"in START", "out DONE", "loop Back"});
   CompoundTransformerCfg instance(&network);
   instance.setIdentifier("CT");
-  EXPECT_TRUE(instance.setParameterValue("MAX_LOOP_ITERATIONS", "7", false));
-  EXPECT_TRUE(instance.setParameterValue("ITERATION_COUNT_ATTR", "_n", false));
-  const QStringList expected{
-      "FACTORY_DEF * TransformFact:2:Looper",
-      "   FACTORY_NAME CT",
-      "   FACTORY_META_PARAMS",
-      "   TRANSFORMER_NAME:CT",
-      QStringLiteral("   TRANSFORMER_PARAMS:") + instance.getTransformerParams(),
-      "   LOOPBACK_INPUT_TAG:Back",
-      "   LOOPBACK_OUTPUT_TAG:INCOMPLETE",
-      "   RECURRING_INPUT_TAG:START,Side,Side<space>In",
-      "   MAX_LOOP_ITERATIONS:7",
-      "   ITERATION_COUNT_ATTR:_n",
-      "   INPUT START FEATURE_TYPE CT_START",
-      "   INPUT Side FEATURE_TYPE CT_Side",
-      "   INPUT Back FEATURE_TYPE CT_Back",
-      "   INPUT Side In FEATURE_TYPE \"CT_Side In\"",
-      "   OUTPUT DONE FEATURE_TYPE CT_DONE",
-      "FACTORY_DEF * TeeFactory",
-      "  FACTORY_NAME \"CT DONE Output Renamer/Nuker\"",
-      "  INPUT FEATURE_TYPE CT_DONE",
-  };
-  EXPECT_EQ(written(instance), expected);
-  const QStringList outside = written(instance, false);
-  EXPECT_TRUE(outside.contains("INCLUDE_CUSTOM_TRANSFORMER_VER Looper:2"));
-  EXPECT_EQ(linesFrom(outside, "MACRO ").size(), 4) << "prefix, identifier, two of the loop";
+  EXPECT_TRUE(written(instance).contains("FACTORY_DEF * TransformFact:2:Looper"));
+  EXPECT_EQ(linesFrom(written(instance), "MACRO ").size(), 0);
+  EXPECT_TRUE(written(instance, false).contains("INCLUDE_CUSTOM_TRANSFORMER_VER Looper:2"));
+  EXPECT_EQ(linesFrom(written(instance, false), "MACRO ").size(), 4) << "prefix, identifier, two of the loop";
+  network.isLooping = false;
+  instance.setTransformerType(TransformerCfg::kBuiltIn);
+  EXPECT_TRUE(written(instance).contains("INCLUDE_BUILTIN_CUSTOM_TRANSFORMER_VER Looper:2"));
 }
 
 struct Parallel {
@@ -156,86 +134,34 @@ TEST(Instance, WritesParameterMacros) {
   }
 }
 
-struct ScriptCase {
-  const char* python;
-  const char* tcl;
-  const char* value;  // in the instance CT_1, whose BASE is inner_1
-};
-
-const ScriptCase kScripts[] = {
-    {"'x'", "x", "x"},
-    {"ORX_MacroValues['BASE'] + '!'", "$ORX_MacroValues(BASE)!", "%1!"},
-    {"a = ORX_MacroValues[\"BASE\"]\n# done\na * 2", "set a $ORX_MacroValues(BASE)\nreturn $a$a", "%1%1"},
-    {"if ORX_MacroValues['XFORMER_NAME'] == 'CT_2':\n  return 'two'\nreturn ORX_MacroValues['ORX_HOME']",
-     "if {$ORX_MacroValues(XFORMER_NAME) eq \"CT_2\"} {\n  return two\n}\nreturn $ORX_MacroValues(ORX_HOME)",
-     "%2"},
-    {"k = 'BA'\nORX_MacroValues[k + 'SE']", "set k BA\nreturn $ORX_MacroValues(${k}SE)", "%1"},
-};
-
-// Each script in two instances, run with the macros of both and those of the workspace.
+// The blocks that the text floor runs, each line a statement of its own.
 TEST(Instance, WritesScriptsThatComputeTheInstancesMacros) {
+  const QString prefix = makePrefixMacro("My Net");
+  const QString code = QORXWwjdEncode("ORX_MacroValues['BASE']\n# $ORX_MacroValues(BASE)");
   OpenNetwork network("My Net");
-  network.publish("GUI TEXT BASE Base", QString());
-  int count = 0;
-  for (const ScriptCase& row : kScripts) {
-    network.publish(QStringLiteral("GUI TEXT_EDIT_PYTHON_PARM PY%1 Py").arg(++count),
-                    QORXWwjdEncode(row.python));
-    network.publish(QStringLiteral("GUI TEXT_EDIT_TCL_PARM TC%1 Tcl").arg(count), QORXWwjdEncode(row.tcl));
-  }
+  network.publish("GUI TEXT_EDIT_PYTHON_PARM PY Py", QORXWwjdEncode("1"));
+  network.publish("GUI OPTIONAL TEXT_EDIT_TCL_PARM TC Tcl", QString());
   network.doneAdding(true);
-  QMap<QString, QString> macros{{"BASE", "outer"}, {"ORX_HOME", "home"}};
-  for (const QString id : {"CT_1", "CT_2"}) {
-    const QString base = QStringLiteral("inner") + id.right(2);
-    CompoundTransformerCfg instance(&network);
-    instance.setIdentifier(id);
-    instance.setParameterValue("BASE", base, false);
-    EXPECT_TRUE(instance.findUnwritableParameters().isEmpty());
-    TextBuffer buffer;
-    ASSERT_TRUE(static_cast<TransformerCfg&>(instance).instantiate(buffer, QString(), true));
-    QStringList physical = buffer.text().split('\n');
-    macros[makePrefixMacro("My Net")] = id;
-    macros[id + "_BASE"] = base;
-    macros[id + "_XFORMER_NAME"] = id;
-    QVector<ScriptRun> pythons;
-    QMap<QString, QString> defined;
-    const auto take = [&](const QMap<QString, QString>& result) {
-      for (auto macro = result.cbegin(); macro != result.cend(); ++macro)
-        defined.insert(macro.key(), macro.value());
-    };
-    for (int at = 0; at < physical.size(); ++at) {
-      if (!physical.at(at).startsWith("INCLUDE PYTHON") && !physical.at(at).startsWith("INCLUDE TCL"))
-        continue;
-      const int end = physical.indexOf("END_INCLUDE", at);
-      ASSERT_GT(end, at);
-      EXPECT_EQ(physical.at(at + 1), QString()) << "each line is a statement of its own";
-      const ScriptRun run{physical.mid(at, end + 1 - at), macros};
-      if (physical.at(at).endsWith("PYTHON"))
-        pythons.append(run);
-      else
-        take(runTclBlock(run));
-      at = end;
-    }
-    for (const QMap<QString, QString>& result : runPythonBlocks(pythons))
-      take(result);
-    EXPECT_EQ(defined.size(), 2 * count);
-    for (int number = 1; number <= count; ++number) {
-      QString value = QLatin1String(kScripts[number - 1].value);
-      value.replace("%1", base);
-      value.replace("%2", id == "CT_2" ? "two" : "home");
-      EXPECT_EQ(defined.value(id + QStringLiteral("_PY%1").arg(number)), value)
-          << kScripts[number - 1].python;
-      EXPECT_EQ(defined.value(id + QStringLiteral("_TC%1").arg(number)), value) << kScripts[number - 1].tcl;
-    }
-  }
-
   CompoundTransformerCfg instance(&network);
+  instance.setIdentifier("CT_1");
+  instance.setParameterValue("PY", code, false);
+  instance.setParameterValue("TC", code, false);
+  EXPECT_TRUE(instance.findUnwritableParameters().isEmpty());
+  QStringList python;
+  QStringList tcl;
+  getPythonParameterLines(prefix, "PY", code, python);
+  getTclParameterLines(prefix, "TC", code, tcl);
+  TextBuffer buffer;
+  ASSERT_TRUE(static_cast<TransformerCfg&>(instance).instantiate(buffer, QString(), true));
+  EXPECT_TRUE(buffer.text().contains(python.join("\n\n"))) << qPrintable(buffer.text());
+  EXPECT_TRUE(buffer.text().contains(tcl.join("\n\n"))) << qPrintable(buffer.text());
+
   QString message;
-  instance.setParameterValue("PY1", QORXWwjdEncode("END_INCLUDE"), false);
-  EXPECT_FALSE(instance.validateParameter("PY1", message));
-  EXPECT_FALSE(message.isEmpty());
-  EXPECT_EQ(instance.findUnwritableParameters().keys(), names("PY1"));
-  instance.setParameterValue("PY1", "", false);
-  EXPECT_FALSE(instance.validateParameter("PY1", message)) << "a required script may not be empty";
+  instance.setParameterValue("PY", "END_INCLUDE", false);
+  EXPECT_FALSE(instance.validateParameter("PY", message));
+  EXPECT_EQ(instance.findUnwritableParameters().keys(), names("PY"));
+  instance.setParameterValue("PY", "", false);
+  EXPECT_FALSE(instance.validateParameter("PY", message)) << "a required script may not be empty";
   EXPECT_EQ(message, TransformResString(370608, "Py"));
 }
 
@@ -372,23 +298,6 @@ std::vector<std::unique_ptr<OpenNetwork>> doubledLevels(int count, const Transfo
     levels.push_back(std::move(network));
   }
   return levels;
-}
-
-TEST(Instance, NestingCostsItsDefinitionsOnly) {
-  constexpr int kLevels = 60;
-  const auto levels = doubledLevels(kLevels, passing("Adder", "OUT", "x"));
-  CompoundTransformerCfg instance(levels.back().get());
-  instance.setInputAttributes("A", {"a"});
-  EXPECT_EQ(instance.getOutputAttributes("O"), names("a,x"));
-  EXPECT_TRUE(instance.getUsesTransformer("Adder", nullptr));
-  EXPECT_FALSE(instance.getUsesTransformer("None", nullptr));
-  EXPECT_FALSE(instance.getIsBlocking());
-  QStringList readers;
-  QStringList writers;
-  QStringList transformers;
-  instance.getUsedComponents(readers, writers, transformers, true);
-  EXPECT_EQ(transformers.size(), kLevels + 1);
-  EXPECT_TRUE(instance.instantiationFault().isEmpty());
 }
 
 // Every transformer on the way makes another name of the attribute, so that no two instances are asked alike.
