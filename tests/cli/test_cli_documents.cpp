@@ -322,20 +322,16 @@ TEST(InfoCommand, NeverPrintsPasswordsOrTerminalControls) {
 TEST(InfoCommand, ListsStoredVersionsAndSkipsWhatCannotBeRead) {
   QTemporaryDir folder;
   write(folder.filePath("cleaner.ort"), kVersions);
-  const QJsonObject info = infoJson({"cleaner.ort"}, folder.path()).at(0).toObject();
-  EXPECT_EQ(info.value("form").toString(), QString("versions"));
-  EXPECT_EQ(info.value("documentType").toString(), QString("TRANSFORMER"));
-  EXPECT_EQ(info.value("attributes").toObject().value("TITLE").toString(), QString("second"));
-  const QJsonArray versions = info.value("versions").toArray();
-  ASSERT_EQ(versions.size(), 2);
-  EXPECT_EQ(versions.at(0).toObject().value("version").toInt(), 2);
-  EXPECT_EQ(versions.at(1).toObject().value("version").toInt(), 1);
-  EXPECT_EQ(versions.at(1).toObject().value("guid").toString(), QString("aa-bb"));
-  EXPECT_EQ(versions.at(1).toObject().value("line").toInt(), 9);
-
   const Outcome mixed = orxt({"info", "--json", "missing.ort", "cleaner.ort"}, folder.path());
   EXPECT_EQ(mixed.status, 3);
-  EXPECT_EQ(QJsonDocument::fromJson(mixed.out.toUtf8()).array().size(), 1);
+  const QJsonArray files = QJsonDocument::fromJson(mixed.out.toUtf8()).array();
+  ASSERT_EQ(files.size(), 1);
+  EXPECT_EQ(files[0]["form"].toString() + files[0]["attributes"]["TITLE"].toString(),
+            QString("versionssecond"));
+  const QJsonValue first = files[0]["versions"].toArray().at(1);
+  EXPECT_EQ(first["version"].toInt(), 1);
+  EXPECT_EQ(first["guid"].toString(), QString("aa-bb"));
+  EXPECT_EQ(first["line"].toInt(), 9);
 }
 
 }  // namespace

@@ -78,25 +78,6 @@ TEST(Validate, EndsWithTheStatusThatFits) {
   }
 }
 
-TEST(Validate, GivesRefusalsInEveryLanguage) {
-  QSet<QString> texts;
-  for (const char* language : {"en", "de", "fr"}) {
-    const Outcome run = validateBroken({"--json", "refused-values.orw", "--lang", language});
-    QStringList rules;
-    const QJsonArray findings = QJsonDocument::fromJson(run.out.toUtf8()).array().at(0)["findings"].toArray();
-    for (const QJsonValue& finding : findings) {
-      rules << finding["rule"].toString() + " " + finding["parameter"].toString();
-      texts.insert(finding["text"].toString());
-      EXPECT_EQ(finding["node"].toString(), QString("Refused"));
-    }
-    EXPECT_EQ(rules,
-              (QStringList{"missing-value NEEDED", "missing-file FILE", "unknown-connection CONNECTION",
-                           "missing-attribute ATTRIBUTE", "invalid-value LONG_TEXT"}))
-        << language;
-  }
-  EXPECT_EQ(texts.size(), 15);
-}
-
 TEST(Validate, WritesSarif) {
   QTemporaryDir folder;
   const QString spaced = folder.filePath("a b#.orw");

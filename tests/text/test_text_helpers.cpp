@@ -123,10 +123,9 @@ TEST(TextHelpers, ReadsPortDescriptions) {
     unsigned second = 8;
     QString name;
     EXPECT_EQ(decodePortDescription(c.text, isFeature, isOutput, first, second, name), c.ok) << c.text;
-    EXPECT_EQ(isFeature, c.isFeature) << c.text;
-    EXPECT_EQ(isOutput, c.isOutput) << c.text;
-    EXPECT_EQ(first, c.first) << c.text;
-    EXPECT_EQ(second, c.second) << c.text;
+    EXPECT_EQ(std::tie(isFeature, isOutput, first, second),
+              std::tie(c.isFeature, c.isOutput, c.first, c.second))
+        << c.text;
     EXPECT_EQ(name, c.name) << c.text;
   }
 }
