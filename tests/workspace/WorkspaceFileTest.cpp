@@ -97,8 +97,10 @@ TEST(WorkspaceFile, WhatStoodThereSurvivesEveryFailure) {
   EXPECT_EQ(file.content().toStdString(), "#! <WORKSPACE/>\n");
   EXPECT_FALSE(WorkspaceFile().save(QStringLiteral("/nowhere/x.orw"), kWorkspaceDocument, whole, error));
   EXPECT_TRUE(error.contains(QLatin1String("/nowhere/x.orw")));
-  if (QFile::exists(QStringLiteral("/dev/full"))) {
-    EXPECT_FALSE(WorkspaceFile().save(QStringLiteral("/dev/full"), kWorkspaceDocument, whole, error));
+  QFile full(QStringLiteral("/dev/full"));
+  if (full.open(QIODevice::WriteOnly | QIODevice::Unbuffered)) {
+    EXPECT_FALSE(WorkspaceFile().save(full.fileName(), kWorkspaceDocument, whole, error));
+    EXPECT_FALSE(WorkspaceFile().write(full, kWorkspaceDocument, whole, error));
   }
   WorkspaceFile file16;
   EXPECT_FALSE(file16.setEncoding("UTF-32") || file16.setEncoding("nonsense"));
