@@ -28,10 +28,11 @@ QStringList linesFrom(const QStringList& lines, const QString& start) {
 
 TEST(Instance, ALoopIsIncludedWhereItIsNotWrittenInline) {
   LoopingNetwork network("Looper", 2);
-  assemble(network, {"in START", "out DONE", "loop Back"});
+  assemble(network, {"in START", "in Side", "in Back", "out DONE", "loop Back"});
   CompoundTransformerCfg instance(&network);
   instance.setIdentifier("CT");
   EXPECT_TRUE(written(instance).contains("FACTORY_DEF * TransformFact:2:Looper"));
+  EXPECT_TRUE(written(instance).contains("   RECURRING_INPUT_TAG:START,Side"));
   EXPECT_EQ(linesFrom(written(instance), "MACRO ").size(), 0);
   EXPECT_TRUE(written(instance, false).contains("INCLUDE_CUSTOM_TRANSFORMER_VER Looper:2"));
   EXPECT_EQ(linesFrom(written(instance, false), "MACRO ").size(), 4) << "prefix, identifier, two of the loop";
