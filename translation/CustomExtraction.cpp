@@ -123,7 +123,7 @@ bool CustomExtraction::makeDefinition(SubDocumentLibrary& library, orx::Findings
   if (diagnostics.hasErrors())
     return false;
   const WorkspaceListener surroundings(m_global);
-  CustomDefinitions definitions(networks, surroundings);
+  CustomDefinitions definitions(networks, networks.size(), surroundings);
   if (!definitions.prepare(diagnostics))
     return false;
   const CustomDefinition& itself = definitions.all().back();

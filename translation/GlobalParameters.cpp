@@ -1,7 +1,9 @@
 #include <transform/core/ParameterReferences.h>
 #include <transform/text/GlobalMacros.h>
+#include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <translation/GlobalParameters.h>
+#include <translation/graph/FlowOrder.h>
 
 #include <algorithm>
 
@@ -47,9 +49,11 @@ void GlobalParameters::readHeaderLine(const QString& line, int lineNumber) {
   parameter.line = lineNumber;
 }
 
-void GlobalParameters::declare(const QString& name, const QString& value, int lineNumber) {
+void GlobalParameters::declare(const QString& name, const QString& value, int lineNumber,
+                               const QString& promptLine) {
   Parameter& parameter = entry(name);
   parameter.isPublished = true;
+  parameter.promptLine = promptLine;
   if (!parameter.setInHeader) {
     parameter.value = value;
     parameter.line = lineNumber;
@@ -78,6 +82,31 @@ GlobalParameters::Parameter& GlobalParameters::entry(const QString& name) {
 const GlobalParameters::Parameter* GlobalParameters::find(const QString& name) const {
   const auto found = m_index.constFind(name);
   return found == m_index.constEnd() ? nullptr : &m_parameters[static_cast<std::size_t>(found.value())];
+}
+
+std::vector<std::vector<const GlobalParameters::Parameter*>> GlobalParameters::circles() const {
+  std::vector<std::pair<int, int>> edges;
+  for (std::size_t from = 0; from < m_parameters.size(); ++from) {
+    const QString& value = m_parameters[from].currentValue();
+    if (!value.contains(QLatin1Char('$')))
+      continue;
+    // Deferred references are ordinary ones as soon as they are written.
+    const QString written =
+        MFBuffer::closesDeferredMacros(value) ? MFBuffer::withOrdinaryMacros(value) : value;
+    anyParameterReference(written, [&](const QString& name) {
+      const auto to = m_index.constFind(name);
+      if (to != m_index.constEnd())
+        edges.emplace_back(static_cast<int>(from), to.value());
+      return false;
+    });
+  }
+  std::vector<std::vector<const Parameter*>> found;
+  for (const std::vector<int>& cycle : flowOrder(static_cast<int>(m_parameters.size()), edges).cycles) {
+    found.emplace_back();
+    for (const int member : cycle)
+      found.back().push_back(&m_parameters[static_cast<std::size_t>(member)]);
+  }
+  return found;
 }
 
 const GlobalParameters::Parameter* GlobalParameters::findReference(const QString& reference) const {

@@ -17,6 +17,7 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
     QString name;
     QString value;             // as stored: encoded where its type is
     QString overridingValue;   // takes its place when isOverridden
+    QString promptLine;        // when isPublished
     bool setInHeader = false;  // a header line sets it, so no statement of ours does
     bool isPublished = false;  // declared by a prompt line
     bool isOverridden = false;
@@ -28,7 +29,8 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
   // Takes "MACRO NAME VALUE" and "DEFAULT_MACRO NAME VALUE" statements; every other one is passed over.
   void readHeaderLine(const QString& line, int lineNumber);
   // A value that the header sets is kept.
-  void declare(const QString& name, const QString& value, int lineNumber);
+  void declare(const QString& name, const QString& value, int lineNumber,
+               const QString& promptLine = QString());
   // Gives a parameter another value. False when the workspace has no such parameter.
   bool override(const QString& name, const QString& value);
 
@@ -36,6 +38,8 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
   const std::vector<Parameter>& all() const { return m_parameters; }
   // Null when there is none.
   const Parameter* find(const QString& name) const;
+  // Groups of parameters whose values lead back to themselves through references.
+  std::vector<std::vector<const Parameter*>> circles() const;
 
   bool isPublishedParameter(const QString& reference) const override;
   bool isPrivateParameter(const QString& reference) const override;

@@ -2,8 +2,9 @@
 #include <transform/files/AtomicFile.h>
 #include <translation/WorkspaceDocument.h>
 #include <translation/WorkspaceTranslation.h>
+#include <translation/WorkspaceValidation.h>
 #include <translation/generation/MFDeviceBuffer.h>
-#include <translation/generation/MappingFileWriter.h>
+#include <translation/graph/Workspace.h>
 #include <translation/graph/WorkspaceBuilder.h>
 
 using orx::Rule;
@@ -18,27 +19,31 @@ std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, Tran
 }
 
 TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,
-                                     orx::Findings& diagnostics, QString& error) {
-  const std::unique_ptr<Workspace> workspace = readWorkspace(request, source, diagnostics, error);
-  if (!workspace)
-    return error.isEmpty() ? TranslationResult::Refused : TranslationResult::Unreadable;
-
-  MappingFileWriter writer(*workspace, diagnostics);
-  if (!writer.prepare())
-    return TranslationResult::Refused;
+                                     orx::Findings& diagnostics, QString& error,
+                                     const orx::RuleSettings& settings) {
+  WorkspaceJudgement judgement(request.workspaceFile, source, settings, request.parameterValues);
+  error = judgement.readError();
+  if (!error.isEmpty())
+    return TranslationResult::Unreadable;
+  const auto end = [&](TranslationResult result) {
+    diagnostics.take(judgement.findings());
+    return result;
+  };
+  if (!judgement.allowsWriting())
+    return end(TranslationResult::Refused);
   AtomicFile output(request.outputFile);
   if (!output.open()) {
     error = output.errorString();
-    return TranslationResult::Unwritable;
+    return end(TranslationResult::Unwritable);
   }
   {
     MFDeviceBuffer buffer(output.device());
-    if (!writer.write(buffer))
-      return TranslationResult::Refused;
+    if (!judgement.write(buffer))
+      return end(TranslationResult::Refused);
   }
   if (!output.commit()) {
     error = output.errorString();
-    return TranslationResult::Unwritable;
+    return end(TranslationResult::Unwritable);
   }
-  return TranslationResult::Done;
+  return end(TranslationResult::Done);
 }

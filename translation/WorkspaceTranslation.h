@@ -3,6 +3,7 @@
 
 #include <platform/Export.h>
 #include <transform/findings/Findings.h>
+#include <transform/findings/RuleSettings.h>
 
 #include <QHash>
 #include <QString>
@@ -25,13 +26,16 @@ struct TranslationRequest {
   QHash<QString, QString> parameterValues;  // other values for global parameters, by name
 };
 
-// Reads a workspace file into a graph of configured transformers. Null when there is no document to build
-// from: `error` says why the file cannot be read, and is empty when diagnostics say what is wrong inside.
+// Reads a workspace file into a graph of configured transformers, unjudged. Null when there is no document to
+// build from: `error` says why the file cannot be read, and is empty when diagnostics say what is wrong
+// inside.
 ORX_EXPORT std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request,
                                                     TransformerSource& source, orx::Findings& diagnostics,
                                                     QString& error);
 
-// The whole job. Output appears whole or not at all. `error` receives why a file could not be read or
-// written.
+// The whole job. The workspace is judged as validation does, with the same settings and the same findings;
+// where one counts as an error nothing is written. Output appears whole or not at all. `error` receives why a
+// file could not be read or written.
 ORX_EXPORT TranslationResult translateWorkspace(const TranslationRequest& request, TransformerSource& source,
-                                                orx::Findings& diagnostics, QString& error);
+                                                orx::Findings& diagnostics, QString& error,
+                                                const orx::RuleSettings& settings = {});

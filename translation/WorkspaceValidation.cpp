@@ -1,4 +1,6 @@
+#include <transform/core/TransformParamCfg.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerDefinition.h>
 #include <transform/core/TransformerSource.h>
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
@@ -6,6 +8,7 @@
 #include <transform/custom/ScriptParameters.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/GlobalMacros.h>
+#include <transform/text/MFBuffer.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/WorkspaceDocument.h>
 #include <translation/WorkspaceValidation.h>
@@ -25,27 +28,34 @@ using orx::Severity;
 namespace {
 
 constexpr long kDeprecatedOnly = 370861;
+const QLatin1String kPasswordType("PASSWORD");
 
 class Validation {
  public:
-  Validation(const WorkspaceDocument& document, TransformerSource& source, const orx::RuleSettings& settings,
-             orx::Findings& diagnostics)
-      : m_reader(document.reader()),
-        m_headerLines(document.headerLines()),
+  Validation(const IXMLComponentReader& reader, const QStringList& headerLines, TransformerSource& source,
+             const orx::RuleSettings& settings, orx::Findings& diagnostics)
+      : m_reader(reader),
+        m_headerLines(headerLines),
         m_source(source),
+        m_settings(settings),
         m_diagnostics(diagnostics),
         m_values(diagnostics, settings) {}
 
-  void run();
+  // `isConnected`: whether the transformers know which attributes arrive.
+  void check(Workspace& workspace, bool isConnected);
 
  private:
-  using Records = QHash<int, const TransformerStruct*>;  // by identifier, the first of each
-
-  static Records byIdentifier(const ORXTValSlist<TransformerStruct>& list);
   void checkBuild();
   void checkTransformers(const Workspace& workspace, bool isConnected);
-  void checkInside(const ExternalDocNetwork& network, const Workspace& workspace);
-  void checkAge(const TransformerCfg& cfg, int line, const QString& title);
+  void checkParameters(Workspace& workspace);
+  // Where findings about one file go, and the checks that report there.
+  struct Place {
+    orx::Findings& diagnostics;
+    ValueChecks& values;
+  };
+  void checkInside(const ExternalDocNetwork& network, const Workspace& workspace, Place place);
+  void checkLinked(const ExternalTransformerNetwork& linked, const Workspace& workspace);
+  void checkAge(const TransformerCfg& cfg, int line, const QString& title, orx::Findings& diagnostics);
   void checkParameterValues(const Workspace& workspace);
   void checkParameterValue(const Workspace& workspace, const GlobalParameterStruct& parameter,
                            const GUIType& type, const QString& document);
@@ -56,42 +66,30 @@ class Validation {
   const IXMLComponentReader& m_reader;
   const QStringList& m_headerLines;
   TransformerSource& m_source;
+  const orx::RuleSettings& m_settings;
   orx::Findings& m_diagnostics;
   ValueChecks m_values;
-  ORXTValSlist<TransformerStruct> m_transformers;  // of the main document
   QStringList m_parameterNames;
   bool m_includesOthers = false;       // the header takes in files that may set further parameters
   QHash<QString, int> m_newestByName;  // -1: not known outside the document
 };
 
-void Validation::run() {
+void Validation::check(Workspace& workspace, bool isConnected) {
   checkBuild();
-  WorkspaceBuilder builder(m_source, m_diagnostics);
-  builder.includeUnused();
-  const std::unique_ptr<Workspace> workspace = builder.build(m_reader, m_diagnostics.file(), m_headerLines);
-  MappingFileWriter writer(*workspace, m_diagnostics);
-  writer.prepare();
-
-  for (const GlobalParameters::Parameter& parameter : workspace->parameters.all())
+  for (const GlobalParameters::Parameter& parameter : workspace.parameters.all())
     m_parameterNames.append(parameter.name);
   m_includesOthers = std::any_of(m_headerLines.begin(), m_headerLines.end(), [](const QString& line) {
     return line.startsWith(QLatin1String("INCLUDE "));
   });
-  checkTransformers(*workspace, writer.isConnected());
-  for (const ExternalDocNetwork* network : workspace->customTransformers())
-    checkInside(*network, *workspace);
-  checkParameterValues(*workspace);
-  checkParameterUse(*workspace);
-  fit_checks::checkParameters(m_reader, workspace->parameters, m_diagnostics);
-}
-
-Validation::Records Validation::byIdentifier(const ORXTValSlist<TransformerStruct>& list) {
-  Records records;
-  for (const TransformerStruct& record : list) {
-    if (!records.contains(record.identifier))
-      records.insert(record.identifier, &record);
-  }
-  return records;
+  checkParameters(workspace);
+  checkTransformers(workspace, isConnected);
+  for (const ExternalDocNetwork* network : workspace.customTransformers())
+    checkInside(*network, workspace, {m_diagnostics, m_values});
+  for (const ExternalTransformerNetwork* network : workspace.linkedCustomTransformers)
+    checkLinked(*network, workspace);
+  checkParameterValues(workspace);
+  checkParameterUse(workspace);
+  fit_checks::checkParameters(m_reader, workspace.parameters, m_diagnostics);
 }
 
 void Validation::checkBuild() {
@@ -105,54 +103,95 @@ bool Validation::isKnown(const GlobalParameters& parameters, const QString& name
   return m_includesOthers || parameters.find(name) || isGlobalMacro(name);
 }
 
+// A prompt line says of a value what a definition says of a transformer's, so a transformer with nothing but
+// these parameters judges them.
+void Validation::checkParameters(Workspace& workspace) {
+  TransformerCfg prompts;
+  prompts.configure(TransformerDefinition());
+  prompts.setIdentifier(m_diagnostics.file());
+  std::vector<std::pair<QString, int>> lines;
+  for (const GlobalParameters::Parameter& parameter : workspace.parameters.all()) {
+    TransformParamCfg record(GUIType::fromGuiLine(parameter.promptLine));
+    // No document keeps a password; it is given when the workspace is run.
+    const bool isWithheld = record.getType().startsWith(kPasswordType) && parameter.currentValue().isEmpty();
+    if (!parameter.isPublished || isWithheld)
+      continue;
+    record.setValue(parameter.currentValue());
+    prompts.addParameter(record);
+    lines.emplace_back(parameter.name, parameter.line);
+  }
+  prompts.setListener(&workspace.listener);
+  // Which files and connections a parameter names is settled when the workspace is run.
+  m_values.check(
+      {prompts, QString(), ParameterLines(lines), /*knowsWhatArrives=*/false, /*isUsedHere=*/false},
+      [&](const QString& name) { return isKnown(workspace.parameters, name); }, m_parameterNames);
+}
+
 void Validation::checkTransformers(const Workspace& workspace, bool isConnected) {
   const FlowChecks flow(workspace);
   flow.report(m_diagnostics);
-  m_transformers = m_reader.GetTransformerList(QString());
-  const Records records = byIdentifier(m_transformers);
   const auto knows = [&](const QString& name) { return isKnown(workspace.parameters, name); };
   for (std::size_t number = 0; number < workspace.nodes.size(); ++number) {
     const WorkspaceNode& node = workspace.nodes[number];
-    const TransformerStruct* record = node.isTransformer() ? records.value(node.identifier) : nullptr;
-    if (!record)
+    if (!node.isTransformer())
       continue;
-    m_values.check({*node.cfg, *record, node.name, node.parameterLines,
+    m_values.check({*node.cfg, node.name, node.parameterLines,
                     isConnected && flow.knowsWhatArrives(static_cast<int>(number))},
                    knows, m_parameterNames);
     fit_checks::checkTransformer(*node.cfg, node.parameterLines, node.name, m_diagnostics);
-    checkAge(*node.cfg, node.line, node.name);
+    checkAge(*node.cfg, node.line, node.name, m_diagnostics);
   }
 }
 
-void Validation::checkInside(const ExternalDocNetwork& network, const Workspace& workspace) {
-  reportFlowsInside(network, m_reader, m_diagnostics);
-  const ORXTValSlist<TransformerStruct> list = m_reader.GetTransformerList(network.getName());
-  const Records records = byIdentifier(list);
+void Validation::checkInside(const ExternalDocNetwork& network, const Workspace& workspace, Place place) {
+  reportFlowsInside(network, place.diagnostics);
   const QStringList names = network.getParameters();
   const auto knows = [&](const QString& name) {
     return network.hasParameter(name) || isKnown(workspace.parameters, name);
   };
   for (const SubDocNetworkObj* object : network.nodes()) {
     const auto* node = dynamic_cast<const SubDocNetworkObjXformer*>(object);
-    const TransformerStruct* record = node ? records.value(node->number()) : nullptr;
-    if (!record)
+    if (!node)
       continue;
     const TransformerCfg& cfg = *node->getTransformer();
     const QString title = network.getName() + QLatin1Char('/') + node->name();
-    m_values.check({cfg, *record, title, node->parameterLines(), /*knowsWhatArrives=*/false}, knows, names);
-    fit_checks::checkTransformer(cfg, node->parameterLines(), title, m_diagnostics);
-    checkAge(cfg, record->line, title);
+    place.values.check({cfg, title, node->parameterLines(), /*knowsWhatArrives=*/false}, knows, names);
+    fit_checks::checkTransformer(cfg, node->parameterLines(), title, place.diagnostics);
+    checkAge(cfg, node->line(), title, place.diagnostics);
   }
 }
 
-void Validation::checkAge(const TransformerCfg& cfg, int line, const QString& title) {
+// Also those that its file embeds; the ones that it links have their own turn.
+void Validation::checkLinked(const ExternalTransformerNetwork& linked, const Workspace& workspace) {
+  orx::Findings found(linked.getFileName());
+  ValueChecks values(found, m_settings);
+  QSet<const CompoundTransformerNetwork*> seen{&linked};
+  std::vector<const ExternalDocNetwork*> open{&linked};
+  while (!open.empty()) {
+    const ExternalDocNetwork& network = *open.back();
+    open.pop_back();
+    checkInside(network, workspace, {found, values});
+    for (const TransformerCfg* cfg : network.customTransformers()) {
+      const auto* inner = dynamic_cast<const ExternalDocNetwork*>(networkOf(cfg));
+      if (!inner || dynamic_cast<const ExternalTransformerNetwork*>(inner) || seen.contains(inner))
+        continue;
+      seen.insert(inner);
+      open.push_back(inner);
+    }
+  }
+  for (const orx::Finding& finding : found.all())
+    m_diagnostics.add(finding);
+}
+
+void Validation::checkAge(const TransformerCfg& cfg, int line, const QString& title,
+                          orx::Findings& diagnostics) {
   const QString name = cfg.getName();
   const CompoundTransformerNetwork* network = networkOf(&cfg);
   if (cfg.isDeprecated() || (network && network->isDeprecated())) {
     if (cfg.replacedBy().isEmpty())
-      m_diagnostics.reportText(Rule::Deprecated, line, title, TransformResString(kDeprecatedOnly, name));
+      diagnostics.reportText(Rule::Deprecated, line, title, TransformResString(kDeprecatedOnly, name));
     else
-      m_diagnostics.report(Rule::Deprecated, line, title, {name, cfg.replacedBy()});
+      diagnostics.report(Rule::Deprecated, line, title, {name, cfg.replacedBy()});
     return;
   }
   if (network && !dynamic_cast<const ExternalTransformerNetwork*>(network))
@@ -164,8 +203,8 @@ void Validation::checkAge(const TransformerCfg& cfg, int line, const QString& ti
     newest = m_newestByName.insert(name, made ? made->getVersion() : -1);
   }
   if (newest.value() > cfg.getVersion())
-    m_diagnostics.report(Rule::NewerVersion, line, title,
-                         {name, QString::number(cfg.getVersion()), QString::number(newest.value())});
+    diagnostics.report(Rule::NewerVersion, line, title,
+                       {name, QString::number(cfg.getVersion()), QString::number(newest.value())});
 }
 
 void Validation::collectReferences(ReferencedNames& names) const {
@@ -194,8 +233,7 @@ void Validation::collectReferences(ReferencedNames& names) const {
         names.add(attribute.attrValue);
     }
   };
-  addTransformers(m_transformers);
-  for (const QString& document : m_reader.GetSubDocList())
+  for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList())
     addTransformers(m_reader.GetTransformerList(document));
   // Also inside custom transformers, whose scripts see the global parameters.
   for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList()) {
@@ -245,6 +283,11 @@ void Validation::checkParameterUse(const Workspace& workspace) {
   }
 }
 
+class Nowhere : public MFBuffer {
+ public:
+  void write(const QByteArray&) override {}
+};
+
 std::vector<orx::Finding> inDocumentOrder(const orx::Findings& diagnostics) {
   std::vector<orx::Finding> findings = diagnostics.all();
   std::stable_sort(findings.begin(), findings.end(),
@@ -268,22 +311,70 @@ int ValidationReport::count(Severity severity) const {
                     [severity](const orx::Finding& finding) { return finding.severity == severity; }));
 }
 
-ValidationReport validateWorkspace(const QString& fileName, TransformerSource& source,
-                                   const orx::RuleSettings& settings) {
-  ValidationReport report;
-  report.file = InputFile::shownName(fileName);
-  orx::Findings diagnostics(report.file);
+struct WorkspaceJudgement::Work {
+  Work(const QString& fileName, const orx::RuleSettings& rules)
+      : diagnostics(InputFile::shownName(fileName)), settings(rules) {}
+
+  void judge(const QString& fileName, TransformerSource& source,
+             const QHash<QString, QString>& parameterValues);
+
+  orx::Findings diagnostics;
+  orx::RuleSettings settings;
+  QString readError;
+  std::unique_ptr<Workspace> workspace;  // null when there is no document to build it from
+  std::unique_ptr<MappingFileWriter> writer;
+};
+
+void WorkspaceJudgement::Work::judge(const QString& fileName, TransformerSource& source,
+                                     const QHash<QString, QString>& parameterValues) {
   WorkspaceDocument document(fileName);
-  switch (document.read(diagnostics, report.readError)) {
-    case WorkspaceDocument::Reading::Unreadable:
-      return report;
-    case WorkspaceDocument::Reading::Refused:
-      break;
-    case WorkspaceDocument::Reading::Done:
-      Validation(document, source, settings, diagnostics).run();
-      checkDocument(document, diagnostics);
-      break;
+  if (document.read(diagnostics, readError) != WorkspaceDocument::Reading::Done)
+    return;
+  WorkspaceBuilder builder(source, diagnostics, parameterValues);
+  builder.includeUnused();
+  workspace = builder.build(document.reader(), fileName, document.headerLines());
+  writer = std::make_unique<MappingFileWriter>(*workspace, diagnostics);
+  writer->prepare();
+  Validation(document.reader(), document.headerLines(), source, settings, diagnostics)
+      .check(*workspace, writer->isConnected());
+  checkDocument(document, diagnostics);
+}
+
+WorkspaceJudgement::WorkspaceJudgement(const QString& fileName, TransformerSource& source,
+                                       const orx::RuleSettings& settings,
+                                       const QHash<QString, QString>& parameterValues)
+    : m_work(std::make_unique<Work>(fileName, settings)) {
+  m_work->judge(fileName, source, parameterValues);
+}
+
+WorkspaceJudgement::~WorkspaceJudgement() = default;
+
+const QString& WorkspaceJudgement::readError() const {
+  return m_work->readError;
+}
+
+std::vector<orx::Finding> WorkspaceJudgement::findings() const {
+  return m_work->settings.apply(inDocumentOrder(m_work->diagnostics));
+}
+
+bool WorkspaceJudgement::allowsWriting() const {
+  const std::vector<orx::Finding>& all = m_work->diagnostics.all();
+  return m_work->writer && std::none_of(all.begin(), all.end(), [this](const orx::Finding& finding) {
+           return m_work->settings.severity(finding.rule) == Severity::Error;
+         });
+}
+
+bool WorkspaceJudgement::write(MFBuffer& buffer) {
+  return m_work->writer->write(buffer);
+}
+
+ValidationReport validateWorkspace(const QString& fileName, TransformerSource& source,
+                                   const orx::RuleSettings& settings,
+                                   const QHash<QString, QString>& parameterValues) {
+  WorkspaceJudgement judgement(fileName, source, settings, parameterValues);
+  if (judgement.allowsWriting()) {
+    Nowhere nowhere;
+    judgement.write(nowhere);
   }
-  report.findings = settings.apply(inDocumentOrder(diagnostics));
-  return report;
+  return {InputFile::shownName(fileName), judgement.readError(), judgement.findings()};
 }

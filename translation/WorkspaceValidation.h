@@ -1,21 +1,25 @@
-// Finds everything that is wrong with a workspace, in one run, and changes nothing.
+// Finds everything that is wrong with a workspace, in one run, and changes nothing. Whoever writes a mapping
+// file asks first, so that both say the same.
 //
 // Beside all that stops or disturbs the writing of a mapping file: values that the transformers refuse,
 // attributes that do not arrive, inputs that nothing feeds, features that nothing takes, outdated
-// transformers, parameters and references that do not fit together. The transformers inside embedded custom
-// transformers are judged as well, those inside linked ones where the linked file is loaded. Which attributes
-// reach the inside differs by instance, so no attribute is called missing there. Embedded custom transformers
-// that nothing uses are judged like those in use.
+// transformers, parameters and references that do not fit together, global parameters that do not fit their
+// prompt lines. The transformers inside custom transformers, embedded and linked, are judged as well. Which
+// attributes reach the inside differs by instance, so no attribute is called missing there. Embedded custom
+// transformers that nothing uses are judged like those in use.
 #pragma once
 
 #include <platform/Export.h>
 #include <transform/findings/Findings.h>
 #include <transform/findings/RuleSettings.h>
 
+#include <QHash>
 #include <QString>
 
+#include <memory>
 #include <vector>
 
+class MFBuffer;
 class TransformerSource;
 
 struct ORX_EXPORT ValidationReport {
@@ -27,6 +31,34 @@ struct ORX_EXPORT ValidationReport {
   int count(orx::Severity severity) const;
 };
 
-// `fileName` may be "-", standard input.
+// The judgement itself, for whoever wants to write what passes. The workspace is read and judged once.
+class ORX_EXPORT WorkspaceJudgement {
+ public:
+  // `fileName` may be "-", standard input; `parameterValues` gives global parameters other values, by name.
+  // `source` is not owned.
+  WorkspaceJudgement(const QString& fileName, TransformerSource& source,
+                     const orx::RuleSettings& settings = {},
+                     const QHash<QString, QString>& parameterValues = {});
+  ~WorkspaceJudgement();
+  WorkspaceJudgement(const WorkspaceJudgement&) = delete;
+  WorkspaceJudgement& operator=(const WorkspaceJudgement&) = delete;
+
+  // Why the file cannot be read; empty when it can.
+  const QString& readError() const;
+  // With the severities of the settings, in the order of a report.
+  std::vector<orx::Finding> findings() const;
+  // Whether nothing that was found counts as an error.
+  bool allowsWriting() const;
+  // The mapping file. Call once, when allowsWriting() answers true. False when a transformer did not write
+  // its statements after all, which the findings then tell.
+  bool write(MFBuffer& buffer);
+
+ private:
+  struct Work;
+  std::unique_ptr<Work> m_work;
+};
+
+// The judgement alone. What passes is written as well, to nowhere, so that nothing is left to be found.
 ORX_EXPORT ValidationReport validateWorkspace(const QString& fileName, TransformerSource& source,
-                                              const orx::RuleSettings& settings = {});
+                                              const orx::RuleSettings& settings = {},
+                                              const QHash<QString, QString>& parameterValues = {});

@@ -2,10 +2,12 @@
 // against silence, and the forms for programs.
 #include <tests/cli/BrokenFiles.h>
 #include <tests/support/QtPrinters.h>
+#include <transform/findings/RuleSettings.h>
 
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
+#include <QRegularExpression>
 #include <QTemporaryDir>
 #include <gtest/gtest.h>
 
@@ -75,6 +77,55 @@ TEST(Validate, EndsWithTheStatusThatFits) {
     EXPECT_EQ(run.status, test.status) << line;
     EXPECT_EQ(run.err.count('\n'), test.errors) << line;
     EXPECT_EQ(run.out, QString(test.out)) << line;
+  }
+}
+
+// The errors among the lines, in their order.
+QStringList errorsIn(const QString& lines) {
+  return lines.split('\n').filter(QRegularExpression(": error: "));
+}
+
+TEST(Judgement, IsTheSameForValidateAndGenerate) {
+  QStringList raised;
+  QStringList lowered;
+  for (const orx::RuleRow& rule : orx::ruleTable()) {
+    orx::RuleSettings settings;
+    QString reason;
+    const QString name = rule.name;
+    if (settings.set(name + "=error", reason))
+      raised << "--rule" << name + "=error";
+    if (settings.set(name + "=off", reason))
+      lowered << "--rule" << name + "=off";
+  }
+  QStringList workspaces = samples();
+  for (const QString& name : QDir(brokenFolder()).entryList({"*.orw"}))
+    workspaces << brokenFolder() + "/" + name;
+  const QStringList common = {
+      "--resources", brokenFolder() + "/definitions", "--resources", sample("custom"), "--lang", "en"};
+  const QStringList settings[] = {
+      {},
+      raised,
+      lowered,
+      {"--param", "NOWHERE=1"},
+      {"--param", "LEVEL=none", "--param", "ROUND=$(ROUND)"},
+      {"--rule", "unknown-global-parameter=off", "--param", "LEVEL=high"},
+  };
+  for (const QStringList& setting : settings) {
+    QTemporaryDir folder;
+    const Outcome judged = orxt(QStringList{"validate", "-q"} + common + setting + workspaces);
+    const Outcome written =
+        orxt(QStringList{"generate", "-q", "-d", folder.path()} + common + setting + workspaces);
+    const std::string what = setting.mid(0, 6).join(' ').toStdString();
+    EXPECT_EQ(errorsIn(written.err), errorsIn(judged.err)) << what;
+    EXPECT_EQ(written.status, judged.status) << what << written.err.toStdString();
+    const Outcome json = orxt(QStringList{"validate", "--json"} + common + setting + workspaces);
+    const QJsonArray reports = QJsonDocument::fromJson(json.out.toUtf8()).array();
+    ASSERT_EQ(reports.size(), workspaces.size()) << what;
+    for (int i = 0; i < workspaces.size(); ++i) {
+      const QString output = folder.filePath(QFileInfo(workspaces.at(i)).completeBaseName() + ".mf");
+      EXPECT_EQ(QFile::exists(output), reports.at(i)["errors"].toInt(-1) == 0)
+          << what << workspaces.at(i).toStdString();
+    }
   }
 }
 

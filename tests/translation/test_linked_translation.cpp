@@ -250,7 +250,8 @@ TEST_F(LinkedTranslation, AnEncipheredWorkspaceIsReadByARoutine) {
     ORW_setDecipherRoutine(hasRoutine ? ORWDecipherRoutine(decipher) : ORWDecipherRoutine());
     orx::Findings diagnostics(path);
     QString error;
-    const TranslationResult result = translateWorkspace({path, output, {}}, registry, diagnostics, error);
+    const TranslationResult result =
+        translateWorkspace({path, output, {}}, registry, diagnostics, error, withoutLooseEnds());
     EXPECT_EQ(result, hasRoutine ? TranslationResult::Done : TranslationResult::Refused);
     EXPECT_EQ(describe(diagnostics), hasRoutine ? QStringList() : QStringList("no-document "));
     EXPECT_EQ(WorkspaceFile::recognise(path) == WorkspaceFile::Form::Workspace, hasRoutine);

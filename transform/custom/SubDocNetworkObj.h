@@ -42,6 +42,12 @@ class ORX_EXPORT SubDocNetworkObj {
   // Of the element in the file that the network was read from; 0 when there is none.
   int line() const { return m_line; }
   void setLine(int line) { m_line = line; }
+  // Whether a link of the document at this end was left out: it, or the node at its other end, is disabled or
+  // at fault.
+  bool lacksInputLink() const { return m_lacksInputLink; }
+  bool lacksOutputLink() const { return m_lacksOutputLink; }
+  void noteMissingInputLink() { m_lacksInputLink = true; }
+  void noteMissingOutputLink() { m_lacksOutputLink = true; }
   // The nodes that feed this one, by the port of this node.
   const Ports& feeders() const { return m_feeders; }
   // The nodes that this one feeds, by the port of this node.
@@ -131,6 +137,8 @@ class ORX_EXPORT SubDocNetworkObj {
 
   QString m_name;
   int m_line = 0;
+  bool m_lacksInputLink = false;
+  bool m_lacksOutputLink = false;
   Ports m_feeders;
   Ports m_consumers;
   std::map<QString, std::vector<AttributeCopy>> m_copies;

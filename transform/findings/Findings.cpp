@@ -50,12 +50,21 @@ void Findings::reportUnwritable(int line, const QString& node, const QString& pa
 }
 
 void Findings::add(Finding finding) {
-  finding.severity = ruleRow(finding.rule).severity;
+  const RuleRow& row = ruleRow(finding.rule);
+  finding.severity = row.severity;
+  m_forbidsWriting = m_forbidsWriting || (row.kind == RuleKind::Writing && row.severity == Severity::Error);
   if (finding.file.isEmpty())
     finding.file = m_file;
   if (finding.severity == Severity::Error)
     ++m_errors;
   m_all.push_back(std::move(finding));
+}
+
+void Findings::take(const std::vector<Finding>& judged) {
+  for (const Finding& finding : judged) {
+    m_errors += finding.severity == Severity::Error ? 1 : 0;
+    m_all.push_back(finding);
+  }
 }
 
 }  // namespace orx

@@ -32,13 +32,19 @@ class ORX_EXPORT Findings {
   // none.
   void add(Finding finding);
 
+  // What was judged already: as it stands, its severity included.
+  void take(const std::vector<Finding>& judged);
+
   bool hasErrors() const { return m_errors > 0; }
+  // Whether anything was found that no setting can make less than an error.
+  bool forbidsWriting() const { return m_forbidsWriting; }
   const std::vector<Finding>& all() const { return m_all; }
 
  private:
   QString m_file;
   std::vector<Finding> m_all;
   int m_errors = 0;
+  bool m_forbidsWriting = false;
 };
 
 }  // namespace orx

@@ -9,6 +9,10 @@ ParameterLines::ParameterLines(const TransformerStruct& record) : m_transformer(
   std::sort(m_lines.begin(), m_lines.end());
 }
 
+ParameterLines::ParameterLines(std::vector<std::pair<QString, int>> lines) : m_lines(std::move(lines)) {
+  std::sort(m_lines.begin(), m_lines.end());
+}
+
 int ParameterLines::of(const QString& parameter) const {
   const auto behind =
       std::upper_bound(m_lines.begin(), m_lines.end(), parameter,

@@ -14,6 +14,8 @@ class ORX_EXPORT ParameterLines {
  public:
   ParameterLines() = default;
   explicit ParameterLines(const TransformerStruct& record);
+  // Of parameters that belong to no transformer: names and lines.
+  explicit ParameterLines(std::vector<std::pair<QString, int>> lines);
 
   // The last that gives the parameter; that of the transformer when none does.
   int of(const QString& parameter) const;

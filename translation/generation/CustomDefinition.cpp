@@ -142,10 +142,10 @@ bool CustomDefinition::prepare(orx::Findings& diagnostics) {
       diagnostics.reportText(Rule::UnwritableValue, node->line(), m_network.getName(),
                              TransformResString(number, node->name()));
   }
-  if (diagnostics.hasErrors())
+  if (diagnostics.forbidsWriting())
     return false;
   m_body = makeBody(diagnostics);
-  return !diagnostics.hasErrors();
+  return !diagnostics.forbidsWriting();
 }
 
 QStringList CustomDefinition::lines() const {

@@ -42,7 +42,7 @@ class CustomDefinition {
   void passAttributes(const InnerAttributes::ByPort& arriving);
   // Those of the copies that are custom transformers, in the order of their statements.
   std::vector<const TransformerCfg*> customTransformers() const;
-  // Checks what will be written, makes the text. False when anything was reported as an error.
+  // Checks what will be written, makes the text. False when anything forbids that, found here or before.
   bool prepare(orx::Findings& diagnostics);
   // All below: call after prepare() answered true.
   void write(MFBuffer& buffer) const;

@@ -11,9 +11,9 @@ constexpr long kUnequalTwins = 370906;
 
 }  // namespace
 
-CustomDefinitions::CustomDefinitions(const std::vector<ExternalDocNetwork*>& networks,
+CustomDefinitions::CustomDefinitions(const std::vector<ExternalDocNetwork*>& networks, std::size_t used,
                                      const TransformerCfgListener& surroundings)
-    : m_surroundings(surroundings) {
+    : m_surroundings(surroundings), m_used(used) {
   for (const ExternalDocNetwork* network : networks)
     m_definitions.emplace_back(*network, surroundings);
 }
@@ -79,12 +79,20 @@ QString CustomDefinitions::placeOf(CompoundTransformerNetwork& network, const QS
 
 // Outermost first: what reaches an instance inside is known when all that reaches the outside is.
 void CustomDefinitions::passAttributes() {
-  for (auto definition = m_definitions.rbegin(); definition != m_definitions.rend(); ++definition) {
-    InnerAttributes::ByPort arriving = m_arriving.take(&definition->network());
+  for (std::size_t number = m_definitions.size(); number-- > 0;) {
+    CustomDefinition& definition = m_definitions[number];
+    InnerAttributes::ByPort arriving = m_arriving.take(&definition.network());
     for (QStringList& attributes : arriving)
       attributes.removeDuplicates();
-    definition->passAttributes(arriving);
-    for (const TransformerCfg* cfg : definition->customTransformers())
+    definition.passAttributes(arriving);
+    if (number >= m_used)
+      continue;
+    for (const TransformerCfg* cfg : definition.customTransformers())
       addInstance(cfg);
   }
+}
+
+void CustomDefinitions::write(MFBuffer& buffer) const {
+  for (std::size_t number = 0; number < m_used; ++number)
+    m_definitions[number].write(buffer);
 }

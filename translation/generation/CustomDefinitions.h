@@ -13,12 +13,13 @@
 #include <deque>
 
 class CompoundTransformerNetwork;
+class MFBuffer;
 
 class CustomDefinitions {
  public:
-  // `networks` stand each behind those inside it. `surroundings` is the listener of the workspace. Neither is
-  // owned.
-  CustomDefinitions(const std::vector<ExternalDocNetwork*>& networks,
+  // `networks` stand each behind those inside it; behind the first `used` of them stand some that are checked
+  // alone. `surroundings` is the listener of the workspace. Neither is owned.
+  CustomDefinitions(const std::vector<ExternalDocNetwork*>& networks, std::size_t used,
                     const TransformerCfgListener& surroundings);
   ~CustomDefinitions();
 
@@ -29,6 +30,8 @@ class CustomDefinitions {
 
   // Innermost first; to be written after prepare() answered true.
   const std::deque<CustomDefinition>& all() const { return m_definitions; }
+  // Writes those in use. Call after prepare().
+  void write(MFBuffer& buffer) const;
 
  private:
   void passAttributes();
@@ -40,6 +43,7 @@ class CustomDefinitions {
 
   const TransformerCfgListener& m_surroundings;
   std::deque<CustomDefinition> m_definitions;
+  std::size_t m_used;
   std::vector<CompoundTransformerNetwork*> m_roots;  // of the instances in the main document
   QHash<const CompoundTransformerNetwork*, InnerAttributes::ByPort> m_arriving;
 };

@@ -23,6 +23,8 @@ using orx::Rule;
 
 namespace {
 
+constexpr long kParameterCircle = 371400;
+
 std::size_t at(int number) {
   return static_cast<std::size_t>(number);
 }
@@ -37,7 +39,7 @@ void writeStatement(MFBuffer& buffer, const QString& line) {
 MappingFileWriter::MappingFileWriter(Workspace& workspace, orx::Findings& diagnostics)
     : m_workspace(workspace),
       m_diagnostics(diagnostics),
-      m_definitions(workspace.customTransformers(), workspace.listener) {}
+      m_definitions(workspace.customTransformers(), workspace.usedCustomTransformers, workspace.listener) {}
 
 bool MappingFileWriter::prepare() {
   const std::size_t count = m_workspace.nodes.size();
@@ -251,13 +253,24 @@ void MappingFileWriter::checkParameter(const GlobalParameters::Parameter& parame
     m_diagnostics.reportUnwritable(parameter.line, QString(), parameter.name, TransformResString(reason));
 }
 
-void MappingFileWriter::check() {
+void MappingFileWriter::checkParameters() {
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
     if (!parameter.setInHeader)
       checkParameter(parameter, parameter.value);
     if (parameter.isOverridden)
       checkParameter(parameter, parameter.overridingValue);
   }
+  for (const std::vector<const GlobalParameters::Parameter*>& circle : m_workspace.parameters.circles()) {
+    QStringList names;
+    for (const GlobalParameters::Parameter* parameter : circle)
+      names.append(parameter->name);
+    m_diagnostics.reportText(Rule::Cycle, circle.front()->line, QString(),
+                             TransformResString(kParameterCircle, names.join(QLatin1String(", "))));
+  }
+}
+
+void MappingFileWriter::check() {
+  checkParameters();
   QSet<const CompoundTransformerNetwork*> checked;
   QSet<const ConfiguredDefinition*> sound;  // whose template needs no second look
   for (const WorkspaceNode& node : m_workspace.nodes) {
@@ -311,15 +324,17 @@ bool MappingFileWriter::write(MFBuffer& buffer) {
   }
   writeParameters(buffer);
   writeFeatureTypes(buffer);
-  for (const CustomDefinition& definition : m_definitions.all())
-    definition.write(buffer);
+  m_definitions.write(buffer);
+  bool isWritten = true;
   for (const int number : m_order) {
     const WorkspaceNode& node = m_workspace.nodes[at(number)];
-    if (!node.cfg->instantiate(buffer, m_workspace.fileName))
-      m_diagnostics.report(Rule::NotWritten, node.line, node.name, {node.name});
+    if (node.cfg->instantiate(buffer, m_workspace.fileName))
+      continue;
+    m_diagnostics.report(Rule::NotWritten, node.line, node.name, {node.name});
+    isWritten = false;
   }
   writeWriterRoutes(buffer);
-  return !m_diagnostics.hasErrors();
+  return isWritten;
 }
 
 void MappingFileWriter::writeParameters(MFBuffer& buffer) const {

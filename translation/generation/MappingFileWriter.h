@@ -20,12 +20,12 @@ class MappingFileWriter {
   MappingFileWriter(Workspace& workspace, orx::Findings& diagnostics);
 
   // Orders and connects the transformers and pushes attributes through; checks everything that will be
-  // written. False when there are errors, those found before included; nothing may be written then.
+  // written. False when there are errors, those found before included.
   bool prepare();
   // Whether prepare() could connect the transformers and tell them which attributes arrive.
   bool isConnected() const { return m_isConnected; }
-  // The whole mapping file. Call after prepare() answered true. False when a transformer did not write its
-  // statements after all, which diagnostics tell.
+  // The whole mapping file. Call after prepare(), and not when anything was found that forbids the writing.
+  // False when a transformer did not write its statements after all, which diagnostics tell.
   bool write(MFBuffer& buffer);
 
  private:
@@ -35,6 +35,7 @@ class MappingFileWriter {
   void connect();
   void pushAttributes();
   void check();
+  void checkParameters();
   void checkParameter(const GlobalParameters::Parameter& parameter, const QString& value);
   // False when something was reported.
   bool checkText(const QString& text, const QString& what, int line, const QString& node);

@@ -16,6 +16,7 @@
 #include <vector>
 
 class ExternalDocNetwork;
+class ExternalTransformerNetwork;
 class SubDocumentLibrary;
 class TransformerCfg;
 
@@ -75,8 +76,11 @@ class Workspace {
   WorkspaceListener listener{parameters};
   // The custom transformers that the document embeds; outlives the nodes that are their instances.
   std::unique_ptr<SubDocumentLibrary> library;
-  // Those in use, each behind the ones that stand inside it.
+  // Each behind the ones that stand inside it; those in use first.
   const std::vector<ExternalDocNetwork*>& customTransformers() const;
+  std::size_t usedCustomTransformers = 0;
+  // Those that files of their own hold, at any depth, whether or not what they stand in is used.
+  std::vector<ExternalTransformerNetwork*> linkedCustomTransformers;
   std::vector<WorkspaceNode> nodes;
   std::vector<WorkspaceLink> links;
   std::vector<AttributeLink> attributeLinks;

@@ -50,6 +50,7 @@ std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& re
   for (const LinkStruct& record : reader.GetAttributeLinkList(mainDocument))
     addAttributeLink(record);
   reportRepeatedNames(reader);
+  m_workspace->usedCustomTransformers = m_workspace->customTransformers().size();
   if (m_includesUnused)
     buildUnused(reader);
   reportCustomTransformers();
@@ -84,7 +85,7 @@ void WorkspaceBuilder::addGlobalParameters(const IXMLComponentReader& reader) {
       m_diagnostics.report(Rule::RepeatedDeclaration, record.line, QString(),
                            {name, QString::number(*earlier)});
     linesByName.insert(name, record.line);
-    parameters.declare(name, record.defaultValue, record.line);
+    parameters.declare(name, record.defaultValue, record.line, record.guiLine);
   }
   QStringList names = m_parameterValues.keys();
   names.sort();
@@ -211,14 +212,18 @@ std::unique_ptr<TransformerCfg> WorkspaceBuilder::makeTransformer(const Transfor
 void WorkspaceBuilder::reportCustomTransformers() {
   for (const ExternalDocNetwork* network : m_workspace->customTransformers())
     reportNetworkProblems(*network, m_workspace->fileName, m_diagnostics);
-  std::vector<CompoundTransformerNetwork*> placed;
+  const std::vector<ExternalDocNetwork*>& embedded = m_workspace->customTransformers();
+  std::vector<CompoundTransformerNetwork*> placed(embedded.begin(), embedded.end());
   for (const WorkspaceNode& node : m_workspace->nodes) {
     if (CompoundTransformerNetwork* network = networkOf(node.cfg.get()))
       placed.push_back(network);
   }
-  for (const CompoundTransformerNetwork* network : nestedNetworks(placed)) {
-    if (const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(network))
-      reportNetworkProblems(*linked, linked->getFileName(), m_diagnostics);
+  for (CompoundTransformerNetwork* network : nestedNetworks(placed)) {
+    auto* linked = dynamic_cast<ExternalTransformerNetwork*>(network);
+    if (!linked)
+      continue;
+    reportNetworkProblems(*linked, linked->getFileName(), m_diagnostics);
+    m_workspace->linkedCustomTransformers.push_back(linked);
   }
 }
 

@@ -2,7 +2,6 @@
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/MessageStrings.h>
-#include <transform/workspace/IXMLComponentReader.h>
 #include <translation/validation/FlowChecks.h>
 
 using orx::Rule;
@@ -113,40 +112,23 @@ void FlowChecks::reportOutputs(const WorkspaceNode& node, const QSet<QString>& t
     diagnostics.report(Rule::UnusedReader, node.line, node.name);
 }
 
-void reportFlowsInside(const ExternalDocNetwork& network, const IXMLComponentReader& reader,
-                       orx::Findings& diagnostics) {
-  QSet<int> faultyLines;
-  for (const orx::Finding& problem : network.problems())
-    faultyLines.insert(problem.line);
-  QSet<const SubDocNetworkObj*> lacksInput;
-  QSet<const SubDocNetworkObj*> lacksOutput;
-  for (const LinkStruct& link : reader.GetFeatureTypeLinkList(network.getName())) {
-    const SubDocNetworkObj* source = network.nodeByNumber(link.sourceNode);
-    const SubDocNetworkObj* target = network.nodeByNumber(link.targetNode);
-    if (link.enabled && source && target && !faultyLines.contains(link.line))
-      continue;
-    lacksOutput.insert(source);
-    lacksInput.insert(target);
-  }
-  QHash<int, int> portLines;
-  for (const SubDocumentIOStruct& port : reader.GetSubDocumentIOList(network.getName()))
-    portLines.insert(port.identifier, port.line);
-
+void reportFlowsInside(const ExternalDocNetwork& network, orx::Findings& diagnostics) {
   for (const SubDocNetworkObj* node : network.nodes()) {
     const QString title = network.getName() + QLatin1Char('/') + node->name();
     const auto* inner = dynamic_cast<const SubDocNetworkObjXformer*>(node);
-    const int line = inner ? node->line() : portLines.value(node->number());
-    if (!lacksInput.contains(node)) {
+    if (!node->lacksInputLink()) {
       if (inner)
-        reportUnfed(*inner->getTransformer(), connectedPorts(node->feeders()), line, title, diagnostics);
+        reportUnfed(*inner->getTransformer(), connectedPorts(node->feeders()), node->line(), title,
+                    diagnostics);
       else if (node->kind() == SubDocNetworkObj::Kind::Output && node->feeders().empty())
-        diagnostics.reportText(Rule::UnfedWriter, line, title, TransformResString(kUnfedOutputPort));
+        diagnostics.reportText(Rule::UnfedWriter, node->line(), title, TransformResString(kUnfedOutputPort));
     }
-    if (!lacksOutput.contains(node)) {
+    if (!node->lacksOutputLink()) {
       if (inner)
-        reportDropped(*inner->getTransformer(), connectedPorts(node->consumers()), line, title, diagnostics);
+        reportDropped(*inner->getTransformer(), connectedPorts(node->consumers()), node->line(), title,
+                      diagnostics);
       else if (node->kind() == SubDocNetworkObj::Kind::Input && node->consumers().empty())
-        diagnostics.reportText(Rule::UnusedReader, line, title, TransformResString(kUnusedInputPort));
+        diagnostics.reportText(Rule::UnusedReader, node->line(), title, TransformResString(kUnusedInputPort));
     }
   }
 }

@@ -11,7 +11,6 @@
 #include <vector>
 
 class ExternalDocNetwork;
-class IXMLComponentReader;
 
 class FlowChecks {
  public:
@@ -36,6 +35,5 @@ class FlowChecks {
   std::vector<bool> m_isKnown;
 };
 
-// The same for the inside of a custom transformer that the document embeds.
-void reportFlowsInside(const ExternalDocNetwork& network, const IXMLComponentReader& reader,
-                       orx::Findings& diagnostics);
+// The same for the inside of a custom transformer.
+void reportFlowsInside(const ExternalDocNetwork& network, orx::Findings& diagnostics);

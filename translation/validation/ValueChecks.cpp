@@ -3,7 +3,6 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/ParameterLines.h>
-#include <transform/workspace/WorkspaceRecords.h>
 #include <translation/graph/ReferencedNames.h>
 #include <translation/validation/ValueChecks.h>
 
@@ -84,20 +83,22 @@ void ValueChecks::check(const Node& node, const Knows& knows, const QStringList&
 
 ValueChecks::LooseReferences ValueChecks::looseReferences(const Node& node, const Knows& knows) {
   LooseReferences loose;
-  for (const XformParmStruct& given : node.record.parameters) {
-    if (!given.parmValue.contains(QLatin1Char('$')))
+  for (const QString& parameter : node.cfg.getParameters()) {
+    const QString value = node.cfg.getParameterValue(parameter);
+    if (!value.contains(QLatin1Char('$')))
       continue;
     // A custom transformer's own parameters have other macros, and are meant only where the type says so.
-    const TransformParamCfg* record = node.cfg.getParameterByMacroName(given.parmName);
+    const TransformParamCfg* record = node.cfg.getParameterByMacroName(parameter);
     const bool meansOwn =
         !isCustomTransformer(&node.cfg) || (record && record->getFlag(kGUITypeInstanceMacros));
     QStringList unknown;
-    for (const QString& name : ReferencedNames::inValue(given.parmValue)) {
+    for (const QString& name : ReferencedNames::inValue(value)) {
       const bool isOwn = name.startsWith(kInstanceNames) || node.cfg.getParameterByMacroName(name);
       if (!knows(name) && !(meansOwn && isOwn))
         unknown.append(name);
     }
-    loose.insert(given.parmName, unknown);
+    if (!unknown.isEmpty())
+      loose.insert(parameter, unknown);
   }
   return loose;
 }
@@ -117,6 +118,8 @@ void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const
         continue;
     }
     const Rule rule = ruleOf(text);
+    if (!node.isUsedHere && (rule == Rule::MissingFile || rule == Rule::UnknownConnection))
+      continue;
     if (rule == Rule::MissingAttribute) {
       if (!node.knowsWhatArrives)
         continue;
@@ -143,12 +146,12 @@ void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const
 void ValueChecks::reportReferences(const Node& node, LooseReferences& loose, const QStringList& names) {
   if (loose.isEmpty())
     return;
-  for (const XformParmStruct& given : node.record.parameters) {
-    const QString& prompt = node.cfg.getParameterPrompt(given.parmName);
-    for (const QString& name : loose.take(given.parmName)) {
+  for (const QString& parameter : node.cfg.getParameters()) {
+    const QString& prompt = node.cfg.getParameterPrompt(parameter);
+    for (const QString& name : loose.take(parameter)) {
       m_diagnostics.reportParameter(
-          Rule::UnknownReference, node.lines.of(given.parmName), node.title, given.parmName,
-          (prompt.isEmpty() ? given.parmName : prompt) + QLatin1String(": ") + referenceText(name, names));
+          Rule::UnknownReference, node.lines.of(parameter), node.title, parameter,
+          (prompt.isEmpty() ? parameter : prompt) + QLatin1String(": ") + referenceText(name, names));
     }
   }
 }

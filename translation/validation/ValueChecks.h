@@ -15,7 +15,6 @@
 
 class ParameterLines;
 class TransformerCfg;
-struct TransformerStruct;
 
 class ValueChecks {
  public:
@@ -27,10 +26,10 @@ class ValueChecks {
 
   struct Node {
     const TransformerCfg& cfg;
-    const TransformerStruct& record;  // what the document says about it
-    const QString& title;             // how findings name it
+    const QString& title;  // how findings name it
     const ParameterLines& lines;
-    bool knowsWhatArrives;  // whether attributes can be said to be missing
+    bool knowsWhatArrives;   // whether attributes can be said to be missing
+    bool isUsedHere = true;  // whether what a value names has to be on this machine
   };
 
   // `names` are those that references may be told to mean.

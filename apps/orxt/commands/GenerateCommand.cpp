@@ -42,11 +42,9 @@ void GenerateCommand::declare(CLI::App& app) {
                  "Folder for the mapping files of several workspaces (NAME.mf)")
       ->type_name("DIR")
       ->excludes(output);
-  app.add_option("--param", m_parameters, "Gives a global parameter another value (repeatable)")
-      ->type_name("NAME=VALUE")
-      ->expected(1)
-      ->allow_extra_args(false)
-      ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+  m_parameters.declare(app);
+  m_findings.declareRules(app);
+  app.add_flag("-q,--quiet", m_quiet, "Errors only");
   app.add_option("-j,--jobs", m_jobs, "How many workspaces to work on at once")
       ->type_name("N")
       ->check(CLI::Range(1, 256))
@@ -82,23 +80,12 @@ bool GenerateCommand::planJobs(std::vector<Job>& jobs, Console& console) const {
   return true;
 }
 
-bool GenerateCommand::readParameters(QHash<QString, QString>& values, Console& console) const {
-  for (const std::string& text : m_parameters) {
-    const QString setting = QString::fromStdString(text);
-    const int equals = setting.indexOf(QLatin1Char('='));
-    if (equals <= 0) {
-      console.fail(QStringLiteral("--param takes NAME=VALUE, not '%1'").arg(setting));
-      return false;
-    }
-    values.insert(setting.left(equals), setting.mid(equals + 1));
-  }
-  return true;
-}
-
 ExitStatus GenerateCommand::run(Console& console) {
+  m_definitions.setLanguage();
   std::vector<Job> jobs;
-  QHash<QString, QString> values;
-  if (!planJobs(jobs, console) || !readParameters(values, console))
+  Setting setting;
+  if (!planJobs(jobs, console) || !m_parameters.read(setting.values, console) ||
+      !m_findings.readRules(setting.rules, console))
     return kExitUsage;
   if (!m_directory.empty()) {
     const QString directory = QString::fromStdString(m_directory);
@@ -109,18 +96,22 @@ ExitStatus GenerateCommand::run(Console& console) {
   }
   TransformerMgr& registry = m_definitions.load(console);
   if (jobs.size() == 1)
-    return runJob(jobs.front(), values, registry, console);
-  return runInProcesses(jobs, values, registry, console);
+    return runJob(jobs.front(), setting, registry, console);
+  return runInProcesses(jobs, setting, registry, console);
 }
 
-ExitStatus GenerateCommand::runJob(const Job& job, const QHash<QString, QString>& values,
-                                   TransformerSource& source, Console& console) const {
+ExitStatus GenerateCommand::runJob(const Job& job, const Setting& setting, TransformerSource& source,
+                                   Console& console) const {
   const QString shownName = InputFile::shownName(job.workspace);
   orx::Findings diagnostics(shownName);
   QString error;
-  const TranslationResult result =
-      translateWorkspace({job.workspace, job.output, values}, source, diagnostics, error);
-  console.show(diagnostics);
+  const TranslationResult result = translateWorkspace({job.workspace, job.output, setting.values}, source,
+                                                      diagnostics, error, setting.rules);
+  for (const orx::Finding& finding : diagnostics.all()) {
+    // Hints are for whoever tidies up, and asks for them by validation.
+    if (finding.severity == orx::Severity::Error || (!m_quiet && finding.severity == orx::Severity::Warning))
+      console.show(finding);
+  }
   if (result == TranslationResult::Unreadable)
     console.failFile(shownName, error);
   else if (result == TranslationResult::Unwritable)
@@ -128,14 +119,13 @@ ExitStatus GenerateCommand::runJob(const Job& job, const QHash<QString, QString>
   return exitStatus(result);
 }
 
-ExitStatus GenerateCommand::runInProcesses(const std::vector<Job>& jobs,
-                                           const QHash<QString, QString>& values, TransformerSource& source,
-                                           Console& console) const {
+ExitStatus GenerateCommand::runInProcesses(const std::vector<Job>& jobs, const Setting& setting,
+                                           TransformerSource& source, Console& console) const {
   int worst = kExitDone;
   int done = 0;
   const int count = static_cast<int>(jobs.size());
   const auto work = [&](int job) {
-    return static_cast<int>(runJob(jobs[static_cast<std::size_t>(job)], values, source, console));
+    return static_cast<int>(runJob(jobs[static_cast<std::size_t>(job)], setting, source, console));
   };
   const auto finished = [&](int, int status) {
     worst = std::max(worst, status);

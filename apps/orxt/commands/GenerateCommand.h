@@ -2,6 +2,8 @@
 
 #include <apps/orxt/console/Command.h>
 #include <apps/orxt/console/DefinitionOptions.h>
+#include <apps/orxt/console/FindingOptions.h>
+#include <apps/orxt/console/ParameterOptions.h>
 
 #include <QHash>
 #include <QString>
@@ -23,18 +25,25 @@ class GenerateCommand : public Command {
     QString output;
   };
 
+  // What every workspace is judged with.
+  struct Setting {
+    QHash<QString, QString> values;
+    orx::RuleSettings rules;
+  };
+
   // False, with the reason on the console, when the options do not go together.
   bool planJobs(std::vector<Job>& jobs, Console& console) const;
-  bool readParameters(QHash<QString, QString>& values, Console& console) const;
-  ExitStatus runJob(const Job& job, const QHash<QString, QString>& values, TransformerSource& source,
+  ExitStatus runJob(const Job& job, const Setting& setting, TransformerSource& source,
                     Console& console) const;
-  ExitStatus runInProcesses(const std::vector<Job>& jobs, const QHash<QString, QString>& values,
-                            TransformerSource& source, Console& console) const;
+  ExitStatus runInProcesses(const std::vector<Job>& jobs, const Setting& setting, TransformerSource& source,
+                            Console& console) const;
 
   std::vector<std::string> m_workspaces;
   std::string m_output;
   std::string m_directory;
-  std::vector<std::string> m_parameters;
+  ParameterOptions m_parameters;
+  FindingOptions m_findings;
+  bool m_quiet = false;
   int m_jobs = 1;
   DefinitionOptions m_definitions;
 };

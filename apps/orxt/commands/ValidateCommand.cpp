@@ -62,6 +62,7 @@ void ValidateCommand::declare(CLI::App& app) {
       ->type_name("WORKSPACE")
       ->required();
   m_options.declare(app, "As JSON: a list with one object per workspace");
+  m_parameters.declare(app);
   app.add_flag("-q,--quiet", m_quiet, "Errors only, and no summary");
   m_definitions.declare(app);
 }
@@ -69,12 +70,13 @@ void ValidateCommand::declare(CLI::App& app) {
 ExitStatus ValidateCommand::run(Console& console) {
   m_definitions.setLanguage();
   orx::RuleSettings settings;
-  if (!m_options.readRules(settings, console))
+  QHash<QString, QString> values;
+  if (!m_options.readRules(settings, console) || !m_parameters.read(values, console))
     return kExitUsage;
   TransformerMgr& registry = m_definitions.load(console);
   std::vector<ValidationReport> reports;
   for (const std::string& workspace : m_workspaces) {
-    reports.push_back(validateWorkspace(QString::fromStdString(workspace), registry, settings));
+    reports.push_back(validateWorkspace(QString::fromStdString(workspace), registry, settings, values));
     std::vector<orx::Finding>& findings = reports.back().findings;
     if (m_quiet) {
       findings.erase(

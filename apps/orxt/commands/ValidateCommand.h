@@ -3,6 +3,7 @@
 #include <apps/orxt/console/Command.h>
 #include <apps/orxt/console/DefinitionOptions.h>
 #include <apps/orxt/console/FindingOptions.h>
+#include <apps/orxt/console/ParameterOptions.h>
 #include <translation/WorkspaceValidation.h>
 
 #include <string>
@@ -20,6 +21,7 @@ class ValidateCommand : public Command {
 
   std::vector<std::string> m_workspaces;
   FindingOptions m_options;
+  ParameterOptions m_parameters;
   bool m_quiet = false;
   DefinitionOptions m_definitions;
 };

@@ -6,6 +6,10 @@
 void FindingOptions::declare(CLI::App& app, const char* jsonHelp) {
   CLI::Option* json = app.add_flag("--json", m_json, jsonHelp);
   app.add_flag("--sarif", m_sarif, "As a SARIF 2.1.0 log")->excludes(json);
+  declareRules(app);
+}
+
+void FindingOptions::declareRules(CLI::App& app) {
   app.add_option("--rule", m_rules, "Turns a rule off, or gives it another severity (repeatable)")
       ->type_name("NAME=off|warning|error|hint")
       ->expected(1)

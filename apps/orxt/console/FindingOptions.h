@@ -15,6 +15,8 @@ class FindingOptions {
  public:
   // `jsonHelp` tells what the JSON holds.
   void declare(CLI::App& app, const char* jsonHelp);
+  // For a command whose findings are no results: how severe each rule counts, and nothing of the form.
+  void declareRules(CLI::App& app);
   // Call once the language is set. False, with the reason on the console, for a setting that is none.
   bool readRules(orx::RuleSettings& settings, Console& console) const;
 

@@ -31,8 +31,10 @@ void ExternalDocNetwork::Builder::build() {
   addPorts();
   for (const TransformerStruct& record : m_reader.GetTransformerList(m_document))
     addTransformer(record);
-  for (const LinkStruct& record : m_reader.GetFeatureTypeLinkList(m_document))
-    addLink(record);
+  for (const LinkStruct& record : m_reader.GetFeatureTypeLinkList(m_document)) {
+    if (!addLink(record))
+      noteLeftOut(record);
+  }
   for (const LinkStruct& record : m_reader.GetAttributeLinkList(m_document))
     addAttributeLink(record);
   addParameters();
@@ -96,6 +98,9 @@ void ExternalDocNetwork::Builder::addPorts() {
       default:
         m_network.addLoop(record.name, record.identifier);
     }
+    SubDocNetworkObj* port = m_network.nodeByNumber(record.identifier);
+    if (port && port->line() == 0)
+      port->setLine(record.line);
   }
   const QStringList inputNames = m_network.getInputs();
   const QSet<QString> taken(inputNames.begin(), inputNames.end());
@@ -238,11 +243,18 @@ bool ExternalDocNetwork::Builder::findPort(const LinkStruct& record, const Place
   return false;
 }
 
-void ExternalDocNetwork::Builder::addLink(const LinkStruct& record) {
+void ExternalDocNetwork::Builder::noteLeftOut(const LinkStruct& record) {
+  if (SubDocNetworkObj* source = m_network.nodeByNumber(record.sourceNode))
+    source->noteMissingOutputLink();
+  if (SubDocNetworkObj* target = m_network.nodeByNumber(record.targetNode))
+    target->noteMissingInputLink();
+}
+
+bool ExternalDocNetwork::Builder::addLink(const LinkStruct& record) {
   Place* source = nullptr;
   Place* target = nullptr;
   if (!record.enabled || !findEnds(record, source, target))
-    return;
+    return false;
   const auto readPort = [&](const Place& place, const QString& description, bool wantsOutput,
                             unsigned& number, QString& name) {
     if (readFeaturePort(description, wantsOutput, number, name))
@@ -254,20 +266,22 @@ void ExternalDocNetwork::Builder::addLink(const LinkStruct& record) {
     const bool isSource = source->kind == Kind::Output;
     reportPort(record, isSource ? *source : *target,
                isSource ? record.sourcePortDesc : record.targetPortDesc);
-    return;
+    return false;
   }
   unsigned number = 0;
   QString name;
   QString output;
   if (!readPort(*source, record.sourcePortDesc, true, number, name) ||
       !findPort(record, *source, true, number, name, output))
-    return;
+    return false;
   number = 0;
   name.clear();
   QString input;
-  if (readPort(*target, record.targetPortDesc, false, number, name) &&
-      findPort(record, *target, false, number, name, input))
-    m_network.addLink(record.sourceNode, output, record.targetNode, input);
+  if (!readPort(*target, record.targetPortDesc, false, number, name) ||
+      !findPort(record, *target, false, number, name, input))
+    return false;
+  m_network.addLink(record.sourceNode, output, record.targetNode, input);
+  return true;
 }
 
 void ExternalDocNetwork::Builder::addAttributeLink(const LinkStruct& record) {

@@ -30,7 +30,9 @@ class ExternalDocNetwork::Builder {
   void addTransformer(const TransformerStruct& record);
   std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& title);
   void configure(const TransformerStruct& record, Place& place);
-  void addLink(const LinkStruct& record);
+  // False when the link is left out.
+  bool addLink(const LinkStruct& record);
+  void noteLeftOut(const LinkStruct& record);
   void addAttributeLink(const LinkStruct& record);
   void addParameters();
   void checkLoops();
