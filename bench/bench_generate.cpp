@@ -15,23 +15,30 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <cstdlib>
 #include <ctime>
 
 namespace {
 
 // Chains of ten transformers each, from one reader to one writer.
 QByteArray makeWorkspace(int count, TransformerMgr& registry) {
-  const QStringList types = {QStringLiteral("SequenceNumberer"), QStringLiteral("GeometryBufferer"),
-                             QStringLiteral("FeatureOrderer"), QStringLiteral("NullReplacer"),
-                             QStringLiteral("ConditionSplitter")};
+  // With the values that each must have.
+  const std::pair<QString, QStringList> types[] = {
+      {"SequenceNumberer", {}},
+      {"GeometryBufferer", {}},
+      {"FeatureOrderer", {"ORDER_BY", "id;NUMBER;ASCENDING"}},
+      {"NullReplacer", {"ATTRIBUTES", "zone"}},
+      {"ConditionSplitter",
+       {"CONDITION", "<commercialat>Value<leftparenthesis>id<rightparenthesis><space>=<space>1"}}};
   struct Kind {
     QString type;
+    QStringList parameters;
     int version;
     QString input;
     QString output;
   };
   std::vector<Kind> kinds;
-  for (const QString& type : types) {
+  for (const auto& [type, parameters] : types) {
     const std::unique_ptr<TransformerCfg> cfg =
         registry.makeTransformer(type, TransformerSource::kNewestVersion);
     if (!cfg)
@@ -40,7 +47,7 @@ QByteArray makeWorkspace(int count, TransformerMgr& registry) {
     QStringList outputs;
     cfg->getInputTags(inputs);
     cfg->getOutputTags(outputs);
-    kinds.push_back({type, cfg->getVersion(), inputs.first(), outputs.first()});
+    kinds.push_back({type, parameters, cfg->getVersion(), inputs.first(), outputs.first()});
   }
 
   SmallWorkspace workspace;
@@ -48,8 +55,8 @@ QByteArray makeWorkspace(int count, TransformerMgr& registry) {
   for (int i = 0; i < count; ++i) {
     const Kind& kind = kinds[static_cast<std::size_t>(i) % kinds.size()];
     const int id = i + 3;
-    workspace.transformer(id, kind.type, {"XFORMER_NAME", QStringLiteral("%1_%2").arg(kind.type).arg(i)},
-                          {"VERSION", QString::number(kind.version)});
+    const QStringList name = {"XFORMER_NAME", QStringLiteral("%1_%2").arg(kind.type).arg(i)};
+    workspace.transformer(id, kind.type, name + kind.parameters, {"VERSION", QString::number(kind.version)});
     if (i % 10 == 0)
       workspace.link(1, "fo 0", id, "fi 0 " + kind.input);
     else
@@ -72,8 +79,8 @@ double microsecondsSince(std::clock_t start) {
 }
 
 [[noreturn]] void fail(const std::vector<orx::Finding>& findings) {
-  for (const orx::Finding& finding : findings)
-    std::printf("%s\n", qUtf8Printable(orx::formatFinding(finding)));
+  if (!findings.empty())
+    std::printf("%s\n", qUtf8Printable(orx::formatFinding(findings.front())));
   std::exit(1);
 }
 
