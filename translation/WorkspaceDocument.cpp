@@ -1,4 +1,4 @@
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/DocumentCopy.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
@@ -9,13 +9,9 @@
 
 #include <algorithm>
 
+namespace messages = orx::messages;
+
 using orx::Rule;
-
-namespace {
-
-constexpr long kOnlyCustomTransformers = 370867;
-
-}  // namespace
 
 WorkspaceDocument::Reading WorkspaceDocument::read(orx::Findings& diagnostics, QString& error,
                                                    Versions versions) {
@@ -48,7 +44,7 @@ WorkspaceDocument::Reading WorkspaceDocument::readOpened(orx::Findings& diagnost
     if (!error.isEmpty())
       return Reading::Unreadable;
     if (versions == Versions::Refused || m_versions.isEmpty()) {
-      diagnostics.reportText(Rule::NoDocument, 0, QString(), TransformResString(kOnlyCustomTransformers));
+      diagnostics.reportAs(Rule::NoDocument, messages::kOnlyCustomTransformers, 0, QString());
       return Reading::Refused;
     }
   } else if (m_form != WorkspaceFile::Form::Unknown) {

@@ -9,6 +9,7 @@
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/WorkspaceDocument.h>
 #include <translation/WorkspaceValidation.h>
@@ -22,12 +23,13 @@
 
 #include <algorithm>
 
+namespace messages = orx::messages;
+
 using orx::Rule;
 using orx::Severity;
 
 namespace {
 
-constexpr long kDeprecatedOnly = 370861;
 const QLatin1String kPasswordType("PASSWORD");
 
 class Validation {
@@ -189,7 +191,7 @@ void Validation::checkAge(const TransformerCfg& cfg, int line, const QString& ti
   const CompoundTransformerNetwork* network = networkOf(&cfg);
   if (cfg.isDeprecated() || (network && network->isDeprecated())) {
     if (cfg.replacedBy().isEmpty())
-      diagnostics.reportText(Rule::Deprecated, line, title, TransformResString(kDeprecatedOnly, name));
+      diagnostics.reportAs(Rule::Deprecated, messages::kDeprecatedOnly, line, title, {name});
     else
       diagnostics.report(Rule::Deprecated, line, title, {name, cfg.replacedBy()});
     return;

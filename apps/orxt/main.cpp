@@ -7,6 +7,8 @@
 #include <apps/orxt/commands/TransformersCommand.h>
 #include <apps/orxt/commands/ValidateCommand.h>
 #include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/DefinitionOptions.h>
+#include <transform/text/MessageNumbers.h>
 #include <translation/ProgramVersion.h>
 
 #include <CLI/CLI.hpp>
@@ -16,6 +18,8 @@
 #include <iostream>
 #include <memory>
 #include <vector>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -52,9 +56,10 @@ int runCommandLine(int argc, char** argv) {
   Console console;
   for (const std::unique_ptr<Command>& command : commands) {
     if (app.got_subcommand(command->facts().name)) {
+      DefinitionOptions::checkLanguage(console);
       const int status = command->run(console);
       if (!console.flush()) {
-        console.failFile(QStringLiteral("standard output"), QStringLiteral("cannot be written"));
+        console.failFile(QStringLiteral("standard output"), messages::kCannotBeWritten);
         return kExitFile;
       }
       return status;

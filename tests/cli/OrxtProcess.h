@@ -16,10 +16,11 @@ struct Outcome {
 
 // `outputFile` receives standard output when it is given; `input` is what stands on standard input.
 inline Outcome orxt(const QStringList& arguments, const QString& folder = QString(),
-                    const QString& outputFile = QString(), const QByteArray& input = QByteArray()) {
+                    const QString& outputFile = QString(), const QByteArray& input = QByteArray(),
+                    const QString& locale = QStringLiteral("C.UTF-8")) {
   QProcess process;
   QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-  environment.insert("LC_ALL", "C.UTF-8");
+  environment.insert("LC_ALL", locale);
   process.setProcessEnvironment(environment);
   if (!folder.isEmpty())
     process.setWorkingDirectory(folder);

@@ -45,10 +45,23 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
       {{"transformers", "show", "GeometryBufferer", "--version", "new"}, 2, "", "new"},
       {{"lint", QStringLiteral(ORX_SOURCE_DIR) + "/resources/transformers"}, 0, "", ""},
       {{"lint", "missing.ort"}, 3, "", "missing.ort"},
+      {{"lint", "x.ort", "--lang", "xx"}, 2, "", "'xx'; there are: de, en, fr"},
+      {{"transformers", "list", "--lang", "german"}, 2, "", "'german'; there are: de, en, fr"},
+      {{"transformers", "list", "--lang", "fr_CA"}, 0, "GeometryBufferer", ""},
+      {{"generate", good, good, "--lang", "de"}, 2, "", "Mehrere Arbeitsbereiche"},
   };
   for (const CommandCase& test : cases)
     expectOutcome(test, folder.path());
   EXPECT_FALSE(QFile::exists(folder.filePath("cut.mf")));
+}
+
+TEST(CommandLine, TellsWhenItDoesNotSpeakTheLanguageOfTheEnvironment) {
+  const QStringList command = {"lint", sample("custom")};
+  for (const char* locale : {"C", "POSIX", "de_AT.UTF-8", "fr"})
+    EXPECT_EQ(orxt(command, QString(), QString(), QByteArray(), locale).err, QString()) << locale;
+  const Outcome run = orxt(command, QString(), QString(), QByteArray(), "ja_JP.UTF-8");
+  EXPECT_EQ(run.status, 0);
+  EXPECT_TRUE(run.err.contains("'ja'; there are: de, en, fr")) << run.err.toStdString();
 }
 
 TEST(CommandLine, GeneratesManyWorkspacesAtOnce) {

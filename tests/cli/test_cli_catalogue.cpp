@@ -115,7 +115,7 @@ TEST_F(Catalogue, SaysWhereItDoesNotAnswerAsAsked) {
       {{"show", "a\x1b[31mb"}, 1, "a\xef\xbf\xbd[31mb"},
       {{"show", QString(50000, 'y')}, 1, "yyy\xe2\x80\xa6"},
       {{"show", "QuokaFeder"}, 1, "did you mean 'QuokkaFeeder'?"},
-      {{"show", "Geometriepufer", "--lang", "de"}, 1, "did you mean 'Geometriepuffer'?"},
+      {{"show", "Geometriepufer", "--lang", "de"}, 1, "meinten Sie 'Geometriepuffer'?"},
       {{"show", "Geometriepuffer", "--lang", "de"}, 0, ""},
       {{"show", "QuokkaFriend", "--version", "2"}, 1, "no version 2; the newest is 1"},
       {{"show", "Quokka", "--version", "2"}, 1, "there are: 1, 3"},

@@ -195,7 +195,8 @@ TEST_F(ConfigValidation, FormulasAreReadWhereverTheyStand) {
   };
   for (const auto& c : cases) {
     const TransformParamCfg parameter(GUIType::fromTransformerTypeString(qs(c.type), qs("P"), qs("P")));
-    EXPECT_EQ(findFormulaFault(parameter, qs(c.value)).isEmpty(), c.isSound) << c.type << " " << c.value;
+    QString message;
+    EXPECT_EQ(checkFormulas(parameter, qs(c.value), message), c.isSound) << c.type << " " << c.value;
   }
 }
 

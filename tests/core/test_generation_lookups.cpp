@@ -5,6 +5,7 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/LookupChecks.h>
 #include <transform/core/generation/LookupWriters.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextPlaces.h>
 
@@ -278,8 +279,7 @@ TEST(Lookups, WhichFormAValueTakes) {
 }
 
 TEST(Lookups, FaultsAreFoundBeforeWriting) {
-  using namespace lookup_checks;
-  using namespace text_refusals;
+  using namespace orx::messages;
   struct Case {
     TestParameter parameter;
     QString line;
@@ -296,14 +296,14 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", "TEXT_ENCODED", "a<u000a>b"}, "K $(P)", 0},
       {{"P", "TEXT", "a\\"}, "K $(P)", kEndsInBackslash},
       {{"P", "TEXT", "a\\"}, "K $(P) x", 0},
-      {{"P", "TEXT", "$[x"}, "K $(P)", kUnclosedReference},
+      {{"P", "TEXT", "$[x"}, "K $(P)", kValueUnclosed},
       {{"P", "TEXT", "$[x] {\"[;"}, "K $(P)", 0},
       {{"P", members, "A,x\\,B,y"}, "K $(A)", kEndsInBackslash},
-      {{"P", members, "A,$[x,B,]"}, "K $(A)", kUnclosedReference},
+      {{"P", members, "A,$[x,B,]"}, "K $(A)", kValueUnclosed},
       {{"P", members, "A,\"x\ny\",B,]"}, "K $(A)", kBreaksLine},
       {{"P", members, "A,x,B,y"}, "K $(A)", 0},
       {{"P", "TEXT_OR_ATTR", "@Value(a)$[x\n"}, "K $(P)", 0},  // the wrapped text is one word
-      {{"P", "LOOKUP_CHOICE A,a", "$(G) $["}, "K $(P)", kUnclosedReference},
+      {{"P", "LOOKUP_CHOICE A,a", "$(G) $["}, "K $(P)", kValueUnclosed},
       {{"P", "LOOKUP_CHOICE A,a", "$(G)\""}, "K", kValueInScript},
       {{"P", "LOOKUP_CHOICE A,a<quotationmark>", "$(G)"}, "K", kChoiceInScript},
       {{"P", "LOOKUP_CHOICE A,a<quotationmark>", "A"}, "K $(P)", 0},
@@ -337,7 +337,7 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
     EXPECT_EQ(cfg->findUnwritableValues(), expected)
         << c.parameter.type.toStdString() << ' ' << c.parameter.value.toStdString() << ' '
         << cfg->findUnwritableValues().values().join('|').toStdString();
-    if (c.number == kUnclosedReference) {
+    if (c.number == kValueUnclosed) {
       TextBuffer buffer;  // comes to an end all the same
       EXPECT_FALSE(cfg->instantiate(buffer, QString()));
     }

@@ -1,13 +1,17 @@
 // The table of rules, its description for people, and what settings may do to it.
 #include <tests/support/QtPrinters.h>
+#include <transform/findings/Refusal.h>
 #include <transform/findings/RuleSettings.h>
 #include <transform/findings/Rules.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QDir>
 #include <QFile>
 #include <QRegularExpression>
 #include <gtest/gtest.h>
+
+#include <thread>
 
 namespace {
 
@@ -34,6 +38,7 @@ TEST(Rules, AreDescribedInTheirOrder) {
   for (int i = 0; i < sections.size(); ++i) {
     const orx::RuleRow& rule = orx::ruleTable()[static_cast<std::size_t>(i)];
     EXPECT_EQ(static_cast<int>(rule.rule), i) << rule.name.latin1();
+    EXPECT_EQ(orx::findRule(rule.name), &rule) << "two rules are called " << rule.name.latin1();
     const QRegularExpressionMatch match = kForm.match(sections.at(i).trimmed());
     ASSERT_TRUE(match.hasMatch()) << sections.at(i).toStdString();
     EXPECT_EQ(match.captured(1), QString(rule.name));
@@ -97,6 +102,31 @@ TEST(RuleSettings, LowerWhatTheyMay) {
   QString reason;
   for (const char* wrong : {"no-such-rule=off", "cycle", "=off", "unused-reader=loud", "unused-reader="})
     EXPECT_FALSE(settings.set(wrong, reason)) << wrong;
+}
+
+TEST(Refusals, AreHeardByTheInnermostListenerOfTheirThread) {
+  const orx::Refusal kMissing{orx::Rule::MissingFile, orx::messages::kMissingFile, true};
+  QString text;
+  EXPECT_FALSE(orx::refuse(text, kMissing, {"a"}));
+  EXPECT_EQ(text, TransformResString(orx::messages::kMissingFile, QString("a")));
+  const orx::RefusalListener outer;
+  EXPECT_EQ(outer.refusal().message, 0) << "what was told before is not kept";
+  {
+    const orx::RefusalListener inner;
+    orx::refuse(text, orx::messages::kBadPattern);
+    orx::refuse(text, kMissing);
+    EXPECT_EQ(inner.refusal().rule, orx::Rule::MissingFile);
+    EXPECT_TRUE(inner.refusal().namesParameter);
+    EXPECT_EQ(outer.refusal().message, 0);
+  }
+  std::thread([] {
+    QString other;
+    orx::refuse(other, orx::messages::kBadPattern);
+  }).join();
+  EXPECT_EQ(outer.refusal().message, 0);
+  orx::refuse(text, orx::messages::kBadPattern);
+  EXPECT_EQ(outer.refusal().message, orx::messages::kBadPattern);
+  EXPECT_EQ(outer.refusal().rule, orx::Rule::InvalidValue);
 }
 
 }  // namespace

@@ -1,11 +1,16 @@
 #include <platform/qorxcore/Language.h>
 #include <transform/text/MessageStrings.h>
 
+#include <QDirIterator>
 #include <QFile>
+#include <QHash>
 #include <QMap>
 #include <QRegularExpression>
 #include <QSet>
 #include <gtest/gtest.h>
+
+#include <algorithm>
+#include <utility>
 
 namespace {
 
@@ -45,7 +50,85 @@ class LanguageGuard {
   QString m_before;
 };
 
+// Of the library and the command, by path.
+QMap<QString, QString> readSources() {
+  QMap<QString, QString> sources;
+  for (const char* folder : {"platform", "transform", "translation", "apps"}) {
+    QDirIterator files(QStringLiteral(ORX_SOURCE_DIR "/") + folder, {"*.h", "*.cpp"}, QDir::Files,
+                       QDirIterator::Subdirectories);
+    while (files.hasNext()) {
+      QFile file(files.next());
+      EXPECT_TRUE(file.open(QIODevice::ReadOnly)) << file.fileName().toStdString();
+      sources.insert(file.fileName(), QString::fromUtf8(file.readAll()));
+    }
+  }
+  return sources;
+}
+
+// Texts of transformers that have no class of their own yet.
+bool waitsForItsClass(long number) {
+  const std::pair<long, long> kWaiting[] = {
+      {370618, 370627},  // joining tables, querying them
+      {370631, 370631},  // sorting features by tests, as 370648 and 370652 to 370659
+      {370637, 370637},  // pages to print, as 370661
+      {370645, 370648},  // queries; tables of attributes
+      {370650, 370660},  // queries; tests; writing features
+      {370661, 370662},  // pages; running other workspaces
+  };
+  return std::any_of(std::begin(kWaiting), std::end(kWaiting),
+                     [number](const auto& range) { return number >= range.first && number <= range.second; });
+}
+
 }  // namespace
+
+TEST(Messages, EveryNumberHasANameATextAndACaller) {
+  const QMap<long, QString> english = readMessages("en");
+  const QMap<QString, QString> sources = readSources();
+  static const QRegularExpression kLiteral("\\b37[01]\\d{3}\\b");
+  QHash<QString, long> named;
+  QSet<QString> used;
+  QSet<QString> rules;
+  QString table;
+  for (auto source = sources.begin(); source != sources.end(); ++source) {
+    if (source.key().endsWith("transform/text/MessageNumbers.h")) {
+      static const QRegularExpression kName("constexpr long (k\\w+) = (\\d+);");
+      for (auto it = kName.globalMatch(source.value()); it.hasNext();) {
+        const QRegularExpressionMatch match = it.next();
+        EXPECT_FALSE(named.contains(match.captured(1)));
+        named.insert(match.captured(1), match.captured(2).toLong());
+      }
+      continue;
+    }
+    EXPECT_FALSE(source.value().contains(kLiteral)) << source.key().toStdString() << " holds a bare number";
+    static const QRegularExpression kUse("\\b(messages|Rule)::(\\w+)");
+    const bool isTable = source.key().contains("transform/findings/Rules.");
+    table += isTable ? source.value() : QString();
+    for (auto it = kUse.globalMatch(isTable ? QString() : source.value()); it.hasNext();) {
+      const QRegularExpressionMatch match = it.next();
+      (match.captured(1) == "Rule" ? rules : used).insert(match.captured(2));
+    }
+  }
+  // The message of a rule is called where the rule is told.
+  static const QRegularExpression kRow("\\{Rule::(\\w+),[^}]*messages::(\\w+)\\}");
+  for (auto it = kRow.globalMatch(table); it.hasNext();) {
+    const QRegularExpressionMatch match = it.next();
+    if (rules.contains(match.captured(1))) {
+      used.insert(match.captured(2));
+    }
+  }
+  QMap<long, QString> names;
+  for (auto name = named.begin(); name != named.end(); ++name) {
+    EXPECT_TRUE(used.contains(name.key())) << name.key().toStdString() << " has no caller";
+    EXPECT_FALSE(names.contains(name.value())) << name.key().toStdString() << " names a number once more";
+    names.insert(name.value(), name.key());
+  }
+  for (const long number : english.keys()) {
+    EXPECT_NE(names.contains(number), waitsForItsClass(number)) << number;
+  }
+  for (const long number : names.keys()) {
+    EXPECT_TRUE(english.contains(number)) << names.value(number).toStdString() << " has no text";
+  }
+}
 
 TEST(Messages, AllLanguagesSayTheSame) {
   const QMap<long, QString> english = readMessages("en");

@@ -1,13 +1,14 @@
 #include <transform/core/Formula.h>
 #include <transform/core/Keywords.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/findings/Refusal.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <algorithm>
 
+namespace messages = orx::messages;
+
 namespace {
 
-constexpr long kNotUnderstoodMessage = 370701;
-constexpr long kIncompleteMessage = 370702;
 constexpr int kLongestQuote = 40;
 
 bool isNameCharacter(QChar c) {
@@ -187,13 +188,13 @@ void Formula::parse() {
   }
 }
 
-QString Formula::faultMessage() const {
+bool Formula::refuse(QString& message) const {
   const QString rest = m_text.mid(m_fault);
   if (rest.isEmpty()) {
-    return TransformResString(kIncompleteMessage);
+    return orx::refuse(message, messages::kIncomplete);
   }
-  return TransformResString(kNotUnderstoodMessage,
-                            rest.size() > kLongestQuote ? rest.left(kLongestQuote) + QChar(0x2026) : rest);
+  return orx::refuse(message, messages::kNotUnderstood,
+                     {rest.size() > kLongestQuote ? rest.left(kLongestQuote) + QChar(0x2026) : rest});
 }
 
 QString Formula::withOwnOperators(const QString& text) {

@@ -26,8 +26,8 @@ class Formula {
   // the end; -1 when all is well.
   int fault() const { return m_fault; }
 
-  // A message for the user about the fault.
-  QString faultMessage() const;
+  // Tells the user about the fault; always false.
+  bool refuse(QString& message) const;
 
   // The text with "==", "<>", "&&", "||" and "!" as the operators that formulas have for them. Texts and
   // attributes stay as they are.

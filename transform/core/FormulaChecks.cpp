@@ -40,16 +40,14 @@ QStringList formulasIn(const GUIType& type, const QString& value) {
   return formulas;
 }
 
-QString findFormulaFault(const TransformParamCfg& parameter, const QString& value) {
-  QString message;
-  forEachPart(parameter, value, [&message](const GUIType& type, const QString& part) {
-    const QStringList formulas = message.isEmpty() ? formulasIn(type, part) : QStringList();
+bool checkFormulas(const TransformParamCfg& parameter, const QString& value, QString& message) {
+  bool isSound = true;
+  forEachPart(parameter, value, [&](const GUIType& type, const QString& part) {
+    const QStringList formulas = isSound ? formulasIn(type, part) : QStringList();
     for (const QString& text : formulas) {
       const Formula formula(text);
-      if (message.isEmpty() && !formula.isValid()) {
-        message = formula.faultMessage();
-      }
+      isSound = isSound && (formula.isValid() || formula.refuse(message));
     }
   });
-  return message;
+  return isSound;
 }

@@ -14,6 +14,6 @@ class TransformParamCfg;
 // what it says is known when the mapping file runs.
 ORX_EXPORT QStringList formulasIn(const GUIType& type, const QString& value);
 
-// The message for the user about the first formula of the value that cannot be understood, whichever member
-// or cell it stands in; empty when all can.
-ORX_EXPORT QString findFormulaFault(const TransformParamCfg& parameter, const QString& value);
+// Whether all formulas of the value can be understood, whichever member or cell they stand in. Otherwise
+// `message` tells the user about the first that cannot.
+ORX_EXPORT bool checkFormulas(const TransformParamCfg& parameter, const QString& value, QString& message);

@@ -1,6 +1,7 @@
 #include <platform/qorxcore/Lists.h>
 #include <transform/core/LookupChecks.h>
 #include <transform/core/generation/LookupWriters.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TclText.h>
 #include <transform/text/TextPlaces.h>
 
@@ -8,6 +9,8 @@
 
 #include <algorithm>
 #include <cstring>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -35,9 +38,9 @@ long refuseMessage(const BoxLookup& lookup) {
     return 0;
   }
   if (!fitsQuotes(lookup.prompt)) {
-    return kPromptInScript;
+    return messages::kPromptInScript;
   }
-  return fitsQuotes(lookup.identifier) ? 0 : kIdentifierInScript;
+  return fitsQuotes(lookup.identifier) ? 0 : messages::kIdentifierInScript;
 }
 
 // What "string map" makes of a text: at each place the first key that fits is replaced.
@@ -144,14 +147,14 @@ bool fitsFragment(const QString& text) {
 
 long refuseChoiceBox(const ChoiceList& choices, const BoxLookup& lookup) {
   if (!isPlainWord(lookup.macro)) {
-    return kNameInMacro;
+    return messages::kNameInMacro;
   }
   if (!fitsQuotes(lookup.value)) {
-    return kValueInScript;
+    return messages::kValueInScript;
   }
   for (const auto& [shown, stored] : choices.entries()) {
     if (!fitsBraces(shown) || !fitsQuotes(stored)) {
-      return kChoiceInScript;
+      return messages::kChoiceInScript;
     }
   }
   return refuseMessage(lookup);
@@ -159,30 +162,30 @@ long refuseChoiceBox(const ChoiceList& choices, const BoxLookup& lookup) {
 
 long refuseListBox(const ChoiceList& choices, const BoxLookup& lookup) {
   if (!isPlainWord(lookup.macro)) {
-    return kNameInMacro;
+    return messages::kNameInMacro;
   }
   if (!fitsBraces(lookup.value)) {
-    return kValueInScript;
+    return messages::kValueInScript;
   }
-  return mapsEverySelection(choices) ? refuseMessage(lookup) : kChoiceInScript;
+  return mapsEverySelection(choices) ? refuseMessage(lookup) : messages::kChoiceInScript;
 }
 
 long refuseChoiceProcedure(const ChoiceList& choices, const QString& procedure, const QString& value) {
   if (!isPlainWord(procedure)) {
-    return kNameInMacro;
+    return messages::kNameInMacro;
   }
   if (!fitsBraces(value)) {
-    return kValueInScript;
+    return messages::kValueInScript;
   }
   const lookup_writers::Entries& entries = choices.entries();
   // Alone, this name would stand for every value.
   if (entries.size() == 1 && entries.front().first == QLatin1String("default")) {
-    return kChoiceInScript;
+    return messages::kChoiceInScript;
   }
   const bool fits = std::all_of(entries.begin(), entries.end(), [](const auto& entry) {
     return fitsBraces(entry.first) && fitsBraces(entry.second);
   });
-  return fits ? 0 : kChoiceInScript;
+  return fits ? 0 : messages::kChoiceInScript;
 }
 
 }  // namespace lookup_checks

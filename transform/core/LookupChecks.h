@@ -21,11 +21,4 @@ ORX_EXPORT long refuseChoiceProcedure(const ChoiceList& choices, const QString& 
 // Whether a text means itself wherever it stands in a fragment.
 ORX_EXPORT bool fitsFragment(const QString& text);
 
-constexpr long kValueInScript = 370723;
-constexpr long kChoiceInScript = 370724;
-constexpr long kPromptInScript = 370725;
-constexpr long kIdentifierInScript = 370726;
-constexpr long kGrowsWithoutEnd = 370727;
-constexpr long kNameInMacro = 370728;
-
 }  // namespace lookup_checks

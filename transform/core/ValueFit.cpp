@@ -4,6 +4,7 @@
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/ValueFit.h>
 #include <transform/core/ValueReferences.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QHash>
@@ -11,12 +12,10 @@
 #include <algorithm>
 #include <cmath>
 
+namespace messages = orx::messages;
+
 namespace {
 
-constexpr long kNoChoice = 371310;
-constexpr long kNoNumber = 371311;
-constexpr long kNoWholeNumber = 371312;
-constexpr long kOutOfRange = 371313;
 constexpr int kMostOffered = 12;
 
 const QLatin1String kCheckBoxType("CHECKBOX");
@@ -135,22 +134,29 @@ std::vector<ValueFit> ValueFit::misfitsOf(const TransformParamCfg& parameter, co
   return misfits;
 }
 
-QString ValueFit::text() const {
+long ValueFit::message() const {
   switch (misfit) {
     case Misfit::None:
       break;
-    case Misfit::Choice: {
-      QStringList shown = offered.mid(0, kMostOffered);
-      if (shown.size() < offered.size())
-        shown.append(QStringLiteral("\u2026"));
-      return TransformResString(kNoChoice, {value, shown.join(QLatin1String(", "))});
-    }
+    case Misfit::Choice:
+      return messages::kUnfitChoice;
     case Misfit::Number:
-      return TransformResString(kNoNumber, value);
+      return messages::kUnfitNumber;
     case Misfit::WholeNumber:
-      return TransformResString(kNoWholeNumber, value);
+      return messages::kNoWholeNumber;
     case Misfit::Range:
-      return TransformResString(kOutOfRange, {value, offered.value(0), offered.value(1)});
+      return messages::kUnfitRange;
   }
-  return QString();
+  return 0;
+}
+
+QString ValueFit::text() const {
+  if (misfit == Misfit::Range)
+    return TransformResString(message(), {value, offered.value(0), offered.value(1)});
+  if (misfit != Misfit::Choice)
+    return fits() ? QString() : TransformResString(message(), value);
+  QStringList shown = offered.mid(0, kMostOffered);
+  if (shown.size() < offered.size())
+    shown.append(QStringLiteral("\u2026"));
+  return TransformResString(message(), {value, shown.join(QLatin1String(", "))});
 }

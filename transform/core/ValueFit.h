@@ -26,7 +26,8 @@ struct ORX_EXPORT ValueFit {
 
   bool fits() const { return misfit == Misfit::None; }
   bool isNumber() const { return misfit != Misfit::Choice; }
-  // What is wrong, in the current language.
+  // What is wrong: its number in orx::messages, and its text in the current language.
+  long message() const;
   QString text() const;
 
   // `choices` are those of the type, with their lookups.

@@ -6,8 +6,8 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/custom/instance/InstancePrototype.h>
-#include <transform/custom/linked/CustomMessages.h>
 #include <transform/scripts/ScriptBlocks.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/text/TextPlaces.h>
@@ -15,6 +15,8 @@
 #include <QSet>
 
 #include <utility>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -343,7 +345,7 @@ void CompoundTransformerCfg::turnOffMultiProcessing() {
 
 QString CompoundTransformerCfg::instantiationFault() const {
   if (!m_network)
-    return TransformResString(custom_messages::kNoInstance, getName());
+    return TransformResString(messages::kNoInstance, getName());
   QString fault = findNameFault(getName());
   if (fault.isEmpty() && TextPlaces::refuse(TextPlace::MacroName, makePrefixMacro(getVisualName())) != 0)
     fault = findNameFault(getVisualName());

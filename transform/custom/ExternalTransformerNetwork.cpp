@@ -4,7 +4,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/SubDocumentLibrary.h>
-#include <transform/custom/linked/CustomMessages.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/TransformerRecords.h>
@@ -14,6 +14,8 @@
 
 #include <QFileInfo>
 #include <QScopeGuard>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -74,8 +76,8 @@ void ExternalTransformerNetwork::readHeader(int version) {
     error = exception.getMessage();
   }
   if (!error.isEmpty()) {
-    addProblem(orx::Rule::CustomTransformerFault, custom_messages::kNoBody, 0, QString(),
-               TransformResString(custom_messages::kNoBody, {getName(), m_fileName, error}));
+    addProblem(orx::Rule::CustomTransformerFault, messages::kNoBody, 0, QString(),
+               TransformResString(messages::kNoBody, {getName(), m_fileName, error}));
   }
   if (!m_isLoaded)
     return;
@@ -131,13 +133,12 @@ void ExternalTransformerNetwork::forceLoad() {
     loadBody();
   } catch (const WorkspaceLoaderException& exception) {
     m_lacksRoutine = lacksRoutine();
-    m_bodyFault =
-        m_lacksRoutine
-            ? TransformResString(custom_messages::kEncipheredBody, {getName(), m_fileName})
-            : TransformResString(custom_messages::kNoBody, {getName(), m_fileName, exception.getMessage()});
+    m_bodyFault = m_lacksRoutine ? TransformResString(messages::kEncipheredBody, {getName(), m_fileName})
+                                 : TransformResString(messages::kNoBody,
+                                                      {getName(), m_fileName, exception.getMessage()});
     addProblem(orx::Rule::CustomTransformerFault,
-               m_lacksRoutine ? custom_messages::kEncipheredBody : custom_messages::kNoBody, exception.line(),
-               QString(), m_bodyFault);
+               m_lacksRoutine ? messages::kEncipheredBody : messages::kNoBody, exception.line(), QString(),
+               m_bodyFault);
     doneAdding(true);
   }
 }
@@ -176,7 +177,7 @@ void ExternalTransformerNetwork::loadBody() {
   PlainFile plain(m_fileName, kTemporaryName);
   const VersionInfo version = findVersion(plain.fileName());
   if (version.byteLength < 0)
-    throw WorkspaceLoaderException(TransformResString(custom_messages::kFileChanged, m_fileName));
+    throw WorkspaceLoaderException(TransformResString(messages::kFileChanged, m_fileName));
   XMLComponentReader reader;
   {
     QStringList headerLines;

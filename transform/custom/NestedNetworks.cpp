@@ -3,7 +3,7 @@
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
-#include <transform/custom/linked/CustomMessages.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/text/TextPlaces.h>
@@ -12,6 +12,8 @@
 #include <QSet>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 bool isCustomTransformer(const TransformerCfg* cfg) {
   return dynamic_cast<const CompoundTransformerCfg*>(cfg) != nullptr;
@@ -94,7 +96,7 @@ QString findNameFault(const QString& name) {
   const bool fits = TextPlaces::refuse(TextPlace::MacroName, makePrefixMacro(name)) == 0 &&
                     TextPlaces::refuse(TextPlace::HeaderField, name) == 0 &&
                     TextPlaces::refuse(TextPlace::Word, name) == 0;
-  return fits ? QString() : TransformResString(custom_messages::kNoMacroName, name);
+  return fits ? QString() : TransformResString(messages::kNoMacroName, name);
 }
 
 QString findNestingFault(CompoundTransformerNetwork& root) {
@@ -109,7 +111,7 @@ QString findNestingFault(CompoundTransformerNetwork& root) {
         depth = std::max(depth, depths.value(inner) + 1);
       if (depth > CompoundTransformerNetwork::kDeepestNesting) {
         return TransformResString(
-            custom_messages::kNestedTooDeep,
+            messages::kNestedTooDeep,
             {root.getName(), QString::number(CompoundTransformerNetwork::kDeepestNesting)});
       }
       depths.insert(level.network, depth);
@@ -122,7 +124,7 @@ QString findNestingFault(CompoundTransformerNetwork& root) {
       depths.insert(inner, kOpen);
       open.push_back(openNetwork(*inner));
     } else if (*known == kOpen) {
-      return TransformResString(custom_messages::kContainsItself, {inner->getName(), circle(open, inner)});
+      return TransformResString(messages::kContainsItself, {inner->getName(), circle(open, inner)});
     }
   }
   return QString();
@@ -143,7 +145,7 @@ QString findPrefixFault(CompoundTransformerNetwork& root) {
       continue;
     for (const CompoundTransformerNetwork* inner : nestedNetworks(*outer)) {
       if (inner != outer && makePrefixMacro(inner->getName()) == prefix) {
-        return TransformResString(custom_messages::kSamePrefix, {outer->getName(), inner->getName(), prefix});
+        return TransformResString(messages::kSamePrefix, {outer->getName(), inner->getName(), prefix});
       }
     }
   }

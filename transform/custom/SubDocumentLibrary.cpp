@@ -4,11 +4,13 @@
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
-#include <transform/custom/linked/CustomMessages.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/IXMLComponentReader.h>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 struct SubDocumentLibrary::Entry {
   ExternalDocNetwork network;
@@ -38,7 +40,7 @@ SubDocumentLibrary::Entry* SubDocumentLibrary::find(const QString& name) {
     return nullptr;
   if (m_open.contains(name)) {
     const QStringList way = m_open.mid(m_open.indexOf(name)) << name;
-    m_refusal = TransformResString(custom_messages::kContainsItself, {name, way.join(QLatin1String(" > "))});
+    m_refusal = TransformResString(messages::kContainsItself, {name, way.join(QLatin1String(" > "))});
     return nullptr;
   }
   // Bounds the recursion; what is built already is judged by its depth.
@@ -89,7 +91,7 @@ std::unique_ptr<TransformerCfg> SubDocumentLibrary::makeTransformer(const QStrin
     return nullptr;
   const int depth = m_open.size() + entry->depth;
   if (!entry->isBuilt || depth > CompoundTransformerNetwork::kDeepestNesting) {
-    m_refusal = TransformResString(custom_messages::kNestedTooDeep,
+    m_refusal = TransformResString(messages::kNestedTooDeep,
                                    {m_open.isEmpty() ? name : m_open.first(),
                                     QString::number(CompoundTransformerNetwork::kDeepestNesting)});
     return nullptr;

@@ -1,10 +1,14 @@
 #include <transform/files/InputFile.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 
 #include <QFile>
 #include <QFileInfo>
 
 #include <fcntl.h>
 #include <unistd.h>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -30,7 +34,7 @@ bool InputFile::open() {
   m_error.clear();
   // A closed descriptor would be taken by the next file that is opened.
   if (isStandardInput(m_fileName) && fcntl(STDIN_FILENO, F_GETFD) < 0)
-    return fail(QStringLiteral("it is closed"));
+    return fail(TransformResString(messages::kStreamClosed));
   QFile file(m_fileName);
   const bool isOpen = isStandardInput(m_fileName)
                           ? file.open(STDIN_FILENO, QIODevice::ReadOnly | QIODevice::Unbuffered)
@@ -46,7 +50,7 @@ bool InputFile::open() {
 bool InputFile::copy(QFile& stream) {
   auto copy = std::make_unique<TemporaryFile>(QStringLiteral("kx-stream-XXXXXX"));
   if (!copy->open())
-    return fail(QStringLiteral("no temporary copy can be made: %1").arg(copy->errorString()));
+    return fail(TransformResString(messages::kNoTemporaryCopy, copy->errorString()));
   QByteArray piece(kPieceSize, '\0');
   qint64 total = 0;
   for (;;) {
@@ -57,12 +61,12 @@ bool InputFile::copy(QFile& stream) {
       break;
     total += count;
     if (total > kLargestStream)
-      return fail(QStringLiteral("it gives more than %1 MiB").arg(kLargestStream >> 20));
+      return fail(TransformResString(messages::kStreamTooLarge, QString::number(kLargestStream >> 20)));
     if (copy->write(piece.constData(), count) != count)
-      return fail(QStringLiteral("no temporary copy can be made: %1").arg(copy->errorString()));
+      return fail(TransformResString(messages::kNoTemporaryCopy, copy->errorString()));
   }
   if (!copy->flush())
-    return fail(QStringLiteral("no temporary copy can be made: %1").arg(copy->errorString()));
+    return fail(TransformResString(messages::kNoTemporaryCopy, copy->errorString()));
   copy->close();
   m_copy = std::move(copy);
   return true;

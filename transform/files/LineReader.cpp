@@ -1,8 +1,12 @@
 #include <transform/files/LineReader.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 
 #include <algorithm>
 #include <cstring>
 #include <unistd.h>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -50,7 +54,8 @@ bool LineReader::next() {
     m_line.chop(1);
   }
   return m_line.size() <= m_longestLine ||
-         fail(QStringLiteral("line %1 is longer than %2 bytes").arg(m_number).arg(m_longestLine));
+         fail(TransformResString(messages::kLineTooLong,
+                                 {QString::number(m_number), QString::number(m_longestLine)}));
 }
 
 // False at the end of the file and after an error.

@@ -13,8 +13,11 @@ QString textOf(Rule rule, long message, const QStringList& arguments) {
 
 }  // namespace
 
-void Findings::report(Rule rule, int line, const QString& node, const QStringList& arguments) {
+void Findings::report(Rule rule, int line, const QString& node, const QStringList& arguments,
+                      const QString& remark) {
   reportAs(rule, ruleRow(rule).message, line, node, arguments);
+  if (!remark.isEmpty())
+    m_all.back().text += QLatin1Char(' ') + remark;
 }
 
 void Findings::reportAs(Rule rule, long message, int line, const QString& node,
@@ -29,18 +32,19 @@ void Findings::reportAs(Rule rule, long message, int line, const QString& node,
 }
 
 void Findings::reportText(Rule rule, int line, const QString& node, const QString& text) {
-  reportParameter(rule, line, node, QString(), text);
-}
-
-void Findings::reportParameter(Rule rule, int line, const QString& node, const QString& parameter,
-                               const QString& text) {
   Finding finding;
   finding.rule = rule;
   finding.line = line;
   finding.node = node;
   finding.text = text;
-  finding.parameter = parameter;
   add(std::move(finding));
+}
+
+void Findings::reportParameter(Rule rule, long message, int line, const QString& node,
+                               const QString& parameter, const QString& text) {
+  reportText(rule, line, node, text);
+  m_all.back().parameter = parameter;
+  m_all.back().message = message;
 }
 
 void Findings::reportUnwritable(int line, const QString& node, const QString& parameter,

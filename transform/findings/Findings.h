@@ -17,14 +17,16 @@ class ORX_EXPORT Findings {
 
   const QString& file() const { return m_file; }
   // The text is the rule's message in the current language with `arguments` (at most five) filled in.
-  void report(Rule rule, int line, const QString& node, const QStringList& arguments = QStringList());
+  // `remark` is a further sentence.
+  void report(Rule rule, int line, const QString& node, const QStringList& arguments = QStringList(),
+              const QString& remark = QString());
   // With another message than the rule's own.
   void reportAs(Rule rule, long message, int line, const QString& node,
                 const QStringList& arguments = QStringList());
   // With a text that another part of the system has put together.
   void reportText(Rule rule, int line, const QString& node, const QString& text);
-  // About one parameter of the node.
-  void reportParameter(Rule rule, int line, const QString& node, const QString& parameter,
+  // About one parameter of the node, with a text made from the message.
+  void reportParameter(Rule rule, long message, int line, const QString& node, const QString& parameter,
                        const QString& text);
   // The parameter's value cannot be written, for the reason given.
   void reportUnwritable(int line, const QString& node, const QString& parameter, const QString& reason);

@@ -1,13 +1,10 @@
 #include <transform/findings/RuleSettings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 namespace orx {
 
 namespace {
-
-constexpr long kNoRule = 370873;
-constexpr long kNoSeverity = 370874;
-constexpr long kCannotBeLowered = 371080;
 
 QString allNames() {
   QStringList names;
@@ -36,17 +33,17 @@ bool RuleSettings::set(const QString& setting, QString& reason) {
   const int equals = setting.indexOf(QLatin1Char('='));
   const RuleRow* row = equals < 0 ? nullptr : findRule(setting.left(equals));
   if (!row) {
-    reason = TransformResString(kNoRule, {setting, allNames()});
+    reason = TransformResString(messages::kNoRule, {setting, allNames()});
     return false;
   }
   const QString word = setting.mid(equals + 1);
   std::optional<Severity> severity;
   if (!readSeverity(word, severity)) {
-    reason = TransformResString(kNoSeverity, {word, row->name});
+    reason = TransformResString(messages::kNoSeverity, {word, row->name});
     return false;
   }
   if (row->kind == RuleKind::Writing && severity != row->severity) {
-    reason = TransformResString(kCannotBeLowered, QString(row->name));
+    reason = TransformResString(messages::kCannotBeLowered, QString(row->name));
     return false;
   }
   m_severities.insert(static_cast<int>(row->rule), severity);

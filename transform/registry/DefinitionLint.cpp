@@ -9,6 +9,7 @@
 #include <transform/registry/lint/TemplateLint.h>
 #include <transform/registry/loading/DefinitionFileNames.h>
 #include <transform/registry/loading/DefinitionFileParser.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/XMLComponentReader.h>
 
 #include <QDir>
@@ -16,6 +17,7 @@
 #include <QFileInfo>
 
 using orx::Rule;
+namespace messages = orx::messages;
 
 namespace {
 
@@ -60,7 +62,7 @@ void DefinitionLint::checkPath(const QString& path) {
 void DefinitionLint::addFolder(const QString& folder) {
   const FolderListing listing = FolderListing::files(folder);
   if (listing.failed()) {
-    m_report.add(Rule::UnreadableFile, folder, 0, listing.errorString());
+    m_report.add(Rule::UnreadableFile, messages::kDefinitionUnreadable, folder, 0, {listing.errorString()});
   }
   for (const QString& name : listing.names()) {
     if (isDefinitionFileName(name) || isCompanionFileName(name)) {
@@ -69,8 +71,7 @@ void DefinitionLint::addFolder(const QString& folder) {
   }
   for (const QString& name : listing.unusableNames()) {
     if (isDefinitionFileName(name) || isCompanionFileName(name)) {
-      m_report.add(Rule::UnreadableFile, folder + QLatin1Char('/') + name, 0,
-                   QStringLiteral("This is no file that can be read"));
+      m_report.add(Rule::UnreadableFile, messages::kNoReadableFile, folder + QLatin1Char('/') + name, 0);
     }
   }
 }
@@ -100,35 +101,31 @@ void DefinitionLint::readDefinitions(const QString& path, bool isGiven) {
   QFile file(path);
   DefinitionFileParser parser;
   if (!file.open(QIODevice::ReadOnly)) {
-    report.add(Rule::UnreadableFile, path, 0, file.errorString());
+    report.add(Rule::UnreadableFile, messages::kDefinitionUnreadable, path, 0, {file.errorString()});
     return;
   }
   if (!parser.parse(file, path)) {
-    report.add(Rule::UnreadableFile, path, 0, parser.errorString());
+    report.add(Rule::UnreadableFile, messages::kDefinitionUnreadable, path, 0, {parser.errorString()});
     return;
   }
   if (XMLComponentReader::IsFileXMLWorkspace(path)) {
     if (parser.definitions().empty()) {
       return;
     }
-    report.add(
-        Rule::WorkspaceMark, path, 1,
-        QStringLiteral("The first 100 bytes hold ORW or a tag of a workspace, so the file is taken for one "
-                       "and its definitions are not read"));
+    report.add(Rule::WorkspaceMark, messages::kTakenForWorkspace, path, 1);
   }
   if (!parser.isSoundUtf8()) {
-    report.add(Rule::NotUtf8, path, 0, QStringLiteral("The file is not UTF-8"));
+    report.add(Rule::NotUtf8, messages::kFileNotUtf8, path, 0);
   }
   if (parser.openBlockLine() != 0) {
-    report.add(Rule::OpenBlock, path, parser.openBlockLine(), QStringLiteral("This block has no end"));
+    report.add(Rule::OpenBlock, messages::kBlockWithoutEnd, path, parser.openBlockLine());
   }
   if (!parser.unfinished().isEmpty()) {
-    report.add(Rule::UnfinishedDefinition, path, parser.unfinished().firstLine(),
-               QStringLiteral("What stands behind the last TEMPLATE_END is no definition and is lost"));
+    report.add(Rule::UnfinishedDefinition, messages::kLostLines, path, parser.unfinished().firstLine());
   }
   for (const CategoryText& category : parser.categories()) {
     if (category.name.isEmpty()) {
-      report.add(Rule::BadValue, path, category.line, QStringLiteral("The category has no name"));
+      report.add(Rule::BadValue, messages::kNamelessCategory, path, category.line);
     }
     m_catalogue->addCategory(category.name);
   }
@@ -158,10 +155,8 @@ void DefinitionLint::checkDefinition(const LintedDefinition& definition) {
   const TransformerDefinition& fields = definition.fields();
   const QString key = entryKey(QFileInfo(definition.file()).absolutePath(), fields.name, fields.version);
   if (m_defined.contains(key)) {
-    m_report.add(Rule::DuplicateDefinition, definition.file(), definition.nameLine(),
-                 QStringLiteral("The folder defines %1 version %2 already; the last one read is kept")
-                     .arg(fields.name)
-                     .arg(fields.version));
+    m_report.add(Rule::DuplicateDefinition, messages::kDuplicateDefinition, definition.file(),
+                 definition.nameLine(), {fields.name, QString::number(fields.version)});
   }
   m_defined.insert(key);
   HeaderLint(definition, m_report).check();
@@ -174,7 +169,7 @@ void DefinitionLint::checkDefinition(const LintedDefinition& definition) {
 void DefinitionLint::checkCompanion(const QString& path) {
   QFile file(path);
   if (!file.open(QIODevice::ReadOnly)) {
-    m_report.add(Rule::UnreadableFile, path, 0, file.errorString());
+    m_report.add(Rule::UnreadableFile, messages::kDefinitionUnreadable, path, 0, {file.errorString()});
     return;
   }
   CompanionLint lint(path, *m_catalogue, m_report);
@@ -217,11 +212,8 @@ void DefinitionLint::checkShipped() {
     for (const QLatin1String language : kShippedLanguages) {
       const TransformerDefinition& fields = definition->fields();
       if (!m_translated.contains(entryKey(language, fields.name, fields.version))) {
-        m_report.add(Rule::MissingTranslation, definition->file(), definition->nameLine(),
-                     QStringLiteral("%1 version %2 has no entry in a companion for '%3'")
-                         .arg(fields.name)
-                         .arg(fields.version)
-                         .arg(language));
+        m_report.add(Rule::MissingTranslation, messages::kNoTranslation, definition->file(),
+                     definition->nameLine(), {fields.name, QString::number(fields.version), language});
       }
     }
   }

@@ -1,4 +1,5 @@
 #include <transform/registry/LintReport.h>
+#include <transform/text/MessageStrings.h>
 
 #include <algorithm>
 #include <tuple>
@@ -10,12 +11,18 @@ constexpr int kLongestText = 400;
 
 }  // namespace
 
-void LintReport::add(orx::Rule rule, const QString& file, int line, const QString& text) {
+void LintReport::add(orx::Rule rule, long message, const QString& file, int line,
+                     const QStringList& arguments) {
+  addText(rule, message, file, line, TransformResString(message, arguments));
+}
+
+void LintReport::addText(orx::Rule rule, long message, const QString& file, int line, const QString& text) {
   orx::Finding finding;
   finding.rule = rule;
   finding.severity = orx::ruleRow(rule).severity;
   finding.file = file;
   finding.line = line;
+  finding.message = message;
   finding.text = text.size() > kLongestText ? text.left(kLongestText) + QLatin1String("...") : text;
   m_findings.push_back(std::move(finding));
 }

@@ -13,6 +13,7 @@
 #include <transform/registry/loading/DefinitionLoader.h>
 #include <transform/registry/loading/ExceptionList.h>
 #include <transform/registry/loading/NamedConnections.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QHash>
@@ -21,12 +22,11 @@
 #include <algorithm>
 #include <utility>
 
+namespace messages = orx::messages;
+
 namespace {
 
 const QString kResourceKind = QStringLiteral("transformer");
-
-constexpr long kNewerBuild = 370745;
-constexpr long kLoadedAlready = 370748;
 
 bool isAnyVersion(int version) {
   return version == ITransformerMgr::NEWEST_VERSION || version == ITransformerMgr::OLDEST_VERSION;
@@ -39,8 +39,9 @@ bool concerns(const TransformerMgr::IgnoredTransformer& ignored, const QString& 
 }  // namespace
 
 QString TransformerMgr::IgnoredTransformer::reason() const {
-  return isDuplicate ? TransformResString(kLoadedAlready, {name, QString::number(version), path, keptPath})
-                     : TransformResString(kNewerBuild, {name, QString::number(version), path});
+  return isDuplicate
+             ? TransformResString(messages::kLoadedAlready, {name, QString::number(version), path, keptPath})
+             : TransformResString(messages::kCustomOfNewerBuild, {name, QString::number(version), path});
 }
 
 ITransformerMgr::~ITransformerMgr() = default;

@@ -1,4 +1,6 @@
 #include <transform/scripts/PythonSyntax.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 
 #include <QJsonArray>
 #include <QJsonDocument>
@@ -31,7 +33,7 @@ bool PythonSyntax::check(const QStringList& scripts) {
   }
   const QString program = QStandardPaths::findExecutable(QStringLiteral("python3"));
   if (program.isEmpty()) {
-    m_error = QStringLiteral("There is no python3 in the search path");
+    m_error = TransformResString(orx::messages::kNoPython);
     return false;
   }
   QProcess python;
@@ -41,7 +43,7 @@ bool PythonSyntax::check(const QStringList& scripts) {
   python.write(QJsonDocument(QJsonArray::fromStringList(scripts)).toJson(QJsonDocument::Compact));
   python.closeWriteChannel();
   if (!python.waitForFinished(kTimeLimit)) {
-    m_error = python.error() == QProcess::Timedout ? QStringLiteral("python3 does not answer")
+    m_error = python.error() == QProcess::Timedout ? TransformResString(orx::messages::kPythonSilent)
                                                    : python.errorString();
     python.kill();
     python.waitForFinished();
@@ -49,8 +51,8 @@ bool PythonSyntax::check(const QStringList& scripts) {
   }
   const QJsonDocument answer = QJsonDocument::fromJson(python.readAllStandardOutput());
   if (python.exitStatus() != QProcess::NormalExit || python.exitCode() != 0 || !answer.isArray()) {
-    m_error = QLatin1String("python3 stopped over the scripts: ") +
-              QString::fromUtf8(python.readAllStandardError()).trimmed().section(QLatin1Char('\n'), -1);
+    const QString said = QString::fromUtf8(python.readAllStandardError()).trimmed();
+    m_error = TransformResString(orx::messages::kPythonStopped, said.section(QLatin1Char('\n'), -1));
     return false;
   }
   for (const auto& value : answer.array()) {

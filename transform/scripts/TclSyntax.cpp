@@ -1,4 +1,6 @@
 #include <transform/scripts/TclSyntax.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 
 #include <QByteArray>
 #include <QVector>
@@ -26,7 +28,7 @@ class Parser {
     const auto brackets =
         std::count_if(script.begin(), script.end(), [](char c) { return c == '[' || c == '(' || c == '"'; });
     if (brackets > kMostBrackets) {
-      m_fault = {1, 0, QStringLiteral("holds more brackets than can be checked")};
+      m_fault = {1, 0, TransformResString(orx::messages::kTclTooManyBrackets)};
       return;
     }
     // An interpreter is there for its messages alone, and making one takes longer than parsing.
@@ -51,7 +53,7 @@ class Parser {
       m_fault.text = QString::fromUtf8(Tcl_GetStringResult(m_interpreter.get()));
     }
     if (m_fault.text.isEmpty()) {
-      m_fault.text = QStringLiteral("cannot be parsed");
+      m_fault.text = TransformResString(orx::messages::kTclNotParsed);
     }
     return false;
   }

@@ -1,11 +1,12 @@
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/findings/Refusal.h>
 #include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
 #include <transform/specialised/values/SpecialisedValues.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
+
+namespace messages = orx::messages;
 
 namespace {
-
-constexpr long kBadExpressionMessage = 370611;
 
 const QLatin1String kExpression("EXPRESSION");
 const QLatin1String kMode("MODE");
@@ -46,8 +47,7 @@ bool AttributeExpressionRemoverTransformerCfg::validateParameter(const QString& 
   if (parameter != kExpression || !findExpression(expression) || expression.isValid()) {
     return true;
   }
-  message = TransformResString(kBadExpressionMessage, expression.pattern());
-  return false;
+  return orx::refuse(message, messages::kBadPattern, {expression.pattern()});
 }
 
 bool AttributeExpressionRemoverTransformerCfg::isRemoved(const QString& attribute) const {

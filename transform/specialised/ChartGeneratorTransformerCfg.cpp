@@ -1,16 +1,16 @@
+#include <transform/findings/Refusal.h>
 #include <transform/specialised/ChartGeneratorTransformerCfg.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QSet>
 
+namespace messages = orx::messages;
+
 namespace {
 
-constexpr long kOutOfRangeMessage = 370715;
-constexpr long kOneSeriesMessage = 370716;
-constexpr long kLabelTwiceMessage = 370717;
 constexpr int kSmallestSize = 16;
 constexpr int kLargestSize = 16384;
 
@@ -61,9 +61,8 @@ bool ChartGeneratorTransformerCfg::validateParameter(const QString& parameter, Q
       (isNumber && size >= kSmallestSize && size <= kLargestSize)) {
     return true;
   }
-  message = TransformResString(kOutOfRangeMessage,
-                               {value, QString::number(kSmallestSize), QString::number(kLargestSize)});
-  return false;
+  return orx::refuse(message, messages::kOutOfRange,
+                     {value, QString::number(kSmallestSize), QString::number(kLargestSize)});
 }
 
 bool ChartGeneratorTransformerCfg::validateSeries(QString& message) const {
@@ -71,26 +70,21 @@ bool ChartGeneratorTransformerCfg::validateSeries(QString& message) const {
   const bool needsPositions = usesPositions(UnpackLevel::Resolved);
   QSet<QString> labels;
   for (int row = 0; row < series.rowCount(); ++row) {
-    const auto refuse = [&](const QString& reason) {
-      message = ParameterTable::rowMessage(row, reason);
-      return false;
-    };
     for (const int column : {kPosition, kValue}) {
       if (series.cell(row, column).isEmpty() && (column == kValue || needsPositions)) {
-        return refuse(series.missingValueMessage(column));
+        return series.refuseMissing(message, row, column);
       }
     }
     const QString label = series.cell(row, kLabel);
     if (labels.contains(label)) {
-      return refuse(TransformResString(kLabelTwiceMessage));
+      return ParameterTable::refuseRow(message, row, messages::kLabelTwice);
     }
     if (!label.isEmpty()) {
       labels.insert(label);
     }
   }
   if (series.rowCount() > 1 && isKind(kPie, UnpackLevel::Resolved)) {
-    message = TransformResString(kOneSeriesMessage);
-    return false;
+    return orx::refuse(message, messages::kOneSeries);
   }
   return true;
 }

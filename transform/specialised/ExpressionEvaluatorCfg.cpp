@@ -18,13 +18,8 @@ bool ExpressionEvaluatorCfg::validateParameter(const QString& parameter, QString
     return false;
   }
   const TransformParamCfg* record = getParameterByMacroName(parameter);
-  const QString fault = parameter == kExpression && record
-                            ? findFormulaFault(*record, getParameterValue(parameter, UnpackLevel::Resolved))
-                            : QString();
-  if (!fault.isEmpty()) {
-    message = fault;
-  }
-  return fault.isEmpty();
+  return parameter != kExpression || !record ||
+         checkFormulas(*record, getParameterValue(parameter, UnpackLevel::Resolved), message);
 }
 
 QString ExpressionEvaluatorCfg::getParameterValueForMappingFile(const QString& name,

@@ -1,16 +1,18 @@
 #include <platform/qorxcore/Lists.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/WorkspaceParameterDirectory.h>
+#include <transform/findings/Refusal.h>
 #include <transform/specialised/ParameterFetcherTransformerCfg.h>
 #include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MappingFileKeywords.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
+
+namespace messages = orx::messages;
 
 namespace {
 
-constexpr long kUnknownParameterMessage = 370617;
 constexpr int kFirstListVersion = 2;
 constexpr int kFirstBlankVersion = 3;  // entries in braces, separated by blanks
 
@@ -114,8 +116,7 @@ bool ParameterFetcherTransformerCfg::validateParameter(const QString& parameter,
   for (const QString& entry : entries()) {
     // What begins in one way and ends in another is no wrapping when the list is split for the attributes.
     if (isWrappedUnevenly(entry) || !parameterDirectory()->knows(referenceTo(macroNameFromMacroDef(entry)))) {
-      message = TransformResString(kUnknownParameterMessage, entry);
-      return false;
+      return orx::refuse(message, messages::kUnknownWorkspaceParameter, {entry});
     }
   }
   return true;

@@ -2,17 +2,16 @@
 #include <transform/specialised/ReportGeneratorTransformerCfg.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QUrl>
 
 #include <algorithm>
 
-namespace {
+namespace messages = orx::messages;
 
-constexpr long kUnknownKindMessage = 370718;
-constexpr long kNoAddressMessage = 370719;
+namespace {
 
 const QLatin1String kParts("PARTS");
 
@@ -68,28 +67,24 @@ bool ReportGeneratorTransformerCfg::validateParameter(const QString& parameter, 
 bool ReportGeneratorTransformerCfg::validateParts(QString& message) const {
   const ParameterTable parts(*this, kParts, kColumns, UnpackLevel::Resolved);
   for (int row = 0; row < parts.rowCount(); ++row) {
-    const auto refuse = [&](const QString& reason) {
-      message = ParameterTable::rowMessage(row, reason);
-      return false;
-    };
     const QString kind = parts.cell(row, kKind);
     if (isOpenValue(kind)) {
       continue;
     }
     const Part* part = findPart(kind);
     if (!part) {
-      return refuse(TransformResString(kUnknownKindMessage, kind));
+      return ParameterTable::refuseRow(message, row, messages::kUnknownKind, {kind});
     }
     const QString content = parts.cell(row, kContent);
     for (const auto& [column, use] :
          {std::make_pair(kContent, part->content), std::make_pair(kAttributes, part->attributes)}) {
       if (use == Use::Required && parts.cell(row, column).isEmpty()) {
-        return refuse(parts.missingValueMessage(column));
+        return parts.refuseMissing(message, row, column);
       }
     }
     const QString address = QORXWwjdDecode(content);
     if (part->isAddress && !isOpenValue(content) && !QUrl(address, QUrl::StrictMode).isValid()) {
-      return refuse(TransformResString(kNoAddressMessage, address));
+      return ParameterTable::refuseRow(message, row, messages::kNoAddress, {address});
     }
   }
   return true;

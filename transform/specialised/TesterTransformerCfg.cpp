@@ -2,23 +2,20 @@
 #include <transform/core/Formula.h>
 #include <transform/core/FormulaChecks.h>
 #include <transform/core/ValueReferences.h>
+#include <transform/findings/Refusal.h>
 #include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QRegularExpression>
 
 #include <algorithm>
 
-namespace {
+namespace messages = orx::messages;
 
-constexpr long kMissingValueMessage = 370608;
-constexpr long kBadPatternMessage = 370611;
-constexpr long kUnknownComparisonMessage = 370703;
-constexpr long kNoTestNumberMessage = 370704;
-constexpr long kUnknownTestMessage = 370705;
+namespace {
 
 const QLatin1String kTests("TESTS");
 const QLatin1String kCombination("COMBINATION");
@@ -76,12 +73,10 @@ bool namesTests(const Formula& formula, int count, QString& message) {
     bool isNumber = false;
     const int test = token.text.toInt(&isNumber);
     if (token.kind != Formula::Kind::Number || !isNumber) {
-      message = TransformResString(kNoTestNumberMessage, token.text);
-      return false;
+      return orx::refuse(message, messages::kNoTestNumber, {token.text});
     }
     if (test < 1 || test > count) {
-      message = TransformResString(kUnknownTestMessage, {token.text, QString::number(count)});
-      return false;
+      return orx::refuse(message, messages::kUnknownTest, {token.text, QString::number(count)});
     }
   }
   return true;
@@ -134,17 +129,14 @@ bool TesterTransformerCfg::validateTests(QString& message) const {
     }
     const Comparison* comparison = findComparison(name);
     if (!comparison) {
-      message = TransformResString(kUnknownComparisonMessage, {QString::number(row + 1), name});
-      return false;
+      return orx::refuse(message, messages::kUnknownComparison, {QString::number(row + 1), name});
     }
     if (comparison->takesRight && right.isEmpty()) {
-      message = tests.missingValueMessage(kRight);
-      return false;
+      return tests.refuseMissing(message, kRight);
     }
     const QString pattern = QORXWwjdDecode(right);
     if (comparison->name == kMatches && !isOpenValue(right) && !QRegularExpression(pattern).isValid()) {
-      message = TransformResString(kBadPatternMessage, pattern);
-      return false;
+      return orx::refuse(message, messages::kBadPattern, {pattern});
     }
   }
   return true;
@@ -158,13 +150,11 @@ bool TesterTransformerCfg::validateExpression(QString& message) const {
   }
   const QString value = getParameterValue(kExpression, UnpackLevel::Resolved);
   if (isUnsetValue(value)) {
-    message = TransformResString(kMissingValueMessage, getParameterPrompt(kExpression));
-    return false;
+    return orx::refuse(message, {orx::Rule::MissingValue, messages::kMissingValue, true},
+                       {getParameterPrompt(kExpression)});
   }
   const TransformParamCfg* expression = getParameterByMacroName(kExpression);
-  const QString fault = findFormulaFault(*expression, value);
-  if (!fault.isEmpty()) {
-    message = fault;
+  if (!checkFormulas(*expression, value, message)) {
     return false;
   }
   // Conditions are about attributes.

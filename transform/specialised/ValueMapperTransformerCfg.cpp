@@ -1,19 +1,19 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/GenerationKeywords.h>
+#include <transform/findings/Refusal.h>
 #include <transform/specialised/ValueMapperTransformerCfg.h>
 #include <transform/specialised/values/FactoryOption.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QSet>
 
-namespace {
+namespace messages = orx::messages;
 
-constexpr long kMappedTwiceMessage = 370706;
-constexpr long kDiffersByFeatureMessage = 370707;
+namespace {
 
 const QLatin1String kMapping("MAPPING");
 const QLatin1String kDirection("DIRECTION");
@@ -68,12 +68,10 @@ bool ValueMapperTransformerCfg::validateParameter(const QString& parameter, QStr
     const QString cell = mapping.cell(row, lookedUp);
     const QString value = QORXWwjdDecode(cell);
     if (beginsValueReference(cell)) {
-      message = TransformResString(kDiffersByFeatureMessage, mapping.prompt(lookedUp));
-      return false;
+      return orx::refuse(message, messages::kDiffersByFeature, {mapping.prompt(lookedUp)});
     }
     if (known.contains(value)) {
-      message = TransformResString(kMappedTwiceMessage, value);
-      return false;
+      return orx::refuse(message, messages::kMappedTwice, {value});
     }
     known.insert(value);
   }

@@ -1,11 +1,12 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
+#include <transform/findings/Refusal.h>
 #include <transform/specialised/XMLTemplaterTransformerCfg.h>
 #include <transform/specialised/values/FactoryOption.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/specialised/values/TemplateText.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QRegularExpression>
@@ -15,13 +16,9 @@
 
 #include <vector>
 
-namespace {
+namespace messages = orx::messages;
 
-constexpr long kNotWellFormedMessage = 370708;
-constexpr long kBadNameMessage = 370709;
-constexpr long kNameTwiceMessage = 370710;
-constexpr long kNoTemplateMessage = 370711;
-constexpr long kCircleMessage = 370712;
+namespace {
 
 const QLatin1String kRootTemplate("ROOT_TEMPLATE");
 const QLatin1String kSubTemplates("SUB_TEMPLATES");
@@ -33,11 +30,6 @@ enum Column { kName, kTemplate, kColumns };
 bool isTag(const QString& name) {
   static const QRegularExpression tag(QStringLiteral("^[A-Za-z][A-Za-z0-9_]*$"));
   return tag.match(name).hasMatch();
-}
-
-bool refuse(QString& message, long number, const QString& argument) {
-  message = TransformResString(number, argument);
-  return false;
 }
 
 // The name of a template that asks for itself, by way of others or not; empty when there is none.
@@ -104,7 +96,7 @@ bool XMLTemplaterTransformerCfg::validateRoot(QString& message) const {
   const TemplateText text(value, TemplateText::languageOf(m_isJson));
   int line = 0;
   if (!text.isWellFormed(TemplateText::Extent::Document, line)) {
-    return refuse(message, kNotWellFormedMessage, QString::number(line));
+    return orx::refuse(message, messages::kNotWellFormed, {QString::number(line)});
   }
   QSet<QString> known;
   const ParameterTable templates(*this, kSubTemplates, kColumns, UnpackLevel::Resolved);
@@ -113,7 +105,7 @@ bool XMLTemplaterTransformerCfg::validateRoot(QString& message) const {
   }
   for (const QString& name : text.insertedTemplates()) {
     if (!known.contains(name)) {
-      return refuse(message, kNoTemplateMessage, name);
+      return orx::refuse(message, messages::kNoSubTemplate, {name});
     }
   }
   return true;
@@ -129,21 +121,21 @@ bool XMLTemplaterTransformerCfg::validateSubTemplates(QString& message) const {
   for (int row = 0; row < templates.rowCount(); ++row) {
     const QString name = QORXWwjdDecode(templates.cell(row, kName));
     if (!isTag(name)) {
-      return refuse(message, kBadNameMessage, name);
+      return orx::refuse(message, messages::kBadInputName, {name});
     }
     if (known.contains(name)) {
-      return refuse(message, kNameTwiceMessage, name);
+      return orx::refuse(message, messages::kInputNameTwice, {name});
     }
     if (templates.cell(row, kTemplate).isEmpty()) {
-      message = templates.missingValueMessage(kTemplate);
-      return false;
+      return templates.refuseMissing(message, kTemplate);
     }
     known.insert(name);
     names.append(name);
     const TemplateText text(templates.cell(row, kTemplate), TemplateText::languageOf(m_isJson));
     int line = 0;
     if (!text.isWellFormed(TemplateText::Extent::Fragment, line)) {
-      message = name + QLatin1String(": ") + TransformResString(kNotWellFormedMessage, QString::number(line));
+      orx::refuse(message, messages::kNotWellFormed, {QString::number(line)});
+      message.prepend(name + QLatin1String(": "));
       return false;
     }
     inserted.insert(name, text.insertedTemplates());
@@ -151,12 +143,12 @@ bool XMLTemplaterTransformerCfg::validateSubTemplates(QString& message) const {
   for (const QString& name : std::as_const(names)) {
     for (const QString& other : inserted.value(name)) {
       if (!inserted.contains(other)) {
-        return refuse(message, kNoTemplateMessage, other);
+        return orx::refuse(message, messages::kNoSubTemplate, {other});
       }
     }
   }
   const QString circle = findCircle(inserted, names);
-  return circle.isEmpty() || refuse(message, kCircleMessage, circle);
+  return circle.isEmpty() || orx::refuse(message, messages::kTemplateCircle, {circle});
 }
 
 bool XMLTemplaterTransformerCfg::doInstantiate(MFBuffer& buffer, bool inlineFlag) {

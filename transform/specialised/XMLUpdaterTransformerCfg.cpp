@@ -1,16 +1,16 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
+#include <transform/findings/Refusal.h>
 #include <transform/specialised/XMLUpdaterTransformerCfg.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
 #include <transform/specialised/values/TemplateText.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
-namespace {
+namespace messages = orx::messages;
 
-constexpr long kNotWellFormedMessage = 370708;
-constexpr long kBadPathMessage = 370713;
+namespace {
 
 const QLatin1String kDocument("DOCUMENT");
 const QLatin1String kUpdates("UPDATES");
@@ -82,33 +82,28 @@ bool XMLUpdaterTransformerCfg::validateDocument(QString& message) const {
           .isWellFormed(TemplateText::Extent::Document, line)) {
     return true;
   }
-  message = TransformResString(kNotWellFormedMessage, QString::number(line));
-  return false;
+  return orx::refuse(message, messages::kNotWellFormed, {QString::number(line)});
 }
 
 bool XMLUpdaterTransformerCfg::validateUpdates(QString& message) const {
   const ParameterTable updates(*this, kUpdates, kColumns, UnpackLevel::Resolved);
   for (int row = 0; row < updates.rowCount(); ++row) {
-    const auto refuse = [&](const QString& reason) {
-      message = ParameterTable::rowMessage(row, reason);
-      return false;
-    };
     const QString path = updates.cell(row, kPath);
     if (!isOpenValue(path) && !isPath(fromRoot(path, m_isJson), m_isJson)) {
-      return refuse(TransformResString(kBadPathMessage, QORXWwjdDecode(path)));
+      return ParameterTable::refuseRow(message, row, messages::kBadPath, {QORXWwjdDecode(path)});
     }
     if (updates.cell(row, kAction) == kRemove) {
       continue;
     }
     const QString value = updates.cell(row, kValue);
     if (value.isEmpty()) {
-      return refuse(updates.missingValueMessage(kValue));
+      return updates.refuseMissing(message, row, kValue);
     }
     int line = 0;
     if (updates.cell(row, kKind) != kTextKind && !value.startsWith(kConditionalPrefix) &&
         !TemplateText(value, TemplateText::languageOf(m_isJson))
              .isWellFormed(TemplateText::Extent::Fragment, line)) {
-      return refuse(TransformResString(kNotWellFormedMessage, QString::number(line)));
+      return ParameterTable::refuseRow(message, row, messages::kNotWellFormed, {QString::number(line)});
     }
   }
   return true;

@@ -1,5 +1,8 @@
 #include <platform/orxutil/ORXLocalizedMessageDatabase.h>
+#include <platform/qorxcore/OrxHome.h>
 #include <transform/text/MessageStrings.h>
+
+#include <QDir>
 
 namespace {
 
@@ -48,4 +51,12 @@ QString TransformResString(long number, const QStringList& arguments) {
     default:
       return text;
   }
+}
+
+QStringList orx::messageLanguages() {
+  QStringList languages;
+  const QDir folder(QORXOrxHome() + QLatin1String("/messages"));
+  for (const QString& file : folder.entryList({QStringLiteral("*.msg")}, QDir::Files, QDir::Name))
+    languages.append(file.section(QLatin1Char('.'), 0, 0));
+  return languages;
 }

@@ -15,3 +15,10 @@ ORX_EXPORT QString TransformResString(long number, const QStringList& arguments)
 // The message without arguments in a language of the caller's choice (two lower-case letters) instead of the
 // current one; an empty one is the current one.
 ORX_EXPORT QString TransformResStringIn(const QString& language, long number);
+
+namespace orx {
+
+// Those that the product's home has texts in, by name.
+ORX_EXPORT QStringList messageLanguages();
+
+}  // namespace orx

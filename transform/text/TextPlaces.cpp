@@ -1,14 +1,15 @@
 #include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MappingFileWords.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TclText.h>
 #include <transform/text/TextPlaces.h>
 
 #include <algorithm>
 
-namespace {
+namespace messages = orx::messages;
 
-using namespace text_refusals;
+namespace {
 
 const QLatin1Char kQuote('"');
 const QLatin1Char kBackslash('\\');
@@ -51,25 +52,25 @@ long refuseOneLine(TextPlace place, const QString& text) {
     case TextPlace::Word:
     case TextPlace::Name:
     case TextPlace::ParallelSetting:
-      return canBeWord(text) ? 0 : kNoWord;
+      return canBeWord(text) ? 0 : messages::kNoWord;
     case TextPlace::Port:
-      return isBareWord(text) && text != kFeatureTypeKeyword ? 0 : kNoPort;
+      return isBareWord(text) && text != kFeatureTypeKeyword ? 0 : messages::kNoPort;
     case TextPlace::LoopSetting:
-      return text.isEmpty() || (!holdsBlank(text) && !text.startsWith(kQuote)) ? 0 : kNoLoopSetting;
+      return text.isEmpty() || (!holdsBlank(text) && !text.startsWith(kQuote)) ? 0 : messages::kNoLoopSetting;
     case TextPlace::QuotedName:
-      return text.contains(kQuote) ? kNoQuotedName : 0;
+      return text.contains(kQuote) ? messages::kNoQuotedName : 0;
     case TextPlace::MacroName:
-      return isMacroName(text) ? 0 : kNoMacroName;
+      return isMacroName(text) ? 0 : messages::kNameInMacro;
     case TextPlace::PrintedName:
-      return holdsBlank(text) ? kNoPrintedName : 0;
+      return holdsBlank(text) ? messages::kNoPrintedName : 0;
     case TextPlace::MacroValue:
-      return text.endsWith(kBackslash) ? kEndsInBackslash : 0;
+      return text.endsWith(kBackslash) ? messages::kEndsInBackslash : 0;
     case TextPlace::TclBraces:
-      return tcl_text::meansItselfInBraces(withoutReferences(text)) ? 0 : kNoScriptText;
+      return tcl_text::meansItselfInBraces(withoutReferences(text)) ? 0 : messages::kValueInScript;
     case TextPlace::TclQuotes:
-      return tcl_text::meansItselfInQuotes(withoutReferences(text)) ? 0 : kNoScriptText;
+      return tcl_text::meansItselfInQuotes(withoutReferences(text)) ? 0 : messages::kValueInScript;
     case TextPlace::HeaderField:
-      return text.contains(QLatin1Char(',')) || text != text.trimmed() ? kNoHeaderField : 0;
+      return text.contains(QLatin1Char(',')) || text != text.trimmed() ? messages::kNoHeaderField : 0;
   }
   return 0;
 }
@@ -78,38 +79,38 @@ long refuseOneLine(TextPlace place, const QString& text) {
 
 long TextPlaces::refuse(TextPlace place, const QString& text) {
   if (!isOneLine(text))
-    return kBreaksLine;
+    return messages::kBreaksLine;
   if (place == TextPlace::Name && beginsMacroReference(text))
-    return kReferenceInName;
+    return messages::kReferenceInName;
   const bool isScript = place == TextPlace::TclBraces || place == TextPlace::TclQuotes;
   if (!isScript && !closesDeferredReferences(text))
-    return kUnclosedReference;
+    return messages::kValueUnclosed;
   return refuseOneLine(place, text);
 }
 
 long TextPlaces::refusePlainValue(const QString& text, const QSet<QString>& keys, Calls calls) {
   if (!isOneLine(text))
-    return kBreaksLine;
+    return messages::kBreaksLine;
   if (!closesDeferredReferences(text))
-    return kUnclosedReference;
+    return messages::kValueUnclosed;
   MappingFileWords words(text);
   for (MappingFileWord word; words.next(word);) {
     if (word.kind == MappingFileWord::Kind::Call && calls == Calls::Refused)
-      return kCallInValue;
+      return messages::kCallInValue;
     if (!word.isClosed || word.isGlued)
-      return kOpenInValue;
+      return messages::kOpenInValue;
     if (word.kind == MappingFileWord::Kind::Bare && isKeyword(word.text.toString(), keys))
-      return kKeywordInValue;
+      return messages::kKeywordInValue;
   }
-  return closesCalls(text) ? 0 : kOpenInValue;
+  return closesCalls(text) ? 0 : messages::kOpenInValue;
 }
 
 long TextPlaces::refuseEncodedValue(const QString& text) {
   if (!isOneLine(text))
-    return kBreaksLine;
+    return messages::kBreaksLine;
   if (!closesDeferredReferences(text))
-    return kUnclosedReference;
-  return text.isEmpty() || (isBareWord(text) && closesCalls(text)) ? 0 : kNotEncoded;
+    return messages::kValueUnclosed;
+  return text.isEmpty() || (isBareWord(text) && closesCalls(text)) ? 0 : messages::kNotEncoded;
 }
 
 QString TextPlaces::withoutKeyword(const QString& encoded, const QSet<QString>& keys) {

@@ -44,24 +44,3 @@ class ORX_EXPORT TextPlaces {
   // Whether a setting can have that key: capital letters, digits and "_".
   static bool isKey(const QStringRef& word);
 };
-
-namespace text_refusals {
-
-constexpr long kBreaksLine = 370720;
-constexpr long kUnclosedReference = 370721;
-constexpr long kEndsInBackslash = 370722;
-constexpr long kNoScriptText = 370723;
-constexpr long kNoMacroName = 370728;
-constexpr long kNoWord = 370749;
-constexpr long kKeywordInValue = 370750;
-constexpr long kOpenInValue = 370751;
-constexpr long kCallInValue = 370752;
-constexpr long kNotEncoded = 370753;
-constexpr long kNoPort = 370754;
-constexpr long kNoQuotedName = 370755;
-constexpr long kNoLoopSetting = 370756;
-constexpr long kNoPrintedName = 370757;
-constexpr long kNoHeaderField = 370758;
-constexpr long kReferenceInName = 370940;
-
-}  // namespace text_refusals

@@ -1,15 +1,19 @@
 #include <platform/orxutil/Decipher.h>
 #include <transform/files/AtomicFile.h>
 #include <transform/files/TemporaryFile.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/reading/DocumentMessages.h>
 #include <transform/workspace/reading/FileLines.h>
 
 #include <QBuffer>
 #include <QFile>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 const char* const VersionStore::kFirstLine = "# ORW custom transformers";
 const char* const VersionStore::kBegin = "# TRANSFORMER_BEGIN ";
@@ -156,9 +160,8 @@ VersionStore::Piece VersionStore::read(qint64 offset, qint64 length) const {
   PlainFile plain(m_fileName, kCopyName);
   const QByteArray all = plain.device().readAll();
   if (offset < 0 || length <= 0 || offset > all.size() || length > all.size() - offset) {
-    throw WorkspaceLoaderException(QStringLiteral("File Error!\nThere is no version at byte %1 of file: %2")
-                                       .arg(offset)
-                                       .arg(m_fileName));
+    throw WorkspaceLoaderException(
+        documentText(messages::kNoVersionAtByte, {QString::number(offset), m_fileName}));
   }
   Piece piece;
   piece.before = all.left(static_cast<int>(offset));
@@ -190,9 +193,7 @@ VersionStore::Piece VersionStore::read(qint64 offset, qint64 length) const {
   }
   if (piece.document.trimmed().isEmpty()) {
     throw WorkspaceLoaderException(
-        QStringLiteral("File Error!\nThe version at byte %1 holds no document, in file: %2")
-            .arg(offset)
-            .arg(m_fileName));
+        documentText(messages::kVersionWithoutDocument, {QString::number(offset), m_fileName}));
   }
   return piece;
 }
@@ -206,22 +207,22 @@ bool hasLineBreak(const QString& text) {
 // Why these cannot become a version; empty when they can.
 QString refusal(const QStringList& fields, const QStringList& definition, const QByteArray& document) {
   if (fields.size() < kNeededFields || fields[0].trimmed().isEmpty())
-    return QStringLiteral("a version needs a name, a version number and a category");
+    return documentText(messages::kVersionNeedsFields);
   bool isNumber = false;
   if (fields[1].trimmed().toInt(&isNumber) < 1 || !isNumber)
-    return QStringLiteral("\"%1\" is no version number").arg(fields[1]);
+    return documentText(messages::kNoVersionNumber, {fields[1]});
   for (const QString& field : fields) {
     if (field.contains(QLatin1Char(',')) || hasLineBreak(field))
-      return QStringLiteral("\"%1\" holds a comma or a line break").arg(field);
+      return documentText(messages::kFieldBreaks, {field});
   }
   for (const QString& line : definition) {
     if (hasLineBreak(line))
-      return QStringLiteral("a line of the definition holds a line break");
+      return documentText(messages::kDefinitionLineBreaks);
     if ((QLatin1String(kDefinitionPrefix) + line).startsWith(QLatin1String(VersionStore::kEnd)))
-      return QStringLiteral("a line of the definition is the mark of its end");
+      return documentText(messages::kDefinitionLineEnds);
   }
   if (!(kDocumentPrefix + document).startsWith(VersionStore::kDocument))
-    return QStringLiteral("the document has no XML declaration");
+    return documentText(messages::kNoXmlDeclaration);
   return QString();
 }
 
@@ -251,7 +252,7 @@ bool VersionStore::insert(const QStringList& fields, const QStringList& definiti
   const auto fail = [&](const QString& reason, bool refused) {
     if (isRefused)
       *isRefused = refused;
-    error = QStringLiteral("Could not write a version into file %1: %2").arg(m_fileName, reason);
+    error = documentText(messages::kVersionNotWritten, {m_fileName, reason});
     return false;
   };
   const auto refuse = [&](const QString& reason) { return fail(reason, true); };
@@ -273,12 +274,12 @@ bool VersionStore::insert(const QStringList& fields, const QStringList& definiti
     readOpeningLine(kBegin + fields.join(QLatin1Char(',')).toUtf8(), wanted);
     for (const VersionInfo& info : scan(buffer)) {
       if (info.name == wanted.name && info.version == wanted.version)
-        return refuse(QStringLiteral("version %1 is there already").arg(info.version));
+        return refuse(documentText(messages::kVersionThere, {QString::number(info.version)}));
     }
   }
   const bool hasFirstLine = old.startsWith(kFirstLine);
   if (!old.isEmpty() && !hasFirstLine && !old.startsWith(kBegin))
-    return refuse(QStringLiteral("it is no file of custom transformers"));
+    return refuse(documentText(messages::kNoVersionFile));
 
   const int firstEnd = old.indexOf('\n');
   const QByteArray lineEnd = firstEnd > 0 && old[firstEnd - 1] == '\r' ? "\r\n" : "\n";

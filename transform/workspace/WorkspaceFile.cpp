@@ -1,5 +1,6 @@
 #include <platform/vtl/SystemEncoding.h>
 #include <transform/files/AtomicFile.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceFile.h>
@@ -13,6 +14,8 @@
 
 #include <QBuffer>
 #include <QTextCodec>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -63,7 +66,7 @@ const QTextCodec* fileCodec(const QByteArray& name) {
 
 WorkspaceLoaderException noWorkspaceFile(const QString& fileName) {
   return WorkspaceLoaderException(QLatin1String("File Error!\n") +
-                                  documentText(document_messages::kNoWorkspaceFile, {fileName}));
+                                  documentText(messages::kNoWorkspaceFile, {fileName}));
 }
 
 }  // namespace
@@ -224,7 +227,7 @@ QByteArray WorkspaceFile::encodedHeader(QString& error) const {
     FileLines lines(buffer);
     const bool isEnd = lines.next() && lines.matchComment(WorkspaceSplitter::kEndHeader) > 0;
     if (isEnd || line.contains(QLatin1Char('\n')) || line.endsWith(QLatin1Char('\r')))
-      error = QStringLiteral("a header line holds a line break or ends the header: %1").arg(line);
+      error = documentText(messages::kBadHeaderLine, {line});
     text += line + QString::fromLatin1(m_lineEnd);
   }
   const auto encode = [&](const QTextCodec& codec) {
@@ -271,7 +274,7 @@ bool WorkspaceFile::write(QIODevice& device, DocumentType type,
   QByteArray header;
   if (m_hasHeader) {
     if (m_form == Form::PlainXml) {
-      error = QStringLiteral("a file of plain XML has no header");
+      error = documentText(messages::kNoHeaderInXml);
       return false;
     }
     header = m_rawHeader.isEmpty() ? encodedHeader(error) : m_rawHeader;
@@ -293,7 +296,7 @@ bool WorkspaceFile::write(QIODevice& device, DocumentType type,
 bool WorkspaceFile::save(const QString& fileName, DocumentType type,
                          const std::function<void(XMLComponentWriter&)>& fill, QString& error) const {
   const auto fail = [&](const QString& reason) {
-    error = QStringLiteral("Could not write workspace file %1: %2").arg(fileName, reason);
+    error = documentText(messages::kWorkspaceNotWritten, {fileName, reason});
     return false;
   };
   AtomicFile file(fileName);

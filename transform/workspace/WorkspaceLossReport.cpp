@@ -1,8 +1,11 @@
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/WorkspaceLossReport.h>
 #include <transform/workspace/reading/DocumentMessages.h>
 #include <transform/workspace/reading/XORXDOMParser.h>
 #include <transform/workspace/records/ElementTable.h>
 #include <transform/workspace/writing/LossCollector.h>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -32,37 +35,36 @@ WorkspaceLossReport::WorkspaceLossReport(const XMLComponentReader& reader) {
 }
 
 QString WorkspaceLossReport::Loss::describe() const {
-  using namespace document_messages;
   switch (kind) {
     case Kind::Root:
-      return documentText(kLostRoot, {element, words::kWorkspace.toQString()});
+      return documentText(messages::kLostRoot, {element, words::kWorkspace.toQString()});
     case Kind::Constant:
-      return documentText(kLostConstant, {element});
+      return documentText(messages::kLostConstant, {element});
     case Kind::ReadOnlyAttribute:
-      return documentText(kReadOnlyAttribute, {attribute, element});
+      return documentText(messages::kReadOnlyAttribute, {attribute, element});
     case Kind::UnknownAttribute:
-      return documentText(kUnknownAttribute, {attribute, element});
+      return documentText(messages::kUnknownAttribute, {attribute, element});
     case Kind::MalformedValue:
-      return documentText(kMalformedValue, {attribute, element, value});
+      return documentText(messages::kMalformedValue, {attribute, element, value});
     case Kind::UnknownElement:
-      return documentText(kUnknownElement, {element});
+      return documentText(messages::kUnknownElement, {element});
     case Kind::RepeatedElement:
-      return documentText(kRepeatedElement, {element});
+      return documentText(messages::kRepeatedElement, {element});
     case Kind::SubDocument:
-      return attribute.isEmpty() ? documentText(kNamelessSubDocument)
-                                 : documentText(kRepeatedSubDocument, {attribute});
+      return attribute.isEmpty() ? documentText(messages::kNamelessSubDocument)
+                                 : documentText(messages::kRepeatedSubDocument, {attribute});
     case Kind::Text:
-      return documentText(kLostText);
+      return documentText(messages::kLostText);
     case Kind::Comment:
-      return documentText(kLostComment);
+      return documentText(messages::kLostComment);
     case Kind::Instruction:
-      return documentText(kLostInstruction);
+      return documentText(messages::kLostInstruction);
     case Kind::Declaration:
-      return documentText(kLostDeclaration);
+      return documentText(messages::kLostDeclaration);
     case Kind::ChangedValue:
-      return documentText(kChangedValue, {attribute, element, value});
+      return documentText(messages::kChangedValue, {attribute, element, value});
     case Kind::RawLine:
-      return documentText(kMovedLine, {value});
+      return documentText(messages::kMovedLine, {value});
   }
   return QString();
 }

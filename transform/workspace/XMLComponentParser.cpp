@@ -1,5 +1,6 @@
 #include <platform/qorxcore/Local8Bit.h>
 #include <transform/files/TemporaryFile.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 #include <transform/workspace/XMLComponentParser.h>
@@ -26,6 +27,8 @@
 #include <xercesc/util/OutOfMemoryException.hpp>
 #include <xercesc/util/XMLException.hpp>
 
+namespace messages = orx::messages;
+
 using namespace XERCES_CPP_NAMESPACE;
 
 namespace {
@@ -35,7 +38,7 @@ constexpr int kFirstBytes = 1024;
 const char* const kEmbeddedDocument = "#! <?xml version";
 
 QString withSupportSentence(const QString& message) {
-  return message + QLatin1String("\n\n") + documentText(document_messages::kContactSupport);
+  return message + QLatin1String("\n\n") + documentText(messages::kContactSupport);
 }
 
 WorkspaceLoaderException placedError(const QString& message, int line, int column) {
@@ -232,7 +235,7 @@ void XMLComponentParser::parseGuarded(QIODevice& device, const LineMap& map) {
     int markLength = 0;
     const QTextCodec* const codec = documentCodec(firstBytes, encoding, markLength);
     if (!codec) {
-      throw generalError(documentText(document_messages::kUnknownEncoding, {QString::fromLatin1(encoding)}));
+      throw generalError(documentText(messages::kUnknownEncoding, {QString::fromLatin1(encoding)}));
     }
     device.read(markLength);
     m_parser->parse(DecodedInputSource(device, *codec, guard));
@@ -250,7 +253,7 @@ void XMLComponentParser::parseGuarded(QIODevice& device, const LineMap& map) {
   } catch (const DOMException& exception) {
     throw generalError(fromXml(exception.getMessage()));
   } catch (const OutOfMemoryException&) {
-    throw generalError(QStringLiteral("Out of memory"));
+    throw generalError(documentText(messages::kOutOfMemory));
   }
   if (guard.hasRefused())
     throw placedError(guard.refusal(), map.fileLine(guard.line()), guard.column());

@@ -1,11 +1,15 @@
 #include <platform/vtl/SystemEncoding.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/XMLComponentWriter.h>
 #include <transform/workspace/reading/DocumentLimits.h>
+#include <transform/workspace/reading/DocumentMessages.h>
 #include <transform/workspace/records/RecordCheck.h>
 #include <transform/workspace/writing/ElementText.h>
 #include <transform/workspace/writing/XmlText.h>
 
 #include <QTextCodec>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -110,21 +114,22 @@ void XMLComponentWriter::setMiscParms(const QString& document, const QHash<QStri
 }
 
 void XMLComponentWriter::checkParameters(const QString& document, const QHash<QString, QString>& parameters) {
-  const QString place = document.isEmpty() ? QStringLiteral("the document's parameters")
-                                           : QStringLiteral("the parameters of %1").arg(document);
+  const QString place = document.isEmpty() ? documentText(messages::kDocumentParameters)
+                                           : documentText(messages::kSubDocumentParameters, {document});
   const auto check = [&](const QString& name, const QString& reason) {
     if (!reason.isEmpty())
-      refuse(QStringLiteral("%1, %2: %3").arg(place, name, reason));
+      refuse(documentText(messages::kParameterRefused, {place, name, reason}));
   };
   check(words::kName.toQString(), valueRefusal(document));
   // A sub-document's name is an attribute, too.
   if (parameters.size() >= limits::kAttributesPerElement)
-    refuse(QStringLiteral("%1 are more than %2").arg(place).arg(limits::kAttributesPerElement - 1));
+    refuse(documentText(messages::kTooManyParameters,
+                        {place, QString::number(limits::kAttributesPerElement - 1)}));
   QStringList names = parameters.keys();
   names.sort();
   for (const QString& name : qAsConst(names)) {
     if (!isXmlName(name))
-      check(name, QStringLiteral("this is no name of XML"));
+      check(name, documentText(messages::kNoXmlName));
     check(name, valueRefusal(parameters.value(name)));
   }
 }
@@ -178,7 +183,7 @@ void XMLComponentWriter::checkEncoding() {
     names.sort();
     for (const QString& name : qAsConst(names)) {
       if (!m_stream.codec()->canEncode(name))
-        refuse(QStringLiteral("the parameter name %1 cannot be written in the encoding").arg(name));
+        refuse(documentText(messages::kNameNotEncoded, {name}));
     }
   }
 }

@@ -14,6 +14,7 @@
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/text/TextPlaces.h>
@@ -29,6 +30,8 @@
 #include <QSet>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 using orx::Rule;
 
@@ -135,12 +138,11 @@ bool CustomDefinition::prepare(orx::Findings& diagnostics) {
     const long number = TextPlaces::refuse(TextPlace::Name, node->name());
     // What else a transformer's name cannot hold is found with its values.
     const bool isFound =
-        node->kind() == SubDocNetworkObj::Kind::Transformer && number != text_refusals::kReferenceInName;
-    if (number == text_refusals::kBreaksLine)
+        node->kind() == SubDocNetworkObj::Kind::Transformer && number != messages::kReferenceInName;
+    if (number == messages::kBreaksLine)
       diagnostics.report(Rule::LineBreak, node->line(), m_network.getName(), {node->name().simplified()});
     else if (number != 0 && !isFound)
-      diagnostics.reportText(Rule::UnwritableValue, node->line(), m_network.getName(),
-                             TransformResString(number, node->name()));
+      diagnostics.reportAs(Rule::UnwritableValue, number, node->line(), m_network.getName(), {node->name()});
   }
   if (diagnostics.forbidsWriting())
     return false;

@@ -1,15 +1,12 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/text/MessageNumbers.h>
 #include <translation/generation/CustomDefinitions.h>
 
 #include <algorithm>
 
-namespace {
-
-constexpr long kUnequalTwins = 370906;
-
-}  // namespace
+namespace messages = orx::messages;
 
 CustomDefinitions::CustomDefinitions(const std::vector<ExternalDocNetwork*>& networks, std::size_t used,
                                      const TransformerCfgListener& surroundings)
@@ -52,7 +49,7 @@ void CustomDefinitions::checkTwins(orx::Findings& diagnostics) {
       first = network;
     if (first == network || statementsOf(*first) == statementsOf(*network))
       continue;
-    diagnostics.reportAs(orx::Rule::CustomTransformerFault, kUnequalTwins, 0, network->getName(),
+    diagnostics.reportAs(orx::Rule::CustomTransformerFault, messages::kUnequalTwins, 0, network->getName(),
                          {network->getName(), QString::number(network->getVersion()),
                           placeOf(*first, diagnostics.file()), placeOf(*network, diagnostics.file())});
   }

@@ -5,6 +5,7 @@
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/text/TextPlaces.h>
@@ -19,11 +20,11 @@
 
 #include <limits>
 
+namespace messages = orx::messages;
+
 using orx::Rule;
 
 namespace {
-
-constexpr long kParameterCircle = 371400;
 
 std::size_t at(int number) {
   return static_cast<std::size_t>(number);
@@ -225,13 +226,12 @@ void MappingFileWriter::checkWord(const QString& text, int line, const QString& 
   if (!checkText(text, text, line, node))
     return;
   if (const long number = TextPlaces::refuse(TextPlace::Name, text))
-    m_diagnostics.reportText(Rule::UnwritableValue, line, node, TransformResString(number, text));
+    m_diagnostics.reportAs(Rule::UnwritableValue, number, line, node, {text});
 }
 
 void MappingFileWriter::checkNoReference(const QString& name, int line, const QString& node) {
   if (beginsMacroReference(name))
-    m_diagnostics.reportText(Rule::UnwritableValue, line, node,
-                             TransformResString(text_refusals::kReferenceInName, name));
+    m_diagnostics.reportAs(Rule::UnwritableValue, messages::kReferenceInName, line, node, {name});
 }
 
 // Names of attributes are written wherever they are asked for.
@@ -264,8 +264,9 @@ void MappingFileWriter::checkParameters() {
     QStringList names;
     for (const GlobalParameters::Parameter* parameter : circle)
       names.append(parameter->name);
-    m_diagnostics.reportText(Rule::Cycle, circle.front()->line, QString(),
-                             TransformResString(kParameterCircle, names.join(QLatin1String(", "))));
+    m_diagnostics.reportText(
+        Rule::Cycle, circle.front()->line, QString(),
+        TransformResString(orx::messages::kParameterCircle, names.join(QLatin1String(", "))));
   }
 }
 

@@ -4,18 +4,13 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/findings/Findings.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/graph/InnerNames.h>
 
 using orx::Rule;
 
-namespace {
-
-constexpr long kReplacesParameter = 370875;
-constexpr long kSameInnerName = 370907;
-constexpr long kInnerParameter = 370908;
-
-}  // namespace
+namespace messages = orx::messages;
 
 QHash<QString, QString> InnerNames::findReplacedParameters(
     const QString& name, const TransformerCfg& cfg, const std::function<bool(const QString&)>& isAround) {
@@ -28,7 +23,7 @@ QHash<QString, QString> InnerNames::findReplacedParameters(
     const QString around = name + QLatin1Char('_') + parameter;
     if (isAround(around) && MFBuffer::withOrdinaryMacros(cfg.getParameterValue(parameter)) !=
                                 kMacroOpen + around + QLatin1Char(')'))
-      messages.insert(parameter, TransformResString(kReplacesParameter, around));
+      messages.insert(parameter, TransformResString(messages::kReplacesParameter, around));
   }
   return messages;
 }
@@ -58,7 +53,7 @@ void InnerNames::report(const QString& scope, orx::Findings& diagnostics) {
   for (const QString& parameter : m_parameters) {
     const JoinedNames::Holder holder = m_macros.findHolder(parameter);
     if (!holder.name.isEmpty())
-      diagnostics.reportAs(Rule::TakenName, kInnerParameter, holder.line, scope + holder.name,
+      diagnostics.reportAs(Rule::TakenName, messages::kInnerParameter, holder.line, scope + holder.name,
                            {holder.name, parameter});
   }
   QSet<QString> told;
@@ -70,7 +65,7 @@ void InnerNames::report(const QString& scope, orx::Findings& diagnostics) {
       told.insert(pair);
       diagnostics.reportText(
           Rule::TakenName, clash.holder.line, scope + clash.holder.name,
-          TransformResString(kSameInnerName, {clash.holder.name, clash.other, clash.name}));
+          TransformResString(messages::kSameInnerName, {clash.holder.name, clash.other, clash.name}));
     }
   }
 }

@@ -6,7 +6,7 @@
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
@@ -14,13 +14,9 @@
 #include <translation/graph/NetworkDiagnostics.h>
 #include <translation/graph/WorkspaceBuilder.h>
 
+namespace messages = orx::messages;
+
 using orx::Rule;
-
-namespace {
-
-constexpr long kRepeatedCustomTransformer = 370869;
-
-}  // namespace
 
 WorkspaceBuilder::WorkspaceBuilder(TransformerSource& source, orx::Findings& diagnostics,
                                    const QHash<QString, QString>& parameterValues)
@@ -103,9 +99,8 @@ void WorkspaceBuilder::reportRepeatedNames(const IXMLComponentReader& reader) {
   for (const QString& name : names) {
     const int count = counts.take(name);
     if (count > 1) {
-      m_diagnostics.reportText(
-          Rule::RepeatedDeclaration, reader.GetDocumentLine(name), QString(),
-          TransformResString(kRepeatedCustomTransformer, {name, QString::number(count)}));
+      m_diagnostics.reportAs(Rule::RepeatedDeclaration, messages::kRepeatedCustomTransformer,
+                             reader.GetDocumentLine(name), QString(), {name, QString::number(count)});
     }
   }
 }

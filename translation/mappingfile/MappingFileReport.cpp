@@ -1,5 +1,8 @@
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/mappingfile/MappingFileReport.h>
+
+namespace messages = orx::messages;
 
 using orx::Rule;
 
@@ -8,7 +11,6 @@ namespace {
 constexpr int kMostFindings = 20000;
 // Findings quote what stands in the file, which may be of any length.
 constexpr int kLongestQuote = 120;
-constexpr long kSuggestion = 370866;
 
 QStringList shortened(QStringList arguments) {
   for (QString& argument : arguments) {
@@ -39,10 +41,8 @@ void MappingFileReport::addMisspelt(Rule rule, int line, const QStringList& argu
   if (meant.isEmpty() || meant == arguments.first()) {
     add(rule, line, arguments);
   } else if (takesMore(line)) {
-    const QString text = TransformResString(orx::ruleRow(rule).message, shortened(arguments));
-    m_diagnostics.reportText(
-        rule, line, QString(),
-        text + QLatin1Char(' ') + TransformResString(kSuggestion, shortened({meant, arguments.first()})));
+    m_diagnostics.report(rule, line, QString(), shortened(arguments),
+                         TransformResString(messages::kSuggestion, shortened({meant, arguments.first()})));
   }
 }
 

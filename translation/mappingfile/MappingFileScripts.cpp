@@ -1,12 +1,15 @@
 #include <transform/scripts/PythonSyntax.h>
 #include <transform/scripts/TclSyntax.h>
 #include <transform/text/MacroText.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/mappingfile/MappingFileReader.h>
 #include <translation/mappingfile/MappingFileReport.h>
 #include <translation/mappingfile/MappingFileScripts.h>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 using orx::Rule;
 
@@ -17,7 +20,6 @@ constexpr qint64 kMostPython = 64 * 1024 * 1024;
 // A body of comments alone is fine.
 const QLatin1String kFunctionStart("def block():\n");
 const QLatin1String kFunctionEnd(" pass\n");
-constexpr long kTooMuch = 370837;
 
 int lineOf(const std::vector<int>& lines, int line) {
   if (lines.empty())
@@ -81,5 +83,5 @@ void MappingFileScripts::finish(MappingFileReport& report) {
     report.add(Rule::PythonSyntax, lineOf(lines, fault.line - 1), {fault.text});
   }
   if (m_uncheckedLine > 0)
-    report.add(Rule::UncheckedPython, m_uncheckedLine, {TransformResString(kTooMuch)});
+    report.add(Rule::UncheckedPython, m_uncheckedLine, {TransformResString(messages::kTooMuchPython)});
 }

@@ -17,8 +17,8 @@ void report(const std::vector<ValueFit>& misfits, const TransformParamCfg& param
     QString prompt = fit.prompt.isEmpty() ? parameter.getDescription() : fit.prompt;
     if (prompt.isEmpty())
       prompt = parameter.getName();
-    findings.reportParameter(fit.isNumber() ? Rule::UnfitNumber : Rule::UnfitChoice, line, node,
-                             parameter.getName(), prompt + QLatin1String(": ") + fit.text());
+    findings.reportParameter(fit.isNumber() ? Rule::UnfitNumber : Rule::UnfitChoice, fit.message(), line,
+                             node, parameter.getName(), prompt + QLatin1String(": ") + fit.text());
   }
 }
 

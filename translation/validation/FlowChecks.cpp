@@ -1,15 +1,14 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/text/MessageNumbers.h>
 #include <translation/validation/FlowChecks.h>
+
+namespace messages = orx::messages;
 
 using orx::Rule;
 
 namespace {
-
-constexpr long kUnfedOutputPort = 370876;
-constexpr long kUnusedInputPort = 370877;
 
 std::size_t at(int number) {
   return static_cast<std::size_t>(number);
@@ -121,14 +120,14 @@ void reportFlowsInside(const ExternalDocNetwork& network, orx::Findings& diagnos
         reportUnfed(*inner->getTransformer(), connectedPorts(node->feeders()), node->line(), title,
                     diagnostics);
       else if (node->kind() == SubDocNetworkObj::Kind::Output && node->feeders().empty())
-        diagnostics.reportText(Rule::UnfedWriter, node->line(), title, TransformResString(kUnfedOutputPort));
+        diagnostics.reportAs(Rule::UnfedWriter, messages::kUnfedOutputPort, node->line(), title);
     }
     if (!node->lacksOutputLink()) {
       if (inner)
         reportDropped(*inner->getTransformer(), connectedPorts(node->consumers()), node->line(), title,
                       diagnostics);
       else if (node->kind() == SubDocNetworkObj::Kind::Input && node->consumers().empty())
-        diagnostics.reportText(Rule::UnusedReader, node->line(), title, TransformResString(kUnusedInputPort));
+        diagnostics.reportAs(Rule::UnusedReader, messages::kUnusedInputPort, node->line(), title);
     }
   }
 }

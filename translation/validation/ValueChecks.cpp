@@ -1,41 +1,27 @@
 #include <transform/core/FormulaChecks.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/findings/Refusal.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/ParameterLines.h>
 #include <translation/graph/ReferencedNames.h>
 #include <translation/validation/ValueChecks.h>
+
+namespace messages = orx::messages;
 
 using orx::Rule;
 using orx::Severity;
 
 namespace {
 
-constexpr long kSuggestion = 370866;
 constexpr int kMostMissing = 20;  // named in one finding
 const QLatin1String kInstanceNames("XFORMER_NAME");
 
 }  // namespace
 
 ValueChecks::ValueChecks(orx::Findings& diagnostics, const orx::RuleSettings& settings)
-    : m_diagnostics(diagnostics), m_settings(settings) {
-  const QChar mark(0xfffc);
-  for (const Rule rule :
-       {Rule::MissingAttribute, Rule::MissingValue, Rule::MissingFile, Rule::UnknownConnection}) {
-    const QString text = TransformResString(orx::ruleRow(rule).message, QString(mark));
-    const int place = text.indexOf(mark);
-    if (place >= 0)
-      m_forms.push_back({rule, text.left(place), text.mid(place + 1)});
-  }
-}
-
-Rule ValueChecks::ruleOf(const QString& message) const {
-  for (const Form& form : m_forms) {
-    if (message.startsWith(form.before) && message.endsWith(form.behind))
-      return form.rule;
-  }
-  return Rule::InvalidValue;
-}
+    : m_diagnostics(diagnostics), m_settings(settings) {}
 
 QString ValueChecks::nearestName(const QString& name, const QStringList& candidates) {
   Suggestion& known = m_suggestions[name];
@@ -46,11 +32,11 @@ QString ValueChecks::nearestName(const QString& name, const QStringList& candida
 
 QString ValueChecks::suggestion(const QString& name, const QStringList& candidates) {
   const QString nearest = nearestName(name, candidates);
-  return nearest.isEmpty() ? QString() : TransformResString(kSuggestion, {nearest, name});
+  return nearest.isEmpty() ? QString() : TransformResString(messages::kSuggestion, {nearest, name});
 }
 
 QString ValueChecks::referenceText(const QString& name, const QStringList& names) {
-  const QString text = TransformResString(orx::ruleRow(Rule::UnknownReference).message, name);
+  const QString text = TransformResString(messages::kUnknownReference, name);
   return (text + QLatin1Char(' ') + suggestion(name, names)).trimmed();
 }
 
@@ -71,8 +57,12 @@ QString ValueChecks::missingText(const TransformerCfg& cfg, const QString& param
     if (!suggested.isEmpty())
       suggestions += QLatin1String(suggestions.isEmpty() ? ". " : " ") + suggested;
   }
-  return TransformResString(orx::ruleRow(Rule::MissingAttribute).message, quoted.join(QLatin1Char(' '))) +
-         suggestions;
+  return TransformResString(messages::kMissingAttribute, quoted.join(QLatin1Char(' '))) + suggestions;
+}
+
+QString ValueChecks::shownName(const TransformerCfg& cfg, const QString& parameter) {
+  const QString prompt = cfg.getParameterPrompt(parameter);
+  return (prompt.isEmpty() ? parameter : prompt) + QLatin1String(": ");
 }
 
 void ValueChecks::check(const Node& node, const Knows& knows, const QStringList& names) {
@@ -111,35 +101,32 @@ bool ValueChecks::standsForReferences(Rule rule) const {
 void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names) {
   for (const QString& parameter : node.cfg.getParameters()) {
     QString text;
-    if (node.cfg.validateParameter(parameter, text)) {
-      text = findFormulaFault(*node.cfg.getParameterByMacroName(parameter),
-                              node.cfg.getParameterValue(parameter, UnpackLevel::Resolved));
-      if (text.isEmpty())
-        continue;
-    }
-    const Rule rule = ruleOf(text);
-    if (!node.isUsedHere && (rule == Rule::MissingFile || rule == Rule::UnknownConnection))
+    const orx::RefusalListener listener;
+    if (node.cfg.validateParameter(parameter, text) &&
+        checkFormulas(*node.cfg.getParameterByMacroName(parameter),
+                      node.cfg.getParameterValue(parameter, UnpackLevel::Resolved), text))
       continue;
-    if (rule == Rule::MissingAttribute) {
+    orx::Refusal refusal = listener.refusal();
+    if (!node.isUsedHere && (refusal.rule == Rule::MissingFile || refusal.rule == Rule::UnknownConnection))
+      continue;
+    if (refusal.rule == Rule::MissingAttribute) {
       if (!node.knowsWhatArrives)
         continue;
       text = missingText(node.cfg, parameter);
     } else if (text.isEmpty()) {
-      text = TransformResString(orx::ruleRow(Rule::InvalidValue).message);
+      orx::refuse(text, {Rule::InvalidValue, messages::kInvalidValue});
+      refusal = listener.refusal();
     }
-    const bool tellsReferences = !loose.isEmpty() && standsForReferences(rule);
+    const bool tellsReferences = !loose.isEmpty() && standsForReferences(refusal.rule);
     for (const QString& name : tellsReferences ? ReferencedNames::inValue(text) : QStringList()) {
       // What the transformer itself says about the value need not be said again.
       if (loose[parameter].removeOne(name))
         text += QLatin1Char(' ') +
-                (rule == Rule::InvalidValue ? suggestion(name, names) : referenceText(name, names));
+                (refusal.rule == Rule::InvalidValue ? suggestion(name, names) : referenceText(name, names));
     }
-    QString prompt = node.cfg.getParameterPrompt(parameter);
-    if (prompt.isEmpty())
-      prompt = parameter;
-    if (!text.contains(QLatin1Char('\'') + prompt + QLatin1Char('\'')))
-      text = prompt + QLatin1String(": ") + text;
-    m_diagnostics.reportParameter(rule, node.lines.of(parameter), node.title, parameter, text.trimmed());
+    const QString before = refusal.namesParameter ? QString() : shownName(node.cfg, parameter);
+    m_diagnostics.reportParameter(refusal.rule, refusal.message, node.lines.of(parameter), node.title,
+                                  parameter, before + text.trimmed());
   }
 }
 
@@ -147,11 +134,10 @@ void ValueChecks::reportReferences(const Node& node, LooseReferences& loose, con
   if (loose.isEmpty())
     return;
   for (const QString& parameter : node.cfg.getParameters()) {
-    const QString& prompt = node.cfg.getParameterPrompt(parameter);
     for (const QString& name : loose.take(parameter)) {
-      m_diagnostics.reportParameter(
-          Rule::UnknownReference, node.lines.of(parameter), node.title, parameter,
-          (prompt.isEmpty() ? parameter : prompt) + QLatin1String(": ") + referenceText(name, names));
+      m_diagnostics.reportParameter(Rule::UnknownReference, messages::kUnknownReference,
+                                    node.lines.of(parameter), node.title, parameter,
+                                    shownName(node.cfg, parameter) + referenceText(name, names));
     }
   }
 }

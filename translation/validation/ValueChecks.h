@@ -38,13 +38,6 @@ class ValueChecks {
   QString referenceText(const QString& name, const QStringList& names);
 
  private:
-  // The fixed text around the argument of a message, by which a refusal's rule is told.
-  struct Form {
-    orx::Rule rule;
-    QString before;
-    QString behind;
-  };
-
   // A misspelt name is often met again among the same candidates.
   struct Suggestion {
     QStringList candidates;
@@ -63,7 +56,8 @@ class ValueChecks {
   void reportReferences(const Node& node, LooseReferences& loose, const QStringList& names);
   // Empty when no name comes near.
   QString suggestion(const QString& name, const QStringList& candidates);
-  orx::Rule ruleOf(const QString& message) const;
+  // In front of a text that does not name the parameter itself.
+  static QString shownName(const TransformerCfg& cfg, const QString& parameter);
   QString nearestName(const QString& name, const QStringList& candidates);
   QString missingText(const TransformerCfg& cfg, const QString& parameter);
 
@@ -71,5 +65,4 @@ class ValueChecks {
   const orx::RuleSettings& m_settings;
   NearestSpelling m_spelling;
   QHash<QString, Suggestion> m_suggestions;  // by the name that was used
-  std::vector<Form> m_forms;
 };

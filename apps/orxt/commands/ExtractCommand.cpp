@@ -3,6 +3,8 @@
 #include <apps/orxt/console/PrintableText.h>
 #include <apps/orxt/facts/DocumentReading.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/workspace/VersionStore.h>
 #include <translation/CustomExtraction.h>
 #include <translation/WorkspaceDocument.h>
@@ -11,6 +13,8 @@
 
 #include <algorithm>
 #include <limits>
+
+namespace messages = orx::messages;
 
 using orx::Severity;
 
@@ -62,7 +66,7 @@ ExitStatus ExtractCommand::run(Console& console) {
   const QString shownName = InputFile::shownName(fileName);
   const QString outputFile = QString::fromStdString(m_output);
   if (outputFile == QLatin1String("-")) {
-    console.fail(QStringLiteral("a version is put into a file: give its name with -o"));
+    console.fail(messages::kNeedsFile);
     return kExitUsage;
   }
   WorkspaceDocument document(fileName);
@@ -75,10 +79,9 @@ ExitStatus ExtractCommand::run(Console& console) {
   const QStringList names = extraction.names();
   if (!names.contains(name)) {
     console.showFinding(shownName, 0, Severity::Error,
-                        names.isEmpty()
-                            ? QStringLiteral("the document embeds no custom transformers")
-                            : QStringLiteral("the document embeds no custom transformer '%1'; there are: %2")
-                                  .arg(name, names.join(QLatin1String(", "))));
+                        names.isEmpty() ? TransformResString(messages::kEmbedsNone)
+                                        : TransformResString(messages::kEmbedsOthers,
+                                                             {name, names.join(QLatin1String(", "))}));
     return kExitRefused;
   }
   orx::Findings diagnostics(shownName);
@@ -100,16 +103,14 @@ ExitStatus ExtractCommand::run(Console& console) {
 void ExtractCommand::warn(const WorkspaceDocument& document, const CustomExtraction& extraction,
                           const QString& shownName, Console& console) const {
   for (const QString& parameter : extraction.workspaceParameters()) {
-    console.showFinding(
-        shownName, 0, Severity::Warning,
-        QStringLiteral("the inside refers to $(%1) of this workspace; each workspace that uses "
-                       "the file needs it as well")
-            .arg(parameter));
+    console.showFinding(shownName, 0, Severity::Warning,
+                        TransformResString(messages::kRefersToWorkspace, parameter));
   }
   const QStringList names = extraction.names();
   for (const WorkspaceLossReport::Loss& loss : document.losses()) {
     if (extraction.parts().contains(documentAt(document.reader(), names, loss.line)))
-      console.showFinding(shownName, loss.line, Severity::Warning,
-                          QStringLiteral("not in the file: ") + onOneLine(loss.describe(), kLongestFinding));
+      console.showFinding(
+          shownName, loss.line, Severity::Warning,
+          TransformResString(messages::kNotInFile, onOneLine(loss.describe(), kLongestFinding)));
   }
 }

@@ -3,11 +3,15 @@
 #include <apps/orxt/console/PrintableText.h>
 #include <apps/orxt/facts/DocumentReading.h>
 #include <transform/files/AtomicFile.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 #include <translation/WorkspaceDocument.h>
 
 #include <CLI/CLI.hpp>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 using orx::Severity;
 
@@ -61,14 +65,14 @@ ExitStatus FormatCommand::run(Console& console) {
 
 bool FormatCommand::optionsFit(Console& console) const {
   if (m_workspaces.size() > 1 && !m_inPlace && !m_check) {
-    console.fail(QStringLiteral("several workspaces cannot be written to one place: give -i or --check"));
+    console.fail(messages::kNoOnePlace);
     return false;
   }
   const auto isStream = [](const std::string& name) {
     return InputFile::isStandardInput(QString::fromStdString(name));
   };
   if (m_inPlace && std::any_of(m_workspaces.begin(), m_workspaces.end(), isStream)) {
-    console.fail(QStringLiteral("standard input cannot be replaced in place: leave out -i"));
+    console.fail(messages::kStreamInPlace);
     return false;
   }
   return true;
@@ -98,7 +102,7 @@ ExitStatus FormatCommand::format(const QString& fileName, Console& console) cons
   if (m_check)
     return compare(original, bytes, shownName, console);
   if (!document.isReplaceable()) {
-    console.failFile(shownName, QStringLiteral("it is no file that could be replaced in place"));
+    console.failFile(shownName, messages::kNotReplaceable);
     return kExitFile;
   }
   return original == bytes ? kExitDone : write(bytes, fileName, console);
@@ -113,11 +117,8 @@ bool FormatCommand::mayLose(const WorkspaceDocument& document, const QString& sh
   }
   if (losses.empty() || m_drop)
     return true;
-  console.failFile(
-      shownName,
-      losses.size() == 1
-          ? QStringLiteral("this would be lost; --drop writes the file without it")
-          : QStringLiteral("these %1 would be lost; --drop writes the file without them").arg(losses.size()));
+  console.failFile(shownName, losses.size() == 1 ? messages::kOneLoss : messages::kLosses,
+                   {QString::number(losses.size())});
   return false;
 }
 
@@ -125,9 +126,8 @@ ExitStatus FormatCommand::compare(const QByteArray& original, const QByteArray& 
                                   const QString& shownName, Console& console) const {
   if (original == bytes)
     return kExitDone;
-  console.showFinding(
-      shownName, firstDifference(original, bytes), Severity::Error,
-      QStringLiteral("not in canonical form from this line on; `orxt format -i` rewrites it"));
+  console.showFinding(shownName, firstDifference(original, bytes), Severity::Error,
+                      TransformResString(messages::kNotCanonical));
   return kExitRefused;
 }
 

@@ -3,11 +3,15 @@
 #include <apps/orxt/console/ProcessPool.h>
 #include <transform/files/InputFile.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 #include <translation/WorkspaceTranslation.h>
 
 #include <CLI/CLI.hpp>
 #include <QDir>
 #include <QFileInfo>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -55,7 +59,7 @@ void GenerateCommand::declare(CLI::App& app) {
 bool GenerateCommand::planJobs(std::vector<Job>& jobs, Console& console) const {
   if (m_directory.empty()) {
     if (m_workspaces.size() > 1) {
-      console.fail(QStringLiteral("several workspaces need a folder for their mapping files: give -d DIR"));
+      console.fail(messages::kNeedsFolder);
       return false;
     }
     jobs.push_back({QString::fromStdString(m_workspaces.front()),
@@ -70,8 +74,7 @@ bool GenerateCommand::planJobs(std::vector<Job>& jobs, Console& console) const {
                                                          : QFileInfo(workspace).completeBaseName();
     const QString output = directory + QLatin1Char('/') + base + QLatin1String(".mf");
     if (claimed.contains(output)) {
-      console.fail(QStringLiteral("%1 and %2 would both be written to %3; give them separately")
-                       .arg(claimed.value(output), workspace, output));
+      console.fail(messages::kSameOutput, {claimed.value(output), workspace, output});
       return false;
     }
     claimed.insert(output, workspace);
@@ -90,7 +93,7 @@ ExitStatus GenerateCommand::run(Console& console) {
   if (!m_directory.empty()) {
     const QString directory = QString::fromStdString(m_directory);
     if (!QDir().mkpath(directory)) {
-      console.failFile(directory, QStringLiteral("the folder cannot be made"));
+      console.failFile(directory, messages::kNoFolderMade);
       return kExitFile;
     }
   }
@@ -129,10 +132,11 @@ ExitStatus GenerateCommand::runInProcesses(const std::vector<Job>& jobs, const S
   };
   const auto finished = [&](int, int status) {
     worst = std::max(worst, status);
-    console.showProgress(QStringLiteral("%1 of %2 workspaces").arg(++done).arg(count));
+    console.showProgress(
+        TransformResString(messages::kProgress, {QString::number(++done), QString::number(count)}));
   };
   if (!runInPool(count, m_jobs, work, finished)) {
-    console.fail(QStringLiteral("no further process can be started"));
+    console.fail(messages::kNoProcess);
     return kExitFile;
   }
   console.endProgress();

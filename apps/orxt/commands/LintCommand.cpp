@@ -72,7 +72,6 @@ void LintCommand::declare(CLI::App& app) {
 }
 
 ExitStatus LintCommand::run(Console& console) {
-  m_definitionOptions.setLanguage();
   orx::RuleSettings settings;
   if (!m_options.readRules(settings, console))
     return kExitUsage;

@@ -4,6 +4,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/files/AtomicFile.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <CLI/CLI.hpp>
 #include <QJsonArray>
@@ -13,6 +14,8 @@
 #include <algorithm>
 #include <limits>
 #include <memory>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -65,10 +68,8 @@ ExitStatus TransformersChangeLogCommand::run(Console& console) {
   const QString name = newest->getName();
   const int highest = std::max(m_fromVersion, m_version);
   if (highest > newest->getVersion()) {
-    console.fail(QStringLiteral("'%1' has no version %2; the newest is %3")
-                     .arg(name)
-                     .arg(highest)
-                     .arg(newest->getVersion()));
+    console.fail(messages::kNoVersionOf,
+                 {name, QString::number(highest), QString::number(newest->getVersion())});
     return kExitRefused;
   }
   // One that is no longer offered leads on to what replaces it.

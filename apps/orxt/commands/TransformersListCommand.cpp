@@ -4,12 +4,16 @@
 #include <apps/orxt/facts/SearchText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 
 #include <CLI/CLI.hpp>
 #include <QJsonArray>
 #include <QJsonDocument>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -36,10 +40,9 @@ ExitStatus TransformersListCommand::run(Console& console) {
       QStringList shown;
       for (const QString& known : registry.getCategories())
         shown << registry.getLocalizedCategoryName(known);
-      console.fail(
-          QStringLiteral("there is no category '%1'; %2")
-              .arg(category, orNearest(category, shown + registry.getCategories(),
-                                       QLatin1String("there are: ") + shown.join(QLatin1String(", ")))));
+      const QString all = TransformResString(messages::kThereAre, shown.join(QLatin1String(", ")));
+      console.fail(messages::kNoCategoryNamed,
+                   {category, orNearest(category, shown + registry.getCategories(), all)});
       return kExitRefused;
     }
     wanted = registry.getCategoryTransformers(category);

@@ -4,10 +4,14 @@
 #include <apps/orxt/facts/CatalogueText.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 
 #include <CLI/CLI.hpp>
 #include <QJsonArray>
 #include <QJsonDocument>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -51,20 +55,18 @@ ExitStatus TransformersSearchCommand::run(Console& console) {
     words << QString::fromStdString(word);
   CatalogueSearch search(words);
   if (search.isEmpty()) {
-    console.fail(QStringLiteral("give at least one word to search for"));
+    console.fail(messages::kNeedsWord);
     return kExitUsage;
   }
   const std::vector<CatalogueSearch::Hit> hits = search.find(m_definitions.loadCatalogue(console), m_all);
   if (!search.unknownWords().isEmpty()) {
-    console.fail(QStringLiteral("no transformer has '%1'; `orxt transformers categories` shows where to look")
-                     .arg(search.unknownWords().join(QLatin1String("' or '"))));
+    console.fail(messages::kWordUnknown, {search.unknownWords().join(TransformResString(messages::kWordOr))});
   }
   for (int i = 0; !hits.empty() && i + 1 < search.misspeltWords().size(); i += 2) {
-    console.fail(QStringLiteral("no transformer has '%1'; searching for '%2'")
-                     .arg(search.misspeltWords().at(i), search.misspeltWords().at(i + 1)));
+    console.fail(messages::kWordMisspelt, {search.misspeltWords().at(i), search.misspeltWords().at(i + 1)});
   }
   if (search.isPartial())
-    console.fail(QStringLiteral("no transformer has all of these words; these have the most of them"));
+    console.fail(messages::kSomeWordsOnly);
   if (m_json) {
     QJsonArray list;
     for (const CatalogueSearch::Hit& hit : hits) {

@@ -6,6 +6,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 
@@ -17,6 +18,8 @@
 #include <memory>
 #include <optional>
 
+namespace messages = orx::messages;
+
 namespace {
 
 constexpr CommandFacts kFacts = {"show", "Show one transformer: its ports, parameters and texts",
@@ -26,20 +29,6 @@ constexpr CommandFacts kFacts = {"show", "Show one transformer: its ports, param
 constexpr int kTagColumn = 24;
 constexpr int kParameterColumn = 28;
 constexpr int kLongestLine = 4000;
-
-constexpr long kHeadline = 370880;
-constexpr long kCustomFile = 370881;
-constexpr long kOtherVersions = 370882;
-constexpr long kReplaced = 370883;
-constexpr long kUnmetDependency = 370884;
-constexpr long kInputs = 370885;
-constexpr long kOutputs = 370886;
-constexpr long kParameters = 370887;
-constexpr long kChanges = 370888;
-constexpr long kOneOf = 370889;
-constexpr long kMadeOf = 370890;
-constexpr long kOptional = 370891;
-constexpr long kDefault = 370892;
 
 // The version that the words of the command line ask for; nothing when they ask for none.
 std::optional<int> wantedVersion(const std::string& text) {
@@ -76,7 +65,7 @@ QString typeAsText(const TransformParamCfg& parameter) {
     members.append(member.getDescription().isEmpty() ? member.getName() : member.getDescription());
   return choices.isEmpty() && members.isEmpty()
              ? parameter.getTypeWithConfig()
-             : TransformResString(members.isEmpty() ? kOneOf : kMadeOf,
+             : TransformResString(members.isEmpty() ? messages::kOneOf : messages::kMadeOf,
                                   {parameter.getType(), (choices + members).join(QLatin1String(" | "))});
 }
 
@@ -125,9 +114,9 @@ void TransformersShowCommand::showText(const TransformerCfg& cfg, const Transfor
     line(QLatin1String("  ") + makeColumnString(printable(left), printable(right), width));
   };
   line(printable(TransformResString(
-      kHeadline, {cfg.getLocalizedName(), cfg.getName(), QString::number(cfg.getVersion())})));
+      messages::kHeadline, {cfg.getLocalizedName(), cfg.getName(), QString::number(cfg.getVersion())})));
   if (isCustomTransformer(&cfg))
-    line(printable(TransformResString(kCustomFile, cfg.getFileName())));
+    line(printable(TransformResString(messages::kCustomFile, cfg.getFileName())));
   QStringList categories;
   for (const QString& tag : cfg.tags())
     categories << registry.getLocalizedCategoryName(tag);
@@ -139,11 +128,11 @@ void TransformersShowCommand::showText(const TransformerCfg& cfg, const Transfor
       others << QString::number(version);
   }
   if (!others.isEmpty())
-    line(TransformResString(kOtherVersions, others.join(QLatin1String(", "))));
+    line(TransformResString(messages::kOtherVersions, others.join(QLatin1String(", "))));
   if (cfg.isDeprecated())
-    line(printable(TransformResString(kReplaced, cfg.replacedBy())));
+    line(printable(TransformResString(messages::kReplaced, cfg.replacedBy())));
   if (!cfg.dependencyMet())
-    line(printable(TransformResString(kUnmetDependency, cfg.dependencyMsg())));
+    line(printable(TransformResString(messages::kMayNotRun, cfg.dependencyMsg())));
   line(QString());
   for (const QString& text : cfg.getDescriptionLines())
     line(printable(text));
@@ -159,24 +148,24 @@ void TransformersShowCommand::showText(const TransformerCfg& cfg, const Transfor
     for (const QString& tag : tags)
       row(tag, cfg.getTagDescription(tag), kTagColumn);
   };
-  ports(kInputs, inputs);
-  ports(kOutputs, outputs);
+  ports(messages::kInputs, inputs);
+  ports(messages::kOutputs, outputs);
 
-  heading(kParameters);
+  heading(messages::kParameters);
   for (const QString& name : cfg.getParameters()) {
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
     row(name, parameter->getDescription(), kParameterColumn);
     QStringList facts{typeAsText(*parameter)};
     if (parameter->getFlag(kGUITypeOptional))
-      facts << TransformResString(kOptional);
+      facts << TransformResString(messages::kOptional);
     if (!parameter->getDefaultValue().isEmpty())
-      facts << TransformResString(kDefault,
+      facts << TransformResString(messages::kDefault,
                                   cfg.formatParamDisplayString(name, parameter->getDefaultValue(), false));
     row(QString(), facts.join(QLatin1String(", ")), kParameterColumn);
   }
   const QStringList changes = cfg.getChangeLog();
   if (!changes.isEmpty()) {
-    heading(kChanges);
+    heading(messages::kChangesTitle);
     for (const QString& text : changes)
       line(QLatin1String("  ") + printable(text));
   }

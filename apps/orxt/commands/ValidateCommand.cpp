@@ -3,6 +3,7 @@
 #include <apps/orxt/console/FindingJson.h>
 #include <apps/orxt/console/SarifLog.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <CLI/CLI.hpp>
@@ -10,12 +11,11 @@
 
 #include <algorithm>
 
+namespace messages = orx::messages;
+
 using orx::Severity;
 
 namespace {
-
-constexpr long kSummary = 370871;
-constexpr long kUnreadable = 370872;
 
 constexpr CommandFacts kFacts = {"validate", "Find everything that is wrong with workspaces",
                                  "orxt validate parcels.orw roads.orw\n"
@@ -68,7 +68,6 @@ void ValidateCommand::declare(CLI::App& app) {
 }
 
 ExitStatus ValidateCommand::run(Console& console) {
-  m_definitions.setLanguage();
   orx::RuleSettings settings;
   QHash<QString, QString> values;
   if (!m_options.readRules(settings, console) || !m_parameters.read(values, console))
@@ -120,9 +119,10 @@ void ValidateCommand::summarize(const std::vector<ValidationReport>& reports, Co
       counts[static_cast<int>(severity)] += report.count(severity);
     unreadable += report.isReadable() ? 0 : 1;
   }
-  QString line = TransformResString(kSummary, {QString::number(reports.size()), QString::number(counts[0]),
-                                               QString::number(counts[1]), QString::number(counts[2])});
+  QString line =
+      TransformResString(messages::kSummary, {QString::number(reports.size()), QString::number(counts[0]),
+                                              QString::number(counts[1]), QString::number(counts[2])});
   if (unreadable > 0)
-    line += QLatin1Char(' ') + TransformResString(kUnreadable, QString::number(unreadable));
+    line += QLatin1Char(' ') + TransformResString(messages::kUnreadableCount, QString::number(unreadable));
   console.print(line + QLatin1Char('\n'));
 }

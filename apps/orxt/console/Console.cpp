@@ -1,5 +1,6 @@
 #include <apps/orxt/console/Console.h>
 #include <apps/orxt/console/PrintableText.h>
+#include <transform/text/MessageStrings.h>
 
 #include <cstdio>
 #include <cstdlib>
@@ -35,6 +36,14 @@ void Console::writeError(const QString& text) {
 
 void Console::fail(const QString& text) {
   writeError(QLatin1String("orxt: ") + withoutControls(text, kLongestMessage));
+}
+
+void Console::fail(long message, const QStringList& arguments) {
+  fail(TransformResString(message, arguments));
+}
+
+void Console::failFile(const QString& file, long message, const QStringList& arguments) {
+  failFile(file, TransformResString(message, arguments));
 }
 
 void Console::failFile(const QString& file, const QString& reason) {

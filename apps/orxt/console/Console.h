@@ -5,6 +5,7 @@
 
 #include <QByteArray>
 #include <QString>
+#include <QStringList>
 
 class Console {
  public:
@@ -15,8 +16,11 @@ class Console {
   bool flush();
   // "orxt: text" on standard error, whatever a stranger's name in it holds.
   void fail(const QString& text);
+  // With one of orx::messages.
+  void fail(long message, const QStringList& arguments = QStringList());
   // A file that could not be read or written: "FILE: error: reason".
   void failFile(const QString& file, const QString& reason);
+  void failFile(const QString& file, long message, const QStringList& arguments = QStringList());
   void show(const orx::Findings& findings);
   // With the name of its rule behind it.
   void show(const orx::Finding& finding);

@@ -4,8 +4,30 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <platform/session/session.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 
 #include <CLI/CLI.hpp>
+#include <QRegularExpression>
+
+namespace messages = orx::messages;
+
+namespace {
+
+std::string noLanguage(const QString& language) {
+  const QString known = orx::messageLanguages().join(QLatin1String(", "));
+  return TransformResString(messages::kNoLanguage, {language, known}).toStdString();
+}
+
+// Why there are no texts in it; empty when there are. A locale counts by its language.
+std::string refuseLanguage(const QString& given) {
+  static const QRegularExpression kLocale(QStringLiteral("^[A-Za-z]{2}([_.@-].*)?$"));
+  const bool isKnown =
+      kLocale.match(given).hasMatch() && orx::messageLanguages().contains(given.left(2).toLower());
+  return isKnown ? std::string() : noLanguage(given);
+}
+
+}  // namespace
 
 void DefinitionOptions::declare(CLI::App& app) {
   app.add_option("--resources", m_resources,
@@ -15,16 +37,18 @@ void DefinitionOptions::declare(CLI::App& app) {
       ->expected(1)
       ->allow_extra_args(false)
       ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
-  app.add_option("--lang", m_language, "Language of texts: en, de or fr")->type_name("LANG");
+  app.add_option("--lang", m_language, "Language of texts, such as en, de or fr")
+      ->type_name("LANG")
+      ->check([](const std::string& language) { return refuseLanguage(QString::fromStdString(language)); })
+      ->each([](const std::string& language) { QORXSetLanguage(QString::fromStdString(language)); });
 }
 
-void DefinitionOptions::setLanguage() const {
-  if (!m_language.empty())
-    QORXSetLanguage(QString::fromStdString(m_language));
+void DefinitionOptions::checkLanguage(Console& console) {
+  if (!refuseLanguage(QORXLanguage()).empty() && !orx::messageLanguages().isEmpty())
+    console.fail(QString::fromStdString(noLanguage(QORXLanguage())));
 }
 
 TransformerMgr& DefinitionOptions::load(Console& console) const {
-  setLanguage();
   for (const std::string& folder : m_resources)
     ORX_addResourceDirectory(QString::fromStdString(folder));
   // Lives as long as the process: the registry keeps it.
@@ -43,8 +67,8 @@ TransformerMgr& DefinitionOptions::loadCatalogue(Console& console) const {
   for (const TransformerMgr::IgnoredTransformer& ignored : registry.ignoredTransformers())
     console.fail(ignored.reason());
   if (registry.transformerNames().isEmpty()) {
-    console.fail(QStringLiteral("no transformers were found in any of: %1")
-                     .arg(ORX_resourcePlaces(QStringLiteral("transformer")).join(QLatin1String(", "))));
+    console.fail(messages::kNoTransformers,
+                 {ORX_resourcePlaces(QStringLiteral("transformer")).join(QLatin1String(", "))});
   }
   return registry;
 }

@@ -1,4 +1,5 @@
-// What every command that loads definitions takes: further folders and the language.
+// What every command that loads definitions takes: further folders and the language, which is set as soon as
+// it is read.
 #pragma once
 
 #include <string>
@@ -13,12 +14,12 @@ class TransformerMgr;
 class DefinitionOptions {
  public:
   void declare(CLI::App& app);
-  // Sets language and folders, loads the registry once and says on the console what could not be loaded.
+  // Sets folders, loads the registry once and says on the console what could not be loaded.
   TransformerMgr& load(Console& console) const;
   // The same for those who look at the catalogue itself: also says what was refused, and when it is empty.
   TransformerMgr& loadCatalogue(Console& console) const;
-  // Sets the language alone.
-  void setLanguage() const;
+  // Says on the console when there are no texts in the language that the environment asks for.
+  static void checkLanguage(Console& console);
 
  private:
   std::vector<std::string> m_resources;

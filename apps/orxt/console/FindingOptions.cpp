@@ -1,7 +1,10 @@
 #include <apps/orxt/console/Console.h>
 #include <apps/orxt/console/FindingOptions.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <CLI/CLI.hpp>
+
+namespace messages = orx::messages;
 
 void FindingOptions::declare(CLI::App& app, const char* jsonHelp) {
   CLI::Option* json = app.add_flag("--json", m_json, jsonHelp);
@@ -21,7 +24,7 @@ bool FindingOptions::readRules(orx::RuleSettings& settings, Console& console) co
   for (const std::string& rule : m_rules) {
     QString reason;
     if (!settings.set(QString::fromStdString(rule), reason)) {
-      console.fail(QLatin1String("--rule: ") + reason);
+      console.fail(messages::kOptionRefused, {QStringLiteral("--rule"), reason});
       return false;
     }
   }

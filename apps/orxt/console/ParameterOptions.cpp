@@ -1,7 +1,10 @@
 #include <apps/orxt/console/Console.h>
 #include <apps/orxt/console/ParameterOptions.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <CLI/CLI.hpp>
+
+namespace messages = orx::messages;
 
 void ParameterOptions::declare(CLI::App& app) {
   app.add_option("--param", m_parameters, "Gives a global parameter another value (repeatable)")
@@ -16,7 +19,7 @@ bool ParameterOptions::read(QHash<QString, QString>& values, Console& console) c
     const QString setting = QString::fromStdString(text);
     const int equals = setting.indexOf(QLatin1Char('='));
     if (equals <= 0) {
-      console.fail(QStringLiteral("--param takes NAME=VALUE, not '%1'").arg(setting));
+      console.fail(messages::kNeedsNameAndValue, {setting});
       return false;
     }
     values.insert(setting.left(equals), setting.mid(equals + 1));

@@ -4,11 +4,15 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/registry/TransformerMgr.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 #include <translation/NearestSpelling.h>
 
 #include <QJsonArray>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 QString firstSentence(const QStringList& lines) {
   const QString text = lines.join(QLatin1Char(' ')).simplified();
@@ -31,9 +35,8 @@ QString summaryAsText(const TransformerCfg& transformer) {
   const QString summary = firstSentence(transformer.getDescriptionLines());
   if (!isCustomTransformer(&transformer))
     return summary;
-  return QStringLiteral("[custom, version %1, %2] ")
-             .arg(transformer.getVersion())
-             .arg(transformer.getFileName()) +
+  return TransformResString(messages::kCustomMark,
+                            {QString::number(transformer.getVersion()), transformer.getFileName()}) +
          summary;
 }
 
@@ -59,7 +62,7 @@ std::vector<std::unique_ptr<TransformerCfg>> offeredTransformers(TransformerMgr&
 
 QString orNearest(const QString& name, const QStringList& candidates, const QString& otherwise) {
   const QString nearest = NearestSpelling().find(name, candidates);
-  return nearest.isEmpty() ? otherwise : QStringLiteral("did you mean '%1'?").arg(nearest);
+  return nearest.isEmpty() ? otherwise : TransformResString(messages::kDidYouMean, nearest);
 }
 
 std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const QString& name, int version,
@@ -76,11 +79,9 @@ std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const 
     QStringList versions;
     for (const int known : registry.transformerVersions(newest->getName()))
       versions << QString::number(known);
-    error = QStringLiteral("'%1' has no version %2; the newest is %3, and there are: %4")
-                .arg(name)
-                .arg(version)
-                .arg(newest->getVersion())
-                .arg(versions.join(QLatin1String(", ")));
+    error = TransformResString(messages::kNoVersionAmong,
+                               {name, QString::number(version), QString::number(newest->getVersion()),
+                                versions.join(QLatin1String(", "))});
     return nullptr;
   }
   QStringList names = registry.transformerNames() + registry.getVisibleTransformerAliases();
@@ -89,7 +90,7 @@ std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const 
       return findTransformer(registry, transformer->getName(), version, error);
     names << transformer->getLocalizedName();
   }
-  error = QStringLiteral("there is no transformer '%1'; %2")
-              .arg(name, orNearest(name, names, QStringLiteral("`orxt transformers list` names them all")));
+  error = TransformResString(messages::kNoTransformerNamed,
+                             {name, orNearest(name, names, TransformResString(messages::kListNamesAll))});
   return nullptr;
 }

@@ -8,18 +8,15 @@
 #include <transform/core/definition/CompiledTemplate.h>
 #include <transform/core/definition/DependencyChecker.h>
 #include <transform/files/ProductFiles.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QSet>
 #include <QTextStream>
 
-namespace {
+namespace messages = orx::messages;
 
-constexpr long kIdentifierPrompt = 370605;
-constexpr long kProcessCountPrompt = 370606;
-constexpr long kGroupsOrderedPrompt = 370635;
-constexpr long kNoMessage = 370664;
-constexpr long kYesMessage = 370665;
+namespace {
 
 const QLatin1String kNoStored("No");
 const QLatin1String kYesStored("Yes");
@@ -178,13 +175,13 @@ void TransformerCfg::addDefaultParms() {
       m_parameters.append(record);
     }
   };
-  add(makeParameter(kTextType, kIdentifierParameter, TransformResStringIn(language, kIdentifierPrompt),
-                    QString()));
+  add(makeParameter(kTextType, kIdentifierParameter,
+                    TransformResStringIn(language, messages::kIdentifierPrompt), QString()));
   if (configured().fields.multiProcess.isEmpty()) {
     return;
   }
   add(makeParameter(kProcessCountType, kProcessCountParameter,
-                    TransformResStringIn(language, kProcessCountPrompt), kProcessCountDefault,
+                    TransformResStringIn(language, messages::kProcessCountPrompt), kProcessCountDefault,
                     QStringList(kProcessCountLookup)));
   add(makeParameter(kProcessCountDisplayType, kProcessCountDisplayParameter, QString(),
                     kProcessCountDefault));
@@ -192,9 +189,9 @@ void TransformerCfg::addDefaultParms() {
     return ORX_quoteConfigPiece(TransformResStringIn(language, shown)) + QLatin1Char(',') +
            QORXWwjdEncode(stored);
   };
-  add(makeParameter(QLatin1String("LOOKUP_CHOICE ") + entry(kNoMessage, kNoStored) + QLatin1Char('%') +
-                        entry(kYesMessage, kYesStored),
-                    kGroupsOrderedParameter, TransformResStringIn(language, kGroupsOrderedPrompt),
+  add(makeParameter(QLatin1String("LOOKUP_CHOICE ") + entry(messages::kNo, kNoStored) + QLatin1Char('%') +
+                        entry(messages::kYes, kYesStored),
+                    kGroupsOrderedParameter, TransformResStringIn(language, messages::kGroupsOrderedPrompt),
                     kNoStored));
 }
 

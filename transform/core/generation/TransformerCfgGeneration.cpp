@@ -21,6 +21,7 @@
 #include <transform/core/validation/MappingFileChecks.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/NullBuffer.h>
 #include <transform/text/TextHelpers.h>
@@ -29,6 +30,8 @@
 
 #include <algorithm>
 #include <typeinfo>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -467,7 +470,7 @@ QHash<QString, QString> TransformerCfg::findUnwritableValues() const {
     if (!expandInOrder(tried, buffer, lines)) {
       const QString culprit = values.firstWithTokens();
       messages.insert(culprit.isEmpty() ? QString(kIdentifierParameter) : culprit,
-                      TransformResString(lookup_checks::kGrowsWithoutEnd));
+                      TransformResString(messages::kGrowsWithoutEnd));
     }
   }
   return messages;

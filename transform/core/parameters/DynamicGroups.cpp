@@ -5,6 +5,7 @@
 #include <transform/core/ParameterSet.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/parameters/DynamicGroups.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QHash>
@@ -12,9 +13,10 @@
 
 #include <set>
 
+namespace messages = orx::messages;
+
 namespace {
 
-constexpr long kGroupTitleMessage = 370663;
 // More groups than anyone can look through come from a value that is no list of names.
 constexpr int kMostGroups = 1000;
 
@@ -62,7 +64,7 @@ void updateDynamicParameterGroups(const TransformerCfg& cfg, ParameterSet& param
     const QString shown = QORXWwjdDecode(group);
     const QString type = kDynamicGroupType + QLatin1Char(' ') + framed.value(group).join(QLatin1Char('%'));
     TransformParamCfg record(
-        GUIType::fromTransformerTypeString(type, name, TransformResString(kGroupTitleMessage, shown)));
+        GUIType::fromTransformerTypeString(type, name, TransformResString(messages::kGroupTitle, shown)));
     record.setDefaultValue(shown);
     record.setValue(shown);
     const int index = parameters.indexOf(name);

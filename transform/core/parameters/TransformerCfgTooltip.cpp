@@ -2,15 +2,16 @@
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QScopedValueRollback>
 
 #include <functional>
 
-namespace {
+namespace messages = orx::messages;
 
-constexpr long kNotSetMessage = 370649;
+namespace {
 
 QString escaped(const QString& text, bool asHtml) {
   if (!asHtml) {
@@ -97,5 +98,5 @@ QString TransformerCfg::tooltipValue(const QString& parameter) const {
   if (text == kUnusedGroupBy && parameter == configured().fields.multiProcess) {
     text.clear();
   }
-  return escaped(text.isEmpty() ? TransformResString(kNotSetMessage) : text, m_tooltipAsHtml);
+  return escaped(text.isEmpty() ? TransformResString(messages::kNotSet) : text, m_tooltipAsHtml);
 }

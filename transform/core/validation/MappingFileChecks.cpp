@@ -11,6 +11,7 @@
 #include <transform/core/generation/LookupWriters.h>
 #include <transform/core/validation/MappingFileChecks.h>
 #include <transform/text/MacroText.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/NullBuffer.h>
 #include <transform/text/TextHelpers.h>
@@ -19,10 +20,11 @@
 #include <algorithm>
 #include <typeinfo>
 
+namespace messages = orx::messages;
+
 namespace {
 
 using namespace lookup_checks;
-using namespace text_refusals;
 
 const QLatin1String kTclCall("@Tcl2(");
 
@@ -73,14 +75,14 @@ long MappingFileChecks::refuse(const TransformParamCfg& record) const {
                                 ? QORXSdfStringToList(value, record.members().separator())
                                 : QStringList(value);
   if (!std::all_of(parts.cbegin(), parts.cend(), &TextPlaces::isOneLine)) {
-    return kBreaksLine;
+    return messages::kBreaksLine;
   }
   if (!std::all_of(parts.cbegin(), parts.cend(), &closesDeferredReferences)) {
-    return kUnclosedReference;
+    return messages::kValueUnclosed;
   }
   const auto endsInBackslash = [](const QString& part) { return part.endsWith(QLatin1Char('\\')); };
   if (m_written.mayEndLine(record) && std::any_of(parts.cbegin(), parts.cend(), endsInBackslash)) {
-    return kEndsInBackslash;
+    return messages::kEndsInBackslash;
   }
   if (name == kIdentifierParameter) {
     return refuseIdentifier(stored);
@@ -137,12 +139,12 @@ long MappingFileChecks::refuseIdentifier(const QString& value) const {
   // Such a name is wrapped in quotes when it holds a blank itself, without a change to what stands inside.
   QString expanded = value;
   if (!expandMacros(expanded)) {
-    return kGrowsWithoutEnd;
+    return messages::kGrowsWithoutEnd;
   }
   const bool isSplit = !value.contains(QLatin1Char(' ')) && expanded.contains(QLatin1Char(' '));
   const bool isBroken = isSplit || expanded.contains(QLatin1Char('\t')) ||
                         expanded.contains(QLatin1Char('"')) || expanded.endsWith(QLatin1Char('\\'));
-  return isBroken ? kIdentifierInScript : 0;
+  return isBroken ? messages::kIdentifierInScript : 0;
 }
 
 long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QString& value) const {
@@ -153,7 +155,7 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
   const ChoiceList& choices = record.choices();
   const QString identifier = m_cfg.getIdentifier();
   if (!mapping_file_checks::closesDeferredMacros(choices, {value, record.getDescription(), identifier})) {
-    return kUnclosedReference;
+    return messages::kValueUnclosed;
   }
   if (const long number = refuseChoices(choices)) {
     return number;
@@ -162,7 +164,7 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
                    record.getFlag(kGUITypeOptional)};
   for (QString* text : {&lookup.value, &lookup.prompt, &lookup.identifier}) {
     if (!expandMacros(*text)) {
-      return kGrowsWithoutEnd;
+      return messages::kGrowsWithoutEnd;
     }
   }
   if (kind == LookupKind::Procedure) {
@@ -177,7 +179,7 @@ long MappingFileChecks::refuseChoices(const ChoiceList& choices) const {
     for (QString text : {shown, stored}) {
       const bool refers = text.contains(kMacroOpen) || text.contains(kDeferredOpen);
       if (refers && (!expandMacros(text) || !fitsFragment(text))) {
-        return kChoiceInScript;
+        return messages::kChoiceInScript;
       }
     }
   }

@@ -7,19 +7,22 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/TransformerSource.h>
-#include <transform/text/MessageStrings.h>
+#include <transform/findings/Refusal.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <QUrlQuery>
 
 #include <sys/stat.h>
 
+using orx::Rule;
+namespace messages = orx::messages;
+
 namespace {
 
-constexpr long kMissingAttributesMessage = 370607;
-constexpr long kMissingValueMessage = 370608;
-constexpr long kNoFileMessage = 370612;
-constexpr long kNoConnectionMessage = 370636;
 constexpr int kLongestMissingText = 100;
+
+const orx::Refusal kMissing{Rule::MissingValue, messages::kMissingValue, true};
+const orx::Refusal kNoConnection{Rule::UnknownConnection, messages::kUnknownConnection};
 
 const QLatin1String kConnectionScheme("orx://");
 const QLatin1String kConnectionSchemeEncoded("orx:<solidus><solidus>");
@@ -90,8 +93,7 @@ bool TransformerCfg::validateParameter(const QString& parameter, QString& messag
     if (record->getFlag(kGUITypeOptional)) {
       return true;
     }
-    message = TransformResString(kMissingValueMessage, prompt);
-    return false;
+    return orx::refuse(message, kMissing, {prompt});
   }
   if (value == kUnusedValue) {
     return true;
@@ -104,16 +106,15 @@ bool TransformerCfg::validateParameter(const QString& parameter, QString& messag
   if (record->isMultiParameter()) {
     QString missingPrompt;
     if (!checkMembers(value, *record, record->members(), missingPrompt)) {
-      message = TransformResString(kMissingValueMessage, missingPrompt);
-      return false;
+      return orx::refuse(message, {Rule::MissingValue, messages::kMissingValue}, {missingPrompt});
     }
   }
   QStringList missing;
   bool hasReferences = false;
   getMissingAttributeReferences(parameter, missing, hasReferences);
   if (!missing.isEmpty()) {
-    message = TransformResString(kMissingAttributesMessage, quotedNames(missing));
-    return false;
+    return orx::refuse(message, {Rule::MissingAttribute, messages::kMissingAttribute},
+                       {quotedNames(missing)});
   }
   if (hasReferences && !record->isTable()) {
     return true;
@@ -124,8 +125,7 @@ bool TransformerCfg::validateParameter(const QString& parameter, QString& messag
   if (value.startsWith(kConnectionScheme) || value.startsWith(kConnectionSchemeEncoded)) {
     const QString name = connectionName(value);
     if (!isConnectionKnown(QORXWwjdEncode(name))) {
-      message = TransformResString(kNoConnectionMessage, name);
-      return false;
+      return orx::refuse(message, kNoConnection, {name});
     }
   }
   const bool isConditional = value.startsWith(kConditionalPrefix);
@@ -142,8 +142,7 @@ bool TransformerCfg::validateParameter(const QString& parameter, QString& messag
     if (isConnectionKnown(encoded)) {
       return true;
     }
-    message = TransformResString(kNoConnectionMessage, QORXWwjdDecode(encoded));
-    return false;
+    return orx::refuse(message, kNoConnection, {QORXWwjdDecode(encoded)});
   }
   return !record->isTable() ||
          validateTableValues(parameter, columnRecords(record->members()),
@@ -161,11 +160,7 @@ bool TransformerCfg::validateFile(const TransformParamCfg& record, const QString
     path = QORXWwjdDecode(path);
   }
   path = resolveUserTypedMacro(path, UnpackLevel::Resolved);
-  if (isPlainFile(path)) {
-    return true;
-  }
-  message = TransformResString(kNoFileMessage, path);
-  return false;
+  return isPlainFile(path) || orx::refuse(message, {Rule::MissingFile, messages::kMissingFile}, {path});
 }
 
 bool TransformerCfg::validateParameters(QString& message) const {
@@ -227,8 +222,7 @@ bool TransformerCfg::validateTableValues(const QString& parameter,
   for (int i = 0; i < cells.size(); ++i) {
     const TransformParamCfg& column = columns[static_cast<std::size_t>(i) % columns.size()];
     if (cells[i].isEmpty() && !column.getFlag(kGUITypeOptional)) {
-      message = TransformResString(kMissingValueMessage, getParameterPrompt(parameter));
-      return false;
+      return orx::refuse(message, kMissing, {getParameterPrompt(parameter)});
     }
   }
   return true;

@@ -10,15 +10,17 @@
 #include <transform/custom/instance/CustomTransformerStatement.h>
 #include <transform/custom/instance/InstancePrototype.h>
 #include <transform/custom/instance/LookedUpParameters.h>
-#include <transform/custom/linked/CustomMessages.h>
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextPlaces.h>
 
 #include <algorithm>
 #include <optional>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -226,7 +228,7 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
     if (language == ScriptLanguage::None) {
       lines.append(macroValue(parameter, type, prefix));
       if (lines.first().contains(QLatin1Char('\n')) || lines.first().contains(QLatin1Char('\r')))
-        message = TransformResString(custom_messages::kLineBreak, parameter);
+        message = TransformResString(messages::kLineBreak, parameter);
     } else if (!isUnsetValue(stored)) {
       const bool isPython = language == ScriptLanguage::Python;
       if (isPython ? canWritePythonParameter(prefix, parameter, stored, message)
@@ -238,11 +240,11 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
         getTclParameterLines(prefix, parameter, stored, lines);
     }
     if (const long number = message.isEmpty() && isApart ? refuseApart(parameter, type, stored) : 0)
-      message = number == custom_messages::kOwnReferenceForWorkers
+      message = number == messages::kOwnReferenceForWorkers
                     ? TransformResString(number, ownReference(stored, *this))
                     : TransformResString(number);
     if (message.isEmpty() && !areClosed({lines}))
-      message = TransformResString(custom_messages::kUnclosedReference, parameter);
+      message = TransformResString(messages::kUnclosedReference, parameter);
     if (message.isEmpty() && language == ScriptLanguage::None) {
       if (const long number = refuseMacroValue(parameter, lines.first(), lookedUp))
         message = TransformResString(number);
@@ -258,15 +260,15 @@ long CompoundTransformerCfg::refuseApart(const QString& parameter, const GUIType
                                          const QString& stored) const {
   if (m_network->blockedLooping() && parameter == kMaxLoopIterationsParameter) {
     if (parallelSettingsOf(*m_network, *this).isEnabled())
-      return custom_messages::kLoopInProcesses;
+      return messages::kLoopInProcesses;
     if (!isIterationCount(getParameterValue(parameter, UnpackLevel::Decoded)))
-      return custom_messages::kBadMaximum;
+      return messages::kBadMaximum;
   }
   if (scriptLanguage(type) != ScriptLanguage::None)
-    return isUnsetValue(stored) ? 0 : custom_messages::kScriptForWorkers;
+    return isUnsetValue(stored) ? 0 : messages::kScriptForWorkers;
   const TransformParamCfg* record = getParameterByMacroName(parameter);
   return record && record->getFlag(kGUITypeInstanceMacros) && !ownReference(stored, *this).isEmpty()
-             ? custom_messages::kOwnReferenceForWorkers
+             ? messages::kOwnReferenceForWorkers
              : 0;
 }
 
@@ -324,10 +326,10 @@ QStringList CompoundTransformerCfg::findUnwritablePorts() const {
       number = TextPlaces::refuse(TextPlace::QuotedName, port);
     if (number == 0 && isBare)
       number = TextPlaces::refuse(TextPlace::Port, port);
-    if (number == text_refusals::kBreaksLine)
-      number = isEmbedded ? 0 : custom_messages::kLineBreak;
-    else if (number == text_refusals::kUnclosedReference)
-      number = isEmbedded ? 0 : custom_messages::kUnclosedReference;
+    if (number == messages::kBreaksLine)
+      number = isEmbedded ? 0 : messages::kLineBreak;
+    else if (number == messages::kValueUnclosed)
+      number = isEmbedded ? 0 : messages::kUnclosedReference;
     if (number != 0)
       messages.append(TransformResString(number, port));
   }
@@ -343,16 +345,16 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   if (const long number = TextPlaces::refuse(TextPlace::MacroName, parameter))
     return number;
   if (isName && value != value.trimmed())
-    return custom_messages::kBlankAtEnd;
+    return messages::kBlankAtEnd;
   if (getParameterValue(parameter).startsWith(kConditionalPrefix))
-    return custom_messages::kConditionInMacro;
+    return messages::kConditionInMacro;
   QString expanded = MFBuffer::withOrdinaryMacros(value);
   const bool ends = !listener() || listener()->expandMacros(*this, expanded);
   // The name stands in quotes as it is.
   if (isName && TextPlaces::refuse(TextPlace::QuotedName, expanded) != 0)
-    return lookup_checks::kIdentifierInScript;
+    return messages::kIdentifierInScript;
   if (isName && TextPlaces::refuse(TextPlace::PrintedName, expanded) != 0 && printsMacroNames())
-    return text_refusals::kNoPrintedName;
+    return messages::kNoPrintedName;
   if (const long number = refuseSetting(parameter))
     return number;
   if ((ends && lookup_checks::fitsFragment(expanded)) || !m_network)
@@ -360,6 +362,6 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   if (!lookedUp)
     lookedUp.emplace(*m_network);
   if (isName)
-    return lookedUp->hasFragment() ? lookup_checks::kIdentifierInScript : 0;
-  return lookedUp->contains(parameter) ? lookup_checks::kValueInScript : 0;
+    return lookedUp->hasFragment() ? messages::kIdentifierInScript : 0;
+  return lookedUp->contains(parameter) ? messages::kValueInScript : 0;
 }

@@ -2,8 +2,10 @@
 #include <transform/core/TransformerDefinition.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/instance/InstancePrototype.h>
-#include <transform/custom/linked/CustomMessages.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -30,6 +32,10 @@ void configureWithoutBody(TransformerCfg& cfg, const CompoundTransformerNetwork&
   definition.version = network.getVersion();
   definition.category = network.getCategory();
   definition.visible = !network.isDeprecated();
+  definition.tooltipLines = QStringList(
+      definition.filePath.isEmpty()
+          ? TransformResString(messages::kEmbeddedTransformer, definition.name)
+          : TransformResString(messages::kLinkedTransformer, {definition.name, definition.filePath}));
   cfg.configure(definition);
 }
 
@@ -46,14 +52,14 @@ std::shared_ptr<const TransformerCfg> makeInstancePrototype(const CompoundTransf
         parameter.defaultValue);
   }
   if (network.blockedLooping()) {
-    addOwn(*prototype, kMaxLoopIterationsParameter, "OPTIONAL INTEGER", custom_messages::kPromptMaxIterations,
+    addOwn(*prototype, kMaxLoopIterationsParameter, "OPTIONAL INTEGER", messages::kPromptMaxIterations,
            QString());
-    addOwn(*prototype, kIterationCountParameter, "OPTIONAL NEW_ATTR", custom_messages::kPromptIterationCount,
+    addOwn(*prototype, kIterationCountParameter, "OPTIONAL NEW_ATTR", messages::kPromptIterationCount,
            QString());
   }
   const ParallelSettings parallel = network.getParallelSettings();
   if (parallel.isEnabled() && !isParameterReference(parallel.groupBy)) {
-    addOwn(*prototype, kProcessGroupByParameter, "OPTIONAL ATTR_LIST", custom_messages::kPromptGroupBy,
+    addOwn(*prototype, kProcessGroupByParameter, "OPTIONAL ATTR_LIST", messages::kPromptGroupBy,
            parallel.groupBy);
   }
   return prototype;

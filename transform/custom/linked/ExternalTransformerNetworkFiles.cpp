@@ -2,8 +2,8 @@
 #include <platform/qorxcore/Local8Bit.h>
 #include <platform/qorxcore/OrxHome.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
-#include <transform/custom/linked/CustomMessages.h>
 #include <transform/files/AtomicFile.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
@@ -11,6 +11,8 @@
 
 #include <QFile>
 #include <QFileInfo>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -35,10 +37,10 @@ bool ExternalTransformerNetwork::extractToFile(const QString& fileName) {
   };
   setExtractError(QString());
   if (isEnciphered())
-    return refuse(TransformResString(custom_messages::kEnciphered, m_fileName));
+    return refuse(TransformResString(messages::kEnciphered, m_fileName));
   const VersionInfo version = findVersion(m_fileName);
   if (!m_isLoaded || version.byteLength < 0)
-    return refuse(TransformResString(custom_messages::kFileChanged, m_fileName));
+    return refuse(TransformResString(messages::kFileChanged, m_fileName));
 
   QFile source(m_fileName);
   if (!source.open(QIODevice::ReadOnly) || !source.seek(version.byteOffset))

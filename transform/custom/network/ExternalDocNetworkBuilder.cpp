@@ -3,14 +3,16 @@
 #include <transform/core/TransformerSource.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
-#include <transform/custom/linked/CustomMessages.h>
 #include <transform/custom/network/ExternalDocNetworkBuilder.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
 
 #include <map>
+
+namespace messages = orx::messages;
 
 using orx::Rule;
 
@@ -53,7 +55,7 @@ bool ExternalDocNetwork::Builder::enter(int identifier, const Place& place) {
     m_places.insert(identifier, place);
     return true;
   }
-  report(Rule::DuplicateNumber, place.line, place.title, custom_messages::kDuplicateNumber,
+  report(Rule::DuplicateNumber, place.line, place.title, messages::kDuplicateNumber,
          {QString::number(identifier), QString::number(earlier->line)});
   return false;
 }
@@ -79,7 +81,7 @@ void ExternalDocNetwork::Builder::addPorts() {
     const auto earlier = known.constFind(record.name);
     place.isLeftOut = earlier != known.constEnd();
     if (place.isLeftOut)
-      report(Rule::DuplicateName, record.line, record.name, custom_messages::kDuplicateName,
+      report(Rule::DuplicateName, record.line, record.name, messages::kDuplicateName,
              {record.name, QString::number(*earlier)});
     else
       known.insert(record.name, record.line);
@@ -106,8 +108,8 @@ void ExternalDocNetwork::Builder::addPorts() {
   const QSet<QString> taken(inputNames.begin(), inputNames.end());
   for (const QString& output : m_network.getOutputs()) {
     if (taken.contains(output)) {
-      report(Rule::DuplicateName, m_reader.GetDocumentLine(m_document), output,
-             custom_messages::kSamePortName, {output});
+      report(Rule::DuplicateName, m_reader.GetDocumentLine(m_document), output, messages::kSamePortName,
+             {output});
     }
   }
 }
@@ -121,7 +123,7 @@ void ExternalDocNetwork::Builder::addTransformer(const TransformerStruct& record
   if (record.enabled) {
     const auto sameName = m_linesByTitle.constFind(place.title);
     if (sameName != m_linesByTitle.constEnd()) {
-      report(Rule::DuplicateName, record.line, place.title, custom_messages::kDuplicateName,
+      report(Rule::DuplicateName, record.line, place.title, messages::kDuplicateName,
              {place.title, QString::number(*sameName)});
     } else {
       m_linesByTitle.insert(place.title, record.line);
@@ -147,7 +149,7 @@ std::unique_ptr<TransformerCfg> ExternalDocNetwork::Builder::makeTransformer(con
   const bool isCustom = record.kind == TransformerKind::SubDocument;
   const QString type = isCustom ? subDocumentName(record) : record.type;
   if (isCustom && type.isEmpty()) {
-    report(Rule::UnknownTransformer, record.line, title, custom_messages::kNoSubDocumentName, {});
+    report(Rule::UnknownTransformer, record.line, title, messages::kNoSubDocumentName, {});
     return nullptr;
   }
   std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(type, record.version);
@@ -162,10 +164,10 @@ std::unique_ptr<TransformerCfg> ExternalDocNetwork::Builder::makeTransformer(con
   }
   const auto newest = m_source.makeTransformer(type, TransformerSource::kNewestVersion);
   if (newest) {
-    report(Rule::UnknownVersion, record.line, title, custom_messages::kUnknownVersion,
+    report(Rule::UnknownVersion, record.line, title, messages::kUnknownVersion,
            {type, QString::number(record.version), QString::number(newest->getVersion())});
   } else {
-    report(Rule::UnknownTransformer, record.line, title, custom_messages::kUnknownTransformer,
+    report(Rule::UnknownTransformer, record.line, title, messages::kUnknownTransformer,
            {type, QString::number(record.version),
             ORX_resourcePlaces(QStringLiteral("transformer")).join(QLatin1String(", "))});
   }
@@ -181,16 +183,16 @@ void ExternalDocNetwork::Builder::configure(const TransformerStruct& record, Pla
     if (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentNameParameter)
       continue;
     if (!cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
-      report(Rule::UnknownParameter, parameter.line, place.title, custom_messages::kUnknownParameter,
+      report(Rule::UnknownParameter, parameter.line, place.title, messages::kUnknownParameter,
              {nameWithFile(cfg), parameter.parmName});
     }
   }
   cfg.autoUpgradeTransformer();
   if (cfg.isAutoUpgraded()) {
-    report(Rule::Upgraded, record.line, place.title, custom_messages::kUpgraded, {cfg.getName()});
+    report(Rule::Upgraded, record.line, place.title, messages::kUpgraded, {cfg.getName()});
   }
   if (!cfg.dependencyMet()) {
-    report(Rule::UnmetDependency, record.line, place.title, custom_messages::kUnmetDependency,
+    report(Rule::UnmetDependency, record.line, place.title, messages::kUnmetDependency,
            {cfg.getName(), cfg.dependencyMsg()});
   }
 
@@ -203,7 +205,7 @@ bool ExternalDocNetwork::Builder::findEnds(const LinkStruct& record, Place*& sou
   for (const int identifier : {record.sourceNode, record.targetNode}) {
     if (m_places.contains(identifier))
       continue;
-    report(Rule::DanglingLink, record.line, QString(), custom_messages::kDanglingLink,
+    report(Rule::DanglingLink, record.line, QString(), messages::kDanglingLink,
            {QString::number(record.identifier), QString::number(identifier)});
     return false;
   }
@@ -214,7 +216,7 @@ bool ExternalDocNetwork::Builder::findEnds(const LinkStruct& record, Place*& sou
 
 void ExternalDocNetwork::Builder::reportPort(const LinkStruct& record, const Place& place,
                                              const QString& description) {
-  report(Rule::BadPort, record.line, place.title, custom_messages::kBadPort,
+  report(Rule::BadPort, record.line, place.title, messages::kBadPort,
          {QString::number(record.identifier), description});
 }
 
@@ -237,7 +239,7 @@ bool ExternalDocNetwork::Builder::findPort(const LinkStruct& record, const Place
   else
     place.cfg->getInputTags(tags);
   report(isOutput ? Rule::UnknownOutput : Rule::UnknownInput, record.line, place.title,
-         isOutput ? custom_messages::kUnknownOutput : custom_messages::kUnknownInput,
+         isOutput ? messages::kUnknownOutput : messages::kUnknownInput,
          {nameWithFile(*place.cfg), name.isEmpty() ? QString::number(number) : name,
           tags.join(QLatin1String(", "))});
   return false;
@@ -315,12 +317,12 @@ void ExternalDocNetwork::Builder::addAttributeLink(const LinkStruct& record) {
 void ExternalDocNetwork::Builder::checkLoops() {
   const QStringList loops = m_network.getLoops();
   if (m_network.blockedLooping() && loops.isEmpty())
-    report(Rule::CustomTransformerFault, m_reader.GetDocumentLine(m_document), QString(),
-           custom_messages::kNoLoop, {});
+    report(Rule::CustomTransformerFault, m_reader.GetDocumentLine(m_document), QString(), messages::kNoLoop,
+           {});
   for (const QString& output : m_network.getOutputs()) {
     if (loops.contains(output) || (!loops.isEmpty() && output == m_network.getLoopOutput()))
-      report(Rule::DuplicateName, m_reader.GetDocumentLine(m_document), output,
-             custom_messages::kSameLoopName, {output});
+      report(Rule::DuplicateName, m_reader.GetDocumentLine(m_document), output, messages::kSameLoopName,
+             {output});
   }
   for (const SubDocNetworkObj* node : m_network.nodes()) {
     if (node->kind() != SubDocNetworkObj::Kind::Loop ||
@@ -330,12 +332,11 @@ void ExternalDocNetwork::Builder::checkLoops() {
     const bool isLost =
         !m_network.blockedLooping() && !(node->feeders().empty() && node->consumers().empty());
     if (isLost)
-      report(Rule::CustomTransformerFault, line, node->name(), custom_messages::kLostLoop, {node->name()});
+      report(Rule::CustomTransformerFault, line, node->name(), messages::kLostLoop, {node->name()});
     else if (m_network.blockedLooping())
-      report(Rule::LoopPoint, line, node->name(), custom_messages::kSecondLoop,
-             {node->name(), loops.first()});
+      report(Rule::LoopPoint, line, node->name(), messages::kSecondLoop, {node->name(), loops.first()});
     else
-      report(Rule::LoopPoint, line, node->name(), custom_messages::kIdleLoop, {node->name()});
+      report(Rule::LoopPoint, line, node->name(), messages::kIdleLoop, {node->name()});
   }
 }
 
@@ -345,7 +346,7 @@ void ExternalDocNetwork::Builder::addParameters() {
   for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(m_document)) {
     const GUIType type = GUIType::fromGuiLine(record.guiLine);
     if (type.getName().isEmpty()) {
-      report(Rule::BadPromptLine, record.line, QString(), custom_messages::kBadPromptLine, {record.guiLine});
+      report(Rule::BadPromptLine, record.line, QString(), messages::kBadPromptLine, {record.guiLine});
       continue;
     }
     m_network.addPublishedParameter(type, type.getName());

@@ -3,11 +3,13 @@
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/instance/InstancePrototype.h>
-#include <transform/custom/linked/CustomMessages.h>
 #include <transform/custom/network/AttributeMemo.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -113,7 +115,7 @@ bool CompoundTransformerNetwork::getIsBlocking() const {
 }
 
 bool CompoundTransformerNetwork::extractToFile(const QString&) {
-  setExtractError(TransformResString(custom_messages::kNoFileOfItsOwn, m_name));
+  setExtractError(TransformResString(messages::kNoFileOfItsOwn, m_name));
   return false;
 }
 

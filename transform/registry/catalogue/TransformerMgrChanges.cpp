@@ -4,19 +4,12 @@
 #include <transform/registry/TransformerMgr.h>
 #include <transform/registry/catalogue/ChangeLogPage.h>
 #include <transform/registry/catalogue/PrototypeTable.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <algorithm>
 
-namespace {
-
-constexpr long kNoChanges = 370642;
-constexpr long kChanges = 370643;
-constexpr long kVersionHeading = 370644;
-constexpr long kNamedVersion = 370743;
-constexpr long kAllChanges = 370744;
-
-}  // namespace
+namespace messages = orx::messages;
 
 void TransformerMgr::getChangeLog(ITransformerCfg* configuration, IORXString& page) const {
   ORXAssign(page, changeLog(dynamic_cast<TransformerCfg*>(configuration)));
@@ -81,18 +74,21 @@ QStringList TransformerMgr::changeLog(const QString& name, int fromVersion, cons
   };
   const QString lastText =
       QString::number(toVersion == NEWEST_VERSION ? currentTransformerVersion(newName) : toVersion);
-  ChangeLogPage page(fromVersion < 0
-                         ? TransformResString(kAllChanges, {shownName(newName), lastText})
-                         : TransformResString(kChanges, {shownName(name), QString::number(fromVersion),
-                                                         shownName(newName), lastText}));
+  ChangeLogPage page(
+      fromVersion < 0 ? TransformResString(messages::kAllChanges, {shownName(newName), lastText})
+                      : TransformResString(messages::kChanges, {shownName(name), QString::number(fromVersion),
+                                                                shownName(newName), lastText}));
   for (const VersionChanges& version : changes(name, fromVersion, newName, toVersion)) {
     const QString number = QString::number(version.version);
-    page.addVersion(name == newName ? TransformResString(kVersionHeading, number)
-                                    : TransformResString(kNamedVersion, {version.localizedName, number}),
+    page.addVersion(name == newName
+                        ? TransformResString(messages::kVersionHeading, number)
+                        : TransformResString(messages::kNamedVersion, {version.localizedName, number}),
                     version.entries);
   }
   if (page.isEmpty()) {
-    page.addText(TransformResString(kNoChanges));
+    page.addText(m_prototypes->newest(newName)
+                     ? TransformResString(messages::kNoChanges)
+                     : TransformResString(messages::kUnknownTransformerName, newName));
   }
   return page.lines();
 }

@@ -1,10 +1,12 @@
 #include <transform/registry/lint/CompanionLint.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <QIODevice>
 
 #include <algorithm>
 
 using orx::Rule;
+namespace messages = orx::messages;
 
 namespace {
 
@@ -21,38 +23,36 @@ void LintedCatalogue::add(const std::shared_ptr<const LintedDefinition>& definit
   }
 }
 
-void CompanionLint::add(Rule rule, int line, const QString& text) {
-  m_report.add(rule, m_file, line, text);
+void CompanionLint::add(Rule rule, long message, int line, const QStringList& arguments) {
+  m_report.add(rule, message, m_file, line, arguments);
 }
 
 void CompanionLint::check(QIODevice& device, bool isComplete) {
   CompanionFileParser parser;
   if (!parser.parse(device)) {
-    add(Rule::UnreadableFile, 0, parser.errorString());
+    add(Rule::UnreadableFile, messages::kDefinitionUnreadable, 0, {parser.errorString()});
     return;
   }
   if (!parser.isSoundUtf8()) {
-    add(Rule::NotUtf8, 0, QStringLiteral("The file is not UTF-8"));
+    add(Rule::NotUtf8, messages::kFileNotUtf8, 0);
   }
   if (parser.openBlockLine() != 0) {
-    add(Rule::OpenBlock, parser.openBlockLine(), QStringLiteral("This block has no end"));
+    add(Rule::OpenBlock, messages::kBlockWithoutEnd, parser.openBlockLine());
   }
   for (const DefinitionLine& line : parser.strayLines()) {
-    add(Rule::UnknownKeyword, line.number, QLatin1String("This line means nothing here: ") + line.text);
+    add(Rule::UnknownKeyword, messages::kLineMeansNothing, line.number, {line.text});
   }
   for (const CompanionEntry& entry : parser.entries()) {
     checkEntry(entry, isComplete);
   }
   for (const CategoryText& category : parser.categoryDescriptions()) {
     if (!m_catalogue.hasCategory(category.name)) {
-      add(Rule::UnknownInCompanion, category.line,
-          QStringLiteral("There is no category '%1'").arg(category.name));
+      add(Rule::UnknownInCompanion, messages::kNoSuchCategory, category.line, {category.name});
     }
   }
   for (const CategoryName& category : parser.categoryNames()) {
     if (!m_catalogue.hasCategory(category.name)) {
-      add(Rule::UnknownInCompanion, category.line,
-          QStringLiteral("There is no category '%1'").arg(category.name));
+      add(Rule::UnknownInCompanion, messages::kNoSuchCategory, category.line, {category.name});
     }
   }
 }
@@ -61,8 +61,7 @@ void CompanionLint::checkRepetitions(const std::vector<CompanionEntry::Text>& te
   QSet<QString> names;
   for (const CompanionEntry::Text& text : texts) {
     if (names.contains(text.name)) {
-      add(Rule::RepeatedKeyword, text.line,
-          QStringLiteral("This replaces an earlier text of '%1'").arg(text.name));
+      add(Rule::RepeatedKeyword, messages::kRepeatedText, text.line, {text.name});
     }
     names.insert(text.name);
   }
@@ -74,6 +73,7 @@ void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
   bool isKnown = false;
   for (const auto& definition : m_catalogue.named(entry.name)) {
     const int version = definition->fields().version;
+    const QString versionText = QString::number(version);
     if (entry.hasVersion && entry.version != version) {
       continue;
     }
@@ -81,17 +81,14 @@ void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
     m_translated.insert({entry.name, version});
     for (const CompanionEntry::Text& prompt : entry.prompts) {
       if (!definition->parameterNames().contains(prompt.name)) {
-        add(Rule::UnknownInCompanion, prompt.line,
-            QStringLiteral("%1 version %2 has no parameter '%3'")
-                .arg(entry.name)
-                .arg(version)
-                .arg(prompt.name));
+        add(Rule::UnknownInCompanion, messages::kVersionHasNoParameter, prompt.line,
+            {entry.name, versionText, prompt.name});
       }
     }
     for (const CompanionEntry::Text& tag : entry.tagDescriptions) {
       if (!definition->isInput(tag.name) && !definition->isOutput(tag.name)) {
-        add(Rule::UnknownInCompanion, tag.line,
-            QStringLiteral("%1 version %2 has no port '%3'").arg(entry.name).arg(version).arg(tag.name));
+        add(Rule::UnknownInCompanion, messages::kVersionHasNoPort, tag.line,
+            {entry.name, versionText, tag.name});
       }
     }
     if (isComplete) {
@@ -99,27 +96,23 @@ void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
     }
   }
   if (!isKnown) {
-    add(Rule::UnknownInCompanion, entry.line,
-        entry.hasVersion
-            ? QStringLiteral("There is no transformer '%1' of version %2").arg(entry.name).arg(entry.version)
-            : QStringLiteral("There is no transformer '%1'").arg(entry.name));
+    add(Rule::UnknownInCompanion,
+        entry.hasVersion ? messages::kNoSuchVersion : messages::kUnknownTransformerName, entry.line,
+        {entry.name, QString::number(entry.version)});
   }
 }
 
 void CompanionLint::checkCompleteness(const CompanionEntry& entry, const LintedDefinition& definition) {
-  const auto need = [&](bool isThere, const QString& what) {
+  const auto need = [&](bool isThere, long message, const QString& what = QString()) {
     if (!isThere) {
-      add(Rule::MissingTranslation, entry.line,
-          QStringLiteral("%1 version %2: %3 is not translated")
-              .arg(entry.name)
-              .arg(definition.fields().version)
-              .arg(what));
+      add(Rule::MissingTranslation, message, entry.line,
+          {entry.name, QString::number(definition.fields().version), what});
     }
   };
-  need(!entry.localizedName.isEmpty(), QStringLiteral("the name"));
-  need(!isBlankText(entry.descriptionLines), QStringLiteral("the description"));
-  need(!isBlankText(entry.tooltipLines), QStringLiteral("the tooltip"));
-  need(!isBlankText(entry.changeLog), QStringLiteral("the change log"));
+  need(!entry.localizedName.isEmpty(), messages::kNameNotTranslated);
+  need(!isBlankText(entry.descriptionLines), messages::kDescriptionNotTranslated);
+  need(!isBlankText(entry.tooltipLines), messages::kTooltipNotTranslated);
+  need(!isBlankText(entry.changeLog), messages::kChangeLogNotTranslated);
   QSet<QString> translated;
   for (const CompanionEntry::Text& prompt : entry.prompts) {
     if (!prompt.text.isEmpty()) {
@@ -127,8 +120,8 @@ void CompanionLint::checkCompleteness(const CompanionEntry& entry, const LintedD
     }
   }
   for (const LintedParameter& parameter : definition.parameters()) {
-    need(parameter.prompt.isEmpty() || translated.contains(parameter.name),
-         QStringLiteral("the prompt of '%1'").arg(parameter.name));
+    need(parameter.prompt.isEmpty() || translated.contains(parameter.name), messages::kPromptNotTranslated,
+         parameter.name);
   }
   QSet<QString> describedPorts;
   for (const CompanionEntry::Text& tag : entry.tagDescriptions) {
@@ -136,6 +129,6 @@ void CompanionLint::checkCompleteness(const CompanionEntry& entry, const LintedD
   }
   for (const QString& port : definition.inputs() + definition.outputs()) {
     need(definition.fields().tagDescriptions.value(port).isEmpty() || describedPorts.contains(port),
-         QStringLiteral("the description of port '%1'").arg(port));
+         messages::kPortNotTranslated, port);
   }
 }

@@ -42,7 +42,7 @@ class CompanionLint {
   const QSet<QPair<QString, int>>& translated() const { return m_translated; }
 
  private:
-  void add(orx::Rule rule, int line, const QString& text);
+  void add(orx::Rule rule, long message, int line, const QStringList& arguments = {});
   void checkRepetitions(const std::vector<CompanionEntry::Text>& texts);
   void checkEntry(const CompanionEntry& entry, bool isComplete);
   void checkCompleteness(const CompanionEntry& entry, const LintedDefinition& definition);

@@ -3,12 +3,14 @@
 #include <transform/core/RenameMapping.h>
 #include <transform/registry/lint/HeaderLint.h>
 #include <transform/registry/loading/DefinitionKeywords.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <QRegularExpression>
 
 #include <algorithm>
 
 using orx::Rule;
+namespace messages = orx::messages;
 
 namespace {
 
@@ -34,26 +36,23 @@ int mappedVersion(const QString& token, int& end) {
 
 }  // namespace
 
-void HeaderLint::add(Rule rule, int line, const QString& text) {
-  m_report.add(rule, m_definition.file(), line, text);
+void HeaderLint::add(Rule rule, long message, int line, const QStringList& arguments) {
+  m_report.add(rule, message, m_definition.file(), line, arguments);
 }
 
 void HeaderLint::check() {
   QHash<QString, int> seen;
   for (const LintedDefinition::HeaderLine& line : m_definition.header()) {
     if (!line.keyword) {
-      add(Rule::UnknownKeyword, line.line.number,
-          QLatin1String("No keyword begins like this: ") + line.line.text);
+      add(Rule::UnknownKeyword, messages::kNoKeyword, line.line.number, {line.line.text});
       continue;
     }
     const KeywordKind kind = line.keyword->kind;
     if (kind == KeywordKind::Text || kind == KeywordKind::Number || kind == KeywordKind::Flag) {
       int& first = seen[line.keyword->word];
       if (first != 0) {
-        add(Rule::RepeatedKeyword, line.line.number,
-            QStringLiteral("%1 stands on line %2 already; this line replaces it")
-                .arg(line.keyword->word)
-                .arg(first));
+        add(Rule::RepeatedKeyword, messages::kRepeatedKeyword, line.line.number,
+            {line.keyword->word, QString::number(first)});
       }
       first = line.line.number;
     }
@@ -61,7 +60,7 @@ void HeaderLint::check() {
     checkReferences(line);
   }
   if (m_definition.fields().name.isEmpty()) {
-    add(Rule::BadValue, m_definition.line(), QStringLiteral("The definition has no TRANSFORMER_NAME"));
+    add(Rule::BadValue, messages::kNamelessTransformer, m_definition.line());
   }
   checkTexts();
 }
@@ -73,37 +72,34 @@ void HeaderLint::checkValue(const LintedDefinition::HeaderLine& line) {
     case KeywordKind::Number: {
       bool isNumber = false;
       if (line.value.toInt(&isNumber) < 0 || !isNumber) {
-        add(Rule::BadValue, number,
-            QStringLiteral("%1 needs a whole number from 0 up, not '%2'").arg(word, line.value));
+        add(Rule::BadValue, messages::kNeedsNumber, number, {word, line.value});
       }
       break;
     }
     case KeywordKind::Flag:
       if (flagValue(line.value) < 0) {
-        add(Rule::BadValue, number,
-            QStringLiteral("%1 needs yes, true, no or false, not '%2'").arg(word, line.value));
+        add(Rule::BadValue, messages::kNeedsTruth, number, {word, line.value});
       }
       break;
     case KeywordKind::Modes:
       for (const QString& mode : splitDefinitionList(line.value)) {
         if (featureHoldingBit(mode) == 0) {
-          add(Rule::BadValue, number,
-              QStringLiteral("%1 knows NONE, GROUPED and ALL, not '%2'").arg(word, mode));
+          add(Rule::BadValue, messages::kNeedsMode, number, {word, mode});
         }
       }
       break;
     case KeywordKind::Lookup:
       if (line.value.isEmpty()) {
-        add(Rule::BadValue, number, QStringLiteral("%1 needs entries KEY,MAPPED separated by %").arg(word));
+        add(Rule::BadValue, messages::kNeedsLookup, number, {word});
       }
       break;
     case KeywordKind::TagDescription: {
       QString tag;
       QString description;
       if (!splitTagDescription(line.value, tag, description)) {
-        add(Rule::BadValue, number, QStringLiteral("%1 needs a tag and its description").arg(word));
+        add(Rule::BadValue, messages::kNeedsTagText, number, {word});
       } else if (!m_definition.isInput(tag) && !m_definition.isOutput(tag)) {
-        add(Rule::UnknownPort, number, QStringLiteral("There is no port '%1'").arg(tag));
+        add(Rule::UnknownPort, messages::kNoSuchPort, number, {tag});
       }
       break;
     }
@@ -118,8 +114,7 @@ void HeaderLint::checkReferences(const LintedDefinition::HeaderLine& line) {
   const int number = line.line.number;
   if (keyword.text == &Fields::multiProcess) {
     if (!m_definition.parameterNames().contains(line.value)) {
-      add(Rule::UndeclaredParameter, number,
-          QStringLiteral("There is no parameter '%1' to group by").arg(line.value));
+      add(Rule::UndeclaredParameter, messages::kNoParameterToGroupBy, number, {line.value});
     }
   } else if (keyword.list == &Fields::listActions) {
     checkListAction(line.value, number);
@@ -140,13 +135,13 @@ void HeaderLint::checkReferences(const LintedDefinition::HeaderLine& line) {
 
 void HeaderLint::checkInput(const QString& tag, int line) {
   if (!m_definition.isInput(tag)) {
-    add(Rule::UnknownPort, line, QStringLiteral("There is no input '%1'").arg(tag));
+    add(Rule::UnknownPort, messages::kNoSuchInput, line, {tag});
   }
 }
 
 void HeaderLint::checkOutput(const QString& tag, int line) {
   if (!m_definition.isOutput(tag)) {
-    add(Rule::UnknownPort, line, QStringLiteral("There is no output '%1'").arg(tag));
+    add(Rule::UnknownPort, messages::kNoSuchOutput, line, {tag});
   }
 }
 
@@ -154,7 +149,7 @@ void HeaderLint::checkParametersOf(const QString& text, int line) {
   const ParameterText parsed(text);
   for (const ParameterText::Piece& piece : parsed.pieces()) {
     if (piece.isParameter && !m_definition.parameterNames().contains(piece.text)) {
-      add(Rule::UndeclaredParameter, line, QStringLiteral("There is no parameter '%1'").arg(piece.text));
+      add(Rule::UndeclaredParameter, messages::kNoSuchParameter, line, {piece.text});
     }
   }
 }
@@ -183,9 +178,7 @@ void HeaderLint::checkAdded(const QString& token, int line) {
 void HeaderLint::checkListAction(const QString& action, int line) {
   AttributeRules rules;
   if (!rules.addListAction(action)) {
-    add(Rule::BadListAction, line,
-        QStringLiteral("Needs OUT KEEP, OUT DROP, OUT COLLECT IN LIST or OUT EXPLODE LIST, not '%1'")
-            .arg(action));
+    add(Rule::BadListAction, messages::kBadListAction, line, {action});
     return;
   }
   const QStringList words = action.split(QLatin1Char(' '), Qt::SkipEmptyParts);
@@ -203,23 +196,20 @@ void HeaderLint::checkMappedVersion(const QString& token, int line) {
   int end = 0;
   const int version = mappedVersion(token, end);
   if (version > m_definition.fields().version || version == 0) {
-    add(Rule::BadMapping, line,
-        QStringLiteral("Version %1 in '%2' is not one that could have brought the change")
-            .arg(version)
-            .arg(token));
+    add(Rule::BadMapping, messages::kBadMappedVersion, line, {token});
   }
 }
 
 void HeaderLint::checkParameterMapping(const QString& token, int line) {
   RenameMapping mapping;
   if (!mapping.add(token)) {
-    add(Rule::BadMapping, line, QStringLiteral("Needs [VERSION:]OLD=NEW, not '%1'").arg(token));
+    add(Rule::BadMapping, messages::kBadParameterMapping, line, {token});
     return;
   }
   checkMappedVersion(token, line);
   const QString name = token.mid(token.indexOf(QLatin1Char('=')) + 1);
   if (!m_definition.parameterNames().contains(name)) {
-    add(Rule::UndeclaredParameter, line, QStringLiteral("There is no parameter '%1'").arg(name));
+    add(Rule::UndeclaredParameter, messages::kNoSuchParameter, line, {name});
   }
 }
 
@@ -230,8 +220,7 @@ void HeaderLint::checkTagMapping(const QString& token, int line) {
   const bool isInput = mapping.startsWith(QLatin1String("I:"));
   const QString renaming = mapping.mid(2);
   if ((!isInput && !mapping.startsWith(QLatin1String("O:"))) || !RenameMapping().add(renaming)) {
-    add(Rule::BadMapping, line,
-        QStringLiteral("Needs [VERSION:]I:OLD=NEW or [VERSION:]O:OLD=NEW, not '%1'").arg(token));
+    add(Rule::BadMapping, messages::kBadTagMapping, line, {token});
     return;
   }
   checkMappedVersion(token, line);
@@ -246,18 +235,18 @@ void HeaderLint::checkTagMapping(const QString& token, int line) {
 void HeaderLint::checkTexts() {
   const TransformerDefinition& fields = m_definition.fields();
   const int line = m_definition.nameLine();
-  const auto need = [&](bool isThere, const QString& what) {
+  const auto need = [&](bool isThere, long message, const QString& what = QString()) {
     if (!isThere) {
-      add(Rule::MissingText, line, QStringLiteral("%1 has no %2").arg(fields.name, what));
+      add(Rule::MissingText, message, line, {fields.name, what});
     }
   };
-  need(!fields.category.isEmpty(), QStringLiteral("category"));
-  need(!isBlankText(fields.descriptionLines), QStringLiteral("description"));
-  need(!isBlankText(fields.tooltipLines), QStringLiteral("tooltip"));
-  need(!isBlankText(fields.changeLog), QStringLiteral("change log"));
+  need(!fields.category.isEmpty(), messages::kNoCategory);
+  need(!isBlankText(fields.descriptionLines), messages::kNoDescription);
+  need(!isBlankText(fields.tooltipLines), messages::kNoTooltip);
+  need(!isBlankText(fields.changeLog), messages::kNoChangeLog);
   const QStringList ports = m_definition.inputs() + m_definition.outputs();
   for (const QString& tag : ports) {
-    need(!fields.tagDescriptions.value(tag).isEmpty(), QLatin1String("TAG_DESCRIPTION of ") + tag);
+    need(!fields.tagDescriptions.value(tag).isEmpty(), messages::kNoTagDescription, tag);
   }
   if (m_definition.hasOwnClass()) {
     return;

@@ -13,7 +13,7 @@ class HeaderLint {
   void check();
 
  private:
-  void add(orx::Rule rule, int line, const QString& text);
+  void add(orx::Rule rule, long message, int line, const QStringList& arguments = {});
   void checkValue(const LintedDefinition::HeaderLine& line);
   void checkReferences(const LintedDefinition::HeaderLine& line);
   void checkPreserved(const QString& token, int line);

@@ -6,8 +6,10 @@
 #include <transform/core/ValueReferences.h>
 #include <transform/registry/lint/ParameterLint.h>
 #include <transform/registry/loading/DefinitionKeywords.h>
+#include <transform/text/MessageNumbers.h>
 
 using orx::Rule;
+namespace messages = orx::messages;
 
 namespace {
 
@@ -29,8 +31,8 @@ bool hasEncodedForm(const GUIType& type) {
 
 }  // namespace
 
-void ParameterLint::add(Rule rule, int line, const QString& text) {
-  m_report.add(rule, m_definition.file(), line, text);
+void ParameterLint::add(Rule rule, long message, int line, const QStringList& arguments) {
+  m_report.add(rule, message, m_definition.file(), line, arguments);
 }
 
 bool ParameterLint::check() {
@@ -40,18 +42,15 @@ bool ParameterLint::check() {
   QHash<QString, int> seen;
   for (const LintedParameter& parameter : m_definition.parameters()) {
     if (parameter.name.isEmpty()) {
-      add(Rule::BadValue, parameter.line, QStringLiteral("The parameter has no name"));
+      add(Rule::BadValue, messages::kNamelessParameter, parameter.line);
     } else if (seen.contains(parameter.name)) {
-      add(Rule::DuplicateParameter, parameter.line,
-          QStringLiteral("Parameter '%1' stands on line %2 already")
-              .arg(parameter.name)
-              .arg(seen[parameter.name]));
+      add(Rule::DuplicateParameter, messages::kDuplicateParameter, parameter.line,
+          {parameter.name, QString::number(seen[parameter.name])});
     } else {
       seen.insert(parameter.name, parameter.line);
     }
     if (parameter.prompt.isEmpty() && parameter.type.getType() != kDividerType) {
-      add(Rule::MissingText, parameter.line,
-          QStringLiteral("Parameter '%1' has no prompt").arg(parameter.name));
+      add(Rule::MissingText, messages::kNoPrompt, parameter.line, {parameter.name});
     }
     checkType(parameter, parameter.type);
     const MemberList members(parameter.type);
@@ -86,7 +85,7 @@ bool ParameterLint::checkLines() {
       name = line.value;
     } else if (line.keyword->word == kParameterLookup && names == 0) {
       isSound = false;
-      add(Rule::ParameterLines, line.line.number, QStringLiteral("No parameter is named above this line"));
+      add(Rule::ParameterLines, messages::kLineAboveParameters, line.line.number);
     }
     for (Kind& kind : kinds) {
       if (line.keyword->word != kind.word) {
@@ -99,20 +98,20 @@ bool ParameterLint::checkLines() {
       kind.isTold = true;
       isSound = false;
       const QString taken = m_definition.fields().parameterNames.value(kind.count - 1);
-      add(Rule::ParameterLines, line.line.number,
-          taken.isEmpty() ? QStringLiteral("No parameter is named for this %1").arg(kind.word)
-          : taken == name
-              ? QStringLiteral("Parameter '%1' has this %2 already").arg(name, kind.word)
-              : QStringLiteral("This %1 is taken for parameter '%2', not '%3'; each parameter needs a line")
-                    .arg(kind.word, taken, name));
+      if (taken.isEmpty()) {
+        add(Rule::ParameterLines, messages::kLineWithoutParameter, line.line.number, {kind.word});
+      } else if (taken == name) {
+        add(Rule::ParameterLines, messages::kLineTwice, line.line.number, {name, kind.word});
+      } else {
+        add(Rule::ParameterLines, messages::kShiftedLine, line.line.number, {kind.word, taken, name});
+      }
     }
   }
   for (const LintedParameter& parameter : m_definition.parameters()) {
     if (parameter.type.isNull()) {
       isSound = false;
       if (!kinds[0].isTold) {
-        add(Rule::ParameterLines, parameter.typeLine,
-            QStringLiteral("Parameter '%1' has no type").arg(parameter.name));
+        add(Rule::ParameterLines, messages::kNoType, parameter.typeLine, {parameter.name});
       }
     }
   }
@@ -121,20 +120,17 @@ bool ParameterLint::checkLines() {
 
 void ParameterLint::checkType(const LintedParameter& parameter, const GUIType& type) {
   if (!type.isKnown()) {
-    add(Rule::UnknownType, parameter.typeLine,
-        QStringLiteral("There is no parameter type '%1'").arg(type.getType()));
+    add(Rule::UnknownType, messages::kNoSuchType, parameter.typeLine, {type.getType()});
   } else if (!type.valueIsEncoded() && hasEncodedForm(type)) {
-    add(Rule::PlainTextType, parameter.typeLine,
-        QStringLiteral("'%1' may hold any text, so its type needs to be %2%3")
-            .arg(type.getName(), type.getType(), kEncodedSuffix));
+    add(Rule::PlainTextType, messages::kPlainTextType, parameter.typeLine,
+        {type.getName(), type.getType() + kEncodedSuffix});
   }
 }
 
 void ParameterLint::checkGroup(const LintedParameter& parameter) {
   for (const QString& member : ORX_splitConfig(parameter.type.getConfigToken(), QLatin1Char('%'))) {
     if (!m_definition.parameterNames().contains(member)) {
-      add(Rule::UndeclaredParameter, parameter.typeLine,
-          QStringLiteral("There is no parameter '%1' to frame").arg(member));
+      add(Rule::UndeclaredParameter, messages::kNoParameterToFrame, parameter.typeLine, {member});
     }
   }
 }
@@ -158,8 +154,8 @@ void ParameterLint::checkDefault(const LintedParameter& parameter) {
     if (const GUIType* member = members.find(pieces[i])) {
       checkDefault(parameter, *member, pieces[i + 1]);
     } else {
-      add(Rule::UndeclaredParameter, parameter.defaultLine,
-          QStringLiteral("'%1' has no member '%2'").arg(parameter.name, pieces[i]));
+      add(Rule::UndeclaredParameter, messages::kNoSuchMember, parameter.defaultLine,
+          {parameter.name, pieces[i]});
     }
   }
 }
@@ -173,12 +169,11 @@ void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType
   if (isUnset || isReference || hasNoValue(type) || value.contains(kMacroOpen)) {
     return;
   }
-  const auto refuse = [&](const QString& text) {
-    add(Rule::BadDefault, parameter.defaultLine,
-        QStringLiteral("Default of '%1': %2").arg(type.getName(), text));
+  const auto refuse = [&](long message, const QString& what, const QString& remedy = QString()) {
+    add(Rule::BadDefault, message, parameter.defaultLine, {type.getName(), what, remedy});
   };
   if (isMark) {
-    refuse(QStringLiteral("'%1' would be written as it stands; write @Value(%2)").arg(value, value.mid(1)));
+    refuse(messages::kDefaultNoReference, value, value.mid(1));
     return;
   }
   ChoiceList choices(type);
@@ -187,13 +182,12 @@ void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType
   }
   const ValueFit fit = ValueFit::of(type, choices, value);
   if (!fit.fits()) {
-    refuse(fit.text());
+    refuse(messages::kDefaultUnfit, fit.text());
   } else if (type.valueIsEncoded()) {
     // Lists are packed with commas, which are no part of the words.
     for (const QString& word : value.split(QLatin1Char(','))) {
       if (!QORXWwjdIsWellFormed(word)) {
-        refuse(QStringLiteral("'%1' is not word-encoded; write %2")
-                   .arg(word, QORXWwjdEncode(QORXWwjdDecode(word))));
+        refuse(messages::kDefaultNotEncoded, word, QORXWwjdEncode(QORXWwjdDecode(word)));
       }
     }
   }

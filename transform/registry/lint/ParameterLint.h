@@ -15,7 +15,7 @@ class ParameterLint {
   bool check();
 
  private:
-  void add(orx::Rule rule, int line, const QString& text);
+  void add(orx::Rule rule, long message, int line, const QStringList& arguments = {});
   bool checkLines();
   void checkType(const LintedParameter& parameter, const GUIType& type);
   void checkGroup(const LintedParameter& parameter);

@@ -5,9 +5,11 @@
 #include <transform/scripts/PythonSyntax.h>
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/scripts/TclSyntax.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 using orx::Rule;
+namespace messages = orx::messages;
 
 namespace {
 
@@ -46,14 +48,14 @@ void ScriptLint::checkDefault(const LintedParameter& parameter, const Place& pla
     checkTcl(script, place, report);
     if (type == kTclParameterType &&
         !canWriteTclParameter(QString(), parameter.name, parameter.defaultValue, reason)) {
-      report.add(Rule::TclSyntax, place.file, place.line, reason);
+      report.addText(Rule::TclSyntax, messages::kScriptRefused, place.file, place.line, reason);
     }
   } else if (type == kPythonType) {
     m_python.append(script);
     m_pythonPlaces.push_back(place);
   } else if (type == kPythonParameterType) {
     if (!canWritePythonParameter(QString(), parameter.name, parameter.defaultValue, reason)) {
-      report.add(Rule::PythonSyntax, place.file, place.line, reason);
+      report.addText(Rule::PythonSyntax, messages::kScriptRefused, place.file, place.line, reason);
       return;
     }
     // As the engine gets it, inside a function.
@@ -67,27 +69,21 @@ void ScriptLint::checkDefault(const LintedParameter& parameter, const Place& pla
 void ScriptLint::checkTcl(const QString& script, const Place& place, LintReport& report) {
   const TclFault fault = findTclFault(script);
   if (!fault.text.isEmpty()) {
-    report.add(Rule::TclSyntax, place.file, place.line,
-               QStringLiteral("Tcl script of %1, line %2: %3")
-                   .arg(place.owner.trimmed())
-                   .arg(fault.line)
-                   .arg(fault.text));
+    report.add(Rule::TclSyntax, messages::kTclFaultOf, place.file, place.line,
+               {place.owner.trimmed(), QString::number(fault.line), fault.text});
   }
 }
 
 void ScriptLint::checkPython(LintReport& report) {
   PythonSyntax python;
   if (!python.check(m_python)) {
-    report.add(Rule::UncheckedPython, m_pythonPlaces.front().file, m_pythonPlaces.front().line,
-               QStringLiteral("%1 Python script(s) could not be checked: %2")
-                   .arg(m_python.size())
-                   .arg(python.errorString()));
+    report.add(Rule::UncheckedPython, messages::kUncheckedPython, m_pythonPlaces.front().file,
+               m_pythonPlaces.front().line, {python.errorString()});
   }
   for (const PythonFault& fault : python.faults()) {
     const Place& place = m_pythonPlaces[static_cast<std::size_t>(fault.script)];
-    report.add(
-        Rule::PythonSyntax, place.file, place.line,
-        QStringLiteral("Python script of %1, line %2: %3").arg(place.owner).arg(fault.line).arg(fault.text));
+    report.add(Rule::PythonSyntax, messages::kPythonFaultOf, place.file, place.line,
+               {place.owner, QString::number(fault.line), fault.text});
   }
   m_python.clear();
   m_pythonPlaces.clear();

@@ -5,10 +5,12 @@
 #include <transform/registry/lint/TemplateLint.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <QRegularExpression>
 
 using orx::Rule;
+namespace messages = orx::messages;
 
 namespace {
 
@@ -50,8 +52,8 @@ TemplateLint::TemplateLint(const LintedDefinition& definition, LintReport& repor
   }
 }
 
-void TemplateLint::add(Rule rule, int line, const QString& text) {
-  m_report.add(rule, m_definition.file(), line, text);
+void TemplateLint::add(Rule rule, long message, int line, const QStringList& arguments) {
+  m_report.add(rule, message, m_definition.file(), line, arguments);
 }
 
 void TemplateLint::check() {
@@ -82,14 +84,11 @@ void TemplateLint::checkStatement(const DefinitionLine& line) {
   static const QRegularExpression keyword(QStringLiteral("^(#|[A-Za-z_][A-Za-z0-9_]*( |$))"));
   static const QRegularExpression secondFactory(QStringLiteral("\\sFACTORY_DEF\\s"));
   if (line.text.endsWith(QLatin1Char('\\'))) {
-    add(Rule::BadStatement, line.number,
-        QStringLiteral("Each line is a whole statement; write it on one line"));
+    add(Rule::BadStatement, messages::kStatementContinued, line.number);
   } else if (!keyword.match(line.text).hasMatch()) {
-    add(Rule::BadStatement, line.number,
-        QStringLiteral("Each line is a whole statement and begins with its keyword"));
+    add(Rule::BadStatement, messages::kStatementNoKeyword, line.number);
   } else if (secondFactory.match(line.text).hasMatch()) {
-    add(Rule::BadStatement, line.number,
-        QStringLiteral("A second %1 needs a line of its own").arg(kFactoryStatement));
+    add(Rule::BadStatement, messages::kSecondStatement, line.number, {kFactoryStatement});
   }
 }
 
@@ -107,7 +106,7 @@ bool TemplateLint::takePortToken(const QString& token, int line, LineTokens& tok
     tokens.hasInputs = true;
     m_usedInputs.insert(input);
     if (!m_definition.isInput(input) && !m_definition.hasOwnClass()) {
-      add(Rule::UnknownPort, line, QStringLiteral("There is no input '%1'").arg(input));
+      add(Rule::UnknownPort, messages::kNoSuchInput, line, {input});
     }
     return true;
   }
@@ -119,7 +118,7 @@ bool TemplateLint::takePortToken(const QString& token, int line, LineTokens& tok
     m_routedOutputs.insert(output);
   }
   if (!m_definition.isOutput(output) && !m_definition.hasOwnClass()) {
-    add(Rule::UnknownPort, line, QStringLiteral("There is no output '%1'").arg(output));
+    add(Rule::UnknownPort, messages::kNoSuchOutput, line, {output});
   }
   return true;
 }
@@ -137,8 +136,7 @@ TemplateLint::LineTokens TemplateLint::takeTokens(const DefinitionLine& line) {
       m_usesAllParameters = true;
     } else if (!isInstanceToken(token) && !takePortToken(token, line.number, tokens) &&
                !m_macros.contains(token) && !isGlobalMacro(token)) {
-      add(Rule::UnknownToken, line.number,
-          QStringLiteral("$(%1) names neither a parameter nor a port").arg(token));
+      add(Rule::UnknownToken, messages::kNoSuchToken, line.number, {token});
     }
   }
   return tokens;
@@ -151,19 +149,11 @@ void TemplateLint::checkOutputs(const LineTokens& tokens, int line) {
   const QSet<QString> half =
       (tokens.featureTypes - tokens.functions) + (tokens.functions - tokens.featureTypes);
   if (!half.isEmpty()) {
-    add(Rule::OutputRoute, line,
-        QStringLiteral("A statement that routes an output holds both its _FTYPE and its _FUNCS token: %1")
-            .arg(sortedList(half)));
+    add(Rule::OutputRoute, messages::kHalfRoute, line, {sortedList(half)});
   } else if (tokens.featureTypes.size() > 1) {
-    add(Rule::OutputRoute, line,
-        QStringLiteral("Each output is routed in a statement of its own: %1")
-            .arg(sortedList(tokens.featureTypes)));
+    add(Rule::OutputRoute, messages::kTwoRoutes, line, {sortedList(tokens.featureTypes)});
   } else if (tokens.hasInputs || !tokens.parameters.isEmpty()) {
-    add(Rule::OutputRoute, line,
-        QStringLiteral(
-            "While %1 is not connected, this whole line goes away; route the output in a statement of "
-            "its own")
-            .arg(sortedList(tokens.featureTypes)));
+    add(Rule::OutputRoute, messages::kMixedRoute, line, {sortedList(tokens.featureTypes)});
   }
 }
 
@@ -175,10 +165,9 @@ void TemplateLint::checkOmittables(const LineTokens& tokens, const DefinitionLin
   const bool isOwn = line.text.startsWith(kOption) && tokens.parameters.size() == 1 && !tokens.hasInputs &&
                      tokens.featureTypes.isEmpty() && tokens.functions.isEmpty();
   if (!isOwn) {
-    add(Rule::OmittableLine, line.number,
-        QStringLiteral(
-            "While %1 has no value, this whole line goes away; write %2$(%3) KEY VALUE on a line of its own")
-            .arg(sortedList(omittables), kOption, kEncodedNameToken));
+    add(Rule::OmittableLine, messages::kOmittableLine, line.number,
+        {sortedList(omittables),
+         kOption + QLatin1String("$(") + kEncodedNameToken + QLatin1String(") KEY VALUE")});
   }
 }
 
@@ -189,12 +178,12 @@ void TemplateLint::checkUse() {
   const int line = m_definition.nameLine();
   for (const QString& tag : m_definition.inputs()) {
     if (!m_usesAllInputs && !m_usedInputs.contains(tag)) {
-      add(Rule::UnusedPort, line, QStringLiteral("The template does not use input '%1'").arg(tag));
+      add(Rule::UnusedPort, messages::kUnusedInput, line, {tag});
     }
   }
   for (const QString& tag : m_definition.outputs()) {
     if (!m_routedOutputs.contains(tag)) {
-      add(Rule::UnusedPort, line, QStringLiteral("The template does not route output '%1'").arg(tag));
+      add(Rule::UnusedPort, messages::kUnroutedOutput, line, {tag});
     }
   }
   if (m_usesAllParameters) {
@@ -212,8 +201,7 @@ void TemplateLint::checkUse() {
     }
     for (const QString& name : std::as_const(names)) {
       if (needsUse(parameter.type) && !isGroupBy && !m_used.contains(name) && name != kIdentifierParameter) {
-        add(Rule::UnplacedParameter, parameter.line,
-            QStringLiteral("The template does not use parameter '%1'").arg(name));
+        add(Rule::UnplacedParameter, messages::kUnplacedParameter, parameter.line, {name});
       }
     }
   }

@@ -23,7 +23,7 @@ class TemplateLint {
     bool hasInputs = false;
   };
 
-  void add(orx::Rule rule, int line, const QString& text);
+  void add(orx::Rule rule, long message, int line, const QStringList& arguments = {});
   void collectMacros();
   void checkStatement(const DefinitionLine& line);
   LineTokens takeTokens(const DefinitionLine& line);

@@ -1,4 +1,5 @@
 #include <transform/registry/loading/DefinitionLines.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QIODevice>
@@ -7,9 +8,10 @@
 #include <algorithm>
 #include <cstring>
 
+namespace messages = orx::messages;
+
 namespace {
 
-constexpr long kTooLarge = 370740;
 constexpr int kMibUtf8 = 106;
 const char kByteOrderMark[] = "\xEF\xBB\xBF";
 constexpr int kByteOrderMarkSize = 3;
@@ -38,7 +40,7 @@ QString decoded(const char* bytes, int size) {
 }  // namespace
 
 QString DefinitionLines::tooLargeMessage() {
-  return TransformResString(kTooLarge, QString::number(kLargestFile / (1024 * 1024)));
+  return TransformResString(messages::kFileTooLarge, QString::number(kLargestFile / (1024 * 1024)));
 }
 
 void DefinitionLines::open(const QByteArray& bytes, bool isWholeFile) {

@@ -6,6 +6,7 @@
 #include <transform/registry/loading/DefinitionFileNames.h>
 #include <transform/registry/loading/DefinitionLoader.h>
 #include <transform/registry/loading/ExceptionList.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/XMLComponentReader.h>
 
@@ -14,14 +15,7 @@
 #include <map>
 #include <utility>
 
-namespace {
-
-constexpr long kUnfinishedDefinition = 370741;
-constexpr long kNamelessDefinition = 370742;
-constexpr long kUnfinishedLines = 370746;
-constexpr long kDefinedTwice = 370747;
-
-}  // namespace
+namespace messages = orx::messages;
 
 DefinitionLoader::DefinitionLoader(PrototypeTable& prototypes, CategoryTexts& categories,
                                    const ExceptionList& exceptions,
@@ -145,15 +139,15 @@ void DefinitionLoader::noteLosses(const QString& path) {
     const QString& name = definition.facts.name;
     const int version = definition.facts.version;
     if (name.isEmpty()) {
-      note(TransformResString(kNamelessDefinition, path));
+      note(TransformResString(messages::kNamelessDefinition, path));
     } else if (m_index.definitions().size() > 1 && ++counts[{name, version}] == 2) {
-      note(TransformResString(kDefinedTwice, {path, name, QString::number(version)}));
+      note(TransformResString(messages::kDefinedTwice, {path, name, QString::number(version)}));
     }
   }
   if (m_index.endsUnfinished()) {
     const QString& name = m_index.unfinishedName();
-    note(name.isEmpty() ? TransformResString(kUnfinishedLines, path)
-                        : TransformResString(kUnfinishedDefinition, {path, name}));
+    note(name.isEmpty() ? TransformResString(messages::kUnfinishedLines, path)
+                        : TransformResString(messages::kUnfinishedDefinition, {path, name}));
   }
 }
 

@@ -1,7 +1,10 @@
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/scripts/blocks/PythonLineScanner.h>
+#include <transform/text/MessageNumbers.h>
 
 #include <QRegularExpression>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -47,7 +50,7 @@ bool isSafeBehindPlus(const QString& key) {
 ScriptRefusal PythonLineScanner::scan(const QString& line, bool redirectsLookups) {
   ++m_line;
   if (!m_quote.isNull()) {
-    return {script_refusal::kTextOfSeveralLines, m_line};
+    return {messages::kScriptTextOfSeveralLines, m_line};
   }
   m_hasStatementMark = false;
   m_sawSemicolon = false;
@@ -59,7 +62,7 @@ ScriptRefusal PythonLineScanner::scan(const QString& line, bool redirectsLookups
     while (nextKey < keys.size() && keys[nextKey].position <= at) {
       const ScriptKey& key = keys[nextKey++];
       if (!isRedirectable() || !isSafeBehindPlus(line.mid(key.position, key.length))) {
-        return {script_refusal::kLookup, m_line};
+        return {messages::kScriptLookup, m_line};
       }
     }
     if (m_quote.isNull() && line[at] == QLatin1Char('#')) {
@@ -125,7 +128,7 @@ int PythonLineScanner::scanCode(const QString& line, int at, ScriptRefusal& refu
     case u']':
     case u'}':
       if (m_brackets.isEmpty() || m_brackets.last().close != character) {
-        refusal = {script_refusal::kUnbalanced, m_line};
+        refusal = {messages::kScriptUnbalanced, m_line};
         return at;
       }
       m_brackets.removeLast();

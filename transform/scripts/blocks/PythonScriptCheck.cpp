@@ -1,13 +1,14 @@
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/scripts/blocks/PythonLineScanner.h>
 #include <transform/scripts/blocks/ScriptRefusal.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QSet>
 
-namespace {
+namespace messages = orx::messages;
 
-using namespace script_refusal;
+namespace {
 
 const QLatin1Char kBackslash('\\');
 
@@ -77,7 +78,7 @@ ScriptRefusal refusePython(const QStringList& codeLines, bool redirectsLookups) 
   }
   const int result = scriptResultLine(codeLines);
   if (result < 0) {
-    return {kEmpty, 0};
+    return {messages::kScriptEmpty, 0};
   }
   PythonLineScanner scanner;
   bool isJoined = false;
@@ -99,26 +100,26 @@ ScriptRefusal refusePython(const QStringList& codeLines, bool redirectsLookups) 
     const bool continues = line.endsWith(kBackslash);
     if (continues &&
         (i + 1 == codeLines.size() || !isJoinable(line, codeLines[i + 1], isJoined, scanner.lineEnd()))) {
-      return {kContinuation, i + 1};
+      return {messages::kScriptContinuation, i + 1};
     }
     if (scanner.lineEnd() == PythonLineScanner::LineEnd::Text) {
-      return {kUnbalanced, i + 1};
+      return {messages::kScriptUnbalanced, i + 1};
     }
     isJoined = continues;
     if (i < result) {
       continue;
     }
     if (scanner.isInsideBrackets()) {
-      return {kUnbalanced, scanner.openBracketLine()};
+      return {messages::kScriptUnbalanced, scanner.openBracketLine()};
     }
     if (scanner.lineEnd() == PythonLineScanner::LineEnd::TextOfSeveralLines) {
-      return {kUnbalanced, i + 1};
+      return {messages::kScriptUnbalanced, i + 1};
     }
     if (!startsStatement) {
-      return {kResultInsideStatement, first + 1};
+      return {messages::kScriptResultInsideStatement, first + 1};
     }
     if (i == result && !givesValue(codeLines[first].trimmed(), hasStatementMark)) {
-      return {kResultNoValue, first + 1};
+      return {messages::kScriptResultNoValue, first + 1};
     }
   }
   return {};

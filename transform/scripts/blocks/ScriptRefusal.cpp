@@ -1,10 +1,11 @@
 #include <transform/scripts/blocks/ScriptRefusal.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
-namespace {
+namespace messages = orx::messages;
 
-constexpr long kCannotWrite = 370613;
+namespace {
 
 bool isBrokenSurrogate(const QString& text, int index) {
   const QChar character = text[index];
@@ -36,11 +37,11 @@ ScriptRefusal refuseUnwritableLines(const QStringList& codeLines) {
     const QString& line = codeLines[number - 1];
     for (int i = 0; i < line.size(); ++i) {
       if (line[i].isNull() || line[i] == QLatin1Char('\r') || isBrokenSurrogate(line, i)) {
-        return {script_refusal::kCharacter, number};
+        return {messages::kScriptCharacter, number};
       }
     }
     if (line.trimmed() == kIncludeEnd) {
-      return {script_refusal::kBlockEnd, number};
+      return {messages::kScriptBlockEnd, number};
     }
   }
   return {};
@@ -49,10 +50,10 @@ ScriptRefusal refuseUnwritableLines(const QStringList& codeLines) {
 QString scriptRefusalText(const QString& parameterName, const ScriptRefusal& refusal) {
   const QString why = refusal.line > 0 ? TransformResString(refusal.message, QString::number(refusal.line))
                                        : TransformResString(refusal.message);
-  return TransformResString(kCannotWrite, {parameterName, why});
+  return TransformResString(messages::kScriptRefused, {parameterName, why});
 }
 
 QString scriptNameRefusalText(const QString& parameterName, const QString& badName) {
-  return TransformResString(kCannotWrite,
-                            {parameterName, TransformResString(script_refusal::kName, badName)});
+  return TransformResString(messages::kScriptRefused,
+                            {parameterName, TransformResString(messages::kScriptName, badName)});
 }

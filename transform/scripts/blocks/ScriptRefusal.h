@@ -13,20 +13,6 @@ struct ScriptRefusal {
   explicit operator bool() const { return message != 0; }
 };
 
-namespace script_refusal {
-constexpr long kTooManyBrackets = 370729;
-constexpr long kName = 370730;
-constexpr long kEmpty = 370731;
-constexpr long kCharacter = 370732;
-constexpr long kBlockEnd = 370733;
-constexpr long kContinuation = 370734;
-constexpr long kTextOfSeveralLines = 370735;
-constexpr long kUnbalanced = 370736;
-constexpr long kResultInsideStatement = 370737;
-constexpr long kResultNoValue = 370738;
-constexpr long kLookup = 370739;
-}  // namespace script_refusal
-
 // A name that can stand in a macro line and in a string literal of a script.
 bool isScriptableName(const QString& name);
 // A text without the characters of `specials`, control characters and broken surrogate pairs.

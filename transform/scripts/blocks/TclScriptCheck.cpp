@@ -1,5 +1,6 @@
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/scripts/blocks/ScriptRefusal.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QByteArray>
@@ -8,9 +9,9 @@
 
 #include <algorithm>
 
-namespace {
+namespace messages = orx::messages;
 
-using namespace script_refusal;
+namespace {
 
 // What is put in front of the line that gives the value.
 constexpr int kReturnSize = sizeof("return ") - 1;
@@ -154,7 +155,7 @@ class TclBody {
     while (at < end) {
       const TclCommand command(at, static_cast<int>(end - at));
       if (!command.isComplete()) {
-        return {kUnbalanced, lineOf(std::min(command.fault(), end))};
+        return {messages::kScriptUnbalanced, lineOf(std::min(command.fault(), end))};
       }
       if (command.wordCount() > 0) {
         if (const ScriptRefusal refusal = refuse(command)) {
@@ -168,19 +169,20 @@ class TclBody {
 
   ScriptRefusal refuseCommand(const TclCommand& command) const {
     if (const char* lineEnd = findTextOfSeveralLines(command)) {
-      return {kTextOfSeveralLines, lineOf(lineEnd) + 1};
+      return {messages::kScriptTextOfSeveralLines, lineOf(lineEnd) + 1};
     }
     if (!m_isReturnInserted || command.end() <= m_resultStart) {
       return {};
     }
     if (command.begin() < m_resultStart) {
-      return isHarmlessInside(command, m_resultStart) ? ScriptRefusal()
-                                                      : ScriptRefusal{kResultInsideStatement, m_result + 1};
+      return isHarmlessInside(command, m_resultStart)
+                 ? ScriptRefusal()
+                 : ScriptRefusal{messages::kScriptResultInsideStatement, m_result + 1};
     }
     // The inserted "return" takes one value; a second word would become an option, a second command would
     // never be reached.
     const bool isOneValue = command.begin() == m_resultStart && command.wordCount() == 2;
-    return isOneValue ? ScriptRefusal() : ScriptRefusal{kResultNoValue, m_result + 1};
+    return isOneValue ? ScriptRefusal() : ScriptRefusal{messages::kScriptResultNoValue, m_result + 1};
   }
 
   // Within the braces of the procedure, braces in comments and texts count as well.
@@ -189,14 +191,14 @@ class TclBody {
     const QByteArray block = head + m_text + "\n}";
     const TclCommand command(block.constData(), block.size());
     if (!command.isComplete()) {
-      return {kUnbalanced, braceCommentLine()};
+      return {messages::kScriptUnbalanced, braceCommentLine()};
     }
     if (command.end() == block.constData() + block.size() && command.wordCount() == 4) {
       return {};
     }
     // The command reaches over its line end.
     const auto offset = command.end() - 1 - block.constData() - head.size();
-    return {kUnbalanced, lineOf(m_text.constData() + std::max<std::ptrdiff_t>(offset, 0))};
+    return {messages::kScriptUnbalanced, lineOf(m_text.constData() + std::max<std::ptrdiff_t>(offset, 0))};
   }
 
   // The code by itself is complete, so it is a comment that holds the brace; without one, the last line.
@@ -224,7 +226,7 @@ ScriptRefusal refuseTcl(const QString& prefix, const QString& encodedCode) {
   for (int i = 0; i < code.size(); ++i) {
     const QString line = code[i].trimmed();
     if (line.endsWith(QLatin1Char('\\'))) {
-      return {kContinuation, i + 1};
+      return {messages::kScriptContinuation, i + 1};
     }
     if (prefix.isEmpty()) {
       continue;
@@ -234,13 +236,13 @@ ScriptRefusal refuseTcl(const QString& prefix, const QString& encodedCode) {
     for (const ScriptKey& key : redirectedTclKeys(line)) {
       const int start = key.position - kBracedLookup.size();
       if (start >= 0 && line.midRef(start).startsWith(kBracedLookup)) {
-        return {kLookup, i + 1};
+        return {messages::kScriptLookup, i + 1};
       }
     }
   }
   const QStringList written = tclBodyLines(prefix, encodedCode);
   if (exceedsParserDepth(written.join(QLatin1Char('\n')))) {
-    return {kTooManyBrackets, 0};
+    return {messages::kScriptTooManyBrackets, 0};
   }
   return TclBody(written, code).refuse();
 }

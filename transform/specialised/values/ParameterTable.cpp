@@ -3,14 +3,21 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/findings/Refusal.h>
 #include <transform/specialised/values/ParameterTable.h>
 #include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
+
+namespace messages = orx::messages;
 
 namespace {
 
-constexpr long kMissingValueMessage = 370608;
-constexpr long kInRowMessage = 370714;
+const orx::Refusal kMissing{orx::Rule::MissingValue, messages::kMissingValue};
+
+QString rowMessage(int row, const QString& reason) {
+  return TransformResString(messages::kInRow, QStringList{QString::number(row + 1), reason});
+}
 
 }  // namespace
 
@@ -51,12 +58,20 @@ QString ParameterTable::prompt(int index) const {
   return column(index).getDescription();
 }
 
-QString ParameterTable::missingValueMessage(int column) const {
-  return TransformResString(kMissingValueMessage, prompt(column));
+bool ParameterTable::refuseMissing(QString& message, int column) const {
+  return orx::refuse(message, kMissing, {prompt(column)});
 }
 
-QString ParameterTable::rowMessage(int row, const QString& reason) {
-  return TransformResString(kInRowMessage, QStringList{QString::number(row + 1), reason});
+bool ParameterTable::refuseMissing(QString& message, int row, int column) const {
+  refuseMissing(message, column);
+  message = rowMessage(row, message);
+  return false;
+}
+
+bool ParameterTable::refuseRow(QString& message, int row, long reason, const QStringList& arguments) {
+  orx::refuse(message, reason, arguments);
+  message = rowMessage(row, message);
+  return false;
 }
 
 QStringList ParameterTable::attributeNames(const IsUsed& isUsed) const {

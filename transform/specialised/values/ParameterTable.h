@@ -28,10 +28,11 @@ class ParameterTable {
   void setCell(int row, int column, const QString& text);
   QString prompt(int index) const;  // of a column
 
-  // Messages for the user: that a cell of the column needs a value; that the row, counted from 0, is refused
-  // for a reason.
-  QString missingValueMessage(int column) const;
-  static QString rowMessage(int row, const QString& reason);
+  // Refusals, always false: a cell of the column needs a value, in a row counted from 0 or somewhere; a row
+  // is refused for a reason, one of orx::messages.
+  bool refuseMissing(QString& message, int column) const;
+  bool refuseMissing(QString& message, int row, int column) const;
+  static bool refuseRow(QString& message, int row, long reason, const QStringList& arguments = {});
 
   using IsUsed = std::function<bool(int row, int column)>;
   // The attributes that the cells refer to, each once; of those cells alone that are used.

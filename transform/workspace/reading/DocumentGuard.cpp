@@ -1,8 +1,11 @@
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/reading/DocumentGuard.h>
 #include <transform/workspace/reading/DocumentLimits.h>
 #include <transform/workspace/reading/DocumentMessages.h>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 bool DocumentGuard::refuse(const QString& message) {
   m_refusal = message;
@@ -64,12 +67,12 @@ int DocumentGuard::check(const ushort* units, int size) {
       break;
     const ushort unit = units[i];
     if (unit == 0 || (m_replacement != 0 && unit == m_replacement)) {
-      refuse(documentText(document_messages::kUndecodable));
+      refuse(documentText(messages::kUndecodable));
       return i;
     }
     // What ends a value is counted with it.
     if (++m_runLength > limits::kValueLength + 1) {
-      refuse(documentText(document_messages::kValueTooLong, {QString::number(limits::kValueLength)}));
+      refuse(documentText(messages::kValueTooLong, {QString::number(limits::kValueLength)}));
       return i;
     }
     if (!take(unit))
@@ -140,15 +143,15 @@ bool DocumentGuard::takeOpen(ushort unit) {
   m_elementLines.push_back(m_line);
   m_attributes = 0;
   if (++m_depth > limits::kNesting)
-    return refuse(documentText(document_messages::kNestedTooDeep, {QString::number(limits::kNesting)}));
+    return refuse(documentText(messages::kElementsTooDeep, {QString::number(limits::kNesting)}));
   return enter(State::Tag) && takeTag(unit);
 }
 
 bool DocumentGuard::takeTag(ushort unit) {
   if (unit == '"' || unit == '\'') {
     if (++m_attributes > limits::kAttributesPerElement)
-      return refuse(documentText(document_messages::kTooManyAttributes,
-                                 {QString::number(limits::kAttributesPerElement)}));
+      return refuse(
+          documentText(messages::kTooManyAttributes, {QString::number(limits::kAttributesPerElement)}));
     return enter(unit == '"' ? State::DoubleQuoted : State::SingleQuoted);
   }
   if (unit == '>') {
@@ -167,6 +170,6 @@ bool DocumentGuard::takeBang(ushort unit) {
   if (m_bang == QLatin1String("[CDATA["))
     return enter(State::CharacterData);
   if (m_bang.size() >= 7)
-    return refuse(documentText(document_messages::kDocumentType));
+    return refuse(documentText(messages::kDocumentType));
   return true;
 }

@@ -1,13 +1,17 @@
 #include <platform/orxparameter/GUIType.h>
 #include <platform/vtl/SystemEncoding.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 #include <transform/workspace/reading/DocumentLimits.h>
+#include <transform/workspace/reading/DocumentMessages.h>
 #include <transform/workspace/reading/FileLines.h>
 #include <transform/workspace/reading/WorkspaceSplitter.h>
 
 #include <QRegularExpression>
 #include <QTextCodec>
+
+namespace messages = orx::messages;
 
 const char* const WorkspaceSplitter::kStartHeader = "START_HEADER";
 const char* const WorkspaceSplitter::kEndHeader = "END_HEADER";
@@ -17,8 +21,8 @@ namespace {
 
 constexpr int kDeclarationLength = 1024;
 
-[[noreturn]] void fail(const QString& text, const QString& fileName) {
-  throw WorkspaceLoaderException(QStringLiteral("File Error!\n%1: %2").arg(text, fileName));
+[[noreturn]] void fail(long message, const QString& fileName) {
+  throw WorkspaceLoaderException(documentText(message, {fileName}));
 }
 
 bool isValid(const QTextCodec& codec, const QList<QByteArray>& lines) {
@@ -54,7 +58,7 @@ void WorkspaceSplitter::split(QIODevice& input, QIODevice& xml, const QString& f
     decodeHeader(lines);
   }
   if (lines.hasFailed())
-    fail(QStringLiteral("Could not read file"), fileName);
+    fail(messages::kFileNotRead, fileName);
 }
 
 void WorkspaceSplitter::readXml(FileLines& lines, QIODevice& xml, const QString& fileName) {
@@ -65,7 +69,7 @@ void WorkspaceSplitter::readXml(FileLines& lines, QIODevice& xml, const QString&
     if (m_xmlStart.size() < kDeclarationLength)
       m_xmlStart.append(bytes, std::min(size, kDeclarationLength));
     if (xml.write(bytes, size) != size)
-      fail(QStringLiteral("Could not write a temporary copy of the file"), fileName);
+      fail(messages::kNoPlainCopy, fileName);
   };
   while (lines.next()) {
     if (isFirst)
@@ -112,7 +116,7 @@ void WorkspaceSplitter::readHeader(FileLines& lines) {
     QByteArray& line = m_rawHeader.last();
     if (line.size() / lines.unitSize() > limits::kValueLength) {
       throw WorkspaceLoaderException(
-          QStringLiteral("A header line is longer than %1 characters").arg(limits::kValueLength),
+          documentText(messages::kHeaderLineTooLong, {QString::number(limits::kValueLength)}),
           m_firstLine + lines.lineNumber() - 1);
     }
     if (lines.endsLine()) {
