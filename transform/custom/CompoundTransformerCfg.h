@@ -98,7 +98,6 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   void takeParameters();
   void putInputAttributes() const;
   QStringList resolvedAttributes(const QStringList& attributes) const;
-  QStringList propertyLines(const QString& property) const;
   Statements inputCollectors() const;
   Statements outputRenamers() const;
   // One line each.

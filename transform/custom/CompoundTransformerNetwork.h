@@ -162,8 +162,6 @@ class ORX_EXPORT CompoundTransformerNetwork {
   // null when the attributes are nobody's.
   const TransformerCfg* attributeOwner() const { return m_attributeOwner; }
   void setAttributeOwner(const TransformerCfg* owner) { m_attributeOwner = owner; }
-  // What the network sets on inner transformers that have no listener.
-  const InnerTransformerListener& innerListener() const { return *m_innerListener; }
   // What a new instance starts from: made once, shared by all instances, renewed after a change.
   const TransformerCfg& instancePrototype() const;
 

@@ -40,7 +40,6 @@ class ORX_EXPORT WorkspaceFile {
   const QByteArray& encoding() const { return m_encoding; }
   // An encoding that contains ASCII, or UTF-16LE or UTF-16BE; false for a name that is not known.
   bool setEncoding(const QByteArray& name);
-  bool hasHeader() const { return m_hasHeader; }
   const QStringList& headerLines() const { return m_headerLines; }
   // A file whose header lines are set has a header, be it empty.
   void setHeaderLines(const QStringList& lines);

@@ -40,7 +40,6 @@ class CompiledTemplate {
   int slotCount() const { return m_slotNames.size(); }
   // kNoSlot when the token does not occur.
   int slotOf(const QString& name) const { return m_slots.value(name, kNoSlot); }
-  const QStringList& slotNames() const { return m_slotNames; }
   // The lines that hold the token, in order, each once.
   const std::vector<int>& linesOf(int slot) const { return m_linesOf[static_cast<std::size_t>(slot)]; }
 

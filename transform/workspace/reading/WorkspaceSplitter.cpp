@@ -76,8 +76,6 @@ void WorkspaceSplitter::readXml(FileLines& lines, QIODevice& xml, const QString&
       write(lines.byteOrderMark().constData(), lines.byteOrderMark().size());
     int prefix = 0;
     if (lines.startsLine()) {
-      if (m_stopBefore && !isFirst && lines.startsWith(m_stopBefore))
-        return;
       if (lines.matchComment(kStartHeader) > 0) {
         m_firstHeaderLine = m_firstLine + lines.lineNumber();
         return;

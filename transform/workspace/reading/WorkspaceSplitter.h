@@ -22,9 +22,7 @@ class WorkspaceSplitter {
   // `xml`. Both devices are open and belong to the caller. Throws WorkspaceLoaderException when writing or
   // reading fails, or when a header line is longer than any value may be.
   void split(QIODevice& input, QIODevice& xml, const QString& fileName);
-  // Ends the reading in front of a line that begins with this, unless it is the first; counts lines from
-  // `firstLine`.
-  void setStopBefore(const char* lineStart) { m_stopBefore = lineStart; }
+  // Lines are counted from this one.
   void setFirstLine(int line) { m_firstLine = line; }
 
   // Without line ends, decoded: UTF-8 when all are valid UTF-8, otherwise in the encoding that the XML
@@ -43,7 +41,6 @@ class WorkspaceSplitter {
   void readHeader(FileLines& lines);
   void decodeHeader(const FileLines& lines);
 
-  const char* m_stopBefore = nullptr;
   int m_firstLine = 1;
   QByteArray m_xmlStart;  // the beginning of the XML, for its declaration
   QList<QByteArray> m_rawHeader;
