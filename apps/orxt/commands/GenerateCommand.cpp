@@ -84,7 +84,6 @@ bool GenerateCommand::planJobs(std::vector<Job>& jobs, Console& console) const {
 }
 
 ExitStatus GenerateCommand::run(Console& console) {
-  m_definitions.setLanguage();
   std::vector<Job> jobs;
   Setting setting;
   if (!planJobs(jobs, console) || !m_parameters.read(setting.values, console) ||
