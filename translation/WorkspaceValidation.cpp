@@ -265,7 +265,7 @@ void Validation::checkParameterValue(const Workspace& workspace, const GlobalPar
   for (const QString& name : ReferencedNames::inValue(parameter.defaultValue)) {
     if (!isKnown(workspace.parameters, name))
       m_diagnostics.reportParameter(
-          Rule::UnknownReference, parameter.line, document, type.getName(),
+          Rule::UnknownReference, messages::kUnknownReference, parameter.line, document, type.getName(),
           type.getName() + QLatin1String(": ") + m_values.referenceText(name, m_parameterNames));
   }
 }
