@@ -101,7 +101,7 @@ TEST(ExtractCommand, SaysWhatItCannotDo) {
       {{good, kCustom}, 2, "--output"},
       {{good, kCustom, "-o", "-"}, 2, "-o"},
       {{good, kCustom, "-o", "a.ort", "--version", "0"}, 2, "--version"},
-      {{"global.orw", kCustom, "-o", "b.ort"}, 0, "warning: the inside refers to $(SURVEY_YEAR)"},
+      {{"global.orw", kCustom, "-o", "b.ort"}, 0, "warning: The inside refers to $(SURVEY_YEAR)"},
   };
   for (const auto& test : cases) {
     const Outcome run = orxt(QStringList{"extract"} + test.arguments, folder.path());

@@ -117,8 +117,10 @@ bool FormatCommand::mayLose(const WorkspaceDocument& document, const QString& sh
   }
   if (losses.empty() || m_drop)
     return true;
-  console.failFile(shownName, losses.size() == 1 ? messages::kOneLoss : messages::kLosses,
-                   {QString::number(losses.size())});
+  if (losses.size() == 1)
+    console.failFile(shownName, messages::kOneLoss);
+  else
+    console.failFile(shownName, messages::kLosses, {QString::number(losses.size())});
   return false;
 }
 

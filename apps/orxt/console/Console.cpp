@@ -12,6 +12,12 @@ namespace {
 
 constexpr int kLongestMessage = 12000;  // two long paths have room
 
+// Without the message files, under a wrong home, the arguments still tell what is meant.
+QString textOf(long message, const QStringList& arguments) {
+  const QString text = TransformResString(message, arguments);
+  return text.isEmpty() ? arguments.join(QLatin1Char(' ')) : text;
+}
+
 }  // namespace
 
 Console::Console()
@@ -39,11 +45,11 @@ void Console::fail(const QString& text) {
 }
 
 void Console::fail(long message, const QStringList& arguments) {
-  fail(TransformResString(message, arguments));
+  fail(textOf(message, arguments));
 }
 
 void Console::failFile(const QString& file, long message, const QStringList& arguments) {
-  failFile(file, TransformResString(message, arguments));
+  failFile(file, textOf(message, arguments));
 }
 
 void Console::failFile(const QString& file, const QString& reason) {

@@ -96,17 +96,19 @@ void CompanionLint::checkEntry(const CompanionEntry& entry, bool isComplete) {
     }
   }
   if (!isKnown) {
-    add(Rule::UnknownInCompanion,
-        entry.hasVersion ? messages::kNoSuchVersion : messages::kUnknownTransformerName, entry.line,
-        {entry.name, QString::number(entry.version)});
+    if (entry.hasVersion)
+      add(Rule::UnknownInCompanion, messages::kNoSuchVersion, entry.line,
+          {entry.name, QString::number(entry.version)});
+    else
+      add(Rule::UnknownInCompanion, messages::kUnknownTransformerName, entry.line, {entry.name});
   }
 }
 
 void CompanionLint::checkCompleteness(const CompanionEntry& entry, const LintedDefinition& definition) {
-  const auto need = [&](bool isThere, long message, const QString& what = QString()) {
+  const auto need = [&](bool isThere, long message, const QStringList& further = {}) {
     if (!isThere) {
       add(Rule::MissingTranslation, message, entry.line,
-          {entry.name, QString::number(definition.fields().version), what});
+          QStringList{entry.name, QString::number(definition.fields().version)} + further);
     }
   };
   need(!entry.localizedName.isEmpty(), messages::kNameNotTranslated);
@@ -121,7 +123,7 @@ void CompanionLint::checkCompleteness(const CompanionEntry& entry, const LintedD
   }
   for (const LintedParameter& parameter : definition.parameters()) {
     need(parameter.prompt.isEmpty() || translated.contains(parameter.name), messages::kPromptNotTranslated,
-         parameter.name);
+         {parameter.name});
   }
   QSet<QString> describedPorts;
   for (const CompanionEntry::Text& tag : entry.tagDescriptions) {
@@ -129,6 +131,6 @@ void CompanionLint::checkCompleteness(const CompanionEntry& entry, const LintedD
   }
   for (const QString& port : definition.inputs() + definition.outputs()) {
     need(definition.fields().tagDescriptions.value(port).isEmpty() || describedPorts.contains(port),
-         messages::kPortNotTranslated, port);
+         messages::kPortNotTranslated, {port});
   }
 }

@@ -235,9 +235,9 @@ void HeaderLint::checkTagMapping(const QString& token, int line) {
 void HeaderLint::checkTexts() {
   const TransformerDefinition& fields = m_definition.fields();
   const int line = m_definition.nameLine();
-  const auto need = [&](bool isThere, long message, const QString& what = QString()) {
+  const auto need = [&](bool isThere, long message, const QStringList& further = {}) {
     if (!isThere) {
-      add(Rule::MissingText, message, line, {fields.name, what});
+      add(Rule::MissingText, message, line, QStringList(fields.name) + further);
     }
   };
   need(!fields.category.isEmpty(), messages::kNoCategory);
@@ -246,7 +246,7 @@ void HeaderLint::checkTexts() {
   need(!isBlankText(fields.changeLog), messages::kNoChangeLog);
   const QStringList ports = m_definition.inputs() + m_definition.outputs();
   for (const QString& tag : ports) {
-    need(!fields.tagDescriptions.value(tag).isEmpty(), messages::kNoTagDescription, tag);
+    need(!fields.tagDescriptions.value(tag).isEmpty(), messages::kNoTagDescription, {tag});
   }
   if (m_definition.hasOwnClass()) {
     return;

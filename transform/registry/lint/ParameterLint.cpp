@@ -169,11 +169,11 @@ void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType
   if (isUnset || isReference || hasNoValue(type) || value.contains(kMacroOpen)) {
     return;
   }
-  const auto refuse = [&](long message, const QString& what, const QString& remedy = QString()) {
-    add(Rule::BadDefault, message, parameter.defaultLine, {type.getName(), what, remedy});
+  const auto refuse = [&](long message, const QStringList& what) {
+    add(Rule::BadDefault, message, parameter.defaultLine, QStringList(type.getName()) + what);
   };
   if (isMark) {
-    refuse(messages::kDefaultNoReference, value, value.mid(1));
+    refuse(messages::kDefaultNoReference, {value, value.mid(1)});
     return;
   }
   ChoiceList choices(type);
@@ -182,12 +182,12 @@ void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType
   }
   const ValueFit fit = ValueFit::of(type, choices, value);
   if (!fit.fits()) {
-    refuse(messages::kDefaultUnfit, fit.text());
+    refuse(messages::kDefaultUnfit, {fit.text()});
   } else if (type.valueIsEncoded()) {
     // Lists are packed with commas, which are no part of the words.
     for (const QString& word : value.split(QLatin1Char(','))) {
       if (!QORXWwjdIsWellFormed(word)) {
-        refuse(messages::kDefaultNotEncoded, word, QORXWwjdEncode(QORXWwjdDecode(word)));
+        refuse(messages::kDefaultNotEncoded, {word, QORXWwjdEncode(QORXWwjdDecode(word))});
       }
     }
   }
