@@ -254,7 +254,10 @@ void Validation::checkParameterValues(const Workspace& workspace) {
   for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList()) {
     for (const GlobalParameterStruct& parameter : m_reader.GetGlobalParameterList(document)) {
       const GUIType type = GUIType::fromGuiLine(parameter.guiLine);
-      if (scriptLanguage(type) == ScriptLanguage::None)
+      const GlobalParameters::Parameter* own =
+          document.isEmpty() ? workspace.parameters.find(type.getName()) : nullptr;
+      const bool isJudged = own && own->isPublished;  // by checkParameters()
+      if (!isJudged && scriptLanguage(type) == ScriptLanguage::None)
         checkParameterValue(workspace, parameter, type, document);
     }
   }

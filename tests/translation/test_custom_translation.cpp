@@ -294,7 +294,7 @@ TEST(CustomTranslation, WhatALoopIsHandedIsJudged) {
       {"TEXT", "x", "<Unused>", {}, "MAX_LOOP_ITERATIONS: "},
       {"TEXT", "x", "$(ORX_NUMBER)", {}, "MAX_LOOP_ITERATIONS:$(ORX_NUMBER) "},
       {"TEXT", "x", "0", {"unwritable-value L"}, ""},
-      {"TEXT", "x", "4 OUTPUT", {"unwritable-value L"}, ""},
+      {"TEXT", "x", "4 OUTPUT", {"unwritable-value L", "unfit-number L"}, ""},
       {"INSTANCE_MACROS TEXT", "$[Q]", "4", {"unwritable-value L"}, ""},
       {"INSTANCE_MACROS TEXT", "$(ELSEWHERE)", "4", {}, "P,$(ELSEWHERE)"},
       {"TEXT_EDIT_TCL_PARM", "return<space>1", "4", {"unwritable-value L"}, ""},

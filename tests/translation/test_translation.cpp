@@ -221,7 +221,8 @@ TEST(Translation, LookupsInsideCustomTransformersAreJudgedByTheInstances) {
 
 void expectRefused(const SmallWorkspace& workspace, const QStringList& diagnostics) {
   const Outcome outcome = translate(workspace);
-  EXPECT_EQ(outcome.diagnostics.mid(0, diagnostics.size()), diagnostics);
+  for (const QString& diagnostic : diagnostics)
+    EXPECT_TRUE(outcome.diagnostics.contains(diagnostic)) << outcome.diagnostics.join('|').toStdString();
   EXPECT_EQ(outcome.result, TranslationResult::Refused);
   EXPECT_EQ(outcome.text, QString());
 }

@@ -4,6 +4,7 @@
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/ValueFit.h>
 #include <transform/core/ValueReferences.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 
@@ -29,7 +30,7 @@ const QLatin1String kNoProcesses("NO");
 
 // Whether the value is known as it stands.
 bool isPlain(const GUIType& type, const QString& value) {
-  if (isUnsetSetting(value) || value.startsWith(kConditionalPrefix) || value.contains(kMacroOpen) ||
+  if (isUnsetSetting(value) || value.startsWith(kConditionalPrefix) || beginsMacroReference(value) ||
       !valueReferences(value).empty())
     return false;
   const bool isFunction = value.startsWith(QLatin1Char('@')) && value.endsWith(QLatin1Char(')'));

@@ -39,7 +39,8 @@ QString TransformResString(long number, const QStringList& arguments) {
   const QStringList& a = arguments;
   switch (a.size()) {
     case 1:
-      return text.arg(a[0], 0, QLatin1Char(' '));
+      // Qt complains of a text that has no place for it.
+      return text.contains(QLatin1Char('%')) ? text.arg(a[0], 0, QLatin1Char(' ')) : text;
     case 2:
       return text.arg(a[0], a[1]);
     case 3:
