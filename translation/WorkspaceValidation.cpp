@@ -123,10 +123,11 @@ void Validation::checkParameters(Workspace& workspace) {
     lines.emplace_back(parameter.name, parameter.line);
   }
   prompts.setListener(&workspace.listener);
-  // Which files and connections a parameter names is settled when the workspace is run.
+  // Which files and connections a parameter names is settled when the workspace is run; references have their
+  // own check.
   m_values.check(
       {prompts, QString(), ParameterLines(lines), /*knowsWhatArrives=*/false, /*isUsedHere=*/false},
-      [&](const QString& name) { return isKnown(workspace.parameters, name); }, m_parameterNames);
+      [](const QString&) { return true; }, m_parameterNames);
 }
 
 void Validation::checkTransformers(const Workspace& workspace, bool isConnected) {
@@ -254,10 +255,7 @@ void Validation::checkParameterValues(const Workspace& workspace) {
   for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList()) {
     for (const GlobalParameterStruct& parameter : m_reader.GetGlobalParameterList(document)) {
       const GUIType type = GUIType::fromGuiLine(parameter.guiLine);
-      const GlobalParameters::Parameter* own =
-          document.isEmpty() ? workspace.parameters.find(type.getName()) : nullptr;
-      const bool isJudged = own && own->isPublished;  // by checkParameters()
-      if (!isJudged && scriptLanguage(type) == ScriptLanguage::None)
+      if (scriptLanguage(type) == ScriptLanguage::None)
         checkParameterValue(workspace, parameter, type, document);
     }
   }
@@ -265,7 +263,10 @@ void Validation::checkParameterValues(const Workspace& workspace) {
 
 void Validation::checkParameterValue(const Workspace& workspace, const GlobalParameterStruct& parameter,
                                      const GUIType& type, const QString& document) {
-  for (const QString& name : ReferencedNames::inValue(parameter.defaultValue)) {
+  const GlobalParameters::Parameter* known =
+      document.isEmpty() ? workspace.parameters.find(type.getName()) : nullptr;
+  const QString& value = known && known->isOverridden ? known->overridingValue : parameter.defaultValue;
+  for (const QString& name : ReferencedNames::inValue(value)) {
     if (!isKnown(workspace.parameters, name))
       m_diagnostics.reportParameter(
           Rule::UnknownReference, messages::kUnknownReference, parameter.line, document, type.getName(),
