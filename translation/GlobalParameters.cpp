@@ -128,6 +128,8 @@ bool GlobalParameters::isBuiltInParameter(const QString& reference) const {
 }
 
 QString GlobalParameters::resolve(const QString& text) const {
+  if (!text.contains(QLatin1Char('$')))
+    return text;
   QStringList open;
   int budget = kMaximumReplacements;
   return resolve(text, open, budget);

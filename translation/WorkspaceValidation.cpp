@@ -275,6 +275,10 @@ void Validation::checkParameterValue(const Workspace& workspace, const GlobalPar
 }
 
 void Validation::checkParameterUse(const Workspace& workspace) {
+  const std::vector<GlobalParameters::Parameter>& all = workspace.parameters.all();
+  // Who reads them is asked of every record of the document, so not in vain.
+  if (std::all_of(all.begin(), all.end(), [](const auto& parameter) { return parameter.setInHeader; }))
+    return;
   ReferencedNames names;
   collectReferences(names);
   // What the header sets may be read by the engine itself, and what belongs to the server by that.
@@ -283,7 +287,7 @@ void Validation::checkParameterUse(const Workspace& workspace) {
     if (record.isServer)
       readElsewhere.insert(GUIType::fromGuiLine(record.guiLine).getName());
   }
-  for (const GlobalParameters::Parameter& parameter : workspace.parameters.all()) {
+  for (const GlobalParameters::Parameter& parameter : all) {
     if (!parameter.setInHeader && !names.contains(parameter.name) && !readElsewhere.contains(parameter.name))
       m_diagnostics.report(Rule::UnusedParameter, parameter.line, QString(), {parameter.name});
   }
