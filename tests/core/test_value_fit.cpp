@@ -21,7 +21,7 @@ TEST(ValueFit, OnlyPlainValuesAreJudged) {
       {"LOOKUP_LISTBOX \"Deep Blue\",B%Red,R", "B R|\"Deep Blue\" R|Deep Blue|R", "B X|Deep", Misfit::Choice},
       {"CHECKBOX", "YES|NO", "yes|1", Misfit::Choice},
       {"CHECKBOX on%off", "on|off|$(X)", "YES|@Value", Misfit::Choice},
-      {"INT", "0|-12| 7 |+3|99999999999999999999|@Value(n)", "1.0|1e3|--1|-|x|&n|0x10|@Abs(1)",
+      {"INT", "0|-12| 7 |+3|99999999999999999999|@Value(n)", "5$(|$()|1.0|1e3|--1|-|x|&n|0x10|@Abs(1)",
        Misfit::WholeNumber},
       {"INTEGER_OR_ATTR", "@Value(n)|@Abs(1)", "n|&n", Misfit::WholeNumber},
       {"FLOAT_OR_ATTR", "1|-.5|1e-3|2.|$(X)", "&n|1,5|inf|nan|1e999|1 2|n", Misfit::Number},

@@ -30,7 +30,11 @@ const QLatin1String kNoProcesses("NO");
 
 // Whether the value is known as it stands.
 bool isPlain(const GUIType& type, const QString& value) {
-  if (isUnsetSetting(value) || value.startsWith(kConditionalPrefix) || beginsMacroReference(value) ||
+  const std::vector<MacroReference> references = macroReferences(value);
+  // What begins like a reference and is none stands for itself.
+  const bool refers = std::any_of(references.begin(), references.end(),
+                                  [](const MacroReference& reference) { return reference.isClosed; });
+  if (isUnsetSetting(value) || value.startsWith(kConditionalPrefix) || refers ||
       !valueReferences(value).empty())
     return false;
   const bool isFunction = value.startsWith(QLatin1Char('@')) && value.endsWith(QLatin1Char(')'));

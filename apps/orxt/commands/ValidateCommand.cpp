@@ -19,7 +19,7 @@ namespace {
 
 constexpr CommandFacts kFacts = {"validate", "Find everything that is wrong with workspaces",
                                  "orxt validate parcels.orw roads.orw\n"
-                                 "orxt validate --quiet --rule missing-file=warning nightly/*.orw\n"
+                                 "orxt validate --quiet --rule missing-file=error nightly/*.orw\n"
                                  "orxt validate --sarif parcels.orw >parcels.sarif"};
 
 QJsonObject reportJson(const ValidationReport& report) {
