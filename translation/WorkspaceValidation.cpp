@@ -8,9 +8,9 @@
 #include <transform/custom/ScriptParameters.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/GlobalMacros.h>
-#include <transform/text/MFBuffer.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
+#include <transform/text/NullBuffer.h>
 #include <translation/WorkspaceDocument.h>
 #include <translation/WorkspaceValidation.h>
 #include <translation/generation/MappingFileWriter.h>
@@ -293,11 +293,6 @@ void Validation::checkParameterUse(const Workspace& workspace) {
   }
 }
 
-class Nowhere : public MFBuffer {
- public:
-  void write(const QByteArray&) override {}
-};
-
 std::vector<orx::Finding> inDocumentOrder(const orx::Findings& diagnostics) {
   std::vector<orx::Finding> findings = diagnostics.all();
   std::stable_sort(findings.begin(), findings.end(),
@@ -383,7 +378,7 @@ ValidationReport validateWorkspace(const QString& fileName, TransformerSource& s
                                    const QHash<QString, QString>& parameterValues) {
   WorkspaceJudgement judgement(fileName, source, settings, parameterValues);
   if (judgement.allowsWriting()) {
-    Nowhere nowhere;
+    NullBuffer nowhere;
     judgement.write(nowhere);
   }
   return {InputFile::shownName(fileName), judgement.readError(), judgement.findings()};

@@ -28,18 +28,14 @@ using namespace lookup_checks;
 
 const QLatin1String kTclCall("@Tcl2(");
 
-bool isSelfClosed(const QString& text) {
-  return MFBuffer::closesDeferredMacros(text);
-}
-
 }  // namespace
 
 namespace mapping_file_checks {
 
 bool closesDeferredMacros(const ChoiceList& choices, const QStringList& texts) {
-  return std::all_of(texts.cbegin(), texts.cend(), isSelfClosed) &&
+  return std::all_of(texts.cbegin(), texts.cend(), &MFBuffer::closesDeferredMacros) &&
          std::all_of(choices.entries().begin(), choices.entries().end(), [](const auto& entry) {
-           return isSelfClosed(entry.first) && isSelfClosed(entry.second);
+           return MFBuffer::closesDeferredMacros(entry.first) && MFBuffer::closesDeferredMacros(entry.second);
          });
 }
 
