@@ -22,8 +22,14 @@ class RandomRecords {
     using R = typename Table::Record;
     R record;
     for (const AttributeRule<R>& rule : Table::attributes) {
-      if (rule.emission != Emission::Never)
-        visitField(rule, [&](auto field) { fill(record.*field); });
+      if (rule.emission == Emission::Never)
+        continue;
+      std::visit(
+          [&](const auto& field) {
+            if constexpr (std::is_member_pointer_v<std::decay_t<decltype(field)>>)
+              fill(record.*field);
+          },
+          rule.value);
     }
     std::apply([&](const auto&... rule) { (fillList(rule, record), ...); }, Table::children);
     fillSpecial(record);

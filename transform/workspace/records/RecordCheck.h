@@ -5,14 +5,27 @@
 #include <transform/workspace/records/RecordTables.h>
 #include <transform/workspace/records/ValueText.h>
 
+inline const QLatin1String kNotFinite("a number is not finite");
+
 // Why a value cannot be written; empty when it can.
 QString valueRefusal(const QString& value);
 
-// Whether the reader takes what is written of a value that no single field holds.
+template <class T>
+QString valueRefusal(const T& value) {
+  return valuetext::isFinite(value) ? QString() : QString(kNotFinite);
+}
+
+template <class R, class T>
+QString fieldRefusal(T R::*field, const R& record) {
+  return valueRefusal(record.*field);
+}
+// What no single field holds must be taken by the reader as it is written.
 template <class R>
-bool isReadBack(const AttributeRule<R>& rule, const R& record) {
+QString fieldRefusal(const SpecialValue<R>& value, const R& record) {
+  const QString text = value.write(record);
   R read;
-  return rule.read(read, rule.write(record));
+  const QString refusal = valueRefusal(text);
+  return refusal.isEmpty() && !value.read(read, text) ? QString(kNotFinite) : refusal;
 }
 
 template <class Table>
@@ -21,24 +34,8 @@ QString recordRefusal(const typename Table::Record& record) {
   for (const AttributeRule<R>& rule : Table::attributes) {
     if (rule.emission == Emission::Never)
       continue;
-    QString refusal;
-    if (rule.text)
-      refusal = valueRefusal(record.*rule.text);
-    else if (rule.write)
-      refusal = valueRefusal(rule.write(record));
-    bool finite = true;
-    if (rule.real)
-      finite = valuetext::isFinite(record.*rule.real);
-    else if (rule.point)
-      finite = valuetext::isFinite(record.*rule.point);
-    else if (rule.size)
-      finite = valuetext::isFinite(record.*rule.size);
-    else if (rule.rectangle)
-      finite = valuetext::isFinite(record.*rule.rectangle);
-    else if (rule.write && refusal.isEmpty())
-      finite = isReadBack(rule, record);
-    if (!finite)
-      refusal = QStringLiteral("a number is not finite");
+    const QString refusal =
+        std::visit([&](const auto& value) { return fieldRefusal(value, record); }, rule.value);
     if (!refusal.isEmpty())
       return QStringLiteral("%1, attribute %2: %3")
           .arg(Table::element.toQString(), rule.name.toQString(), refusal);

@@ -3,13 +3,8 @@
 
 namespace {
 
-bool same(const QString& left, const QString& right) {
-  return left == right && left.isNull() == right.isNull();
-}
-bool same(bool left, bool right) {
-  return left == right;
-}
-bool same(int left, int right) {
+template <class T>
+bool same(const T& left, const T& right) {
   return left == right;
 }
 // Exact: what is written reads back to the same value.
@@ -28,14 +23,11 @@ bool same(const QRectF& left, const QRectF& right) {
 
 template <class R>
 bool sameAttribute(const AttributeRule<R>& rule, const R& left, const R& right) {
-  if (rule.write)
-    return rule.write(left) == rule.write(right);
   // A text that is missing differs from an empty one only where a document can tell the two apart.
-  if (rule.text && rule.emission != Emission::UnlessNull)
-    return left.*rule.text == right.*rule.text;
-  bool equal = true;
-  visitField(rule, [&](auto field) { equal = same(left.*field, right.*field); });
-  return equal;
+  if (rule.emission == Emission::UnlessNull && rule.text(left)->isNull() != rule.text(right)->isNull())
+    return false;
+  return std::visit([&](const auto& value) { return same(valueOf(value, left), valueOf(value, right)); },
+                    rule.value);
 }
 
 template <class Table>

@@ -66,21 +66,19 @@ class RecordReader {
   // One attribute; false when the text is not well formed and the default stands.
   template <class R>
   static bool readValue(const AttributeRule<R>& rule, R& record, const XMLCh* text) {
-    if (rule.text) {
-      record.*rule.text = fromXml(text);
-      return true;
-    }
-    if (rule.read)
-      return rule.read(record, fromXml(text));
-    bool wellFormed = true;
-    visitField(rule, [&](auto field) {
-      if constexpr (!std::is_same_v<decltype(field), QString R::*>)
-        wellFormed = valuetext::read(QStringView(text), record.*field);
-    });
-    return wellFormed;
+    return std::visit([&](const auto& value) { return readValue(value, record, QStringView(text)); },
+                      rule.value);
   }
 
  private:
+  template <class R, class T>
+  static bool readValue(T R::*field, R& record, QStringView text) {
+    return valuetext::read(text, record.*field);
+  }
+  template <class R>
+  static bool readValue(const SpecialValue<R>& value, R& record, QStringView text) {
+    return value.read(record, text.toString());
+  }
   template <class Table>
   static void readAttributes(const Element& element, typename Table::Record& record) {
     const auto& rules = SortedRules<Table>::get();

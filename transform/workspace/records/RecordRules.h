@@ -11,44 +11,39 @@
 
 #include <array>
 #include <tuple>
+#include <variant>
 
 enum class Emission { Always, UnlessEmpty, UnlessNull, Never };
 
-// One attribute of a record. The default is the field's own initial value. Exactly one of the members is set;
-// `read` and `write` stand for a value that no single field holds, `read` answering whether the text was well
-// formed.
+// A value that no single field holds; `read` answers whether the text was well formed.
+template <class R>
+struct SpecialValue {
+  bool (*read)(R&, const QString&);
+  QString (*write)(const R&);
+};
+
+// One attribute of a record. The default is the field's own initial value.
 template <class R>
 struct AttributeRule {
   Word name;
-  Emission emission = Emission::Always;
-  QString R::*text = nullptr;
-  bool R::*flag = nullptr;
-  int R::*integer = nullptr;
-  double R::*real = nullptr;
-  QPointF R::*point = nullptr;
-  QSizeF R::*size = nullptr;
-  QRectF R::*rectangle = nullptr;
-  bool (*read)(R&, const QString&) = nullptr;
-  QString (*write)(const R&) = nullptr;
+  std::variant<QString R::*, bool R::*, int R::*, double R::*, QPointF R::*, QSizeF R::*, QRectF R::*,
+               SpecialValue<R>>
+      value;
+  Emission emission = Emission::Always;  // only texts can be empty or null
+
+  const QString* text(const R& record) const {
+    const auto* const field = std::get_if<QString R::*>(&value);
+    return field ? &(record.**field) : nullptr;
+  }
 };
 
-// Calls `visit` with the member of the rule that is set; not called for a special rule.
-template <class R, class Visitor>
-void visitField(const AttributeRule<R>& rule, Visitor&& visit) {
-  if (rule.text)
-    visit(rule.text);
-  else if (rule.flag)
-    visit(rule.flag);
-  else if (rule.integer)
-    visit(rule.integer);
-  else if (rule.real)
-    visit(rule.real);
-  else if (rule.point)
-    visit(rule.point);
-  else if (rule.size)
-    visit(rule.size);
-  else if (rule.rectangle)
-    visit(rule.rectangle);
+template <class R, class T>
+const T& valueOf(T R::*field, const R& record) {
+  return record.*field;
+}
+template <class R>
+QString valueOf(const SpecialValue<R>& value, const R& record) {
+  return value.write(record);
 }
 
 // One kind of child element, kept in a list of the record. A wrapped kind stands inside an element of its own
@@ -63,63 +58,14 @@ struct ChildRule {
 
 namespace rules {
 
-template <class R>
-constexpr AttributeRule<R> attribute(Word name, QString R::*field, Emission emission = Emission::Always) {
-  AttributeRule<R> rule{name};
-  rule.emission = emission;
-  rule.text = field;
-  return rule;
-}
-
-template <class R>
-constexpr AttributeRule<R> attribute(Word name, bool R::*field, Emission emission = Emission::Always) {
-  AttributeRule<R> rule{name};
-  rule.emission = emission;
-  rule.flag = field;
-  return rule;
-}
-
-template <class R>
-constexpr AttributeRule<R> attribute(Word name, int R::*field) {
-  AttributeRule<R> rule{name};
-  rule.integer = field;
-  return rule;
-}
-
-template <class R>
-constexpr AttributeRule<R> attribute(Word name, double R::*field) {
-  AttributeRule<R> rule{name};
-  rule.real = field;
-  return rule;
-}
-
-template <class R>
-constexpr AttributeRule<R> attribute(Word name, QPointF R::*field) {
-  AttributeRule<R> rule{name};
-  rule.point = field;
-  return rule;
-}
-
-template <class R>
-constexpr AttributeRule<R> attribute(Word name, QSizeF R::*field) {
-  AttributeRule<R> rule{name};
-  rule.size = field;
-  return rule;
-}
-
-template <class R>
-constexpr AttributeRule<R> attribute(Word name, QRectF R::*field) {
-  AttributeRule<R> rule{name};
-  rule.rectangle = field;
-  return rule;
+template <class R, class T>
+constexpr AttributeRule<R> attribute(Word name, T R::*field, Emission emission = Emission::Always) {
+  return {name, field, emission};
 }
 
 template <class R>
 constexpr AttributeRule<R> special(Word name, bool (*read)(R&, const QString&), QString (*write)(const R&)) {
-  AttributeRule<R> rule{name};
-  rule.read = read;
-  rule.write = write;
-  return rule;
+  return {name, SpecialValue<R>{read, write}};
 }
 
 template <class... Rules>

@@ -10,6 +10,10 @@
 
 namespace valuetext {
 
+inline bool read(QStringView text, QString& value) {
+  value = text.toString();
+  return true;
+}
 bool read(QStringView text, bool& value);
 bool read(QStringView text, int& value);
 // Infinities and "nan" are not well formed.

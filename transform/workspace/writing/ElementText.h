@@ -38,6 +38,11 @@ class ElementText {
   void attributes(const AttributeRule<R>* begin, const AttributeRule<R>* end, const R& record, Layout layout);
   template <class R, class Table>
   void childList(const ChildRule<R, Table>& rule, const R& record);
+  void value(const QString& text) { escaped(text); }
+  template <class T>
+  void value(const T& value) {
+    valuetext::append(m_text, value);
+  }
   void word(const Word& word) { m_text.append(word.chars(), word.size); }
   void escapedSpan(const ushort* begin, const ushort* end);
 
@@ -51,9 +56,9 @@ void ElementText::attributes(const AttributeRule<R>* begin, const AttributeRule<
   for (const AttributeRule<R>* rule = begin; rule != end; ++rule) {
     if (rule->emission == Emission::Never)
       continue;
-    if (rule->emission == Emission::UnlessEmpty && (record.*rule->text).isEmpty())
+    if (rule->emission == Emission::UnlessEmpty && rule->text(record)->isEmpty())
       continue;
-    if (rule->emission == Emission::UnlessNull && (record.*rule->text).isNull())
+    if (rule->emission == Emission::UnlessNull && rule->text(record)->isNull())
       continue;
     if (layout == Layout::Lines)
       m_text += QLatin1String("  ");
@@ -61,15 +66,7 @@ void ElementText::attributes(const AttributeRule<R>* begin, const AttributeRule<
       m_text += QLatin1Char(' ');
     word(rule->name);
     m_text += QLatin1String("=\"");
-    if (rule->text)
-      escaped(record.*rule->text);
-    else if (rule->write)
-      escaped(rule->write(record));
-    else
-      visitField(*rule, [&](auto field) {
-        if constexpr (!std::is_same_v<decltype(field), QString R::*>)
-          valuetext::append(m_text, record.*field);
-      });
+    std::visit([&](const auto& field) { value(valueOf(field, record)); }, rule->value);
     m_text += layout == Layout::Lines ? QLatin1String("\"\n") : QLatin1String("\"");
   }
 }

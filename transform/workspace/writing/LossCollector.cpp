@@ -18,9 +18,8 @@ bool differsFromDefault(const AttributeRule<R>& rule, const XMLCh* text) {
   static const R plain;
   R record;
   RecordReader::readValue(rule, record, text);
-  bool differs = false;
-  visitField(rule, [&](auto field) { differs = record.*field != plain.*field; });
-  return differs;
+  return std::visit([&](const auto& value) { return valueOf(value, record) != valueOf(value, plain); },
+                    rule.value);
 }
 
 }  // namespace
@@ -162,11 +161,12 @@ void LossCollector::record(Place element) {
       lose(Kind::UnknownAttribute);
       return;
     }
+    const auto* const special = std::get_if<SpecialValue<Record>>(&rule->value);
     Record read;
     if (!RecordReader::readValue(*rule, read, attribute.getValue()))
       lose(Kind::MalformedValue);
-    else if (rule->write && rule->write(read) != rule->write(whole))
-      report(Kind::ChangedValue, element, fromXml(attribute.getName()), rule->write(whole));
+    else if (special && special->write(read) != special->write(whole))
+      report(Kind::ChangedValue, element, fromXml(attribute.getName()), special->write(whole));
     else if (rule->emission == Emission::Never && differsFromDefault(*rule, attribute.getValue()))
       lose(Kind::ReadOnlyAttribute);
   });
