@@ -1,6 +1,7 @@
 #include <transform/core/ParameterReferences.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <translation/GlobalParameters.h>
 #include <translation/graph/FlowOrder.h>
@@ -21,6 +22,12 @@ QString referencedName(const QString& reference) {
   return reference.mid(2, reference.size() - 3);
 }
 
+// Deferred references are ordinary ones in what is written.
+QString asWritten(const QString& value) {
+  const bool isDeferred = value.contains(QLatin1String("$[")) && MFBuffer::closesDeferredMacros(value);
+  return isDeferred ? MFBuffer::withOrdinaryMacros(value) : value;
+}
+
 // The first word of a trimmed text, which loses it and the blanks behind it.
 QString takeWord(QString& text) {
   const auto end = std::find_if(text.cbegin(), text.cend(), [](QChar c) { return c.isSpace(); });
@@ -37,9 +44,11 @@ void GlobalParameters::readHeaderLine(const QString& line, int lineNumber) {
   const bool isSetting = keyword == kMacroStatement;
   if (!isSetting && keyword != kDefaultMacroStatement)
     return;
-  const QString name = takeWord(rest);
+  // The engine expands what it knows when it reads the statement.
+  const QString name = resolve(takeWord(rest));
   if (name.isEmpty())
     return;
+  rest = resolve(rest);
   const bool isNew = !m_index.contains(name);
   Parameter& parameter = entry(name);
   // An earlier setting stands against a default.
@@ -55,7 +64,7 @@ void GlobalParameters::declare(const QString& name, const QString& value, int li
   parameter.isPublished = true;
   parameter.promptLine = promptLine;
   if (!parameter.setInHeader) {
-    parameter.value = value;
+    parameter.value = asWritten(value);
     parameter.line = lineNumber;
   }
 }
@@ -64,7 +73,7 @@ bool GlobalParameters::override(const QString& name, const QString& value) {
   if (!m_index.contains(name))
     return false;
   Parameter& parameter = entry(name);
-  parameter.overridingValue = value;
+  parameter.overridingValue = asWritten(value);
   parameter.isOverridden = true;
   return true;
 }
@@ -86,19 +95,23 @@ const GlobalParameters::Parameter* GlobalParameters::find(const QString& name) c
 
 std::vector<std::vector<const GlobalParameters::Parameter*>> GlobalParameters::circles() const {
   std::vector<std::pair<int, int>> edges;
+  int budget = kMaximumReplacements;
   for (std::size_t from = 0; from < m_parameters.size(); ++from) {
     const QString& value = m_parameters[from].currentValue();
     if (!value.contains(QLatin1Char('$')))
       continue;
-    // Deferred references are ordinary ones as soon as they are written.
-    const QString written =
-        MFBuffer::closesDeferredMacros(value) ? MFBuffer::withOrdinaryMacros(value) : value;
-    anyParameterReference(written, [&](const QString& name) {
+    for (const MacroReference& reference : macroReferences(value)) {
+      if (!reference.isClosed || reference.isDeferred)
+        continue;
+      QString name = reference.name(value);
+      if (reference.hasInner) {
+        QStringList open;
+        name = resolve(name, open, budget);
+      }
       const auto to = m_index.constFind(name);
       if (to != m_index.constEnd())
         edges.emplace_back(static_cast<int>(from), to.value());
-      return false;
-    });
+    }
   }
   std::vector<std::vector<const Parameter*>> found;
   for (const std::vector<int>& cycle : flowOrder(static_cast<int>(m_parameters.size()), edges).cycles) {

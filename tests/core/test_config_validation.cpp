@@ -180,6 +180,7 @@ TEST_F(ConfigValidation, FormulasAreReadWhereverTheyStand) {
       {"OPTIONAL EXPRESSION_ENCODED", "<Unused>", true},
       {"INT_OR_ATTR", "@Value(a)+1", true},
       {"INT_OR_ATTR", "@Value(a)+", false},
+      {"INT_OR_ATTR", "@Value(\"c(\")+1", true},
       {"INT_OR_ATTR", "7+", true},  // nothing is computed
       {"TEXT_OR_ATTR", "@Value(a)+", true},
       {"TEXT", "ORX_CONDITIONAL:@Value<leftparenthesis>a<rightparenthesis>=1;x+;", true},

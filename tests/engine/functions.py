@@ -4,7 +4,7 @@ import zlib
 
 from words import Fault, call_end, decode, encode, unquote
 
-TOKEN = re.compile(r'\s*(?:(\d+(?:\.\d+)?|\.\d+)|"((?:[^"]|"")*)"|([A-Za-z_]\w*)|(!=|<=|>=|[=<>+\-*/%(),])|(\S))')
+TOKEN = re.compile(r'\s*(?:((?:\d+(?:\.\d+)?|\.\d+)(?:[eE][-+]?\d+)?)(?!\w)|"((?:[^"]|"")*)"|([A-Za-z_]\w*)|(!=|<=|>=|[=<>+\-*/%(),])|(\S))')
 TYPES = ("STRING", "STRING_ENCODED", "INT", "FLOAT")
 FUNCTIONS = {"abs": abs, "max": max, "min": min, "round": round}
 

@@ -90,11 +90,12 @@ TEST(Values, Expressions) {
     const char* refusal = "";
   };
   for (const Case& c : std::vector<Case>{
-           {" .5 * 2.e-3 + 1E9 "},
+           {" .5e3 * 2.0e-3 + 1E9 "},
+           {"1. + 2", "370701|1. + 2"},
            {"-@Value(a) / (@Value(b) + 2) % 3"},
            {"not @Value(a) = \"x \"\"y\"\" (\" or @Value(b) != 2"},
            {"max(1, min(@Value(a), 2)) >= pi()"},
-           {"sin (1) AND NOT - - +1."},
+           {"sin (1) AND NOT - - +1"},
            {"1 $(P) 2"},
            {"ORX_CONDITIONAL:1=1;2;3"},
            {"ORX_CONDITIONAL:1=1;2;3+", "370702"},

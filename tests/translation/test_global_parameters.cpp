@@ -19,6 +19,10 @@ TEST(GlobalParameters, HeaderLinesSetValues) {
       {"a default does not undo a setting", {"MACRO A x", "DEFAULT_MACRO A y"}, "x", true},
       {"a setting without value", {"MACRO A"}, "", true},
       {"any blanks", {" MACRO\tA \t x y "}, "x y", true},
+      {"known references are expanded when the line is read",
+       {"MACRO N A", "MACRO $(N) x", "MACRO A $(A)y$(B)"},
+       "xy$(B)",
+       true},
       {"another keyword", {"MACROS A x", "# MACRO A x", "INCLUDE A x"}, "", false},
   };
   for (const auto& test : cases) {
@@ -73,6 +77,32 @@ TEST(GlobalParameters, ReferencesResolve) {
   EXPECT_TRUE(parameters.override("A", "two"));
   EXPECT_EQ(parameters.resolve("$(B)"), QString("<two>"));
   EXPECT_FALSE(parameters.override("UNKNOWN", ""));
+}
+
+TEST(GlobalParameters, Circles) {
+  const struct {
+    QStringList values;  // of P0, P1, ...; the first one of the header
+    int members;
+  } cases[] = {
+      {{"a", "$(P0)", "$(P1)$(P0)"}, 0},
+      {{"$(P0)"}, 1},
+      {{"$(P1)", "$(P0)"}, 2},
+      {{"", "x$[P1]"}, 1},
+      {{"", "$($(P2))", "P1"}, 1},
+      {{"$($(P1))", "$(P2)", "P0"}, 1},
+      {{"", "$(P$(P2))", "1", "$($(P4))", "P3"}, 2},
+      {{"", "$($(P2))", "P3", ""}, 0},
+  };
+  for (const auto& c : cases) {
+    GlobalParameters parameters;
+    parameters.readHeaderLine("MACRO P0 " + c.values.first(), 1);
+    for (int i = 1; i < c.values.size(); ++i)
+      parameters.declare(QString("P%1").arg(i), c.values.at(i), 1);
+    std::size_t members = 0;
+    for (const auto& circle : parameters.circles())
+      members += circle.size();
+    EXPECT_EQ(int(members), c.members) << qPrintable(c.values.join(" "));
+  }
 }
 
 TEST(GlobalParameters, ValuesThatMultiplyEachOtherEnd) {

@@ -1,5 +1,6 @@
 #include <transform/core/Formula.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/ValueReferences.h>
 #include <transform/findings/Refusal.h>
 #include <transform/text/MessageNumbers.h>
 
@@ -33,10 +34,11 @@ bool isDigit(QChar c) {
 int numberEnd(const QString& text, int position) {
   int end = skip(text, position, isDigit);
   if (end < text.size() && text.at(end) == QLatin1Char('.')) {
-    end = skip(text, end + 1, isDigit);
-  }
-  if (end == position || (end == position + 1 && text.at(position) == QLatin1Char('.'))) {
-    return -1;
+    const int point = end;
+    end = skip(text, point + 1, isDigit);
+    if (end == point + 1) {
+      return -1;
+    }
   }
   if (end < text.size() && text.at(end).toLower() == QLatin1Char('e')) {
     int digits = end + 1;
@@ -60,18 +62,6 @@ int textEnd(const QString& text, int position) {
       return i + 1;
     }
     ++i;
-  }
-  return -1;
-}
-
-// Behind the bracket that closes the one at `open`.
-int bracketEnd(const QString& text, int open) {
-  int depth = 0;
-  for (int i = open; i < text.size(); ++i) {
-    depth += text.at(i) == QLatin1Char('(') ? 1 : text.at(i) == QLatin1Char(')') ? -1 : 0;
-    if (depth == 0) {
-      return i + 1;
-    }
   }
   return -1;
 }
@@ -126,7 +116,7 @@ bool Formula::take(int& position, bool wantsOperand, Token& token) const {
     return finish(Kind::Text, textEnd(m_text, start));
   }
   if (m_text.midRef(start, kValueReference.size()) == kValueReference) {
-    return finish(Kind::Attribute, bracketEnd(m_text, start + kValueReference.size() - 1));
+    return finish(Kind::Attribute, endOfValueReference(m_text, start));
   }
   if (isDigit(c) || c == QLatin1Char('.')) {
     return finish(Kind::Number, numberEnd(m_text, start));
@@ -214,7 +204,7 @@ QString Formula::withOwnOperators(const QString& text) {
     if (text.at(position) == QLatin1Char('"')) {
       end = textEnd(text, position);
     } else if (text.midRef(position, kValueReference.size()) == kValueReference) {
-      end = bracketEnd(text, position + kValueReference.size() - 1);
+      end = endOfValueReference(text, position);
     }
     if (end < 0) {
       break;

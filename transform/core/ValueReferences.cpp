@@ -114,3 +114,17 @@ bool beginsValueReference(const QString& text) {
   return text.contains(kValueReference) || text.contains(kValueReferenceEncoded) ||
          text.contains(kValueReferenceWord);
 }
+
+int endOfValueReference(const QString& text, int begin) {
+  const int behind = begin + kValueReference.size();
+  const int end = endOfQuotedName(text, behind, Form::Plain);
+  if (end >= 0)
+    return end;
+  int depth = 1;
+  for (int i = behind; i < text.size(); ++i) {
+    depth += text.at(i) == QLatin1Char('(') ? 1 : text.at(i) == QLatin1Char(')') ? -1 : 0;
+    if (depth == 0)
+      return i + 1;
+  }
+  return -1;
+}

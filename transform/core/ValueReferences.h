@@ -27,3 +27,7 @@ ORX_EXPORT bool isValueReference(const QString& text);
 
 // Whether some reference begins in the text, be it closed or not.
 ORX_EXPORT bool beginsValueReference(const QString& text);
+
+// In a decoded text: behind the "@Value(NAME)" that begins at the position, whatever NAME holds; -1 when it
+// is not closed.
+ORX_EXPORT int endOfValueReference(const QString& text, int begin);
