@@ -110,7 +110,7 @@ struct Fault {
 
 const Fault kFaults[] = {
     {"t T Nothing", Rule::UnknownTransformer, "T", "Nothing"},
-    {"use T ", Rule::UnknownTransformer, "T", "SUB_DOC_NAME"},
+    {"use T ", Rule::CustomTransformer, "T", "SUB_DOC_NAME"},
     {"t T Adder;parm T SIZE 3", Rule::UnknownParameter, "T", "SIZE"},
     {"t T Adder;in A;A -> T  NONE", Rule::UnknownInput, "T", "NONE"},
     {"t T Adder;out O;T -> O NONE", Rule::UnknownOutput, "T", "OUT, REST"},

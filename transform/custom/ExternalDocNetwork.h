@@ -8,7 +8,7 @@
 #pragma once
 
 #include <transform/custom/CompoundTransformerNetwork.h>
-#include <transform/findings/Finding.h>
+#include <transform/findings/Findings.h>
 
 #include <vector>
 
@@ -25,7 +25,7 @@ class ORX_EXPORT ExternalDocNetwork : public CompoundTransformerNetwork {
   // rest is built all the same. Neither argument is kept.
   void build(const IXMLComponentReader& reader, const QString& subDocumentName, TransformerSource& source);
   // In the order in which they were found, without the name of a file.
-  const std::vector<orx::Finding>& problems() const { return m_problems; }
+  const std::vector<orx::Finding>& problems() const { return m_problems.all(); }
 
   bool hasTransformerNamed(const QString& identifier) const override;
   IncomingAttributePropogationMode getIncomingAttributePropogationMode() const override;
@@ -48,9 +48,9 @@ class ORX_EXPORT ExternalDocNetwork : public CompoundTransformerNetwork {
   // What a file of its own tells in its header as well.
   void takeRunSettings(const QHash<QString, QString>& settings);
 
-  void addProblem(const orx::Finding& problem) { m_problems.push_back(problem); }
+  void addProblem(const orx::Finding& problem) { m_problems.add(problem); }
   void addProblem(orx::Rule rule, long message, int line, const QString& node, const QString& text);
-  void clearProblems() { m_problems.clear(); }
+  void clearProblems() { m_problems = orx::Findings(QString()); }
 
   void setGUID(const QString& guid) { m_guid = guid; }
   void setDeprecated(bool deprecated) { m_isDeprecated = deprecated; }
@@ -64,7 +64,7 @@ class ORX_EXPORT ExternalDocNetwork : public CompoundTransformerNetwork {
 
   void takeSettings(const QHash<QString, QString>& settings);
 
-  std::vector<orx::Finding> m_problems;
+  orx::Findings m_problems{QString()};
   QSet<QString> m_transformerNames;
   IncomingAttributePropogationMode m_incomingMode = kIncomingDeclared;
   QString m_guid;

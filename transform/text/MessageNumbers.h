@@ -190,7 +190,6 @@ constexpr long kNoFileOfItsOwn = 370842;
 constexpr long kEnciphered = 370843;
 constexpr long kFileChanged = 370844;
 constexpr long kNoBody = 370845;
-constexpr long kNoSubDocumentName = 370846;
 constexpr long kSamePortName = 370847;
 constexpr long kPromptMaxIterations = 370848;
 constexpr long kPromptIterationCount = 370849;

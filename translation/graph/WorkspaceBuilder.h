@@ -2,14 +2,14 @@
 // a diagnostic; the rest is built all the same, so that one run names every fault.
 #pragma once
 
-#include <transform/custom/TransformerPorts.h>
+#include <transform/custom/DocumentBinding.h>
 #include <transform/findings/Findings.h>
 #include <translation/graph/Workspace.h>
 
 #include <QHash>
 
-#include <map>
 #include <memory>
+#include <optional>
 
 class IXMLComponentReader;
 class TransformerSource;
@@ -31,39 +31,21 @@ class WorkspaceBuilder {
                                    const QStringList& headerLines);
 
  private:
-  // What a link may name as its end.
-  struct Place {
-    int node = -1;  // -1: the node is disabled or could not be built, links to it are dropped without a word
-    int line = 0;
-  };
-
   void addGlobalParameters(const IXMLComponentReader& reader);
   void reportRepeatedNames(const IXMLComponentReader& reader);
   void buildUnused(const IXMLComponentReader& reader);
   void addFeatureType(const FeatureTypeStruct& record);
   void addTransformer(const TransformerStruct& record);
-  std::unique_ptr<TransformerCfg> makeTransformer(const TransformerStruct& record, const QString& nodeName);
   void reportCustomTransformers();
-  TransformerPorts applyRecord(const TransformerStruct& record, WorkspaceNode& node);
-  void takeName(const QString& name, int line);
-  bool placeNode(int identifier, int line, const QString& name, int node);
-  // False when the link cannot be placed; `source` and `target` are -1 when it leads to a node that is left
-  // out.
-  bool findEnds(const LinkStruct& record, int& source, int& target);
-  // False when the link is left out.
-  bool addLink(const LinkStruct& record);
-  void noteLeftOut(const LinkStruct& record);
+  void addLink(const LinkStruct& record);
   void addAttributeLink(const LinkStruct& record);
-  // `tag` stays empty for a feature type.
-  bool findPort(int node, const LinkStruct& record, bool isOutput, unsigned number, const QString& name,
-                QString& tag);
+  // Null where the link leads to nothing, or to a node that is left out.
+  WorkspaceNode* nodeAt(int identifier);
 
   TransformerSource& m_source;
   orx::Findings& m_diagnostics;
   const QHash<QString, QString> m_parameterValues;
   bool m_includesUnused = false;
   std::unique_ptr<Workspace> m_workspace;
-  QHash<int, Place> m_places;               // by identifier in the document
-  QHash<QString, int> m_linesByName;        // of transformers
-  std::map<int, TransformerPorts> m_ports;  // by node
+  std::optional<DocumentBinding> m_binding;
 };

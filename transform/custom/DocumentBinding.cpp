@@ -1,0 +1,210 @@
+#include <platform/orxutil/ResourceDirectories.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerSource.h>
+#include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/DocumentBinding.h>
+#include <transform/custom/NestedNetworks.h>
+#include <transform/text/TextHelpers.h>
+#include <transform/workspace/IXMLComponentReader.h>
+#include <transform/workspace/TransformerRecords.h>
+
+using orx::Rule;
+
+DocumentBinding::DocumentBinding(const IXMLComponentReader& reader, TransformerSource& source,
+                                 orx::Findings& findings, const WorkspaceParameterDirectory* parameters,
+                                 TransformerCfgListener* listener)
+    : m_reader(reader),
+      m_source(source),
+      m_findings(findings),
+      m_parameters(parameters),
+      m_listener(listener) {}
+
+// --- nodes -------------------------------------------------------------------------------------------------
+
+bool DocumentBinding::enter(int identifier, const Place& place) {
+  const auto earlier = m_places.constFind(identifier);
+  if (earlier == m_places.constEnd()) {
+    m_places.insert(identifier, place);
+    return true;
+  }
+  m_findings.report(Rule::DuplicateNumber, place.line, place.name,
+                    {QString::number(identifier), QString::number(earlier->line)});
+  return false;
+}
+
+const DocumentBinding::Place* DocumentBinding::find(int identifier) const {
+  const auto at = m_places.constFind(identifier);
+  return at == m_places.constEnd() ? nullptr : &*at;
+}
+
+std::unique_ptr<TransformerCfg> DocumentBinding::enter(const TransformerStruct& record, int node) {
+  Place place;
+  place.node = node;
+  place.line = record.line;
+  place.name = transformerTitle(record);
+  std::unique_ptr<TransformerCfg> cfg;
+  if (record.enabled) {
+    cfg = make(record, place.name);
+    if (cfg) {
+      configure(record, place.name, *cfg);
+      // It may have come out shorter than the record's name; it is what the statements hold.
+      place.name = cfg->getIdentifier();
+      place.ports = TransformerPorts(record, *cfg);
+    }
+    takeName(place.name, record.line);
+  }
+  place.isLeftOut = !cfg;
+  place.cfg = cfg.get();
+  return enter(record.identifier, place) ? std::move(cfg) : nullptr;
+}
+
+void DocumentBinding::takeName(const QString& name, int line) {
+  const auto earlier = m_linesByName.constFind(name);
+  if (earlier != m_linesByName.constEnd())
+    m_findings.report(Rule::DuplicateName, line, name, {name, QString::number(*earlier)});
+  else
+    m_linesByName.insert(name, line);
+}
+
+std::unique_ptr<TransformerCfg> DocumentBinding::make(const TransformerStruct& record, const QString& title) {
+  const bool isCustom = record.kind == TransformerKind::SubDocument;
+  const QString type = isCustom ? subDocumentName(record) : record.type;
+  if (isCustom && type.isEmpty()) {
+    m_findings.report(Rule::CustomTransformer, record.line, title);
+    return nullptr;
+  }
+  std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(type, record.version);
+  if (cfg)
+    return cfg;
+  const QString refusal = m_source.refusalReason();
+  if (!refusal.isEmpty()) {
+    const bool isOfDocument = m_reader.GetSubDocList().contains(type);
+    m_findings.reportText(isOfDocument ? Rule::Nesting : Rule::CustomTransformerFault, record.line, title,
+                          refusal);
+    return nullptr;
+  }
+  const QString version = QString::number(record.version);
+  if (const auto newest = m_source.makeTransformer(type, TransformerSource::kNewestVersion)) {
+    m_findings.report(Rule::UnknownVersion, record.line, title,
+                      {type, version, QString::number(newest->getVersion())});
+  } else {
+    m_findings.report(
+        Rule::UnknownTransformer, record.line, title,
+        {type, version, ORX_resourcePlaces(QStringLiteral("transformer")).join(QLatin1String(", "))});
+  }
+  return nullptr;
+}
+
+void DocumentBinding::configure(const TransformerStruct& record, const QString& title, TransformerCfg& cfg) {
+  if (record.lastParmEdit > 0)
+    cfg.setLastParmEditBuild(record.lastParmEdit);
+  cfg.setIdentifier(title);
+  if (m_parameters)
+    cfg.setParameterDirectory(m_parameters);
+  for (const XformParmStruct& parameter : record.parameters) {
+    const bool isTaken =
+        parameter.parmName == kIdentifierParameter ||
+        (record.kind == TransformerKind::SubDocument && parameter.parmName == kSubDocumentNameParameter);
+    if (!isTaken && !cfg.setParameterValue(parameter.parmName, parameter.parmValue, false)) {
+      m_findings.report(Rule::UnknownParameter, parameter.line, title,
+                        {nameWithFile(cfg), parameter.parmName});
+    }
+  }
+  cfg.autoUpgradeTransformer();
+  if (cfg.isAutoUpgraded())
+    m_findings.report(Rule::Upgraded, record.line, title, {cfg.getName()});
+  if (m_listener)
+    cfg.setListener(m_listener);
+  if (!cfg.dependencyMet())
+    m_findings.report(Rule::UnmetDependency, record.line, title, {cfg.getName(), cfg.dependencyMsg()});
+}
+
+// --- links -------------------------------------------------------------------------------------------------
+
+bool DocumentBinding::findEnds(const LinkStruct& record, const Place*& source, const Place*& target) {
+  source = find(record.sourceNode);
+  target = find(record.targetNode);
+  if (source && target)
+    return record.enabled && !source->isLeftOut && !target->isLeftOut;
+  if (record.enabled) {
+    m_findings.report(Rule::DanglingLink, record.line, QString(),
+                      {QString::number(record.identifier),
+                       QString::number(source ? record.targetNode : record.sourceNode)});
+  }
+  return false;
+}
+
+void DocumentBinding::reportPort(const LinkStruct& record, const Place& place, const QString& description) {
+  m_findings.report(Rule::BadPort, record.line, place.name,
+                    {QString::number(record.identifier), description});
+}
+
+bool DocumentBinding::findPort(const LinkStruct& record, const Place& place, bool isOutput, unsigned number,
+                               const QString& name, QString& tag) {
+  tag = !place.cfg ? place.port
+        : isOutput ? place.ports.output(number, name)
+                   : place.ports.input(number, name);
+  if (!place.cfg || !tag.isNull())
+    return true;
+  // Left where it is, with its ports, because it stands too deep: the nesting is what will be refused.
+  const CompoundTransformerNetwork* inner = networkOf(place.cfg);
+  if (inner && !inner->isBodyLoaded())
+    return false;
+  QStringList tags;
+  if (isOutput)
+    place.cfg->getOutputTags(tags);
+  else
+    place.cfg->getInputTags(tags);
+  m_findings.report(isOutput ? Rule::UnknownOutput : Rule::UnknownInput, record.line, place.name,
+                    {nameWithFile(*place.cfg), name.isEmpty() ? QString::number(number) : name,
+                     tags.join(QLatin1String(", "))});
+  return false;
+}
+
+bool DocumentBinding::readPort(const LinkStruct& record, const Place& place, bool isOutput, QString& tag) {
+  unsigned number = 0;
+  QString name;
+  const QString& description = isOutput ? record.sourcePortDesc : record.targetPortDesc;
+  if (readFeaturePort(description, isOutput, number, name))
+    return findPort(record, place, isOutput, number, name, tag);
+  reportPort(record, place, description);
+  return false;
+}
+
+std::optional<DocumentBinding::Flow> DocumentBinding::flow(const LinkStruct& record) {
+  Flow flow;
+  if (!findEnds(record, flow.source, flow.target))
+    return std::nullopt;
+  if (!flow.source->gives)
+    reportPort(record, *flow.source, record.sourcePortDesc);
+  else if (!flow.target->takes)
+    reportPort(record, *flow.target, record.targetPortDesc);
+  else if (readPort(record, *flow.source, true, flow.output) &&
+           readPort(record, *flow.target, false, flow.input))
+    return flow;
+  return std::nullopt;
+}
+
+std::optional<DocumentBinding::AttributeCopy> DocumentBinding::attributeCopy(const LinkStruct& record) {
+  AttributeCopy copy;
+  const Place* target = nullptr;
+  if (!findEnds(record, copy.source, target))
+    return std::nullopt;
+  unsigned port = 0;
+  const auto readAttribute = [&](const QString& description, bool wantsOutput, QString& attribute) {
+    bool isFeaturePort = false;
+    bool isOutput = false;
+    unsigned ignored = 0;
+    return decodePortDescription(description, isFeaturePort, isOutput, wantsOutput ? port : ignored, ignored,
+                                 attribute) &&
+           !isFeaturePort && isOutput == wantsOutput && !attribute.isEmpty();
+  };
+  if (!copy.source->gives || !readAttribute(record.sourcePortDesc, true, copy.from))
+    reportPort(record, *copy.source, record.sourcePortDesc);
+  else if (!readAttribute(record.targetPortDesc, false, copy.to))
+    reportPort(record, *target, record.targetPortDesc);
+  else if (copy.from != copy.to && findPort(record, *copy.source, true, port, QString(), copy.output))
+    return copy;
+  return std::nullopt;
+}
