@@ -10,33 +10,11 @@
 namespace {
 
 const QLatin1Char kSeparator(',');
-// Lists of lists go no deeper; every level of a name costs a copy of it.
-constexpr int kDeepestList = 16;
 
 bool namesOneAttribute(const GUIType& type) {
   const QString& word = type.getType();
   return (word.startsWith(kAttributeType) || word.startsWith(kNewAttributeType)) &&
          !word.contains(QLatin1String("_LIST"));
-}
-
-// "LIST{12}.NAME" with its indexes taken out.
-QString withoutIndexes(const QString& name) {
-  QString result;
-  result.reserve(name.size());
-  for (int i = 0; i < name.size(); ++i) {
-    result.append(name.at(i));
-    if (name.at(i) != QLatin1Char('{')) {
-      continue;
-    }
-    int end = i + 1;
-    while (end < name.size() && name.at(end).isDigit()) {
-      ++end;
-    }
-    if (end < name.size() && name.at(end) == QLatin1Char('}')) {
-      i = end - 1;
-    }
-  }
-  return result;
 }
 
 }  // namespace
@@ -114,30 +92,4 @@ void AttributeReferences::add(const QString& name, bool mayBeNew) {
   if (!mayBeNew) {
     m_required.insert(name);
   }
-}
-
-void AttributeUnion::add(const QStringList& attributes) {
-  for (const QString& name : attributes) {
-    if (m_known.contains(name)) {
-      continue;
-    }
-    m_known.insert(name);
-    m_names.append(name);
-    int mark = name.indexOf(kListMemberMark);
-    for (int depth = 0; mark >= 0 && depth < kDeepestList; ++depth) {
-      m_lists.insert(name.left(mark + kListMark.size()));
-      mark = name.indexOf(kListMemberMark, mark + 1);
-    }
-  }
-}
-
-bool AttributeUnion::contains(const QString& reference) const {
-  if (m_known.contains(reference) || m_lists.contains(reference)) {
-    return true;
-  }
-  if (!reference.contains(QLatin1Char('{'))) {
-    return false;
-  }
-  const QString name = withoutIndexes(reference);
-  return m_known.contains(name) || m_lists.contains(name);
 }

@@ -41,18 +41,3 @@ class AttributeReferences {
   QSet<QString> m_known;
   QSet<QString> m_required;
 };
-
-// The attributes that reach a transformer by any input, each once, in the order of the inputs.
-class AttributeUnion {
- public:
-  void add(const QStringList& attributes);
-
-  const QStringList& names() const { return m_names; }
-  // A list counts as present when a member is; an element "LIST{3}.NAME" when the list's member is.
-  bool contains(const QString& reference) const;
-
- private:
-  QStringList m_names;
-  QSet<QString> m_known;
-  QSet<QString> m_lists;
-};

@@ -46,7 +46,11 @@ PreservedAttributes PreservedAttributes::parse(const QStringList& tokens) {
 
 bool PreservedAttributes::passes(const QString& attribute, const QString& inputTag,
                                  const QString& outputTag) const {
-  if (everything || outputs.contains(outputTag) || names.contains(attribute)) {
+  return names.contains(attribute) || passesAll(inputTag, outputTag);
+}
+
+bool PreservedAttributes::passesAll(const QString& inputTag, const QString& outputTag) const {
+  if (everything || outputs.contains(outputTag)) {
     return true;
   }
   const auto inputs = inputsOf.constFind(outputTag);

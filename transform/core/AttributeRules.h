@@ -40,6 +40,8 @@ struct ORX_EXPORT PreservedAttributes {
   // Tokens <NONE>, <ALL>, OUT, OUT:IN, =NAME. <NONE> beside others says nothing.
   static PreservedAttributes parse(const QStringList& tokens);
 
+  // Whether all that reaches the input leaves the output, whatever its name.
+  bool passesAll(const QString& inputTag, const QString& outputTag) const;
   bool passes(const QString& attribute, const QString& inputTag, const QString& outputTag) const;
 };
 

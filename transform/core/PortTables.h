@@ -2,6 +2,7 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/core/AttributeSet.h>
 
 #include <QHash>
 #include <QString>
@@ -10,7 +11,7 @@
 struct ORX_EXPORT PortTables {
   QHash<QString, QStringList> inputFeatureTypes;
   QHash<QString, QStringList> inputFilters;
-  QHash<QString, QStringList> inputAttributes;  // changed by TransformerCfg::setInputAttributes() alone
+  QHash<QString, AttributeSet> inputAttributes;  // changed by TransformerCfg::setInputAttributes() alone
   QHash<QString, QString> outputFeatureTypes;
   QHash<QString, QStringList> outputFunctions;
 };

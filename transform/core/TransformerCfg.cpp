@@ -77,8 +77,6 @@ void TransformerCfg::copyValues(const TransformerCfg* other) {
   }
   m_lastParmEditBuild = other->m_lastParmEditBuild;
   deepCopyAttributeInfo(other);
-  // Its order is that of the inputs, which may be others here.
-  m_attributeUnion.reset();
 }
 
 void TransformerCfg::deepCopyParameterInfo(const TransformerCfg* other) {
@@ -87,7 +85,6 @@ void TransformerCfg::deepCopyParameterInfo(const TransformerCfg* other) {
 
 void TransformerCfg::deepCopyAttributeInfo(const TransformerCfg* other) {
   m_ports = other->m_ports;
-  m_attributeUnion = other->m_attributeUnion;
 }
 
 const ConfiguredDefinition& TransformerCfg::configured() const {

@@ -25,11 +25,11 @@
 
 #include <functional>
 #include <memory>
+#include <typeinfo>
 #include <vector>
 
 class AttributePassage;
 class AttributeReferences;
-class AttributeUnion;
 class CompiledTemplate;
 class ConfiguredDefinition;
 class DefinitionDirectory;
@@ -309,6 +309,10 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   void setOutputTagFuncs(const QString& tag, const QStringList& functions);
   QStringList getOutputTagFuncs(const QString& tag) const;
   QHash<QString, QStringList> getInputAttributes() const;
+  // The same as setInputAttributes() and getOutputAttributes(), which are called with lists where the
+  // object's class overrides what becomes of attributes; otherwise without any, at the cost of what changes.
+  void setArrivingAttributes(const QHash<QString, AttributeSet>& attributes);
+  AttributeSet leavingAttributes(const QString& tag) const;
   // By the order of the inputs, each name once.
   QStringList getInputAttributeUnion() const;
   // The attribute names that the parameter's value lists, decoded; none that is only known at run time.
@@ -410,6 +414,8 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   ConfiguredDefinition& detachDefinition();
   void setName(const QString& name);
   void setVersion(int version);
+  // Tells that objects of just this class leave to the base what becomes of attributes.
+  void setPassesByRules(const std::type_info& type) { m_passesByRules = &type; }
 
  private:
   // The type of the values of the name: for a member of a multi-parameter the member's own.
@@ -428,7 +434,11 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   void checkDependencies(ConfiguredDefinition& definition, QTextStream* log);
   QStringList allInputTags() const;
   QStringList attributeTags() const;
-  const AttributeUnion& attributeUnion() const;
+  AttributeSet attributeUnion() const;
+  // Whether a reference to the attribute finds it at an input.
+  bool reaches(const QString& reference) const;
+  bool passesByRules() const { return typeid(*this) == *m_passesByRules; }
+  AttributeSet passedByRules(const QString& outputTag) const;
   const PreservedAttributes& preservedAttributes() const;
   void collectReferences(const QString& parameter, AttributeReferences& references) const;
   // The definition, or an empty one before configure().
@@ -461,11 +471,11 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   QString m_requestedAlias;
   ParameterSet m_parameters;
   PortTables m_ports;
-  mutable std::shared_ptr<const AttributeUnion> m_attributeUnion;  // null until asked for
-  mutable const AttributePassage* m_passage = nullptr;             // while attributes are on their way
-  mutable bool m_isTooLarge = false;                               // since statements were begun
-  mutable bool m_tooltipAsHtml = false;                            // while a tooltip is filled in
-  bool m_tellListener = true;                                      // clear while values are restored
+  const std::type_info* m_passesByRules = &typeid(TransformerCfg);
+  mutable const AttributePassage* m_passage = nullptr;  // while attributes are on their way
+  mutable bool m_isTooLarge = false;                    // since statements were begun
+  mutable bool m_tooltipAsHtml = false;                 // while a tooltip is filled in
+  bool m_tellListener = true;                           // clear while values are restored
   QString m_bannerImageName;
   bool m_showInNavigator = true;
   QStringList m_dynamicParameterNames;

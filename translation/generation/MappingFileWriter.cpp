@@ -185,30 +185,27 @@ void MappingFileWriter::connect() {
 
 void MappingFileWriter::pushAttributes() {
   // What leaves an output is asked once, however many links take it on.
-  std::vector<QHash<QString, QStringList>> leaving(m_workspace.nodes.size());
-  const auto attributesOf = [&](const WorkspaceLink& link) -> const QStringList& {
-    QHash<QString, QStringList>& known = leaving[at(link.source)];
+  std::vector<QHash<QString, AttributeSet>> leaving(m_workspace.nodes.size());
+  const auto attributesOf = [&](const WorkspaceLink& link) -> const AttributeSet& {
+    QHash<QString, AttributeSet>& known = leaving[at(link.source)];
     const auto found = known.constFind(link.output);
     if (found != known.constEnd())
       return found.value();
     const WorkspaceNode& source = m_workspace.nodes[at(link.source)];
-    QStringList attributes =
-        source.isTransformer() ? source.cfg->getOutputAttributes(link.output) : source.attributes;
-    attributes += source.exposed.value(link.output);
-    attributes += m_copies[at(link.source)].value(link.output);
-    attributes.removeDuplicates();
+    AttributeSet attributes =
+        source.isTransformer() ? source.cfg->leavingAttributes(link.output) : AttributeSet(source.attributes);
+    attributes.add(source.exposed.value(link.output));
+    attributes.add(m_copies[at(link.source)].value(link.output));
     return known.insert(link.output, attributes).value();
   };
 
   for (const int target : m_order) {
-    QHash<QString, QStringList> arriving;
+    QHash<QString, AttributeSet> arriving;
     for (const int number : m_incoming[at(target)]) {
       const WorkspaceLink& link = m_workspace.links[at(number)];
-      arriving[link.input] += attributesOf(link);
+      arriving[link.input].add(attributesOf(link));
     }
-    for (QStringList& attributes : arriving)
-      attributes.removeDuplicates();
-    m_workspace.nodes[at(target)].cfg->setInputAttributes(arriving);
+    m_workspace.nodes[at(target)].cfg->setArrivingAttributes(arriving);
   }
 }
 

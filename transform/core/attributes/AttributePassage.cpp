@@ -1,4 +1,5 @@
 #include <transform/core/AttributeRules.h>
+#include <transform/core/AttributeSet.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/attributes/AttributePassage.h>
@@ -94,4 +95,17 @@ void AttributePassage::pass(const QString& attribute, QStringList& result) const
   for (const QString& list : m_collectingLists) {
     result.append(list + attribute);
   }
+}
+
+void AttributePassage::pass(const AttributeSet& attributes, AttributeSet& result) const {
+  if (!m_collectingLists.isEmpty() || !m_explodedLists.isEmpty()) {
+    QStringList passed;
+    for (const QString& attribute : attributes.names())
+      pass(attribute, passed);
+    result.add(passed);
+    return;
+  }
+  const AttributeSet passed =
+      m_preserved.passesAll(m_inputTag, m_outputTag) ? attributes : attributes.only(m_preserved.names);
+  result.add(m_dropsLists ? passed.withoutLists() : passed);
 }

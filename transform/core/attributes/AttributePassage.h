@@ -4,6 +4,7 @@
 #include <QString>
 #include <QStringList>
 
+class AttributeSet;
 struct AttributeRules;
 class ParameterText;
 class TransformerCfg;
@@ -24,6 +25,8 @@ class AttributePassage {
   }
   // Appends what leaves the output for the attribute.
   void pass(const QString& attribute, QStringList& result) const;
+  // Adds what leaves for the attributes of a set: at once where nothing gets another name.
+  void pass(const AttributeSet& attributes, AttributeSet& result) const;
 
  private:
   void apply(const TransformerCfg& cfg, const AttributeRules& rules, const QString& key);

@@ -18,40 +18,32 @@ namespace {
 
 const QLatin1String kPublishedParameterType("PUBLISHED_PARAMETER");
 
-// A few are compared faster than hashed.
-void dropRepeats(QStringList& names) {
-  constexpr int kFew = 8;
-  if (names.size() > kFew) {
-    names.removeDuplicates();
-    return;
-  }
-  for (int at = names.size() - 1; at > 0; --at) {
-    if (names.indexOf(names.at(at)) < at) {
-      names.removeAt(at);
-    }
-  }
-}
-
-QStringList eachOnce(const QStringList& names) {
-  QStringList result = names;
-  dropRepeats(result);
-  return result;
-}
-
 }  // namespace
 
 void TransformerCfg::setInputAttributes(const QString& tag, const QStringList& attributes) {
-  m_ports.inputAttributes.insert(tag, eachOnce(attributes));
-  m_attributeUnion.reset();
+  m_ports.inputAttributes.insert(tag, AttributeSet(attributes));
 }
 
 void TransformerCfg::setInputAttributes(const QHash<QString, QStringList>& attributes) {
-  m_ports.inputAttributes = attributes;
-  m_attributeUnion.reset();
+  m_ports.inputAttributes.clear();
+  for (auto at = attributes.cbegin(); at != attributes.cend(); ++at) {
+    m_ports.inputAttributes.insert(at.key(), AttributeSet(*at));
+  }
 }
 
 QHash<QString, QStringList> TransformerCfg::getInputAttributes() const {
-  return m_ports.inputAttributes;
+  QHash<QString, QStringList> lists;
+  for (auto at = m_ports.inputAttributes.cbegin(); at != m_ports.inputAttributes.cend(); ++at) {
+    lists.insert(at.key(), at->names());
+  }
+  return lists;
+}
+
+void TransformerCfg::setArrivingAttributes(const QHash<QString, AttributeSet>& attributes) {
+  m_ports.inputAttributes = attributes;
+  if (!passesByRules()) {
+    setInputAttributes(getInputAttributes());
+  }
 }
 
 QStringList TransformerCfg::getInputAttributeUnion() const {
@@ -76,16 +68,18 @@ QStringList TransformerCfg::attributeTags() const {
   return tags + others;
 }
 
-const AttributeUnion& TransformerCfg::attributeUnion() const {
-  if (!m_attributeUnion) {
-    auto all = std::make_shared<AttributeUnion>();
-    const QStringList tags = attributeTags();
-    for (const QString& tag : tags) {
-      all->add(m_ports.inputAttributes.value(tag));
-    }
-    m_attributeUnion = std::move(all);
+AttributeSet TransformerCfg::attributeUnion() const {
+  AttributeSet all;
+  const QStringList tags = attributeTags();
+  for (const QString& tag : tags) {
+    all.add(m_ports.inputAttributes.value(tag));
   }
-  return *m_attributeUnion;
+  return all;
+}
+
+bool TransformerCfg::reaches(const QString& reference) const {
+  return std::any_of(m_ports.inputAttributes.begin(), m_ports.inputAttributes.end(),
+                     [&reference](const AttributeSet& attributes) { return attributes.holds(reference); });
 }
 
 const PreservedAttributes& TransformerCfg::preservedAttributes() const {
@@ -96,15 +90,35 @@ void TransformerCfg::updatePreservesAttributes(const QStringList& preserves) {
   m_preserved = std::make_shared<PreservedAttributes>(PreservedAttributes::parse(preserves));
 }
 
+AttributeSet TransformerCfg::passedByRules(const QString& outputTag) const {
+  AttributeSet result;
+  const QStringList inputTags = attributeTags();
+  for (const QString& inputTag : inputTags) {
+    AttributePassage(*this, preservedAttributes(), configured().attributeRules, inputTag, outputTag)
+        .pass(m_ports.inputAttributes.value(inputTag), result);
+  }
+  QStringList added;
+  addAdditionalAttrs(added, outputTag);
+  result.add(added);
+  return result;
+}
+
+AttributeSet TransformerCfg::leavingAttributes(const QString& tag) const {
+  return passesByRules() ? passedByRules(tag) : AttributeSet(getOutputAttributes(tag));
+}
+
 QStringList TransformerCfg::getOutputAttributes(const QString& tag) const {
+  if (passesByRules()) {
+    return passedByRules(tag).names();
+  }
   QStringList result;
   const QStringList inputTags = attributeTags();
   for (const QString& inputTag : inputTags) {
-    QStringList incoming = m_ports.inputAttributes.value(inputTag);
+    QStringList incoming = m_ports.inputAttributes.value(inputTag).names();
     transformAllAttrs(incoming, result, inputTag, tag);
   }
   addAdditionalAttrs(result, tag);
-  dropRepeats(result);
+  result.removeDuplicates();
   return result;
 }
 
@@ -224,18 +238,8 @@ void TransformerCfg::getMissingAttributeReferences(const QString& parameter, QSt
   if (!hasReferences) {
     return;
   }
-  // A few names are found faster than the union is put together.
-  constexpr int kFewNames = 8;
-  const auto arrives = [this](const QString& name) {
-    return std::any_of(m_ports.inputAttributes.begin(), m_ports.inputAttributes.end(),
-                       [&name](const QStringList& attributes) { return attributes.contains(name); });
-  };
-  if (!m_attributeUnion && names.size() <= kFewNames && std::all_of(names.begin(), names.end(), arrives)) {
-    return;
-  }
-  const AttributeUnion& reaching = attributeUnion();
   std::copy_if(names.begin(), names.end(), std::back_inserter(missing),
-               [&reaching](const QString& name) { return !reaching.contains(name); });
+               [this](const QString& name) { return !reaches(name); });
   if (missing.isEmpty()) {
     return;
   }
@@ -269,9 +273,8 @@ void TransformerCfg::getAttributesByType(const QString& type, QStringList& attri
   }
   attributes.removeDuplicates();
   if (onlyInputs) {
-    const AttributeUnion& reaching = attributeUnion();
     attributes.erase(std::remove_if(attributes.begin(), attributes.end(),
-                                    [&](const QString& name) { return !reaching.contains(name); }),
+                                    [this](const QString& name) { return !reaches(name); }),
                      attributes.end());
   }
 }

@@ -95,7 +95,6 @@ void TransformerCfg::configure(const TransformerDefinition& definition, IORXSess
   m_session = session;
   m_definition = own;
   m_preserved.reset();
-  m_attributeUnion.reset();
   m_transformerType = isProductFile(definition.filePath) ? kBuiltIn : kOrdinary;
   addDefinedParameters(own->fields, log);
   addDefaultParms();

@@ -53,7 +53,7 @@ bool TransformerCfg::upgradeTransformer(TransformerCfg* older) {
   m_ports.inputFilters = withRenamedKeys(older->m_ports.inputFilters, inputs);
   m_ports.outputFeatureTypes = withRenamedKeys(older->m_ports.outputFeatureTypes, outputs);
   m_ports.outputFunctions = withRenamedKeys(older->m_ports.outputFunctions, outputs);
-  setInputAttributes(withRenamedKeys(older->m_ports.inputAttributes, inputs));
+  setInputAttributes(withRenamedKeys(older->getInputAttributes(), inputs));
 
   m_baseGuid = older->m_baseGuid;
   m_instantiationCounter = older->m_instantiationCounter;

@@ -118,8 +118,6 @@ bool TransformerCfg::applyParameterValue(const QString& parameter, const QString
       shown->setValue(record->choices().toShown(record->getValue()));
     }
   }
-  // The order of the inputs may hang on a parameter.
-  m_attributeUnion.reset();
   return true;
 }
 

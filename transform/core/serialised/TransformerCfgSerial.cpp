@@ -119,7 +119,7 @@ QString TransformerCfg::serialize() const {
       kInputFiltersKey,
       packTable(m_ports.inputFilters, inputs),
       kInputAttributesKey,
-      packTable(m_ports.inputAttributes, inputs),
+      packTable(getInputAttributes(), inputs),
       kOutputFeatureTypesKey,
       packTable(m_ports.outputFeatureTypes, outputs),
       kOutputFunctionsKey,
