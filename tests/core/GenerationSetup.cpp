@@ -1,5 +1,6 @@
 #include "GenerationSetup.h"
 
+#include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerDefinition.h>
 
 #include <QRegularExpression>
@@ -140,4 +141,12 @@ bool RunTimeListener::isRunTimeValue(const TransformerCfg&, const QString& value
 
 bool RunTimeListener::isDeferredValue(const TransformerCfg&, const QString& value) const {
   return value.contains("$(P");
+}
+
+bool RunTimeListener::expandMacros(const TransformerCfg&, QString& text) const {
+  text = replaceParameterReferences(text, [](const QString& name, QString& value) {
+    value = name.mid(1);
+    return name.size() > 1 && name.startsWith('G');
+  });
+  return true;
 }

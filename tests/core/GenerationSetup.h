@@ -62,4 +62,6 @@ class RunTimeListener : public TransformerCfgListener {
  public:
   bool isRunTimeValue(const TransformerCfg&, const QString& value) const override;
   bool isDeferredValue(const TransformerCfg& cfg, const QString& value) const override;
+  // "$(Gtext)" stands for "text".
+  bool expandMacros(const TransformerCfg& cfg, QString& text) const override;
 };

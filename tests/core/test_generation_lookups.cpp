@@ -288,6 +288,9 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
   const QString members =
       "MULTIPARAMETER " + MemberList::configToken(',', {GUIType::fromGuiLine("GUI TEXT A a"),
                                                         GUIType::fromGuiLine("GUI TEXT B b")});
+  const QString table =
+      "GUI_LINE_TABLE " + MemberList::configToken(';', {GUIType::fromGuiLine("GUI TEXT A a"),
+                                                        GUIType::fromGuiLine("GUI TEXT B b")});
   const Case cases[] = {
       {{"P", "TEXT", "a\nb"}, "K $(P)", kBreaksLine},
       {{"P", "TEXT", "a\nb"}, "K $(Q)", 0},
@@ -324,6 +327,28 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", "TEXT_OR_ATTR", "@Value(a(b)"}, "K $(P)", 0},
       {{"P", "TEXT_ENCODED", "two words"}, "K $(P)", kNotEncoded},
       {{"P", members, "A,\"1 OUTPUT X\",B,y"}, "K $(A)", kKeywordInValue},
+      // Its own token.
+      {{"P", "TEXT", "$(P)"}, "K $(P)", kGrowsWithoutEnd},
+      {{"G", "TEXT", "$(G)"}, "K $(G)", 0},  // there is one around it
+      {{"G", "TEXT", "x$(G)"}, "K $(G)", kGrowsWithoutEnd},
+      {{"G", "TEXT_OR_ATTR", "$(G)@Value(a)"}, "K $(G)", kGrowsWithoutEnd},
+      {{"P", members, "A,$(B),B,$(A)"}, "K $(A)", kGrowsWithoutEnd},
+      {{"P", members, "A,in $(B),B,OUTPUT"}, "K $(A)", kKeywordInValue},
+      {{"P", members, "A,$(B)@Value(a),B,@Value(b)"}, "K $(A)", kReferenceBreaks},
+      {{"P", members, "A,$(B)@Value(a),B,b c"}, "K $(A)", 0},
+      // What the listener knows.
+      {{"P", "TEXT_OR_ATTR", "$(Gabc)@Value(a)"}, "K $(P)", 0},
+      {{"P", "TEXT_OR_ATTR", "$(Ga,b)@Value(a)"}, "K $(P)", kReferenceBreaks},
+      {{"P", "TEXT_OR_ATTR", "$(Ga<space>b)@Value(a)"}, "K $(P)", kReferenceBreaks},
+      {{"P", "TEXT_OR_ATTR_ENCODED", "$(Ga<space>b)@Value<leftparenthesis>a<rightparenthesis>"}, "K $(P)", 0},
+      {{"P", "TEXT_OR_ATTR", "@Value($(Ga\"b))"}, "K $(P)", kReferenceBreaks},
+      {{"P", "TEXT", "ORX_CONDITIONAL:1;$(Ga,b)"}, "K $(P)", kReferenceBreaks},
+      {{"P", "TEXT", "ORX_CONDITIONAL:1;$(Ga;b)"}, "K $(P)", 0},
+      {{"P", "TEXT", "$(Ga,b)"}, "K $(P)", 0},
+      {{"P", "TEXT", "$(G@Value[a])"}, "K $(P)", 0},
+      {{"P", table, "$(Ga,b);x"}, "K $(P)", 0},
+      {{"P", table, "$(Ga;b);x"}, "K $(P)", kReferenceBreaks},
+      {{"P", table, "$(G\"b);x"}, "K $(P)", kReferenceBreaks},
   };
   RunTimeListener listener;
   for (const Case& c : cases) {

@@ -104,7 +104,7 @@ TEST(Tokens, ValuesThatInsertEachOtherWithoutEnd) {
     definition.parameters.append({QString("P%1").arg(i), "TEXT", QString("$(P%1)$(P%1)").arg(i + 1)});
   }
   const auto cfg = makeCfg(definition);
-  EXPECT_EQ(cfg->findUnwritableValues().keys(), QStringList("P0"));
+  EXPECT_TRUE(cfg->findUnwritableValues().contains("P0"));
   TextBuffer buffer;
   EXPECT_FALSE(cfg->instantiate(buffer, QString()));
   EXPECT_EQ(buffer.text(), "");

@@ -5,12 +5,16 @@
 #include <transform/core/FormulaChecks.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformParamCfg.h>
+#include <transform/text/MacroText.h>
 
 namespace {
 
 const QLatin1Char kPartSeparator(';');
 
-void add(QStringList& formulas, const QString& text, bool isEncoded) {
+void add(QStringList& formulas, QString text, bool isEncoded, const ExpandReferences& expand) {
+  if (expand && beginsMacroReference(text)) {
+    expand(text);
+  }
   const QString decoded = isEncoded ? QORXWwjdDecode(text) : text;
   const bool isUnset = decoded.trimmed().isEmpty() || text == kUnusedValue || decoded == kUnusedValue;
   if (!isUnset && !decoded.contains(kMacroOpen) && !decoded.contains(kDeferredOpen)) {
@@ -20,13 +24,13 @@ void add(QStringList& formulas, const QString& text, bool isEncoded) {
 
 }  // namespace
 
-QStringList formulasIn(const GUIType& type, const QString& value) {
+QStringList formulasIn(const GUIType& type, const QString& value, const ExpandReferences& expand) {
   const bool isExpression = type.getType().startsWith(kExpressionType);
   const bool isComputed = isExpression || ExpressionWriter::isComputed(type);
   QStringList formulas;
   if (!value.startsWith(kConditionalPrefix)) {
     if (isExpression || (isComputed && ExpressionWriter::needsWrapping(type, value))) {
-      add(formulas, value, type.valueIsEncoded());
+      add(formulas, value, type.valueIsEncoded(), expand);
     }
     return formulas;
   }
@@ -34,16 +38,17 @@ QStringList formulasIn(const GUIType& type, const QString& value) {
   for (int i = 0; i < parts.size(); ++i) {
     const bool isResult = i % 2 == 1 || i + 1 == parts.size();
     if (isComputed || !isResult) {
-      add(formulas, parts.at(i), true);
+      add(formulas, parts.at(i), true, expand);
     }
   }
   return formulas;
 }
 
-bool checkFormulas(const TransformParamCfg& parameter, const QString& value, QString& message) {
+bool checkFormulas(const TransformParamCfg& parameter, const QString& value, QString& message,
+                   const ExpandReferences& expand) {
   bool isSound = true;
   forEachPart(parameter, value, [&](const GUIType& type, const QString& part) {
-    const QStringList formulas = isSound ? formulasIn(type, part) : QStringList();
+    const QStringList formulas = isSound ? formulasIn(type, part, expand) : QStringList();
     for (const QString& text : formulas) {
       const Formula formula(text);
       isSound = isSound && (formula.isValid() || formula.refuse(message));

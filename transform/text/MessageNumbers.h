@@ -69,6 +69,7 @@ constexpr long kNoQuotedName = 370755;
 constexpr long kNoLoopSetting = 370756;
 constexpr long kNoPrintedName = 370757;
 constexpr long kNoHeaderField = 370758;
+constexpr long kReferenceBreaks = 370759;
 
 // Why a script cannot be written.
 constexpr long kScriptTooManyBrackets = 370729;

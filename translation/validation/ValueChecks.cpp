@@ -1,7 +1,11 @@
 #include <transform/core/FormulaChecks.h>
+#include <transform/core/GenerationKeywords.h>
+#include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerCfgListener.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/findings/Refusal.h>
+#include <transform/text/MFBuffer.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/ParameterLines.h>
@@ -16,7 +20,6 @@ using orx::Severity;
 namespace {
 
 constexpr int kMostMissing = 20;  // named in one finding
-const QLatin1String kInstanceNames("XFORMER_NAME");
 
 }  // namespace
 
@@ -83,7 +86,8 @@ ValueChecks::LooseReferences ValueChecks::looseReferences(const Node& node, cons
         !isCustomTransformer(&node.cfg) || (record && record->getFlag(kGUITypeInstanceMacros));
     QStringList unknown;
     for (const QString& name : ReferencedNames::inValue(value)) {
-      const bool isOwn = name.startsWith(kInstanceNames) || node.cfg.getParameterByMacroName(name);
+      const bool isOwn =
+          name == kIdentifierParameter || name == kEncodedNameToken || node.cfg.getParameterByMacroName(name);
       if (!knows(name) && !(meansOwn && isOwn))
         unknown.append(name);
     }
@@ -99,12 +103,17 @@ bool ValueChecks::standsForReferences(Rule rule) const {
 }
 
 void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names) {
+  const ExpandReferences expand = [&node](QString& value) {
+    value = MFBuffer::withOrdinaryMacros(value);
+    if (node.cfg.listener())
+      node.cfg.listener()->expandMacros(node.cfg, value);
+  };
   for (const QString& parameter : node.cfg.getParameters()) {
     QString text;
     const orx::RefusalListener listener;
     if (node.cfg.validateParameter(parameter, text) &&
-        checkFormulas(*node.cfg.getParameterByMacroName(parameter),
-                      node.cfg.getParameterValue(parameter, UnpackLevel::Resolved), text))
+        checkFormulas(*node.cfg.getParameterByMacroName(parameter), node.cfg.getParameterValue(parameter),
+                      text, expand))
       continue;
     orx::Refusal refusal = listener.refusal();
     if (!node.isUsedHere && (refusal.rule == Rule::MissingFile || refusal.rule == Rule::UnknownConnection))

@@ -16,6 +16,8 @@
 
 namespace {
 
+constexpr int kMostRounds = 64;
+
 QStringList partsOf(const TransformParamCfg& record, const QString& value) {
   return QORXSdfStringToList(value, record.members().separator());
 }
@@ -118,6 +120,18 @@ void ParameterSubstitution::collect(std::size_t position, MFBuffer& buffer) {
   add(name, value, &record, name != kIdentifierParameter && WrittenValues::hasValue(record));
 }
 
+QHash<QString, QString> ParameterSubstitution::byToken() const {
+  QHash<QString, QString> values;
+  for (const Entry& entry : m_entries) {
+    for (const Token& token : entry.tokens) {
+      if (!values.contains(token.name)) {
+        values.insert(token.name, token.value);
+      }
+    }
+  }
+  return values;
+}
+
 void ParameterSubstitution::apply(OrderedSubstitution& lines) const {
   for (std::size_t position = 0; position < m_entries.size(); ++position) {
     if (m_entries[position].removesLines) {
@@ -138,14 +152,22 @@ void ParameterSubstitution::apply(OrderedSubstitution& lines) const {
       }
     }
   }
-  // Once more, and then what the value itself refers to: that may have been substituted before it came in.
-  for (const Token* token : deferred) {
-    lines.substitute(token->name, token->value);
-    TokenScanner scanner(token->value);
-    while (scanner.next()) {
-      const Token* inner = byName.value(scanner.name().toString());
-      if (inner && inner->name != token->name) {
-        lines.substitute(inner->name, inner->value);
+  // Once more, and then what the value itself refers to: that may have been substituted before it came in,
+  // and may in turn refer to what was.
+  bool isLeft = true;
+  for (int round = 0; isLeft && round < kMostRounds; ++round) {
+    isLeft = false;
+    for (const Token* token : deferred) {
+      if (round == 0) {
+        lines.substitute(token->name, token->value);
+      }
+      TokenScanner scanner(token->value);
+      while (scanner.next()) {
+        const Token* inner = byName.value(scanner.name().toString());
+        if (inner && inner->name != token->name && lines.contains(inner->name)) {
+          lines.substitute(inner->name, inner->value);
+          isLeft = true;
+        }
       }
     }
   }

@@ -3,6 +3,7 @@
 
 #include <transform/core/TransformParamCfg.h>
 
+#include <QHash>
 #include <QSet>
 #include <QString>
 #include <QStringList>
@@ -31,6 +32,9 @@ class ParameterSubstitution {
   // Asks for the values, in the order of the parameters; values may write statements into the buffer. With
   // `onlyWritten`, only those are asked for that reach the statements of a template without inserted tokens.
   void collect(MFBuffer& buffer, bool onlyWritten = false);
+
+  // What was collected: of several values of one token the first.
+  QHash<QString, QString> byToken() const;
 
   void apply(OrderedSubstitution& lines) const;
   void apply(TemplateExpansion& expansion, const CompiledTemplate& compiled) const;

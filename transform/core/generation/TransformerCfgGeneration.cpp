@@ -19,6 +19,7 @@
 #include <transform/core/generation/ValueConversion.h>
 #include <transform/core/generation/WrittenValues.h>
 #include <transform/core/validation/MappingFileChecks.h>
+#include <transform/core/validation/OwnTokens.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageNumbers.h>
@@ -461,17 +462,19 @@ void TransformerCfg::writeMultiProcessTransformFact(MFBuffer& buffer, const QStr
 
 QHash<QString, QString> TransformerCfg::findUnwritableValues() const {
   const ParameterSubstitution values(*this, m_parameters.records());
-  const bool inserts = bringsTokens(values);
-  QHash<QString, QString> messages = MappingFileChecks(*this, m_parameters.records(), inserts).find();
-  if (inserts) {
-    NullBuffer buffer;
-    ParameterSubstitution tried(*this, m_parameters.records());
-    QStringList lines;
-    if (!expandInOrder(tried, buffer, lines)) {
-      const QString culprit = values.firstWithTokens();
-      messages.insert(culprit.isEmpty() ? QString(kIdentifierParameter) : culprit,
-                      TransformResString(messages::kGrowsWithoutEnd));
-    }
+  if (!bringsTokens(values)) {
+    return MappingFileChecks(*this, m_parameters.records(), nullptr).find();
+  }
+  NullBuffer buffer;
+  ParameterSubstitution tried(*this, m_parameters.records());
+  QStringList lines;
+  const bool ends = expandInOrder(tried, buffer, lines);
+  const OwnTokens tokens(*this, tried);
+  QHash<QString, QString> messages = MappingFileChecks(*this, m_parameters.records(), &tokens).find();
+  if (!ends) {
+    const QString culprit = values.firstWithTokens();
+    messages.insert(culprit.isEmpty() ? QString(kIdentifierParameter) : culprit,
+                    TransformResString(messages::kGrowsWithoutEnd));
   }
   return messages;
 }

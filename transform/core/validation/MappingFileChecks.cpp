@@ -1,15 +1,18 @@
 #include <platform/qorxcore/Lists.h>
+#include <transform/core/CarriedReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/LookupChecks.h>
+#include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/definition/CompiledTemplate.h>
 #include <transform/core/generation/LookupDecision.h>
 #include <transform/core/generation/LookupWriters.h>
 #include <transform/core/validation/MappingFileChecks.h>
+#include <transform/core/validation/OwnTokens.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
@@ -42,8 +45,8 @@ bool closesDeferredMacros(const ChoiceList& choices, const QStringList& texts) {
 }  // namespace mapping_file_checks
 
 MappingFileChecks::MappingFileChecks(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records,
-                                     bool bringsTokens)
-    : m_cfg(cfg), m_records(records), m_written(cfg, bringsTokens) {}
+                                     const OwnTokens* tokens)
+    : m_cfg(cfg), m_records(records), m_tokens(tokens), m_written(cfg, tokens != nullptr) {}
 
 QHash<QString, QString> MappingFileChecks::find() const {
   QHash<QString, QString> messages;
@@ -65,11 +68,15 @@ long MappingFileChecks::refuse(const TransformParamCfg& record) const {
     return 0;
   }
   NullBuffer buffer;
-  const QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
+  QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
   // Each member and each cell stands in a place of its own.
-  const QStringList parts = record.isMultiParameter() || m_written.isWrittenByRows(record)
-                                ? QORXSdfStringToList(value, record.members().separator())
-                                : QStringList(value);
+  QStringList parts = record.isMultiParameter() || m_written.isWrittenByRows(record)
+                          ? QORXSdfStringToList(value, record.members().separator())
+                          : QStringList(value);
+  const auto insert = [this](QString& part) { return insertTokens(part); };
+  if (!insert(value) || !std::all_of(parts.begin(), parts.end(), insert)) {
+    return messages::kGrowsWithoutEnd;
+  }
   if (!std::all_of(parts.cbegin(), parts.cend(), &TextPlaces::isOneLine)) {
     return messages::kBreaksLine;
   }
@@ -87,6 +94,14 @@ long MappingFileChecks::refuse(const TransformParamCfg& record) const {
     if (const long number = TextPlaces::refuse(TextPlace::Word, value)) {
       return number;
     }
+  }
+  const bool isByRows = m_written.isWrittenByRows(record);
+  const long broken = carried_references::refuse(
+      record, stored,
+      isByRows ? carried_references::TableForm::ByRows : carried_references::TableForm::Packed,
+      [this](QString& text) { return insertTokens(text) && expandMacros(text); });
+  if (broken != 0) {
+    return broken;
   }
   if (record.isMultiParameter()) {
     return refuseMembers(record, stored, parts);
@@ -158,6 +173,21 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
   }
   BoxLookup lookup{value, record.getDescription(), QLatin1Char('x') + record.getName(), identifier,
                    record.getFlag(kGUITypeOptional)};
+  if (kind == LookupKind::RunTime) {
+    // The fragment stands ahead of the lines that tokens are substituted in: there they are macros.
+    const bool isLoose =
+        m_tokens && anyParameterReference(value, [this](const QString& name) {
+          return m_cfg.hasParameter(name) &&
+                 !m_cfg.listener()->isRunTimeValue(m_cfg, kMacroOpen + name + QLatin1Char(')'));
+        });
+    if (isLoose) {
+      return messages::kValueInScript;
+    }
+  } else if (!insertTokens(lookup.value)) {
+    return messages::kGrowsWithoutEnd;
+  } else if (lookup.value != value && lookup.value.contains(QLatin1Char('@'))) {
+    return messages::kValueInScript;
+  }
   for (QString* text : {&lookup.value, &lookup.prompt, &lookup.identifier}) {
     if (!expandMacros(*text)) {
       return messages::kGrowsWithoutEnd;
@@ -180,6 +210,10 @@ long MappingFileChecks::refuseChoices(const ChoiceList& choices) const {
     }
   }
   return 0;
+}
+
+bool MappingFileChecks::insertTokens(QString& text) const {
+  return !m_tokens || !text.contains(kMacroOpen) || m_tokens->carryOut(text);
 }
 
 bool MappingFileChecks::expandMacros(QString& text) const {

@@ -10,6 +10,7 @@
 
 #include <vector>
 
+class OwnTokens;
 class TransformerCfg;
 
 namespace mapping_file_checks {
@@ -21,10 +22,9 @@ bool closesDeferredMacros(const ChoiceList& choices, const QStringList& texts);
 
 class MappingFileChecks {
  public:
-  // Neither is owned; both outlive this object. `bringsTokens` tells that values are inserted into each
-  // other.
+  // None is owned; all outlive this object. `tokens` is null unless values are inserted into each other.
   MappingFileChecks(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records,
-                    bool bringsTokens);
+                    const OwnTokens* tokens);
 
   // Parameter name to the message that says why.
   QHash<QString, QString> find() const;
@@ -38,11 +38,14 @@ class MappingFileChecks {
   long refuseToken(const GUIType& type, const QString& stored, const QString& written) const;
   long refuseMembers(const TransformParamCfg& record, const QString& stored,
                      const QStringList& written) const;
+  // What tokens of the transformer itself bring; false when that has no end.
+  bool insertTokens(QString& text) const;
   // As the engine sees the text when it runs a fragment; false when that has no end.
   bool expandMacros(QString& text) const;
   long refuseChoices(const ChoiceList& choices) const;
 
   const TransformerCfg& m_cfg;
   const std::vector<TransformParamCfg>& m_records;
+  const OwnTokens* const m_tokens;
   const WrittenValues m_written;
 };
