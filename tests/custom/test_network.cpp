@@ -97,7 +97,7 @@ TEST(Network, OrdersAncestors) {
     return list.join(' ');
   };
   EXPECT_EQ(namesOf(ancestors), "O S T B A U");
-  const NetworkOrder order = NetworkSorter(network.nodes().size()).sort(*network.nodeByNumber(0));
+  const NetworkOrder order = NetworkSorter(network.nodes()).sort(*network.nodeByNumber(0));
   EXPECT_EQ(namesOf(order.nodes), "B A S T U O");
   ASSERT_EQ(order.cycles.size(), 1U);
   EXPECT_EQ(order.cycles.front().begin, 2U);
@@ -126,7 +126,7 @@ TEST(Network, OrdersRandomGraphs) {
       const int by = at / count / count, from = at / count % count, to = at % count;
       reaches[from][to] = reaches[from][to] || (reaches[from][by] && reaches[by][to]);
     }
-    const NetworkOrder order = NetworkSorter(network.nodes().size()).sort(*network.nodeByNumber(0));
+    const NetworkOrder order = NetworkSorter(network.nodes()).sort(*network.nodeByNumber(0));
     int places[kMostNodes];
     std::fill_n(places, kMostNodes, -1);
     for (std::size_t i = 0; i < order.nodes.size(); ++i)

@@ -151,7 +151,7 @@ void CompoundTransformerNetwork::ensureOrders() const {
   if (m_ordersValid)
     return;
   m_orders->clear();
-  NetworkSorter sorter(m_nodes.size());
+  NetworkSorter sorter(m_nodes);
   for (const auto& [name, output] : m_outputNodes)
     m_orders->emplace_hint(m_orders->end(), name, sorter.sort(*output));
   m_ordersValid = true;

@@ -1,38 +1,30 @@
+#include <transform/custom/FlowGraph.h>
 #include <translation/graph/FlowOrder.h>
 
 #include <boost/graph/compressed_sparse_row_graph.hpp>
-#include <boost/graph/strong_components.hpp>
 #include <boost/range/iterator_range.hpp>
 #include <queue>
 
 #include <algorithm>
 #include <functional>
+#include <numeric>
 
 namespace {
 
 using Graph = boost::compressed_sparse_row_graph<boost::directedS>;
 
-std::vector<std::vector<int>> findCycles(const Graph& graph, const std::vector<std::pair<int, int>>& edges) {
-  const std::size_t nodeCount = boost::num_vertices(graph);
-  std::vector<int> component(nodeCount);
-  const auto index = boost::get(boost::vertex_index, graph);
-  const int componentCount =
-      boost::strong_components(graph, boost::make_iterator_property_map(component.begin(), index));
-
-  std::vector<std::vector<int>> members(static_cast<std::size_t>(componentCount));
-  for (std::size_t node = 0; node < nodeCount; ++node)
-    members[static_cast<std::size_t>(component[node])].push_back(static_cast<int>(node));
-  std::vector<bool> feedsItself(nodeCount, false);
-  for (const auto& [from, to] : edges) {
-    if (from == to)
-      feedsItself[static_cast<std::size_t>(from)] = true;
-  }
-
+std::vector<std::vector<int>> findCycles(std::size_t nodeCount,
+                                         const std::vector<std::pair<int, int>>& edges) {
+  std::vector<int> nodes(nodeCount);
+  std::iota(nodes.begin(), nodes.end(), 0);
   std::vector<std::vector<int>> cycles;
-  for (std::vector<int>& group : members) {
-    if (group.size() > 1 || feedsItself[static_cast<std::size_t>(group.front())])
-      cycles.push_back(std::move(group));
-  }
+  // They are the same ones whichever way the edges lead.
+  FlowGraph(nodeCount, edges).walk(nodes, [&](const FlowGraph::Group& group) {
+    if (!group.isCycle)
+      return;
+    cycles.emplace_back(group.begin, group.end);
+    std::sort(cycles.back().begin(), cycles.back().end());
+  });
   std::sort(cycles.begin(), cycles.end());
   return cycles;
 }
@@ -67,6 +59,6 @@ FlowOrder flowOrder(int nodeCount, const std::vector<std::pair<int, int>>& edges
     }
   }
   if (static_cast<int>(result.order.size()) != nodeCount)
-    result.cycles = findCycles(graph, edges);
+    result.cycles = findCycles(feeders.size(), edges);
   return result;
 }
