@@ -28,7 +28,7 @@ void Definitions::add(const TransformerDefinition& definition) {
   m_definitions.insert(definition.name, definition);
 }
 
-std::unique_ptr<TransformerCfg> Definitions::makeTransformer(const QString& name, int version) {
+std::unique_ptr<TransformerCfg> Definitions::makeTransformer(const QString& name, int version, QString*) {
   const auto at = m_definitions.constFind(name);
   if (at == m_definitions.constEnd() || (version >= 0 && version != at->version))
     return nullptr;

@@ -29,7 +29,7 @@ std::unique_ptr<TransformerCfg> configured(const TransformerDefinition& definiti
 class Definitions : public TransformerSource {
  public:
   void add(const TransformerDefinition& definition);
-  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override;
+  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version, QString*) override;
 
  private:
   QHash<QString, TransformerDefinition> m_definitions;

@@ -143,7 +143,7 @@ class SmallWorkspace {
 // template that cannot be written).
 class SmallSource : public TransformerSource {
  public:
-  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override {
+  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version, QString*) override {
     TransformerDefinition definition;
     definition.name = name;
     definition.version = 1;

@@ -4,10 +4,6 @@
 
 TransformerSource::~TransformerSource() = default;
 
-QString TransformerSource::refusalReason() const {
-  return QString();
-}
-
 const DefinitionDirectory* TransformerSource::definitionDirectory() const {
   return nullptr;
 }

@@ -19,11 +19,10 @@ class ORX_EXPORT TransformerSource {
   static constexpr int kOldestVersion = -2;
 
   virtual ~TransformerSource();
-  // A new configuration, or null when name or version is unknown.
-  virtual std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) = 0;
-  // Why the last makeTransformer() answered null although the transformer is known: a message for the user.
-  // Empty by default.
-  virtual QString refusalReason() const;
+  // A new configuration, or null when name or version is unknown. When the transformer is known all the same,
+  // `refusal` receives a message for the user that says why; else it stays as it is.
+  virtual std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version,
+                                                          QString* refusal = nullptr) = 0;
   // What the transformers made here are judged by; null when there is nothing to ask. Not owned.
   virtual const DefinitionDirectory* definitionDirectory() const;
 };

@@ -74,10 +74,10 @@ std::unique_ptr<TransformerCfg> DocumentBinding::make(const TransformerStruct& r
     m_findings.report(Rule::CustomTransformer, record.line, title);
     return nullptr;
   }
-  std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(type, record.version);
+  QString refusal;
+  std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(type, record.version, &refusal);
   if (cfg)
     return cfg;
-  const QString refusal = m_source.refusalReason();
   if (!refusal.isEmpty()) {
     const bool isOfDocument = m_reader.GetSubDocList().contains(type);
     m_findings.reportText(isOfDocument ? Rule::Nesting : Rule::CustomTransformerFault, record.line, title,

@@ -32,7 +32,7 @@ void SubDocumentLibrary::forgetReader() {
   m_reader = nullptr;
 }
 
-SubDocumentLibrary::Entry* SubDocumentLibrary::find(const QString& name) {
+SubDocumentLibrary::Entry* SubDocumentLibrary::find(const QString& name, QString* refusal) {
   const std::shared_ptr<Entry> entry = m_entries.value(name);
   if (!entry || entry->isBuilt)
     return entry.get();
@@ -40,7 +40,8 @@ SubDocumentLibrary::Entry* SubDocumentLibrary::find(const QString& name) {
     return nullptr;
   if (m_open.contains(name)) {
     const QStringList way = m_open.mid(m_open.indexOf(name)) << name;
-    m_refusal = TransformResString(messages::kContainsItself, {name, way.join(QLatin1String(" > "))});
+    if (refusal)
+      *refusal = TransformResString(messages::kContainsItself, {name, way.join(QLatin1String(" > "))});
     return nullptr;
   }
   // Bounds the recursion; what is built already is judged by its depth.
@@ -69,34 +70,35 @@ const DefinitionDirectory* SubDocumentLibrary::definitionDirectory() const {
 
 ExternalDocNetwork* SubDocumentLibrary::network(const QString& name) {
   Entry* entry = find(name);
-  m_refusal.clear();
   return entry && entry->isBuilt ? &entry->network : nullptr;
 }
 
-std::unique_ptr<TransformerCfg> SubDocumentLibrary::makeTransformer(const QString& name, int version) {
-  m_refusal.clear();
+std::unique_ptr<TransformerCfg> SubDocumentLibrary::makeTransformer(const QString& name, int version,
+                                                                    QString* refusal) {
   if (!m_entries.contains(name)) {
     if (!m_others)
       return nullptr;
-    std::unique_ptr<TransformerCfg> cfg = m_others->makeTransformer(name, version);
+    std::unique_ptr<TransformerCfg> cfg = m_others->makeTransformer(name, version, refusal);
     const auto* linked = dynamic_cast<const ExternalTransformerNetwork*>(networkOf(cfg.get()));
     // Statements bear the name that the definition's file has, whatever language the name is shown in.
     if (linked && cfg->getLocalizedName() != cfg->getName())
       cfg->setLocalizedName(QString());
-    m_refusal = linked ? linked->bodyFault() : cfg ? QString() : m_others->refusalReason();
-    return m_refusal.isEmpty() ? std::move(cfg) : nullptr;
+    const QString fault = linked ? linked->bodyFault() : QString();
+    if (refusal && !fault.isEmpty())
+      *refusal = fault;
+    return fault.isEmpty() ? std::move(cfg) : nullptr;
   }
-  Entry* entry = find(name);
+  Entry* entry = find(name, refusal);
   if (!entry)
     return nullptr;
   const int depth = m_open.size() + entry->depth;
   if (!entry->isBuilt || depth > CompoundTransformerNetwork::kDeepestNesting) {
-    m_refusal = TransformResString(messages::kNestedTooDeep,
-                                   {m_open.isEmpty() ? name : m_open.first(),
-                                    QString::number(CompoundTransformerNetwork::kDeepestNesting)});
+    if (refusal)
+      *refusal = TransformResString(messages::kNestedTooDeep,
+                                    {m_open.isEmpty() ? name : m_open.first(),
+                                     QString::number(CompoundTransformerNetwork::kDeepestNesting)});
     return nullptr;
   }
-  m_refusal.clear();
   if (!m_open.isEmpty()) {
     Entry& outer = *m_entries.value(m_open.last());
     outer.depth = std::max(outer.depth, entry->depth + 1);

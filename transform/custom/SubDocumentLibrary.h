@@ -26,8 +26,8 @@ class ORX_EXPORT SubDocumentLibrary : public TransformerSource {
   SubDocumentLibrary& operator=(const SubDocumentLibrary&) = delete;
 
   // The document's own custom transformers answer to any version.
-  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override;
-  QString refusalReason() const override { return m_refusal; }
+  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version,
+                                                  QString* refusal = nullptr) override;
   const DefinitionDirectory* definitionDirectory() const override;
 
   bool holds(const QString& name) const { return m_entries.contains(name); }
@@ -43,12 +43,11 @@ class ORX_EXPORT SubDocumentLibrary : public TransformerSource {
 
  private:
   struct Entry;
-  Entry* find(const QString& name);
+  Entry* find(const QString& name, QString* refusal = nullptr);
 
   const IXMLComponentReader* m_reader;
   TransformerSource* m_others;
   QHash<QString, std::shared_ptr<Entry>> m_entries;
   std::vector<ExternalDocNetwork*> m_inOrder;
   QStringList m_open;  // being built, outermost first
-  QString m_refusal;
 };

@@ -77,7 +77,6 @@ void TransformerMgr::reset() {
   m_errors.clear();
   m_ignored.clear();
   m_notedRefusals.clear();
-  m_refusal.clear();
   *m_exceptions = ExceptionList();
   *m_connections = NamedConnections();
   m_members.clear();
@@ -151,7 +150,8 @@ void TransformerMgr::noteIgnored(const IgnoredTransformer& ignored) {
 
 void TransformerMgr::loadOnDemand(const QString& name, int version) {
   const QString path = m_customFiles->fileOf(name);
-  if (path.isEmpty() || version == NEWEST_VERSION)
+  const CatalogueEntry* known = m_prototypes->find(name, version);
+  if (path.isEmpty() || version == NEWEST_VERSION || (known && version != OLDEST_VERSION))
     return;
   if (version != OLDEST_VERSION) {
     loadCustomTransformer(path, version, false);
@@ -159,11 +159,10 @@ void TransformerMgr::loadOnDemand(const QString& name, int version) {
       loadCustomTransformer(path, 1, false);
     return;
   }
-  const CatalogueEntry* oldest = m_prototypes->oldest(name);
   for (const int older : m_customFiles->versionsOf(name)) {
     if (older < 0)
       continue;
-    if (oldest && older >= oldest->version())
+    if (known && older >= known->version())
       return;
     loadCustomTransformer(path, older, false);
     if (m_prototypes->find(name, older))
@@ -172,7 +171,7 @@ void TransformerMgr::loadOnDemand(const QString& name, int version) {
 }
 
 void TransformerMgr::getDefinitionFileName(const IORXString& name, IORXString& fileName) const {
-  const CatalogueEntry* newest = m_prototypes->newest(ORXToQString(name));
+  const CatalogueEntry* newest = m_prototypes->find(ORXToQString(name), NEWEST_VERSION);
   ORXAssign(fileName, newest ? newest->fileName() : QString());
 }
 
@@ -180,14 +179,8 @@ ITransformerCfg* TransformerMgr::getTransformer(const IORXString& name, int vers
   return getTransformer(ORXToQString(name), version);
 }
 
-const CatalogueEntry* TransformerMgr::findEntry(const QString& name, int version) const {
-  return version == NEWEST_VERSION   ? m_prototypes->newest(name)
-         : version == OLDEST_VERSION ? m_prototypes->oldest(name)
-                                     : m_prototypes->find(name, version);
-}
-
 std::unique_ptr<TransformerCfg> TransformerMgr::copyOf(const QString& name, int version) const {
-  const CatalogueEntry* entry = findEntry(name, version);
+  const CatalogueEntry* entry = m_prototypes->find(name, version);
   if (!entry && version == 0 && !m_customFiles->fileOf(name).isEmpty())
     entry = m_prototypes->find(name, 1);  // the first version of a custom transformer is called either way
   if (!entry)
@@ -197,33 +190,23 @@ std::unique_ptr<TransformerCfg> TransformerMgr::copyOf(const QString& name, int 
   return copy;
 }
 
-QString TransformerMgr::refusalReason() const {
-  return m_refusal;
-}
-
-std::unique_ptr<TransformerCfg> TransformerMgr::makeTransformer(const QString& name, int version) {
-  m_refusal.clear();
-  if (version == OLDEST_VERSION || !findEntry(name, version))
-    loadOnDemand(name, version);
-  std::unique_ptr<TransformerCfg> copy = copyOf(name, version);
-  // An alias may lead to another alias; a circle of them leads nowhere.
-  QSet<QString> followed;
-  for (QString alias = name; !copy && m_prototypes->isAlias(alias) && !followed.contains(alias);) {
-    followed.insert(alias);
-    alias = m_prototypes->nameOfAlias(alias);
-    if (version == OLDEST_VERSION || !findEntry(alias, version))
-      loadOnDemand(alias, version);
-    copy = copyOf(alias, version);
-    if (copy)
+std::unique_ptr<TransformerCfg> TransformerMgr::makeTransformer(const QString& name, int version,
+                                                                QString* refusal) {
+  std::unique_ptr<TransformerCfg> copy;
+  m_prototypes->followAliases(name, [&](const QString& asked) {
+    loadOnDemand(asked, version);
+    copy = copyOf(asked, version);
+    if (copy && asked != name)
       copy->setRequestedAlias(name);
-  }
-  if (!copy) {
+    return copy != nullptr;
+  });
+  if (!copy && refusal) {
     const auto refused =
         std::find_if(m_ignored.begin(), m_ignored.end(), [&](const IgnoredTransformer& ignored) {
           return !ignored.isDuplicate && concerns(ignored, name, version);
         });
     if (refused != m_ignored.end())
-      m_refusal = refused->reason();
+      *refusal = refused->reason();
   }
   return copy;
 }
@@ -233,21 +216,13 @@ TransformerCfg* TransformerMgr::getTransformer(const QString& name, int version)
 }
 
 bool TransformerMgr::transformerExists(const QString& name, int version) const {
-  QSet<QString> followed;
-  for (QString asked = name;; asked = m_prototypes->nameOfAlias(asked)) {
-    if (isAnyVersion(version) ? m_prototypes->contains(asked)
-                              : m_prototypes->find(asked, version) != nullptr) {
-      return true;
-    }
-    if (followed.contains(asked) || !m_prototypes->isAlias(asked)) {
-      return false;
-    }
-    followed.insert(asked);
-  }
+  return m_prototypes->followAliases(name, [&](const QString& asked) {
+    return m_prototypes->find(asked, isAnyVersion(version) ? NEWEST_VERSION : version) != nullptr;
+  });
 }
 
 int TransformerMgr::currentTransformerVersion(const QString& name) const {
-  const CatalogueEntry* newest = m_prototypes->newest(name);
+  const CatalogueEntry* newest = m_prototypes->find(name, NEWEST_VERSION);
   return newest ? newest->version() : -1;
 }
 

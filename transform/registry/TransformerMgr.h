@@ -127,10 +127,9 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   QString parameterNotSetDisplayString() const;
 
   // What the lower floors ask.
-  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version) override;
-  // That the custom transformer's file was saved by a newer build, when that is why the last one asked for is
-  // not here.
-  QString refusalReason() const override;
+  // Refused is a custom transformer whose file was saved by a newer build.
+  std::unique_ptr<TransformerCfg> makeTransformer(const QString& name, int version,
+                                                  QString* refusal = nullptr) override;
   bool isConnectionKnown(const QString& encodedName) const override;
   const MemberList* memberDefinitions(const GUIType& type) const override;
   const DefinitionDirectory* definitionDirectory() const override { return this; }
@@ -147,8 +146,6 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   void noteIgnored(const IgnoredTransformer& ignored);
   // Reads a further version of a custom transformer whose file is known.
   void loadOnDemand(const QString& name, int version);
-  // Null when there is none; aliases are not followed.
-  const CatalogueEntry* findEntry(const QString& name, int version) const;
   std::unique_ptr<TransformerCfg> copyOf(const QString& name, int version) const;
   void addChanges(std::vector<VersionChanges>& changes, const QString& name, qint64 first, int last) const;
 
@@ -160,7 +157,6 @@ class ORX_EXPORT TransformerMgr : public ITransformerMgr,
   bool m_loaded = false;
   std::list<IgnoredTransformer> m_ignored;
   QSet<QStringList> m_notedRefusals;
-  QString m_refusal;
   std::unique_ptr<ExceptionList> m_exceptions;
   std::unique_ptr<NamedConnections> m_connections;
   mutable QHash<QString, std::shared_ptr<const MemberList>> m_members;  // by configuration, as asked for

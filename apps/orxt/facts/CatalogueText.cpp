@@ -67,12 +67,10 @@ QString orNearest(const QString& name, const QStringList& candidates, const QStr
 
 std::unique_ptr<TransformerCfg> findTransformer(TransformerMgr& registry, const QString& name, int version,
                                                 QString& error) {
-  std::unique_ptr<TransformerCfg> found(registry.getTransformer(name, version));
-  if (found)
+  error.clear();
+  std::unique_ptr<TransformerCfg> found = registry.makeTransformer(name, version, &error);
+  if (found || !error.isEmpty())
     return found;
-  error = registry.refusalReason();
-  if (!error.isEmpty())
-    return nullptr;
   const std::unique_ptr<TransformerCfg> newest(
       registry.getTransformer(name, ITransformerMgr::NEWEST_VERSION));
   if (newest) {

@@ -1,3 +1,4 @@
+#include <transform/core/TransformerSource.h>
 #include <transform/registry/catalogue/PrototypeTable.h>
 #include <transform/registry/loading/CompanionFileParser.h>
 
@@ -53,27 +54,30 @@ void PrototypeTable::localize(const std::shared_ptr<const CompanionEntry>& compa
   }
 }
 
-const CatalogueEntry* PrototypeTable::newest(const QString& name) const {
-  const Versions* all = versions(name);
-  return all ? &all->rbegin()->second : nullptr;
-}
-
-const CatalogueEntry* PrototypeTable::oldest(const QString& name) const {
-  const Versions* all = versions(name);
-  if (!all) {
-    return nullptr;
-  }
-  const auto lowest = all->lower_bound(0);
-  return lowest == all->end() ? nullptr : &lowest->second;
-}
-
 const CatalogueEntry* PrototypeTable::find(const QString& name, int version) const {
   const Versions* all = versions(name);
   if (!all) {
     return nullptr;
   }
-  const auto found = all->find(version);
+  const auto found = version == TransformerSource::kNewestVersion   ? std::prev(all->end())
+                     : version == TransformerSource::kOldestVersion ? all->lower_bound(0)
+                                                                    : all->find(version);
   return found == all->end() ? nullptr : &found->second;
+}
+
+bool PrototypeTable::followAliases(const QString& name,
+                                   const std::function<bool(const QString&)>& isFound) const {
+  QSet<QString> followed;
+  for (QString asked = name; !followed.contains(asked); asked = nameOfAlias(asked)) {
+    if (isFound(asked)) {
+      return true;
+    }
+    if (!isAlias(asked)) {
+      return false;
+    }
+    followed.insert(asked);
+  }
+  return false;
 }
 
 const PrototypeTable::Versions* PrototypeTable::versions(const QString& name) const {

@@ -9,6 +9,7 @@
 #include <QString>
 #include <QStringList>
 
+#include <functional>
 #include <map>
 #include <memory>
 #include <unordered_map>
@@ -33,14 +34,11 @@ class PrototypeTable {
   // Puts a companion's texts in the place of those of the transformers that it speaks of.
   void localize(const std::shared_ptr<const CompanionEntry>& companion);
 
-  // Null when there is none. Owned by the table.
-  const CatalogueEntry* newest(const QString& name) const;
-  // The lowest version from 0 up.
-  const CatalogueEntry* oldest(const QString& name) const;
+  // Null when there is none; owned by the table. The newest version is the highest, the oldest the lowest
+  // from 0 up.
   const CatalogueEntry* find(const QString& name, int version) const;
   // From the lowest version up; null for an unknown name.
   const Versions* versions(const QString& name) const;
-  bool contains(const QString& name) const { return versions(name) != nullptr; }
 
   const QStringList& names() const { return m_names; }
   // Those that were visible when they first came.
@@ -55,6 +53,8 @@ class PrototypeTable {
   bool isAlias(const QString& alias) const { return m_aliases.contains(alias); }
   // Empty when it is none.
   QString nameOfAlias(const QString& alias) const { return m_aliases.value(alias); }
+  // Whether `isFound` holds for the name, or for one that its alias leads to. A circle of them leads nowhere.
+  bool followAliases(const QString& name, const std::function<bool(const QString&)>& isFound) const;
   // Of an alias that is no visible transformer's own name, whether its transformer is visible.
   bool isVisibleAlias(const QString& alias) const;
   // Those of visible transformers, sorted.

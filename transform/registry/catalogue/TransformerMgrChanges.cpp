@@ -21,7 +21,7 @@ QString TransformerMgr::changeLog(TransformerCfg* configuration) const {
   }
   const bool isReplaced = !configuration->isVisible() && !configuration->replacedBy().isEmpty();
   const QString target = isReplaced ? configuration->replacedBy() : configuration->getName();
-  const CatalogueEntry* newest = m_prototypes->newest(target);
+  const CatalogueEntry* newest = m_prototypes->find(target, NEWEST_VERSION);
   if (!newest) {
     return QString();
   }
@@ -69,7 +69,7 @@ std::vector<TransformerMgr::VersionChanges> TransformerMgr::changes(const QStrin
 QStringList TransformerMgr::changeLog(const QString& name, int fromVersion, const QString& newName,
                                       int toVersion) const {
   const auto shownName = [this](const QString& asked) {
-    const CatalogueEntry* newest = m_prototypes->newest(asked);
+    const CatalogueEntry* newest = m_prototypes->find(asked, NEWEST_VERSION);
     return newest ? newest->prototype().getLocalizedName() : asked;
   };
   const QString lastText =
@@ -86,7 +86,7 @@ QStringList TransformerMgr::changeLog(const QString& name, int fromVersion, cons
                     version.entries);
   }
   if (page.isEmpty()) {
-    page.addText(m_prototypes->newest(newName)
+    page.addText(m_prototypes->find(newName, NEWEST_VERSION)
                      ? TransformResString(messages::kNoChanges)
                      : TransformResString(messages::kUnknownTransformerName, newName));
   }
