@@ -1,4 +1,4 @@
-// Everything but the mapping file, which is written in CompoundMappingFile.cpp.
+// Everything but the mapping file, which is written in CompoundTransformerCfgGeneration.cpp.
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/custom/CompoundTransformerCfg.h>

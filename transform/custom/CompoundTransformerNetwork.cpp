@@ -1,4 +1,4 @@
-// Building, editing and listeners; the answers stand in NetworkAnswers.cpp and NetworkAttributes.cpp.
+// Building, editing and listeners; the answers stand in the files beginning with its name.
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/CompoundTransformerNetworkListener.h>

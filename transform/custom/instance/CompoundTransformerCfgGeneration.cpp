@@ -26,8 +26,19 @@ namespace {
 
 const QLatin1String kSetterAttributeType("STRING_OR_ATTR_ENCODED");
 
-QString factoryName(const QString& id, const QString& tag, QLatin1String role) {
-  return QLatin1String("  FACTORY_NAME \"") + id + QLatin1Char(' ') + tag + role + QLatin1Char('"');
+// Takes features of the types and lets them go on as another one; without one they end here.
+QStringList teeFactory(const QString& name, const QStringList& inputs, const QString& output,
+                       const QStringList& functions = QStringList()) {
+  QStringList lines{QString(kTeeFactoryStatement),
+                    QLatin1String("  FACTORY_NAME \"") + name + QLatin1Char('"')};
+  for (const QString& input : inputs)
+    lines.append(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(input));
+  if (output.isEmpty())
+    return lines;
+  lines.append(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(output));
+  for (const QString& function : functions)
+    lines.append(QLatin1String("    ") + function);
+  return lines;
 }
 
 // References to the instance's parameters, "$(NAME)", become references to its macros.
@@ -121,13 +132,9 @@ CompoundTransformerCfg::Statements CompoundTransformerCfg::inputCollectors() con
   Statements statements;
   for (const QString& tag : qAsConst(tags)) {
     const QStringList featureTypes = getInputFeatureTypes(tag);
-    if (featureTypes.isEmpty())
-      continue;
-    QStringList lines{QString(kTeeFactoryStatement), factoryName(id, tag, kInputCollectorName)};
-    for (const QString& featureType : featureTypes)
-      lines.append(QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(featureType));
-    lines.append(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag));
-    statements.push_back(lines);
+    if (!featureTypes.isEmpty())
+      statements.push_back(teeFactory(id + QLatin1Char(' ') + tag + kInputCollectorName, featureTypes,
+                                      id + QLatin1Char('_') + tag));
   }
   return statements;
 }
@@ -138,17 +145,10 @@ CompoundTransformerCfg::Statements CompoundTransformerCfg::outputRenamers() cons
   getOutputTags(tags);
   Statements statements;
   for (const QString& tag : qAsConst(tags)) {
-    QStringList lines{
-        QString(kTeeFactoryStatement), factoryName(id, tag, kOutputRenamerName),
-        QLatin1String("  INPUT FEATURE_TYPE ") + quotifyStringForMF(id + QLatin1Char('_') + tag)};
     QString featureType;
     getOutputFeatureType(tag, featureType);
-    if (!featureType.isEmpty()) {
-      lines.append(QLatin1String("  OUTPUT FEATURE_TYPE ") + quotifyStringForMF(featureType));
-      for (const QString& function : getOutputTagFuncs(tag))
-        lines.append(QLatin1String("    ") + function);
-    }
-    statements.push_back(lines);
+    statements.push_back(teeFactory(id + QLatin1Char(' ') + tag + kOutputRenamerName,
+                                    {id + QLatin1Char('_') + tag}, featureType, getOutputTagFuncs(tag)));
   }
   return statements;
 }
@@ -167,10 +167,10 @@ QStringList CompoundTransformerCfg::getTransformFactoryInputLines() const {
 
 void CompoundTransformerCfg::writeParametersToMappingFile(MFBuffer& buffer, const QString& prefixMacro,
                                                           bool defaultsOnly) const {
-  for (const QString& statement : parameterStatements(prefixMacro, defaultsOnly)) {
-    buffer.add(statement);
-    buffer.flush();
-  }
+  Statements statements;
+  for (const QString& statement : parameterStatements(prefixMacro, defaultsOnly))
+    statements.push_back({statement});
+  write(buffer, statements);
 }
 
 QStringList CompoundTransformerCfg::parameterStatements(const QString& prefixMacro, bool defaultsOnly) const {
