@@ -421,6 +421,13 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   // The type of the values of the name: for a member of a multi-parameter the member's own.
   const GUIType& typeOfValue(const QString& name) const;
   QString displayString(const QString& name, const QString& value, bool withPrompt, bool isDecoded) const;
+  // What a call from outside carries past operations whose signatures have no place for it.
+  struct Call {
+    const AttributePassage* passage = nullptr;  // of attributes on their way
+    bool isHtml = false;                        // of a tooltip that is filled in
+  };
+
+  bool setParameterValue(const QString& name, const QString& value, bool notify, bool tellListener);
   QString tooltipValue(const QString& parameter) const;
   bool validateFile(const TransformParamCfg& record, const QString& parameter, QString& message) const;
   bool isConnectionKnown(const QString& encodedName) const;
@@ -472,10 +479,8 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   ParameterSet m_parameters;
   PortTables m_ports;
   const std::type_info* m_passesByRules = &typeid(TransformerCfg);
-  mutable const AttributePassage* m_passage = nullptr;  // while attributes are on their way
-  mutable bool m_isTooLarge = false;                    // since statements were begun
-  mutable bool m_tooltipAsHtml = false;                 // while a tooltip is filled in
-  bool m_tellListener = true;                           // clear while values are restored
+  mutable const Call* m_call = nullptr;  // the one that is on its way
+  mutable bool m_isTooLarge = false;     // since statements were begun
   QString m_bannerImageName;
   bool m_showInNavigator = true;
   QStringList m_dynamicParameterNames;

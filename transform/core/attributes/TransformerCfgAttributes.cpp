@@ -126,7 +126,8 @@ void TransformerCfg::transformAllAttrs(QStringList& incoming, QStringList& resul
                                        const QString& outputTag) const {
   const AttributePassage passage(*this, preservedAttributes(), configured().attributeRules, inputTag,
                                  outputTag);
-  const QScopedValueRollback<const AttributePassage*> scope(m_passage, &passage);
+  const Call call{&passage};
+  const QScopedValueRollback<const Call*> scope(m_call, &call);
   for (const QString& attribute : std::as_const(incoming)) {
     transformAttr(attribute, result, inputTag, outputTag);
   }
@@ -134,8 +135,8 @@ void TransformerCfg::transformAllAttrs(QStringList& incoming, QStringList& resul
 
 void TransformerCfg::transformAttr(const QString& attribute, QStringList& result, const QString& inputTag,
                                    const QString& outputTag) const {
-  if (m_passage && m_passage->isBetween(inputTag, outputTag)) {
-    m_passage->pass(attribute, result);
+  if (m_call && m_call->passage && m_call->passage->isBetween(inputTag, outputTag)) {
+    m_call->passage->pass(attribute, result);
   } else {
     AttributePassage(*this, preservedAttributes(), configured().attributeRules, inputTag, outputTag)
         .pass(attribute, result);

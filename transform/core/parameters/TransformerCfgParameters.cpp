@@ -75,6 +75,11 @@ QString TransformerCfg::getParameterValue(const QString& parameter, UnpackLevel 
 }
 
 bool TransformerCfg::setParameterValue(const QString& name, const QString& value, bool notify) {
+  return setParameterValue(name, value, notify, true);
+}
+
+bool TransformerCfg::setParameterValue(const QString& name, const QString& value, bool notify,
+                                       bool tellListener) {
   TransformParamCfg* record = getParameterByMacroName(name);
   if (!record) {
     return false;
@@ -97,7 +102,7 @@ bool TransformerCfg::setParameterValue(const QString& name, const QString& value
   record = getParameterByMacroName(name);
   const QString newValue = record ? storedValue(*record, name) : stored;
   onParameterChanged(name);
-  if (m_listener && m_tellListener) {
+  if (m_listener && tellListener) {
     m_listener->parameterChanged(*this, name, oldValue, newValue);
   }
   return true;

@@ -54,7 +54,8 @@ void replaceTokens(QString& line, const std::function<bool(const QString& name, 
 }  // namespace
 
 void TransformerCfg::getTooltipLines(QStringList& lines, bool asHtml) const {
-  const QScopedValueRollback<bool> scope(m_tooltipAsHtml, asHtml);
+  const Call call{nullptr, asHtml};
+  const QScopedValueRollback<const Call*> scope(m_call, &call);
   lines = configured().fields.tooltipLines;
   QHash<QString, QString> tokens;
   QStringList further;
@@ -98,5 +99,5 @@ QString TransformerCfg::tooltipValue(const QString& parameter) const {
   if (text == kUnusedGroupBy && parameter == configured().fields.multiProcess) {
     text.clear();
   }
-  return escaped(text.isEmpty() ? TransformResString(messages::kNotSet) : text, m_tooltipAsHtml);
+  return escaped(text.isEmpty() ? TransformResString(messages::kNotSet) : text, m_call && m_call->isHtml);
 }

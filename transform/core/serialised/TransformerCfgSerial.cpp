@@ -4,8 +4,6 @@
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/TransformerCfg.h>
 
-#include <QScopedValueRollback>
-
 #include <utility>
 
 namespace {
@@ -130,9 +128,8 @@ QString TransformerCfg::serialize() const {
 
 void TransformerCfg::deserialize(QHash<QString, QString>& fields) {
   if (fields.contains(kParameterValuesKey)) {
-    const QScopedValueRollback<bool> quiet(m_tellListener, false);
     for (const auto& [name, value] : unpackTable(fields.value(kParameterValuesKey))) {
-      setParameterValue(name, value, false);
+      setParameterValue(name, value, false, false);
     }
   }
   appendLists(fields.value(kInputFeatureTypesKey), m_ports.inputFeatureTypes);
