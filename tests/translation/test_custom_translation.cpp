@@ -181,6 +181,19 @@ TEST(CustomTranslation, NestsUpTo64Deep) {
   }
 }
 
+TEST(CustomTranslation, TellsThatAnAnswerWouldCostTooMuch) {
+  for (const int references : {1000, 1001}) {
+    SmallWorkspace workspace;
+    workspace.transformer(3, "SubDocumentTransformer", {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", "C"});
+    workspace.beginCustom("Cleaner", {"CATEGORY", "Mine"}).parameter("GUI TEXT N Name", "n");
+    workspace.transformer(3, "Add", {"XFORMER_NAME", "A", "NEW", QString("$(N)").repeated(references)});
+    workspace.endCustom();
+    const Outcome outcome = translate(workspace);
+    EXPECT_EQ(outcome.diagnostics.contains("nesting "), references > 1000)
+        << outcome.texts.join('\n').toStdString();
+  }
+}
+
 TEST(CustomTranslation, NothingStandsInsideItselfOrUnderItsOwnMacro) {
   const struct {
     QStringList names;

@@ -197,7 +197,6 @@ class ORX_EXPORT CompoundTransformerNetwork {
   void setExtractError(const QString& error) { m_extractError = error; }
 
  private:
-  struct AttributeQuery;
   struct AttributeMemo;
 
   template <class Node>

@@ -3,6 +3,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
+#include <transform/custom/NestedQuestion.h>
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
@@ -13,7 +14,7 @@
 #include <transform/workspace/XMLComponentReader.h>
 
 #include <QFileInfo>
-#include <QScopeGuard>
+#include <QScopedValueRollback>
 
 namespace messages = orx::messages;
 
@@ -116,15 +117,11 @@ void ExternalTransformerNetwork::takeIdentity(const QHash<QString, QString>& set
 void ExternalTransformerNetwork::forceLoad() {
   // Files may name each other in a long row: a row longer than custom transformers may nest is left where it
   // is, and the nesting refused when it is written.
-  static thread_local int depth = 0;
-  if (isBodyLoaded() || m_isLoading || !m_manager || depth > kDeepestNesting)
+  constexpr auto kKind = NestedQuestion::Kind::Body;
+  if (isBodyLoaded() || m_isLoading || !m_manager || NestedQuestion::depth(kKind) > kDeepestNesting)
     return;
-  ++depth;
-  m_isLoading = true;
-  const auto finish = qScopeGuard([this] {
-    m_isLoading = false;
-    --depth;
-  });
+  const NestedQuestion question(kKind);
+  const QScopedValueRollback<bool> loading(m_isLoading, true);
   m_isComplete = false;
   m_bodyFault.clear();
   m_lacksRoutine = false;

@@ -187,6 +187,7 @@ constexpr long kTooManyNames = 370838;
 constexpr long kSamePrefix = 370839;
 constexpr long kContainsItself = 370840;
 constexpr long kNestedTooDeep = 370841;
+constexpr long kNestedTooCostly = 370846;
 constexpr long kNoFileOfItsOwn = 370842;
 constexpr long kEnciphered = 370843;
 constexpr long kFileChanged = 370844;

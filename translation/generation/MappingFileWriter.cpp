@@ -2,6 +2,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/NestedQuestion.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
@@ -43,6 +44,7 @@ MappingFileWriter::MappingFileWriter(Workspace& workspace, orx::Findings& diagno
       m_definitions(workspace.customTransformers(), workspace.usedCustomTransformers, workspace.listener) {}
 
 bool MappingFileWriter::prepare() {
+  const OverrunListener overruns;
   const std::size_t count = m_workspace.nodes.size();
   m_flows.assign(count, {});
   m_functions.assign(count, {});
@@ -58,7 +60,10 @@ bool MappingFileWriter::prepare() {
   check();
   for (const WorkspaceNode& node : m_workspace.nodes)
     m_definitions.addInstance(node.cfg.get());
-  return m_definitions.prepare(m_diagnostics);
+  const bool isPrepared = m_definitions.prepare(m_diagnostics);
+  if (overruns.hasHeard())
+    m_diagnostics.reportAs(Rule::Nesting, messages::kNestedTooCostly, 0, QString());
+  return isPrepared;
 }
 
 bool MappingFileWriter::order() {

@@ -3,6 +3,7 @@
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/NestedQuestion.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/custom/instance/InnerTransformerListener.h>
 
@@ -10,19 +11,11 @@ namespace {
 
 // Values refer to the parameters of the custom transformer around, whose values refer to the next one: what
 // one question may cost, and how long a value may become on the way, is bounded. What is left over stays a
-// reference.
+// reference, which is told.
 constexpr int kMostReplacements = 1000;
 constexpr int kLongestValue = 1 << 18;
 
-struct Budget {
-  int depth = 0;
-  int replacements = 0;
-};
-
-Budget& budget() {
-  static thread_local Budget budget;
-  return budget;
-}
+constexpr auto kKind = NestedQuestion::Kind::Value;
 
 }  // namespace
 
@@ -35,20 +28,17 @@ QString InnerTransformerListener::valueOf(const QString& parameter) const {
 QString InnerTransformerListener::resolve(const QString& value) const {
   if (!value.contains(kMacroOpen))
     return value;
-  Budget& left = budget();
-  if (left.depth++ == 0)
-    left.replacements = 0;
+  const NestedQuestion question(kKind);
   int length = value.size();
-  const QString resolved = replaceParameterReferences(value, [&](const QString& name, QString& replacement) {
+  return replaceParameterReferences(value, [&](const QString& name, QString& replacement) {
     if (!m_network.hasParameter(name) || isScript(name) ||
-        left.depth > CompoundTransformerNetwork::kDeepestNesting || ++left.replacements > kMostReplacements)
+        NestedQuestion::depth(kKind) > CompoundTransformerNetwork::kDeepestNesting ||
+        !NestedQuestion::spend(kKind, 1, kMostReplacements))
       return false;
     replacement = valueOf(name);
     length += replacement.size();
-    return length <= kLongestValue;
+    return length <= kLongestValue || NestedQuestion::spend(kKind, kMostReplacements, 0);
   });
-  --left.depth;
-  return resolved;
 }
 
 // What a script gives is known when it has run, not before.

@@ -1,10 +1,13 @@
 // What leaves the outputs of a network.
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/NestedQuestion.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjOutput.h>
 #include <transform/custom/network/AttributeMemo.h>
 #include <transform/custom/network/NetworkOrder.h>
+
+#include <QScopedValueRollback>
 
 #include <algorithm>
 
@@ -17,20 +20,11 @@ constexpr std::size_t kMostRoundsWithNewNames = 8;
 constexpr std::size_t kMostStepsInCycle = 10 * 1000 * 1000;
 // What the custom transformers inside may cost within one outermost query, in characters of the attributes
 // that reach them. Definitions that are placed in each other again and again, each time with other
-// attributes, could ask for more than any machine has: what exceeds this gives what reaches it.
+// attributes, could ask for more than any machine has: what exceeds this is told, and gives what reaches it.
 constexpr qint64 kMostCost = 32 * 1024 * 1024;
 constexpr qint64 kCostOfQuestion = 512;
 
-struct QueryState {
-  int depth = 0;
-  quint64 number = 0;
-  qint64 cost = 0;
-};
-
-QueryState& queryState() {
-  static thread_local QueryState state;
-  return state;
-}
+constexpr auto kKind = NestedQuestion::Kind::Attributes;
 
 void computeCycle(const NetworkOrder::Cycle& cycle, QHash<QString, QString>& origins) {
   for (SubDocNetworkObj* node : cycle.flow)
@@ -50,26 +44,6 @@ void computeCycle(const NetworkOrder::Cycle& cycle, QHash<QString, QString>& ori
 }
 
 }  // namespace
-
-// One query for attributes, from its begin to its end; queries nest with the custom transformers.
-struct CompoundTransformerNetwork::AttributeQuery {
-  explicit AttributeQuery(bool& isEvaluating) : m_isEvaluating(isEvaluating) {
-    m_isEvaluating = true;
-    if (queryState().depth++ == 0) {
-      ++queryState().number;
-      queryState().cost = 0;
-    }
-  }
-  ~AttributeQuery() {
-    m_isEvaluating = false;
-    --queryState().depth;
-  }
-  AttributeQuery(const AttributeQuery&) = delete;
-  AttributeQuery& operator=(const AttributeQuery&) = delete;
-
- private:
-  bool& m_isEvaluating;
-};
 
 void CompoundTransformerNetwork::setInputAttributes(const QString& input, const QStringList& attributes) {
   const auto at = m_inputNodes.find(input);
@@ -115,25 +89,25 @@ QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& outpu
                                                             QHash<QString, QString>& origins) const {
   const auto node = m_outputNodes.find(output);
   // A network that is being worked out stands inside itself.
-  if (node == m_outputNodes.end() || m_isEvaluating || queryState().depth >= kDeepestNesting)
+  if (node == m_outputNodes.end() || m_isEvaluating || NestedQuestion::depth(kKind) >= kDeepestNesting)
     return QStringList();
   ensureOrders();
   const NetworkOrder& order = m_orders->at(output);
-  if (queryState().depth == 0)
+  if (NestedQuestion::depth(kKind) == 0)
     return evaluate(*node->second, order, origins);
 
   if (!m_memo)
     m_memo = std::make_unique<AttributeMemo>();
-  if (m_memo->query != queryState().number) {
-    m_memo->query = queryState().number;
+  if (m_memo->query != NestedQuestion::number(kKind)) {
+    m_memo->query = NestedQuestion::number(kKind);
     m_memo->answers.clear();
   }
-  queryState().cost += kCostOfQuestion;
+  qint64 cost = kCostOfQuestion;
   for (const QString& input : m_inputs) {
     for (const QString& attribute : m_inputNodes.at(input)->setAttributes())
-      queryState().cost += attribute.size();
+      cost += attribute.size();
   }
-  if (queryState().cost > kMostCost)
+  if (!NestedQuestion::spend(kKind, cost, kMostCost))
     return arrivingAttributes();
   AttributeMemo::Key key;
   key.output = output;
@@ -152,7 +126,8 @@ QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& outpu
 
 QStringList CompoundTransformerNetwork::evaluate(SubDocNetworkObjOutput& output, const NetworkOrder& order,
                                                  QHash<QString, QString>& origins) const {
-  const AttributeQuery query(m_isEvaluating);
+  const NestedQuestion question(kKind);
+  const QScopedValueRollback<bool> evaluating(m_isEvaluating, true);
   auto cycle = order.cycles.begin();
   for (std::size_t at = 0; at < order.nodes.size();) {
     if (cycle == order.cycles.end() || cycle->begin != at) {
