@@ -141,7 +141,8 @@ void Validation::checkTransformers(const Workspace& workspace, bool isConnected)
     m_values.check({*node.cfg, node.name, node.parameterLines,
                     isConnected && flow.knowsWhatArrives(static_cast<int>(number))},
                    knows, m_parameterNames);
-    fit_checks::checkTransformer(*node.cfg, node.parameterLines, node.name, m_diagnostics);
+    fit_checks::checkTransformer(*node.cfg, node.parameterLines, node.name, m_diagnostics,
+                                 fit_checks::References::Known);
     checkAge(*node.cfg, node.line, node.name, m_diagnostics);
   }
 }
@@ -159,7 +160,8 @@ void Validation::checkInside(const ExternalDocNetwork& network, const Workspace&
     const TransformerCfg& cfg = *node->getTransformer();
     const QString title = network.getName() + QLatin1Char('/') + node->name();
     place.values.check({cfg, title, node->parameterLines(), /*knowsWhatArrives=*/false}, knows, names);
-    fit_checks::checkTransformer(cfg, node->parameterLines(), title, place.diagnostics);
+    fit_checks::checkTransformer(cfg, node->parameterLines(), title, place.diagnostics,
+                                 fit_checks::References::Open);
     checkAge(cfg, node->line(), title, place.diagnostics);
   }
 }

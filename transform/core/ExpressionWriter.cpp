@@ -73,21 +73,6 @@ bool ExpressionWriter::needsWrapping(const GUIType& type, const QString& value) 
          (!type.isNull() && !type.valueIsEncoded() && !valueReferences(value).empty());
 }
 
-QString ExpressionWriter::withStoredResults(const QString& value, const ChoiceList& choices) {
-  if (!choices.hasLookup() || !value.startsWith(kConditionalPrefix)) {
-    return value;
-  }
-  QStringList parts = value.mid(kConditionalPrefix.size()).split(kPartSeparator);
-  for (int i = 0; i < parts.size(); ++i) {
-    const bool isResult = i % 2 == 1 || i + 1 == parts.size();
-    const QString result = QORXWwjdDecode(parts.at(i));
-    if (isResult && choices.contains(result)) {
-      parts[i] = QORXWwjdEncode(choices.toStored(result));
-    }
-  }
-  return kConditionalPrefix + parts.join(kPartSeparator);
-}
-
 QString ExpressionWriter::wrap(const QString& value, const QString& name, const QString& type,
                                bool encoded) const {
   QString result = kEvaluateCall;

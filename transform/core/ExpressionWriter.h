@@ -26,8 +26,6 @@ class ORX_EXPORT ExpressionWriter {
   static bool needsWrapping(const GUIType& type, const QString& value);
   // Whether what is wrapped for the type is a formula, whose result is a number.
   static bool isComputed(const GUIType& type);
-  // A conditional value with the stored sides of the choices as its results; any other value as it is.
-  static QString withStoredResults(const QString& value, const ChoiceList& choices);
 
  private:
   const bool m_fractions;

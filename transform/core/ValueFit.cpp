@@ -1,14 +1,12 @@
-#include <platform/qorxcore/Lists.h>
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/ValueFit.h>
 #include <transform/core/ValueReferences.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
-
-#include <QHash>
 
 #include <algorithm>
 #include <cmath>
@@ -28,18 +26,27 @@ const QLatin1String kSliderTypes("RANGE_SLIDER");
 // What also turns parallelism off.
 const QLatin1String kNoProcesses("NO");
 
+// What begins like a reference and is none stands for itself.
+bool refersToMacro(const QString& value) {
+  const std::vector<MacroReference> references = macroReferences(value);
+  return std::any_of(references.begin(), references.end(),
+                     [](const MacroReference& reference) { return reference.isClosed; });
+}
+
 // Whether the value is known as it stands.
 bool isPlain(const GUIType& type, const QString& value) {
-  const std::vector<MacroReference> references = macroReferences(value);
-  // What begins like a reference and is none stands for itself.
-  const bool refers = std::any_of(references.begin(), references.end(),
-                                  [](const MacroReference& reference) { return reference.isClosed; });
-  if (isUnsetSetting(value) || value.startsWith(kConditionalPrefix) || refers ||
+  if (isUnsetSetting(value) || value.startsWith(kConditionalPrefix) || refersToMacro(value) ||
       !valueReferences(value).empty())
     return false;
   const bool isFunction = value.startsWith(QLatin1Char('@')) && value.endsWith(QLatin1Char(')'));
-  const bool isEvaluated = type.mayHoldAttributeReference() || ORX_isChoiceType(type);
-  return !(isFunction && isEvaluated);
+  return !(isFunction && type.mayHoldAttributeReference());
+}
+
+QString expanded(const QString& value, const ValueFit::Expand& expand) {
+  QString result = value;
+  if (expand && refersToMacro(value))
+    expand(result);
+  return result;
 }
 
 bool isWholeNumber(const QString& text) {
@@ -84,58 +91,70 @@ ValueFit numberFit(const GUIType& type, const QString& value) {
                                                              : ValueFit();
 }
 
-ValueFit choiceFit(const GUIType& type, const ChoiceList& choices, const QString& value) {
-  // A list box may show a text with blanks, which then stands as it is.
-  if (choices.isEmpty() || choices.contains(value))
-    return ValueFit();
-  const QStringList values =
-      ORX_isListBoxType(type) ? QORXStringToList(value, QLatin1Char(' ')) : QStringList(value);
-  const auto strange =
-      std::find_if(values.begin(), values.end(), [&](const QString& one) { return !choices.contains(one); });
-  if (strange == values.end())
-    return ValueFit();
+QStringList offeredBy(const single_choices::Choice& choice) {
   QStringList offered;
-  for (const auto& entry : choices.entries())
+  if (choice.type.getType() == kCheckBoxType) {
+    offered = ORX_splitConfig(choice.type.getConfigToken(), QLatin1Char('%'));
+    if (offered.isEmpty())
+      offered << kTicked << kNotTicked;
+    return offered;
+  }
+  for (const auto& entry : choice.choices.entries())
     offered.append(entry.first);
-  return misfitOf(ValueFit::Misfit::Choice, *strange, offered);
+  return offered;
+}
+
+// What is referred to is told only when it is used, and so is what a function gives.
+bool isOffered(const single_choices::Choice& choice) {
+  const bool isCall = choice.text.startsWith(QLatin1Char('@')) && choice.text.endsWith(QLatin1Char(')'));
+  if (choice.refers || isUnsetSetting(choice.text) || (isCall && ORX_isChoiceType(choice.type)))
+    return true;
+  if (!ORX_isChoiceType(choice.type))
+    return offeredBy(choice).contains(choice.text);
+  return choice.choices.isEmpty() || choice.choices.contains(choice.text);
+}
+
+// Collects the choices that are not offered, as a function that replaces nothing.
+single_choices::Replace collecting(std::vector<ValueFit>& misfits, const ValueFit::Expand& expand) {
+  return [&misfits, &expand](const single_choices::Choice& choice) {
+    const QString known = choice.refers ? expanded(choice.text, expand) : choice.text;
+    if (known != choice.text && !known.startsWith(kConditionalPrefix)) {
+      single_choices::replaceIn(choice.type, choice.choices, known, collecting(misfits, nullptr));
+    } else if (!isOffered(choice)) {
+      misfits.push_back(misfitOf(ValueFit::Misfit::Choice, choice.text, offeredBy(choice)));
+      misfits.back().prompt = choice.type.getDescription();
+    }
+    return choice.text;
+  };
 }
 
 }  // namespace
 
 ValueFit ValueFit::of(const GUIType& type, const ChoiceList& choices, const QString& value) {
-  if (!isPlain(type, value))
-    return ValueFit();
-  if (ORX_isChoiceType(type))
-    return choiceFit(type, choices, value);
-  if (type.getType() != kCheckBoxType)
-    return numberFit(type, value);
-  QStringList states = ORX_splitConfig(type.getConfigToken(), QLatin1Char('%'));
-  if (states.isEmpty())
-    states << kTicked << kNotTicked;
-  return states.contains(value) ? ValueFit() : misfitOf(Misfit::Choice, value, states);
+  std::vector<ValueFit> misfits;
+  single_choices::replaceIn(type, choices, value, collecting(misfits, nullptr));
+  if (!misfits.empty())
+    return misfits.front();
+  return isPlain(type, value) ? numberFit(type, value) : ValueFit();
 }
 
-std::vector<ValueFit> ValueFit::misfitsOf(const TransformParamCfg& parameter, const QString& value) {
+std::vector<ValueFit> ValueFit::misfitsOf(const TransformParamCfg& parameter, const QString& value,
+                                           const Expand& expand) {
   std::vector<ValueFit> misfits;
   if (parameter.getName() == kProcessCountParameter && value == kNoProcesses)
     return misfits;
-  const auto add = [&](ValueFit fit, const QString& prompt) {
-    if (fit.fits())
-      return;
-    fit.prompt = prompt;
-    misfits.push_back(fit);
-  };
-  if (parameter.members().members().empty()) {
-    add(of(parameter, parameter.choices(), value), QString());
-    return misfits;
-  }
-  // The rows of a table share the types of its columns.
-  QHash<const GUIType*, ChoiceList> choices;
-  forEachPart(parameter, value, [&](const GUIType& type, const QString& part) {
-    if (!choices.contains(&type))
-      choices.insert(&type, ChoiceList(type));
-    add(of(type, choices[&type], part), type.getDescription());
+  single_choices::replaceIn(parameter, value, collecting(misfits, expand));
+  const bool isComposite = !parameter.members().members().empty();
+  forEachPart(parameter, value, [&](const GUIType& type, const QString& stored) {
+    const QString part = expanded(stored, expand);
+    const ValueFit fit = isPlain(type, part) ? numberFit(type, part) : ValueFit();
+    if (!fit.fits()) {
+      misfits.push_back(fit);
+      misfits.back().prompt = type.getDescription();
+    }
   });
+  for (ValueFit& fit : misfits)
+    fit.prompt = isComposite ? fit.prompt : QString();
   return misfits;
 }
 

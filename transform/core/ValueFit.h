@@ -1,8 +1,8 @@
 // Whether a value is one that its type offers: an entry of a choice or list box, one of the two values of a
 // check box, a number within the range of a slider.
 //
-// Only plain values are judged so. An unset value, a conditional one, one that refers to an attribute or a
-// parameter, or that is a function, is told only when it is used.
+// An unset value, one that refers to an attribute or to a parameter that is not known, and one that is a
+// function, is told only when it is used. Of a condition the results that are choices are judged.
 #pragma once
 
 #include <platform/Export.h>
@@ -11,6 +11,7 @@
 #include <QString>
 #include <QStringList>
 
+#include <functional>
 #include <vector>
 
 class TransformParamCfg;
@@ -33,6 +34,9 @@ struct ORX_EXPORT ValueFit {
   // `choices` are those of the type, with their lookups.
   static ValueFit of(const GUIType& type, const ChoiceList& choices, const QString& value);
   static ValueFit of(const GUIType& type, const QString& value) { return of(type, ChoiceList(type), value); }
+  // Puts the values of parameters in the places of references to them, as far as they are known.
+  using Expand = std::function<void(QString& text)>;
   // All that does not fit in a parameter with members or columns, or in the value itself.
-  static std::vector<ValueFit> misfitsOf(const TransformParamCfg& parameter, const QString& value);
+  static std::vector<ValueFit> misfitsOf(const TransformParamCfg& parameter, const QString& value,
+                                         const Expand& expand = nullptr);
 };

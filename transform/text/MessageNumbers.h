@@ -424,5 +424,6 @@ constexpr long kParameterCircle = 371400;
 
 // Names.
 constexpr long kReferenceInName = 370940;
+constexpr long kShownSideReferred = 371321;
 
 }  // namespace orx::messages

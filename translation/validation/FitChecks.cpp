@@ -1,6 +1,8 @@
 #include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueFit.h>
 #include <transform/findings/Findings.h>
+#include <transform/text/MFBuffer.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/ParameterLines.h>
 #include <transform/workspace/WorkspaceRecords.h>
@@ -25,10 +27,16 @@ void report(const std::vector<ValueFit>& misfits, const TransformParamCfg& param
 }  // namespace
 
 void fit_checks::checkTransformer(const TransformerCfg& cfg, const ParameterLines& lines,
-                                  const QString& title, orx::Findings& findings) {
+                                  const QString& title, orx::Findings& findings, References references) {
+  const auto expand = [&cfg](QString& text) {
+    text = MFBuffer::withOrdinaryMacros(text);
+    if (cfg.listener())
+      cfg.listener()->expandMacros(cfg, text);
+  };
   for (const QString& name : cfg.getParameters()) {
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
-    const std::vector<ValueFit> misfits = ValueFit::misfitsOf(*parameter, parameter->getValue());
+    const std::vector<ValueFit> misfits = ValueFit::misfitsOf(
+        *parameter, parameter->getValue(), references == References::Known ? expand : ValueFit::Expand());
     QString refusal;
     if (!misfits.empty() && cfg.validateParameter(name, refusal))
       report(misfits, *parameter, lines.of(name), title, findings);

@@ -15,8 +15,10 @@ class Findings;
 namespace fit_checks {
 
 // All parameters of a transformer; what its own validation refuses is left to that.
+// References lead to values that are known, or to different ones in each instance of what stands around.
+enum class References { Known, Open };
 void checkTransformer(const TransformerCfg& cfg, const ParameterLines& lines, const QString& title,
-                      orx::Findings& findings);
+                      orx::Findings& findings, References references);
 // The global parameters of the workspace and those of its custom transformers, by their prompt lines.
 void checkParameters(const IXMLComponentReader& reader, const GlobalParameters& parameters,
                      orx::Findings& findings);

@@ -2,6 +2,7 @@
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/definition/CompiledTemplate.h>
@@ -59,17 +60,11 @@ bool ParameterSubstitution::isInert(const TransformParamCfg& record) const {
   if (name == kIdentifierParameter && !isInert(m_cfg.getParameterValue(name, UnpackLevel::Decoded))) {
     return false;
   }
-  const ChoiceList& choices = record.choices();
   QStringList parts(value);
   if (record.isMultiParameter()) {
-    parts += partsOf(record, value);
-  } else if (choices.hasLookup()) {
-    parts += choices.toStored(value);
-    if (ORX_isListBoxType(record)) {
-      for (const QString& element : QORXSdfStringToList(value, QLatin1Char(' '))) {
-        parts += choices.toStored(element);
-      }
-    }
+    parts += partsOf(record, single_choices::toStored(record, value));
+  } else if (record.choices().hasLookup()) {
+    parts += single_choices::toStored(record, value);
   }
   return std::all_of(parts.cbegin(), parts.cend(), [this](const QString& part) { return isInert(part); });
 }

@@ -6,6 +6,7 @@
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/LookupChecks.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/attributes/PortTexts.h>
@@ -304,15 +305,15 @@ QString TransformerCfg::textForMappingFile(QString value, const QString& name,
   const ChoiceList& choices = record->choices();
   const bool isEncoded = record->valueIsEncoded();
   if (record->isMultiParameter()) {
-    return wrapInEvaluateExpression(value, name, record->getTypeWithConfig(), isEncoded);
+    return wrapInEvaluateExpression(single_choices::toStored(*record, value), name,
+                                    record->getTypeWithConfig(), isEncoded);
   }
   if (record->isTable() && !value.startsWith(kConditionalPrefix)) {
-    return wrapGuiTableInEvaluateExpression(*record, value);
+    return wrapGuiTableInEvaluateExpression(*record, single_choices::toStored(*record, value));
   }
   const bool isPerFeature = ExpressionWriter::needsWrapping(*record, value);
   if (isPerFeature) {
-    value =
-        wrapInEvaluateExpression(ExpressionWriter::withStoredResults(value, choices), name, type, isEncoded);
+    value = wrapInEvaluateExpression(single_choices::toStored(*record, value), name, type, isEncoded);
   }
   if (type == kTextEncodedType) {
     value = encodeUserString(value);
@@ -354,17 +355,7 @@ QString TransformerCfg::lookedUp(MFBuffer& buffer, const QString& name, const Tr
     case LookupKind::Stored:
       break;
   }
-  if (!ORX_isListBoxType(record)) {
-    return choices.toStored(value);
-  }
-  QStringList selected = QORXSdfStringToList(value, QLatin1Char(' '));
-  bool isKnown = false;
-  for (QString& element : selected) {
-    const QString stored = choices.toStored(element);
-    isKnown = isKnown || stored != element;
-    element = stored;
-  }
-  return isKnown ? QORXListToSdfString(selected, QLatin1Char(' ')) : value;
+  return single_choices::toStored(record, value);
 }
 
 QString TransformerCfg::getParameterValueForMappingFile(const QString& value, ValueEncoding from,

@@ -6,6 +6,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/LookupChecks.h>
 #include <transform/core/ParameterReferences.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/definition/CompiledTemplate.h>
@@ -161,7 +162,7 @@ long MappingFileChecks::refuseIdentifier(const QString& value) const {
 long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QString& value) const {
   const LookupKind kind = lookupKind(m_cfg, record, value);
   if (kind != LookupKind::RunTime && kind != LookupKind::Procedure) {
-    return 0;
+    return refersToShownSide(record, value) ? messages::kShownSideReferred : 0;
   }
   const ChoiceList& choices = record.choices();
   const QString identifier = m_cfg.getIdentifier();
@@ -196,7 +197,26 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
   if (kind == LookupKind::Procedure) {
     return refuseChoiceProcedure(choices, lookup.macro, lookup.value);
   }
-  return ORX_isListBoxType(record) ? refuseListBox(choices, lookup) : refuseChoiceBox(choices, lookup);
+  if (!ORX_isListBoxType(record)) {
+    return refuseChoiceBox(choices, lookup);
+  }
+  // The fragment looks for what is shown as a list shows it: in quotes.
+  const bool isBare = lookup.value.contains(QLatin1Char(' ')) && choices.contains(lookup.value);
+  return isBare ? messages::kShownSideReferred : refuseListBox(choices, lookup);
+}
+
+// Whether a reference among the choices gives one as it is shown, and no fragment looks it up.
+bool MappingFileChecks::refersToShownSide(const TransformParamCfg& record, const QString& value) const {
+  bool isShown = false;
+  single_choices::replaceIn(record, value, [&](const single_choices::Choice& choice) {
+    QString known = choice.text;
+    if (choice.refers && choice.choices.hasLookup() && expandMacros(known)) {
+      const auto toStored = [](const single_choices::Choice& one) { return one.choices.toStored(one.text); };
+      isShown = isShown || single_choices::replaceIn(choice.type, choice.choices, known, toStored) != known;
+    }
+    return choice.text;
+  });
+  return isShown;
 }
 
 // Choices may refer to macros as well; those that do must fit wherever they stand.
