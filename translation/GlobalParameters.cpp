@@ -1,4 +1,6 @@
 #include <transform/core/ParameterReferences.h>
+#include <transform/core/SingleChoices.h>
+#include <transform/core/TransformParamCfg.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
@@ -15,6 +17,12 @@ namespace {
 constexpr int kMaximumNesting = 32;
 constexpr int kMaximumReplacements = 10000;
 constexpr int kMaximumLength = 1 << 20;
+
+QString withStoredSides(const QString& promptLine, const QString& value) {
+  return promptLine.isEmpty()
+             ? value
+             : single_choices::toStored(TransformParamCfg(GUIType::fromGuiLine(promptLine)), value);
+}
 
 QString referencedName(const QString& reference) {
   if (!reference.startsWith(QLatin1String("$(")) || !reference.endsWith(QLatin1Char(')')))
@@ -63,8 +71,9 @@ void GlobalParameters::declare(const QString& name, const QString& value, int li
   Parameter& parameter = entry(name);
   parameter.isPublished = true;
   parameter.promptLine = promptLine;
+  parameter.language = scriptLanguage(GUIType::fromGuiLine(promptLine));
   if (!parameter.setInHeader) {
-    parameter.value = asWritten(value);
+    parameter.value = asWritten(withStoredSides(promptLine, value));
     parameter.line = lineNumber;
   }
 }
@@ -73,7 +82,7 @@ bool GlobalParameters::override(const QString& name, const QString& value) {
   if (!m_index.contains(name))
     return false;
   Parameter& parameter = entry(name);
-  parameter.overridingValue = asWritten(value);
+  parameter.overridingValue = asWritten(withStoredSides(parameter.promptLine, value));
   parameter.isOverridden = true;
   return true;
 }
@@ -98,7 +107,7 @@ std::vector<std::vector<const GlobalParameters::Parameter*>> GlobalParameters::c
   int budget = kMaximumReplacements;
   for (std::size_t from = 0; from < m_parameters.size(); ++from) {
     const QString& value = m_parameters[from].currentValue();
-    if (!value.contains(QLatin1Char('$')))
+    if (!value.contains(QLatin1Char('$')) || m_parameters[from].isComputed())
       continue;
     for (const MacroReference& reference : macroReferences(value)) {
       if (!reference.isClosed || reference.isDeferred)
@@ -152,7 +161,8 @@ QString GlobalParameters::resolve(const QString& text, QStringList& open, int& b
   int length = text.size();
   QString resolved = replaceParameterReferences(text, [&](const QString& name, QString& replacement) {
     const Parameter* parameter = find(name);
-    if (!parameter || open.contains(parameter->name) || open.size() >= kMaximumNesting || --budget < 0)
+    if (!parameter || parameter->isComputed() || open.contains(parameter->name) ||
+        open.size() >= kMaximumNesting || --budget < 0)
       return false;
     open.append(parameter->name);
     replacement = resolve(parameter->currentValue(), open, budget);

@@ -4,6 +4,7 @@
 
 #include <platform/Export.h>
 #include <transform/core/WorkspaceParameterDirectory.h>
+#include <transform/custom/ScriptParameters.h>
 
 #include <QHash>
 #include <QString>
@@ -15,15 +16,20 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
  public:
   struct Parameter {
     QString name;
-    QString value;             // as stored: encoded where its type is
+    QString value;             // as stored: encoded where its type is, choices by their stored sides
     QString overridingValue;   // takes its place when isOverridden
     QString promptLine;        // when isPublished
     bool setInHeader = false;  // a header line sets it, so no statement of ours does
     bool isPublished = false;  // declared by a prompt line
     bool isOverridden = false;
     int line = 0;
+    ScriptLanguage language = ScriptLanguage::None;  // in which the value is a script, by the prompt line
 
     const QString& currentValue() const { return isOverridden ? overridingValue : value; }
+    // Whether a script gives the value when the mapping file runs.
+    bool isComputed() const {
+      return language != ScriptLanguage::None && !setInHeader && !isOverridden && !isUnsetValue(value);
+    }
   };
 
   // Takes "MACRO NAME VALUE" and "DEFAULT_MACRO NAME VALUE" statements; every other one is passed over.

@@ -143,6 +143,7 @@ void Validation::checkTransformers(const Workspace& workspace, bool isConnected)
                    knows, m_parameterNames);
     fit_checks::checkTransformer(*node.cfg, node.parameterLines, node.name, m_diagnostics,
                                  fit_checks::References::Known);
+    fit_checks::checkInside(*node.cfg, node.line, node.name, m_diagnostics);
     checkAge(*node.cfg, node.line, node.name, m_diagnostics);
   }
 }
@@ -240,6 +241,11 @@ void Validation::collectReferences(ReferencedNames& names) const {
   };
   for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList())
     addTransformers(m_reader.GetTransformerList(document));
+  for (const QString& document : m_reader.GetSubDocList()) {
+    const QHash<QString, QString> settings = m_reader.GetSubDocParms(document);
+    for (const char* name : {"PARALLELISM", "PARALLEL_GROUP_BY", "PARALLEL_PROCESS_SETTING"})
+      names.add(settings.value(QLatin1String(name)));
+  }
   // Also inside custom transformers, whose scripts see the global parameters.
   for (const QString& document : QStringList(QString()) + m_reader.GetSubDocList()) {
     for (const GlobalParameterStruct& parameter : m_reader.GetGlobalParameterList(document)) {

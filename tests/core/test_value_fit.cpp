@@ -14,12 +14,18 @@ TEST(ValueFit, OnlyPlainValuesAreJudged) {
     const char* unfit;
     Misfit misfit;
   } cases[] = {
-      {"CHOICE Red%\"Deep Blue\"", "|<Unused>|Red|Deep Blue|$(COLOUR)|@Value(c)|ORX_CONDITIONAL:x|@Lower(x)",
-       "red| |Deep|@Lower", Misfit::Choice},
+      {"CHOICE Red%\"Deep Blue\"",
+       "|<Unused>|Red|Deep "
+       "Blue|$(COLOUR)|@Value(c)|ORX_CONDITIONAL:x;Red;y;Deep<space>Blue|ORX_CONDITIONAL:x;"
+       "$(C);@Value(c)|@Lower(x)",
+       "red| |Deep|@Lower|ORX_CONDITIONAL:x;red|ORX_CONDITIONAL:x;Red;Deep", Misfit::Choice},
       {"CHOICE \"\"", "anything", "", Misfit::None},
       {"LOOKUP_CHOICE \"Deep Blue\",a<space>b%Red,R", "Deep Blue|a b|R", "a<space>b|Blue", Misfit::Choice},
-      {"LOOKUP_LISTBOX \"Deep Blue\",B%Red,R", "B R|\"Deep Blue\" R|Deep Blue|R", "B X|Deep", Misfit::Choice},
-      {"CHECKBOX", "YES|NO", "yes|1", Misfit::Choice},
+      {"LOOKUP_LISTBOX \"Deep Blue\",B%Red,R",
+       "B R|\"Deep Blue\"  R|Deep Blue|R|R @Value(a b)|$(C) R|ORX_CONDITIONAL:x;<quotationmark>Deep<space>"
+       "Blue<quotationmark><space>R",
+       "B X|Deep|X @Value(a)|ORX_CONDITIONAL:x;B<space>X|{Deep", Misfit::Choice},
+      {"CHECKBOX", "YES|NO|ORX_CONDITIONAL:x;YES;NO", "yes|1|ORX_CONDITIONAL:x;maybe", Misfit::Choice},
       {"CHECKBOX on%off", "on|off|$(X)", "YES|@Value", Misfit::Choice},
       {"INT", "0|-12| 7 |+3|99999999999999999999|@Value(n)", "5$(|$()|1.0|1e3|--1|-|x|&n|0x10|@Abs(1)",
        Misfit::WholeNumber},

@@ -127,6 +127,10 @@ QString inResults(const QString& value,
   return kConditionalPrefix + parts.join(kPartSeparator);
 }
 
+QString storedSideOf(const single_choices::Choice& choice) {
+  return choice.choices.toStored(choice.text);
+}
+
 }  // namespace
 
 QString single_choices::replaceIn(const GUIType& type, const ChoiceList& choices, const QString& value,
@@ -177,11 +181,22 @@ QString single_choices::replaceIn(const TransformParamCfg& parameter, const QStr
   };
   if (!value.startsWith(kConditionalPrefix))
     return inParts(value, nullptr);
-  return inResults(value, [&](const References& references, const QString& text) {
-    return inParts(text, &references);
-  });
+  return inResults(
+      value, [&](const References& references, const QString& text) { return inParts(text, &references); });
 }
 
 QString single_choices::toStored(const TransformParamCfg& parameter, const QString& value) {
-  return replaceIn(parameter, value, [](const Choice& choice) { return choice.choices.toStored(choice.text); });
+  return replaceIn(parameter, value, storedSideOf);
+}
+
+bool single_choices::refersToShownSide(const TransformParamCfg& parameter, const QString& value,
+                                       const Expand& expand) {
+  bool isShown = false;
+  replaceIn(parameter, value, [&](const Choice& choice) {
+    QString known = choice.text;
+    if (choice.refers && choice.choices.hasLookup() && expand(known))
+      isShown = isShown || replaceIn(choice.type, choice.choices, known, storedSideOf) != known;
+    return choice.text;
+  });
+  return isShown;
 }

@@ -23,8 +23,8 @@ struct Choice {
 };
 using Replace = std::function<QString(const Choice& choice)>;
 
-// The value with what `replace` makes of the text of each choice, packed as the value is; where nothing changes, the
-// value as it is. Types that offer no choices are passed over.
+// The value with what `replace` makes of the text of each choice, packed as the value is; where nothing
+// changes, the value as it is. Types that offer no choices are passed over.
 ORX_EXPORT QString replaceIn(const TransformParamCfg& parameter, const QString& value,
                              const Replace& replace);
 ORX_EXPORT QString replaceIn(const GUIType& type, const ChoiceList& choices, const QString& value,
@@ -32,5 +32,11 @@ ORX_EXPORT QString replaceIn(const GUIType& type, const ChoiceList& choices, con
 
 // The value with the stored side of each choice.
 ORX_EXPORT QString toStored(const TransformParamCfg& parameter, const QString& value);
+
+// Whether a reference among the choices leads to one as it is shown. `expand` puts the values of macros in
+// the places of references to them; false when that has no end.
+using Expand = std::function<bool(QString& text)>;
+ORX_EXPORT bool refersToShownSide(const TransformParamCfg& parameter, const QString& value,
+                                  const Expand& expand);
 
 }  // namespace single_choices

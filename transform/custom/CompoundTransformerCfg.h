@@ -77,6 +77,8 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   QHash<QString, QString> findUnwritableParameters() const;
   // One message for each port whose name the statements cannot carry.
   QStringList findUnwritablePorts() const;
+  // Why the settings of several processes cannot be written; empty when they can.
+  QString refuseParallel() const;
   // A message for the user; empty when instances can be written.
   QString instantiationFault() const;
   // The caller sees to it that every deferred reference, "$[", in a value or script is closed;

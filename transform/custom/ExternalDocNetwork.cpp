@@ -55,7 +55,7 @@ void ExternalDocNetwork::takeIdentity(const QHash<QString, QString>& settings) {
   m_guid = withoutBraces(settings.value(QStringLiteral("GUID")));
   m_isDeprecated = isYes(settings.value(QStringLiteral("DEPRECATED")));
   m_parallel = ParallelSettings();
-  m_parallel.parallelism = settings.value(QStringLiteral("PARALLELISM"), kNoParallelism);
+  m_parallel.parallelism = parallelLevel(settings.value(QStringLiteral("PARALLELISM"), kNoParallelism));
   m_parallel.groupBy = settings.value(QStringLiteral("PARALLEL_GROUP_BY"));
   m_parallel.processSetting = settings.value(QStringLiteral("PARALLEL_PROCESS_SETTING"));
   m_parallel.countSetting = settings.value(QStringLiteral("PARALLEL_COUNT_SETTING")).toInt();

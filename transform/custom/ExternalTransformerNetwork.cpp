@@ -32,7 +32,6 @@ enum Field {
 };
 
 const QLatin1String kYes("yes");
-const QLatin1String kNo("no");
 const QString kEmbeddedByDefault = QStringLiteral("Embedded by Default");
 const QLatin1String kLinkedAlways("Linked Always");
 const QString kTemporaryName = QStringLiteral("kx-custom-xform-ver-XXXXXX");
@@ -92,7 +91,7 @@ void ExternalTransformerNetwork::readHeader(int version) {
     m_insertMode = fields.at(kInsertMode);
   takeBlockedLooping(fields.value(kBlockedLooping) == kYes);
   ParallelSettings parallel = ExternalDocNetwork::getParallelSettings();
-  if (has(kParallelism) && fields.at(kParallelism) != kYes && fields.at(kParallelism) != kNo)
+  if (has(kParallelism) && parallelLevel(fields.at(kParallelism)) == fields.at(kParallelism))
     parallel.parallelism = fields.at(kParallelism);
   parallel.groupBy = fields.value(kGroupBy);
   parallel.processSetting = fields.value(kProcessSetting);

@@ -5,6 +5,11 @@ bool ParallelSettings::isEnabled() const {
   return !groupBy.isEmpty() || (!parallelism.isEmpty() && parallelism != kNoParallelism);
 }
 
+QString parallelLevel(const QString& setting) {
+  const bool isFlag = setting == QLatin1String("yes") || setting == QLatin1String("no");
+  return isFlag ? QString(kNoParallelism) : setting;
+}
+
 bool isParameterReference(const QString& text) {
   return text.startsWith(kMacroOpen) && text.endsWith(QLatin1Char(')'));
 }

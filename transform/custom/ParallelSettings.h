@@ -13,5 +13,8 @@ struct ParallelSettings {
   bool isEnabled() const;
 };
 
+// The level that a setting gives: "yes" and "no" are none.
+QString parallelLevel(const QString& setting);
+
 // "$(" NAME ")" as a whole.
 bool isParameterReference(const QString& text);

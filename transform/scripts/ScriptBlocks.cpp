@@ -2,6 +2,8 @@
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MappingFileKeywords.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
 
 #include <algorithm>
@@ -97,6 +99,34 @@ int firstNonBlank(const QString& line) {
     ++i;
   }
   return i;
+}
+
+// Whether a script asks for macros that may not be there, and goes on without them.
+bool minds(const QString& code, bool isPython) {
+  const QStringList marks = isPython
+                                ? QStringList{QStringLiteral("in ORX_MacroValues"), QStringLiteral("try:"),
+                                              QStringLiteral("ORX_MacroValues =")}
+                                : QStringList{QStringLiteral("info exists"), QStringLiteral("catch"),
+                                              QStringLiteral("try "), QStringLiteral("array ")};
+  return std::any_of(marks.begin(), marks.end(), [&](const QString& mark) { return code.contains(mark); });
+}
+
+// The macro that a key names, if it is spelt out and its value is read.
+QString nameRead(const QString& line, const ScriptKey& key, bool isPython) {
+  const QString text = line.mid(key.position, key.length).trimmed();
+  if (!isPython) {
+    const bool isSet = line.left(key.position).contains(QLatin1String("set ORX_MacroValues("));
+    const bool isSpelt = std::none_of(text.begin(), text.end(), [](QChar c) {
+      return c == QLatin1Char('$') || c == QLatin1Char('[') || c == kBackslash;
+    });
+    return isSpelt && !isSet ? text : QString();
+  }
+  const QString name = literalPythonKey(text);
+  const bool isSpelt =
+      name.size() + 2 == text.size() && !name.contains(text.at(0)) && !name.contains(kBackslash);
+  const QString behind = line.mid(key.position + key.length + 1).trimmed();
+  const bool isSet = behind.startsWith(QLatin1Char('=')) && !behind.startsWith(QLatin1String("=="));
+  return isSpelt && !isSet ? name : QString();
 }
 
 }  // namespace
@@ -197,4 +227,26 @@ void getTclParameterLines(const QString& prefix, const QString& parameterName, c
           << QStringLiteral("puts \"MACRO $macroName [ParamFunc]\" ");
   }
   lines << kIncludeEnd;
+}
+
+QString unsetReadByScript(bool isPython, const QString& parameterName, const QString& encodedCode,
+                          const std::function<bool(const QString& name)>& isSetBefore,
+                          const std::function<bool(const QString& name)>& isSetBehind) {
+  const QStringList lines = scriptCodeLines(encodedCode);
+  if (minds(lines.join(QLatin1Char('\n')), isPython))
+    return QString();
+  for (const QString& line : lines) {
+    if (line.trimmed().startsWith(QLatin1Char('#')))
+      continue;
+    for (const ScriptKey& key : isPython ? redirectedPythonKeys(line) : redirectedTclKeys(line)) {
+      const QString name = nameRead(line, key, isPython);
+      if (name.isEmpty() || isSetBefore(name))
+        continue;
+      const long reason = name != parameterName && isSetBehind(name) ? orx::messages::kScriptReadsLater
+                                                                     : orx::messages::kScriptReadsUnknown;
+      return TransformResString(orx::messages::kScriptRefused,
+                                {parameterName, TransformResString(reason, name)});
+    }
+  }
+  return QString();
 }

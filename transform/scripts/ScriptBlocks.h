@@ -7,6 +7,8 @@
 #include <QStringList>
 #include <QVector>
 
+#include <functional>
+
 // The encoded code as lines; no lines for an empty code. Line ends of the form CR LF count as LF.
 QStringList scriptCodeLines(const QString& encodedCode);
 
@@ -39,3 +41,10 @@ ORX_EXPORT bool canWritePythonParameter(const QString& prefix, const QString& pa
 // value is empty.
 ORX_EXPORT bool canWriteTclParameter(const QString& prefix, const QString& parameterName,
                                      const QString& encodedCode, QString& reason);
+
+// Why a script that can be written cannot be run where it stands: it reads a macro that is not set before.
+// Empty when nothing is wrong. Only names that the code spells out are judged, and none of a script that
+// looks whether macros are there, or catches errors.
+ORX_EXPORT QString unsetReadByScript(bool isPython, const QString& parameterName, const QString& encodedCode,
+                                     const std::function<bool(const QString& name)>& isSetBefore,
+                                     const std::function<bool(const QString& name)>& isSetBehind);

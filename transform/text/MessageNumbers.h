@@ -425,5 +425,10 @@ constexpr long kParameterCircle = 371400;
 // Names.
 constexpr long kReferenceInName = 370940;
 constexpr long kShownSideReferred = 371321;
+constexpr long kShownSideWritten = 371322;
+constexpr long kParallelByFeature = 371323;
+constexpr long kNoParallelLevel = 371324;
+constexpr long kScriptReadsUnknown = 371325;
+constexpr long kScriptReadsLater = 371326;
 
 }  // namespace orx::messages

@@ -1,8 +1,11 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/core/SingleChoices.h>
+#include <transform/core/TransformParamCfg.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/NestedQuestion.h>
+#include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
@@ -246,6 +249,40 @@ void MappingFileWriter::checkAttributes(const WorkspaceNode& node) {
   }
 }
 
+// A script sees what stands before it.
+QString MappingFileWriter::refuseScript(const GlobalParameters::Parameter& parameter) const {
+  const bool isPython = parameter.language == ScriptLanguage::Python;
+  QString message;
+  if (isPython ? !canWritePythonParameter(QString(), parameter.name, parameter.value, message)
+               : !canWriteTclParameter(QString(), parameter.name, parameter.value, message))
+    return message;
+  const bool includesOthers =
+      std::any_of(m_workspace.headerLines.begin(), m_workspace.headerLines.end(),
+                  [](const QString& line) { return line.startsWith(QLatin1String("INCLUDE ")); });
+  const auto isSetBefore = [&](const QString& name) {
+    const GlobalParameters::Parameter* read = m_workspace.parameters.find(name);
+    return read ? read->setInHeader || read < &parameter : includesOthers;
+  };
+  return unsetReadByScript(isPython, parameter.name, parameter.value, isSetBefore,
+                           [&](const QString& name) { return m_workspace.parameters.find(name) != nullptr; });
+}
+
+void MappingFileWriter::checkChoices(const GlobalParameters::Parameter& parameter) {
+  const TransformParamCfg record(GUIType::fromGuiLine(parameter.promptLine));
+  const QString& value = parameter.currentValue();
+  const QString stored = single_choices::toStored(record, value);
+  QString reason;
+  if (stored != value)
+    reason = TransformResString(messages::kShownSideWritten, {value, stored});
+  else if (single_choices::refersToShownSide(record, value, [this](QString& text) {
+             text = m_workspace.parameters.resolve(MFBuffer::withOrdinaryMacros(text));
+             return true;
+           }))
+    reason = TransformResString(messages::kShownSideReferred);
+  if (!reason.isEmpty())
+    m_diagnostics.reportUnwritable(parameter.line, QString(), parameter.name, reason);
+}
+
 void MappingFileWriter::checkParameter(const GlobalParameters::Parameter& parameter, const QString& value) {
   const bool isSound = checkText(value, parameter.name, parameter.line, QString());
   long reason = TextPlaces::refuse(TextPlace::MacroName, parameter.name);
@@ -257,6 +294,11 @@ void MappingFileWriter::checkParameter(const GlobalParameters::Parameter& parame
 
 void MappingFileWriter::checkParameters() {
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
+    if (parameter.isPublished)
+      checkChoices(parameter);
+    const QString script = parameter.isComputed() ? refuseScript(parameter) : QString();
+    if (!script.isEmpty())
+      m_diagnostics.reportUnwritable(parameter.line, QString(), parameter.name, script);
     if (!parameter.setInHeader)
       checkParameter(parameter, parameter.value);
     if (parameter.isOverridden)
@@ -343,7 +385,14 @@ bool MappingFileWriter::write(MFBuffer& buffer) {
 void MappingFileWriter::writeParameters(MFBuffer& buffer) const {
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
     const QString name = parameter.name + QLatin1Char(' ');
-    if (!parameter.setInHeader)
+    QStringList script;
+    if (parameter.isComputed() && parameter.language == ScriptLanguage::Python)
+      getPythonParameterLines(QString(), parameter.name, parameter.value, script);
+    else if (parameter.isComputed())
+      getTclParameterLines(QString(), parameter.name, parameter.value, script);
+    for (const QString& line : qAsConst(script))
+      writeStatement(buffer, line);
+    if (!parameter.setInHeader && parameter.language == ScriptLanguage::None)
       writeStatement(buffer, kDefaultMacroStatement + name + parameter.value);
     if (parameter.isOverridden)
       writeStatement(buffer, kMacroStatement + name + parameter.overridingValue);

@@ -36,6 +36,8 @@ class MappingFileWriter {
   void pushAttributes();
   void check();
   void checkParameters();
+  QString refuseScript(const GlobalParameters::Parameter& parameter) const;
+  void checkChoices(const GlobalParameters::Parameter& parameter);
   void checkParameter(const GlobalParameters::Parameter& parameter, const QString& value);
   // False when something was reported.
   bool checkText(const QString& text, const QString& what, int line, const QString& node);

@@ -10,6 +10,9 @@ class WorkspaceListener : public ParameterScopeListener {
   // `parameters` is not owned and must outlive the listener.
   explicit WorkspaceListener(const GlobalParameters& parameters) : m_parameters(parameters) {}
 
+  // What a script gives is not known before it has run.
+  bool expandMacros(const TransformerCfg& cfg, QString& text) const override;
+
  protected:
   bool isScopeParameter(const QString& name) const override;
   QString resolve(const QString& value) const override;

@@ -1,8 +1,14 @@
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueFit.h>
+#include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/NestedNetworks.h>
 #include <transform/findings/Findings.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MacroText.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/ParameterLines.h>
 #include <transform/workspace/WorkspaceRecords.h>
@@ -24,23 +30,60 @@ void report(const std::vector<ValueFit>& misfits, const TransformParamCfg& param
   }
 }
 
-}  // namespace
-
-void fit_checks::checkTransformer(const TransformerCfg& cfg, const ParameterLines& lines,
-                                  const QString& title, orx::Findings& findings, References references) {
-  const auto expand = [&cfg](QString& text) {
+ValueFit::Expand expanding(const TransformerCfg& cfg) {
+  return [&cfg](QString& text) {
     text = MFBuffer::withOrdinaryMacros(text);
     if (cfg.listener())
       cfg.listener()->expandMacros(cfg, text);
   };
+}
+
+}  // namespace
+
+void fit_checks::checkTransformer(const TransformerCfg& cfg, const ParameterLines& lines,
+                                  const QString& title, orx::Findings& findings, References references) {
   for (const QString& name : cfg.getParameters()) {
+    // It follows the level of parallel processing, which is judged itself.
+    if (name == kProcessCountDisplayParameter)
+      continue;
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
-    const std::vector<ValueFit> misfits = ValueFit::misfitsOf(
-        *parameter, parameter->getValue(), references == References::Known ? expand : ValueFit::Expand());
+    const std::vector<ValueFit> misfits =
+        ValueFit::misfitsOf(*parameter, parameter->getValue(),
+                            references == References::Known ? expanding(cfg) : ValueFit::Expand());
     QString refusal;
     if (!misfits.empty() && cfg.validateParameter(name, refusal))
       report(misfits, *parameter, lines.of(name), title, findings);
   }
+}
+
+void fit_checks::checkInside(const TransformerCfg& cfg, int line, const QString& title,
+                             orx::Findings& findings) {
+  CompoundTransformerNetwork* network = networkOf(&cfg);
+  if (!network)
+    return;
+  const TransformerCfg* before = network->attributeOwner();
+  network->setAttributeOwner(&cfg);
+  for (const TransformerCfg* inner : network->getTransformers()) {
+    const QString path = title + QLatin1Char('/') + inner->getIdentifier();
+    const ValueFit::Expand expand = expanding(*inner);
+    for (const QString& name : inner->getParameters()) {
+      const TransformParamCfg* parameter = inner->getParameterByMacroName(name);
+      if (name == kProcessCountDisplayParameter || !beginsMacroReference(parameter->getValue()))
+        continue;
+      report(ValueFit::misfitsOf(*parameter, parameter->getValue(), expand), *parameter, line, path,
+             findings);
+      const bool isLookedUp = !isCustomTransformer(inner) && parameter->choices().hasLookup() &&
+                              !parameter->getValue().startsWith(kConditionalPrefix) &&
+                              name != kProcessCountParameter && name != kGroupsOrderedParameter;
+      if (!isLookedUp &&
+          single_choices::refersToShownSide(*parameter, parameter->getValue(), [&](QString& text) {
+            expand(text);
+            return true;
+          }))
+        findings.reportUnwritable(line, path, name, TransformResString(orx::messages::kShownSideReferred));
+    }
+  }
+  network->setAttributeOwner(before);
 }
 
 void fit_checks::checkParameters(const IXMLComponentReader& reader, const GlobalParameters& parameters,
@@ -54,7 +97,13 @@ void fit_checks::checkParameters(const IXMLComponentReader& reader, const Global
       const GlobalParameters::Parameter* known =
           document.isEmpty() ? parameters.find(parameter.getName()) : nullptr;
       const bool isSetElsewhere = known && (known->setInHeader || known->isOverridden);
-      report(ValueFit::misfitsOf(parameter, isSetElsewhere ? known->currentValue() : record.defaultValue),
+      // Inside a custom transformer the values of the instances count, which are judged there.
+      const auto expand = [&](QString& text) {
+        if (document.isEmpty())
+          text = parameters.resolve(MFBuffer::withOrdinaryMacros(text));
+      };
+      report(ValueFit::misfitsOf(parameter, isSetElsewhere ? known->currentValue() : record.defaultValue,
+                                 expand),
              parameter, isSetElsewhere ? known->line : record.line, document, findings);
     }
   }

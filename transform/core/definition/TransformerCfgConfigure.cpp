@@ -3,6 +3,7 @@
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/ParallelLevels.h>
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/definition/CompiledTemplate.h>
@@ -21,8 +22,7 @@ namespace {
 const QLatin1String kNoStored("No");
 const QLatin1String kYesStored("Yes");
 
-// The levels of parallelism: stored, shown, and the one from the other.
-const QLatin1String kProcessCountType("CHOICE NO_PARALLELISM%MINIMAL%MODERATE%AGGRESSIVE%EXTREME");
+// The levels of parallelism: shown, and as they are stored.
 const QLatin1String kProcessCountDisplayType(
     "CHOICE \"No Parallelism\"%\"Minimal\"%\"Moderate\"%\"Aggressive\"%\"Extreme\"");
 const QLatin1String kProcessCountLookup(
@@ -179,9 +179,9 @@ void TransformerCfg::addDefaultParms() {
   if (configured().fields.multiProcess.isEmpty()) {
     return;
   }
-  add(makeParameter(kProcessCountType, kProcessCountParameter,
-                    TransformResStringIn(language, messages::kProcessCountPrompt), kProcessCountDefault,
-                    QStringList(kProcessCountLookup)));
+  add(makeParameter(QLatin1String("CHOICE ") + parallelLevels().join(QLatin1Char('%')),
+                    kProcessCountParameter, TransformResStringIn(language, messages::kProcessCountPrompt),
+                    kProcessCountDefault, QStringList(kProcessCountLookup)));
   add(makeParameter(kProcessCountDisplayType, kProcessCountDisplayParameter, QString(),
                     kProcessCountDefault));
   const auto entry = [&language](long shown, QLatin1String stored) {

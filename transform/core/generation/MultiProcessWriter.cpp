@@ -1,4 +1,6 @@
+#include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/generation/MultiProcessWriter.h>
 #include <transform/text/MFBuffer.h>
@@ -7,7 +9,32 @@
 
 #include <algorithm>
 
+namespace {
+
+// What also turns parallelism off.
+const QLatin1String kNo("NO");
+
+}  // namespace
+
 namespace multi_process_writer {
+
+Settings settingsOf(const TransformerCfg& cfg) {
+  Settings settings;
+  const ConfiguredDefinition* definition = cfg.definition();
+  if (!definition || definition->fields.multiProcess.isEmpty()) {
+    return settings;
+  }
+  const auto stored = [&cfg](const QString& name, UnpackLevel level) {
+    const TransformParamCfg* record = cfg.getParameterByMacroName(name);
+    return record ? single_choices::toStored(*record, cfg.getParameterValue(name, level)) : QString();
+  };
+  settings.groupBy = cfg.getParameterValue(definition->fields.multiProcess);
+  settings.parallelism = stored(kProcessCountParameter, UnpackLevel::Stored);
+  settings.processSetting = stored(kGroupsOrderedParameter, UnpackLevel::Stored);
+  const QString level = stored(kProcessCountParameter, UnpackLevel::Resolved);
+  settings.isEnabled = level != kNoParallelism && level != kNo && settings.groupBy != kUnusedGroupBy;
+  return settings;
+}
 
 bool write(MFBuffer& buffer, const TransformerCfg& cfg, const QString& groupBy, const QString& parallelism,
            const QString& processSetting) {

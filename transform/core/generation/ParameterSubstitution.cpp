@@ -103,8 +103,15 @@ void ParameterSubstitution::collect(std::size_t position, MFBuffer& buffer) {
   const QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
   if (record.isMultiParameter()) {
     const QStringList parts = partsOf(record, value);
+    QSet<QString> given;
     for (int i = 0; i + 1 < parts.size(); i += 2) {
       add(parts.at(i), parts.at(i + 1), record.members().find(parts.at(i)), true);
+      given.insert(parts.at(i));
+    }
+    for (const GUIType& member : record.members().members()) {
+      if (!given.contains(member.getName())) {
+        add(member.getName(), QString(), nullptr, false);
+      }
     }
     return;
   }

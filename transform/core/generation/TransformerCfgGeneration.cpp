@@ -39,7 +39,6 @@ namespace {
 
 const QLatin1String kSchemaType("varchar(255)");
 const QLatin1String kUserTypedEnd("_USERTYPED)");
-const QLatin1String kNo("NO");
 
 }  // namespace
 
@@ -50,26 +49,18 @@ bool TransformerCfg::instantiate(MFBuffer& buffer, const QString&, bool inlineFl
   const bool before = buffer.getReplaceDeferredMacros();
   buffer.setReplaceDeferredMacros(true);
   const auto restore = qScopeGuard([&] { buffer.setReplaceDeferredMacros(before); });
-  const QString& groupByParameter = configured().fields.multiProcess;
-  if (!groupByParameter.isEmpty()) {
-    const auto stored = [this](const QString& name) {
-      const TransformParamCfg* record = getParameterByMacroName(name);
-      return record ? record->choices().toStored(getParameterValue(name)) : QString();
-    };
-    const QString parallelism = stored(kProcessCountParameter);
-    const QString groupBy = getParameterValue(groupByParameter);
-    if (parallelism != kNoParallelism && parallelism != kNo && groupBy != kUnusedGroupBy) {
-      // The factory is of no use without the statements that its workers run.
-      NullBuffer unused;
-      unused.setReplaceDeferredMacros(true);
-      const int count = m_instantiationCounter;
-      if (!doInstantiate(unused, inlineFlag) ||
-          !multi_process_writer::write(buffer, *this, groupBy, parallelism,
-                                       stored(kGroupsOrderedParameter))) {
-        return false;
-      }
-      m_instantiationCounter = count;
+  const multi_process_writer::Settings parallel = multi_process_writer::settingsOf(*this);
+  if (parallel.isEnabled) {
+    // The factory is of no use without the statements that its workers run.
+    NullBuffer unused;
+    unused.setReplaceDeferredMacros(true);
+    const int count = m_instantiationCounter;
+    if (!doInstantiate(unused, inlineFlag) ||
+        !multi_process_writer::write(buffer, *this, parallel.groupBy, parallel.parallelism,
+                                     parallel.processSetting)) {
+      return false;
     }
+    m_instantiationCounter = count;
   }
   return doInstantiate(buffer, inlineFlag);
 }
@@ -340,7 +331,7 @@ QString TransformerCfg::lookedUp(MFBuffer& buffer, const QString& name, const Tr
   }
   switch (kind) {
     case LookupKind::None:
-      return value;
+      return isUnsetValue(value) ? value : single_choices::toStored(record, value);
     case LookupKind::RunTime: {
       const bool isOptional = record.getFlag(kGUITypeOptional);
       if (ORX_isListBoxType(record)) {
@@ -440,7 +431,8 @@ QString TransformerCfg::getTransformerParams() const {
       list += QLatin1Char(',');
     }
     list += QORXWwjdEncode(name) + QLatin1Char(',') +
-            encodeAroundReferences(stripBasicStringInfo(getParameterValue(name)));
+            encodeAroundReferences(
+                stripBasicStringInfo(single_choices::toStored(record, getParameterValue(name))));
   }
   return list;
 }

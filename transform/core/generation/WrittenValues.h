@@ -19,13 +19,12 @@ class WrittenValues {
   // Whether the value is also written as a quoted word: in the list of values, or beside the workers.
   bool isWord(const TransformParamCfg& record) const;
   bool mayEndLine(const TransformParamCfg& record) const;
+  bool isMultiProcessSetting(const TransformParamCfg& record) const;
 
   // Labels and frames of a dialog have no value.
   static bool hasValue(const TransformParamCfg& record);
 
  private:
-  bool isMultiProcessSetting(const TransformParamCfg& record) const;
-
   const TransformerCfg& m_cfg;
   const CompiledTemplate* const m_compiled;  // null without a template: the values are written as macros
   const bool m_bringsTokens;

@@ -9,9 +9,11 @@
 #include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
+#include <transform/core/ValueReferences.h>
 #include <transform/core/definition/CompiledTemplate.h>
 #include <transform/core/generation/LookupDecision.h>
 #include <transform/core/generation/LookupWriters.h>
+#include <transform/core/generation/MultiProcessWriter.h>
 #include <transform/core/validation/MappingFileChecks.h>
 #include <transform/core/validation/OwnTokens.h>
 #include <transform/text/MacroText.h>
@@ -62,6 +64,9 @@ QHash<QString, QString> MappingFileChecks::find() const {
 long MappingFileChecks::refuse(const TransformParamCfg& record) const {
   const QString& name = record.getName();
   const QString stored = stripBasicStringInfo(m_cfg.getParameterValue(name));
+  if (const long number = refuseParallelSetting(record, stored)) {
+    return number;
+  }
   if (const long number = refuseLookup(record, stored)) {
     return number;
   }
@@ -205,18 +210,20 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
   return isBare ? messages::kShownSideReferred : refuseListBox(choices, lookup);
 }
 
-// Whether a reference among the choices gives one as it is shown, and no fragment looks it up.
 bool MappingFileChecks::refersToShownSide(const TransformParamCfg& record, const QString& value) const {
-  bool isShown = false;
-  single_choices::replaceIn(record, value, [&](const single_choices::Choice& choice) {
-    QString known = choice.text;
-    if (choice.refers && choice.choices.hasLookup() && expandMacros(known)) {
-      const auto toStored = [](const single_choices::Choice& one) { return one.choices.toStored(one.text); };
-      isShown = isShown || single_choices::replaceIn(choice.type, choice.choices, known, toStored) != known;
-    }
-    return choice.text;
-  });
-  return isShown;
+  return single_choices::refersToShownSide(record, value,
+                                           [this](QString& text) { return expandMacros(text); });
+}
+
+// These values go into a statement as they are stored, and nothing looks them up.
+long MappingFileChecks::refuseParallelSetting(const TransformParamCfg& record, const QString& stored) const {
+  if (!m_written.isMultiProcessSetting(record) || !multi_process_writer::settingsOf(m_cfg).isEnabled) {
+    return 0;
+  }
+  if (stored.startsWith(kConditionalPrefix) || beginsValueReference(stored)) {
+    return messages::kParallelByFeature;
+  }
+  return refersToShownSide(record, stored) ? messages::kShownSideReferred : 0;
 }
 
 // Choices may refer to macros as well; those that do must fit wherever they stand.

@@ -34,6 +34,7 @@ class MappingFileChecks {
   long refuse(const TransformParamCfg& record) const;
   long refuseIdentifier(const QString& value) const;
   long refuseLookup(const TransformParamCfg& record, const QString& value) const;
+  long refuseParallelSetting(const TransformParamCfg& record, const QString& stored) const;
   bool refersToShownSide(const TransformParamCfg& record, const QString& value) const;
   // What stands where the template has the token of a parameter, or of a member.
   long refuseToken(const GUIType& type, const QString& stored, const QString& written) const;

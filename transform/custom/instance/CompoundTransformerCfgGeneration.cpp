@@ -1,6 +1,8 @@
 // What an instance of a custom transformer writes into the mapping file.
 #include <transform/core/LookupChecks.h>
+#include <transform/core/ParallelLevels.h>
 #include <transform/core/ParameterReferences.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueReferences.h>
 #include <transform/custom/CompoundTransformerCfg.h>
@@ -206,9 +208,10 @@ QStringList CompoundTransformerCfg::parameterStatements(const QString& prefixMac
 
 QString CompoundTransformerCfg::macroValue(const QString& parameter, const GUIType& type,
                                            const QString& prefixMacro) const {
-  const QString value = stripBasicStringInfo(
-      getParameterValueForMappingFile(getParameterValue(parameter), type.valueIsEncoded(), false));
   const TransformParamCfg* record = getParameterByMacroName(parameter);
+  const QString stored = getParameterValue(parameter);
+  const QString value = stripBasicStringInfo(getParameterValueForMappingFile(
+      record ? single_choices::toStored(*record, stored) : stored, type.valueIsEncoded(), false));
   return record && record->getFlag(kGUITypeInstanceMacros) && !prefixMacro.isEmpty()
              ? redirectReferences(MFBuffer::withOrdinaryMacros(value), prefixMacro, *this)
              : value;
@@ -219,6 +222,7 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
   const bool isApart = m_network && isRunApart(*m_network, *this);
   std::optional<LookedUpParameters> lookedUp;  // found when the first value asks for them
   QHash<QString, QString> messages;
+  QSet<QString> before;
   for (const QString& parameter : getParameters()) {
     const GUIType& type = getParameterGUIType(parameter);
     const QString stored = getParameterValue(parameter);
@@ -233,7 +237,9 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
       const bool isPython = language == ScriptLanguage::Python;
       if (isPython ? canWritePythonParameter(prefix, parameter, stored, message)
                    : canWriteTclParameter(prefix, parameter, stored, message))
-        message.clear();
+        message = unsetReadByScript(
+            isPython, parameter, stored, [&](const QString& name) { return before.contains(name); },
+            [this](const QString& name) { return hasParameter(name); });
       if (isPython)
         getPythonParameterLines(prefix, parameter, stored, lines);
       else
@@ -251,6 +257,7 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
     }
     if (!message.isEmpty())
       messages.insert(parameter, message);
+    before.insert(parameter);
   }
   return messages;
 }
@@ -312,10 +319,31 @@ long CompoundTransformerCfg::refuseSetting(const QString& parameter) const {
   return 0;
 }
 
+// The level stands in the statement as it is stored; inside another custom transformer only its instances
+// know what a reference gives.
+QString CompoundTransformerCfg::refuseParallel() const {
+  const ParallelSettings settings = parallelSettingsOf(*m_network, *this);
+  for (const QString& setting : {settings.groupBy, settings.parallelism, settings.processSetting}) {
+    if (setting.startsWith(kConditionalPrefix) || beginsValueReference(setting))
+      return TransformResString(messages::kParallelByFeature);
+  }
+  QString level = MFBuffer::withOrdinaryMacros(settings.parallelism);
+  if (listener())
+    listener()->expandMacros(*this, level);
+  const bool isOpen = listener() && listener()->isRunTimeValue(*this, level);
+  if (level.isEmpty() || isOpen || parallelLevels().contains(level))
+    return QString();
+  return TransformResString(messages::kNoParallelLevel, {level, m_network->getParallelSettings().parallelism,
+                                                         parallelLevels().join(QLatin1String(", "))});
+}
+
 QStringList CompoundTransformerCfg::findUnwritablePorts() const {
   QStringList messages;
   if (!m_network)
     return messages;
+  const QString parallelFault = refuseParallel();
+  if (!parallelFault.isEmpty())
+    messages.append(parallelFault);
   // Loops and transform factories name the ports as they are.
   const bool isBare = isRunApart(*m_network, *this);
   // What is wrong with it wherever it stands is told where the definition is embedded.
@@ -348,6 +376,10 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
     return messages::kBlankAtEnd;
   if (getParameterValue(parameter).startsWith(kConditionalPrefix))
     return messages::kConditionInMacro;
+  const TransformParamCfg* record = getParameterByMacroName(parameter);
+  const auto expand = [this](QString& text) { return !listener() || listener()->expandMacros(*this, text); };
+  if (record && single_choices::refersToShownSide(*record, getParameterValue(parameter), expand))
+    return messages::kShownSideReferred;
   QString expanded = MFBuffer::withOrdinaryMacros(value);
   const bool ends = !listener() || listener()->expandMacros(*this, expanded);
   // The name stands in quotes as it is.

@@ -1,6 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/ParameterReferences.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/NestedQuestion.h>
@@ -21,8 +22,10 @@ constexpr auto kKind = NestedQuestion::Kind::Value;
 
 QString InnerTransformerListener::valueOf(const QString& parameter) const {
   const TransformerCfg* instance = m_network.attributeOwner();
-  return instance ? instance->getParameterValue(parameter, UnpackLevel::Resolved)
-                  : m_network.getParameterInfo(parameter)->defaultValue;
+  const QString value = instance ? instance->getParameterValue(parameter, UnpackLevel::Resolved)
+                                 : m_network.getParameterInfo(parameter)->defaultValue;
+  const GUIType& type = m_network.getParameterInfo(parameter)->type;
+  return ORX_isChoiceType(type) ? single_choices::toStored(TransformParamCfg(type), value) : value;
 }
 
 QString InnerTransformerListener::resolve(const QString& value) const {
