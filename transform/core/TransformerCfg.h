@@ -23,7 +23,6 @@
 #include <QString>
 #include <QStringList>
 
-#include <functional>
 #include <memory>
 #include <typeinfo>
 #include <vector>
@@ -35,15 +34,18 @@ class ConfiguredDefinition;
 class DefinitionDirectory;
 class IORXSession;
 class MFBuffer;
-class OrderedSubstitution;
 class ParameterSubstitution;
 class QTextStream;
-class TemplateExpansion;
+class Substitution;
 class TransformerCfgListener;
 class TransformerSource;
 class WorkspaceParameterDirectory;
 struct PreservedAttributes;
 struct TransformerDefinition;
+
+namespace port_texts {
+class Texts;
+}
 
 // What addAttributesToList() adds: attributes that a parameter's value names.
 struct AddAttributesInfo {
@@ -455,19 +457,13 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   // The statements of this instance, without writing them. False when values insert each other without end.
   bool expandTemplate(MFBuffer& buffer, QStringList& lines);
   bool expandInOrder(ParameterSubstitution& values, MFBuffer& buffer, QStringList& lines) const;
-  void substParameters(ParameterSubstitution& values, MFBuffer& buffer, QStringList& lines) const;
-  // The lines that are left; notes when a substitution would have grown beyond all measure.
-  QStringList takeLines(const OrderedSubstitution& ordered) const;
+  // Runs the step over the lines; notes when a substitution would have grown beyond all measure.
+  template <class Step>
+  void substitute(QStringList& lines, Step step) const;
+  port_texts::Texts portTexts() const;
   // Whether some text that is to be inserted holds a token itself, so that the order matters.
-  bool bringsTokens(const ParameterSubstitution& values) const;
-  void fillPorts(TemplateExpansion& expansion, const CompiledTemplate& compiled) const;
-  void forEachInputText(const std::function<void(const QString& token, const QString& text)>& visit) const;
-  // The type is null for an output that leaves no trace.
-  void forEachOutputText(const std::function<void(const QString& tag, const QString* featureType,
-                                                  const QString& functions)>& visit) const;
-  void fillInstanceTokens(
-      const std::function<bool(const QString& token)>& holds,
-      const std::function<void(const QString& token, const QString& text)>& substitute) const;
+  static bool bringsTokens(const ParameterSubstitution& values, const port_texts::Texts& ports);
+  void putInstanceTokens(Substitution& lines) const;
   QString lookedUp(MFBuffer& buffer, const QString& name, const TransformParamCfg& record,
                    const QString& value) const;
 

@@ -1,6 +1,8 @@
+#include <transform/core/GenerationKeywords.h>
 #include <transform/core/PortTables.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/attributes/PortTexts.h>
+#include <transform/core/generation/Substitution.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {
@@ -32,32 +34,48 @@ QStringList inputLines(const TransformerCfg& cfg, const PortTables& ports, const
   return lines;
 }
 
-QString InputTexts::add(const TransformerCfg& cfg, const PortTables& ports, const QString& tag) {
-  QString text;
-  for (const QString& line : inputLines(cfg, ports, tag)) {
-    if (!text.isEmpty()) {
-      text += kIndent;
+void Texts::addInputs(const TransformerCfg& cfg, const PortTables& ports) {
+  QString all;
+  QStringList tags;
+  cfg.getInputTags(tags);
+  for (const QString& tag : std::as_const(tags)) {
+    QString text;
+    for (const QString& line : inputLines(cfg, ports, tag)) {
+      text += (text.isEmpty() ? QString() : QString(kIndent)) + line + QLatin1Char('\n');
     }
-    text += line + QLatin1Char('\n');
+    all += (all.isEmpty() ? QString() : QString(kIndent)) + text;
+    m_texts.push_back({kInputTokenStart + tag + kInputTokenEnd, text});
   }
-  if (!m_text.isEmpty()) {
-    m_text += kIndent;
-  }
-  m_text += text;
-  return text;
+  m_texts.push_back({kInputLinesToken, all});
 }
 
-bool isOutputWritten(const TransformerCfg& cfg, const QString& tag, QString& featureType) {
-  const bool isConnected = cfg.getOutputFeatureType(tag, featureType) && !featureType.isEmpty();
-  return isConnected || cfg.nukersRequired();
+void Texts::addOutputs(const TransformerCfg& cfg) {
+  QStringList tags;
+  cfg.getOutputTags(tags);
+  for (const QString& tag : std::as_const(tags)) {
+    QString featureType;
+    const bool isConnected = cfg.getOutputFeatureType(tag, featureType) && !featureType.isEmpty();
+    if (!isConnected && !cfg.nukersRequired()) {
+      m_texts.push_back({tag, QString(), true});
+      continue;
+    }
+    QString functions;
+    for (const QString& function : cfg.getOutputTagFuncs(tag)) {
+      functions += QLatin1String("    ") + function + QLatin1Char('\n');
+    }
+    m_texts.push_back({kOutputTokenStart + tag + kFeatureTypeTokenEnd, quotifyStringForMF(featureType)});
+    m_texts.push_back({kOutputTokenStart + tag + kFunctionsTokenEnd, functions});
+  }
 }
 
-QString outputFunctions(const TransformerCfg& cfg, const QString& tag) {
-  QString text;
-  for (const QString& function : cfg.getOutputTagFuncs(tag)) {
-    text += QLatin1String("    ") + function + QLatin1Char('\n');
+void Texts::putInto(Substitution& lines) const {
+  for (const Text& text : m_texts) {
+    if (text.isRemoved) {
+      lines.removeOutput(text.token);
+    } else {
+      lines.substitute(text.token, text.text);
+    }
   }
-  return text;
 }
 
 }  // namespace port_texts

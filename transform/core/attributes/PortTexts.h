@@ -4,6 +4,10 @@
 #include <QString>
 #include <QStringList>
 
+#include <algorithm>
+#include <vector>
+
+class Substitution;
 class TransformParamCfg;
 class TransformerCfg;
 struct PortTables;
@@ -13,18 +17,26 @@ namespace port_texts {
 // "INPUT NAME FEATURE_TYPE type[ filter]" for each feature type that is connected to the tag.
 QStringList inputLines(const TransformerCfg& cfg, const PortTables& ports, const QString& tag);
 
-// What the input tokens stand for: the text of each tag, and of all that were added.
-class InputTexts {
+// What the tokens of inputs and outputs stand for, each in the order in which it is put in.
+class Texts {
  public:
-  QString add(const TransformerCfg& cfg, const PortTables& ports, const QString& tag);
-  const QString& text() const { return m_text; }
+  void addInputs(const TransformerCfg& cfg, const PortTables& ports);
+  void addOutputs(const TransformerCfg& cfg);
+
+  void putInto(Substitution& lines) const;
+  template <class Holds>
+  bool allOf(Holds holds) const {
+    return std::all_of(m_texts.begin(), m_texts.end(), [&](const Text& text) { return holds(text.text); });
+  }
 
  private:
-  QString m_text;
-};
+  struct Text {
+    QString token;  // of an output that leaves no trace, its tag
+    QString text;
+    bool isRemoved = false;
+  };
 
-// False when the output leaves no trace.
-bool isOutputWritten(const TransformerCfg& cfg, const QString& tag, QString& featureType);
-QString outputFunctions(const TransformerCfg& cfg, const QString& tag);
+  std::vector<Text> m_texts;
+};
 
 }  // namespace port_texts

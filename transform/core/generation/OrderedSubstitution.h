@@ -5,26 +5,28 @@
 // A line that a substitution leaves blank goes away at once; lines that were blank before stay.
 #pragma once
 
+#include <transform/core/generation/Substitution.h>
+
 #include <QHash>
 #include <QString>
 #include <QStringList>
 
 #include <vector>
 
-class OrderedSubstitution {
+class OrderedSubstitution : public Substitution {
  public:
   explicit OrderedSubstitution(const QStringList& lines);
 
-  bool contains(const QString& token) const;
-  void substitute(const QString& token, const QString& value);
-  void removeLinesWith(const QString& token);
+  bool contains(const QString& token) const override;
+  void substitute(const QString& token, const QString& value) override;
+  void removeLinesWith(const QString& token) override;
+  void removeOutput(const QString& tag) override { removeOutputClause(tag, false); }
   // The clause of one output, from each line that begins it to the line that ends it.
   void removeOutputClause(const QString& tag, bool wildcard);
 
   // A substitution would have grown beyond all measure and was left out.
   bool isTooLarge() const { return m_isTooLarge; }
-  // What is left, in order.
-  QStringList lines() const;
+  QStringList lines() const override;
 
  private:
   // Texts that insert each other grow without end. So all lines together may grow by what stands in them from

@@ -6,8 +6,8 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/definition/CompiledTemplate.h>
-#include <transform/core/generation/OrderedSubstitution.h>
 #include <transform/core/generation/ParameterSubstitution.h>
+#include <transform/core/generation/Substitution.h>
 #include <transform/core/generation/TemplateExpansion.h>
 #include <transform/core/generation/WrittenValues.h>
 #include <transform/text/TextHelpers.h>
@@ -134,28 +134,41 @@ QHash<QString, QString> ParameterSubstitution::byToken() const {
   return values;
 }
 
-void ParameterSubstitution::apply(OrderedSubstitution& lines) const {
+void ParameterSubstitution::putInto(Substitution& lines) const {
+  const bool wantsList = lines.contains(kValueListToken);
   for (std::size_t position = 0; position < m_entries.size(); ++position) {
     if (m_entries[position].removesLines) {
       lines.removeLinesWith(m_records[position].getName());
     }
   }
-  std::vector<const Token*> deferred;
-  const TransformerCfgListener* listener = m_cfg.listener();
-  QHash<QString, const Token*> byName;
   for (const Entry& entry : m_entries) {
     for (const Token& token : entry.tokens) {
       lines.substitute(token.name, token.value);
-      if (!byName.contains(token.name)) {
-        byName.insert(token.name, &token);
-      }
-      if (listener && listener->isDeferredValue(m_cfg, token.value)) {
+    }
+  }
+  if (m_cfg.listener()) {
+    putDeferred(lines);
+  }
+  if (wantsList) {
+    lines.substitute(kValueListToken, valueList());
+  }
+}
+
+// Once more, and then what the value itself refers to: that may have been substituted before it came in, and
+// may in turn refer to what was.
+void ParameterSubstitution::putDeferred(Substitution& lines) const {
+  std::vector<const Token*> deferred;
+  for (const Entry& entry : m_entries) {
+    for (const Token& token : entry.tokens) {
+      if (m_cfg.listener()->isDeferredValue(m_cfg, token.value)) {
         deferred.push_back(&token);
       }
     }
   }
-  // Once more, and then what the value itself refers to: that may have been substituted before it came in,
-  // and may in turn refer to what was.
+  if (deferred.empty()) {
+    return;
+  }
+  const QHash<QString, QString> byName = byToken();
   bool isLeft = true;
   for (int round = 0; isLeft && round < kMostRounds; ++round) {
     isLeft = false;
@@ -165,24 +178,12 @@ void ParameterSubstitution::apply(OrderedSubstitution& lines) const {
       }
       TokenScanner scanner(token->value);
       while (scanner.next()) {
-        const Token* inner = byName.value(scanner.name().toString());
-        if (inner && inner->name != token->name && lines.contains(inner->name)) {
-          lines.substitute(inner->name, inner->value);
+        const auto inner = byName.constFind(scanner.name().toString());
+        if (inner != byName.constEnd() && inner.key() != token->name && lines.contains(inner.key())) {
+          lines.substitute(inner.key(), inner.value());
           isLeft = true;
         }
       }
-    }
-  }
-}
-
-void ParameterSubstitution::apply(TemplateExpansion& expansion, const CompiledTemplate& compiled) const {
-  for (std::size_t position = 0; position < m_entries.size(); ++position) {
-    const Entry& entry = m_entries[position];
-    if (entry.removesLines) {
-      expansion.removeLinesOf(compiled.slotOf(m_records[position].getName()));
-    }
-    for (const Token& token : entry.tokens) {
-      expansion.setValue(compiled.slotOf(token.name), token.value);
     }
   }
 }

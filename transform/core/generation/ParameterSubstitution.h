@@ -11,9 +11,7 @@
 #include <vector>
 
 class MFBuffer;
-class OrderedSubstitution;
-class TemplateExpansion;
-class CompiledTemplate;
+class Substitution;
 class TransformerCfg;
 
 class ParameterSubstitution {
@@ -36,11 +34,8 @@ class ParameterSubstitution {
   // What was collected: of several values of one token the first.
   QHash<QString, QString> byToken() const;
 
-  void apply(OrderedSubstitution& lines) const;
-  void apply(TemplateExpansion& expansion, const CompiledTemplate& compiled) const;
-
-  // What "$(ORX_PARM_VAL_LIST)" stands for.
-  QString valueList() const;
+  // All values, and the list of them.
+  void putInto(Substitution& lines) const;
 
  private:
   struct Token {
@@ -56,6 +51,8 @@ class ParameterSubstitution {
   bool isSubstituted(const QString& token) const;
   bool isInert(const TransformParamCfg& record) const;
   void collect(std::size_t position, MFBuffer& buffer);
+  void putDeferred(Substitution& lines) const;
+  QString valueList() const;
 
   const TransformerCfg& m_cfg;
   const std::vector<TransformParamCfg>& m_records;

@@ -1,3 +1,4 @@
+#include <transform/core/GenerationKeywords.h>
 #include <transform/core/generation/TemplateExpansion.h>
 
 #include <algorithm>
@@ -16,7 +17,8 @@ void TemplateExpansion::setValue(int slot, const QString& value) {
   }
 }
 
-void TemplateExpansion::removeLinesOf(int slot) {
+void TemplateExpansion::removeLinesWith(const QString& token) {
+  const int slot = m_compiled.slotOf(token);
   if (slot == CompiledTemplate::kNoSlot) {
     return;
   }
@@ -25,7 +27,13 @@ void TemplateExpansion::removeLinesOf(int slot) {
   }
 }
 
-bool TemplateExpansion::holds(int slot) const {
+// The clause is the lines of its token: the template is one with clauses of one line.
+void TemplateExpansion::removeOutput(const QString& tag) {
+  removeLinesWith(kOutputTokenStart + tag + kFeatureTypeTokenEnd);
+}
+
+bool TemplateExpansion::contains(const QString& token) const {
+  const int slot = m_compiled.slotOf(token);
   if (slot == CompiledTemplate::kNoSlot) {
     return false;
   }

@@ -5,23 +5,27 @@
 #pragma once
 
 #include <transform/core/definition/CompiledTemplate.h>
+#include <transform/core/generation/Substitution.h>
 
 #include <QString>
 #include <QStringList>
 #include <QVarLengthArray>
 
-class TemplateExpansion {
+class TemplateExpansion : public Substitution {
  public:
   // The template must outlive the expansion.
   explicit TemplateExpansion(const CompiledTemplate& compiled);
 
   // The first value of a slot stands. kNoSlot is ignored.
   void setValue(int slot, const QString& value);
-  void removeLinesOf(int slot);
-  // Whether a line that is not removed holds the token.
-  bool holds(int slot) const;
 
-  QStringList lines() const;
+  bool contains(const QString& token) const override;
+  void substitute(const QString& token, const QString& text) override {
+    setValue(m_compiled.slotOf(token), text);
+  }
+  void removeLinesWith(const QString& token) override;
+  void removeOutput(const QString& tag) override;
+  QStringList lines() const override;
 
   // Whether the value brings no token that `isSubstituted` tells, and no part of one, wherever it is inserted
   // in a plain template.

@@ -85,20 +85,17 @@ bool TransformerCfg::expandTemplate(MFBuffer& buffer, QStringList& lines) {
   const CompiledTemplate* compiled = configured().compiledTemplate.get();
   ParameterSubstitution values(*this, m_parameters.records());
   if (compiled && compiled->isPlain() && compiled->hasOneLineClauses() &&
-      typeid(*this) == typeid(TransformerCfg) && !bringsTokens(values)) {
-    TemplateExpansion expansion(*compiled);
-    fillPorts(expansion, *compiled);
-    values.collect(buffer, /*onlyWritten=*/true);
-    values.apply(expansion, *compiled);
-    if (expansion.holds(compiled->slotOf(kValueListToken))) {
-      expansion.setValue(compiled->slotOf(kValueListToken), values.valueList());
+      typeid(*this) == typeid(TransformerCfg)) {
+    const port_texts::Texts ports = portTexts();
+    if (!bringsTokens(values, ports)) {
+      TemplateExpansion expansion(*compiled);
+      ports.putInto(expansion);
+      values.collect(buffer, /*onlyWritten=*/true);
+      values.putInto(expansion);
+      putInstanceTokens(expansion);
+      lines = expansion.lines();
+      return true;
     }
-    fillInstanceTokens([&](const QString& token) { return expansion.holds(compiled->slotOf(token)); },
-                       [&](const QString& token, const QString& text) {
-                         expansion.setValue(compiled->slotOf(token), text);
-                       });
-    lines = expansion.lines();
-    return true;
   }
   return expandInOrder(values, buffer, lines);
 }
@@ -109,40 +106,41 @@ bool TransformerCfg::expandInOrder(ParameterSubstitution& values, MFBuffer& buff
   lines = getTemplateLines();
   substInputs(lines);
   substOutputs(lines);
-  substParameters(values, buffer, lines);
-  OrderedSubstitution ordered(lines);
-  fillInstanceTokens([&](const QString& token) { return ordered.contains(token); },
-                     [&](const QString& token, const QString& text) { ordered.substitute(token, text); });
-  lines = takeLines(ordered);
+  values.collect(buffer);
+  substitute(lines, [&values](Substitution& ordered) { values.putInto(ordered); });
+  substitute(lines, [this](Substitution& ordered) { putInstanceTokens(ordered); });
   return !m_isTooLarge;
 }
 
-QStringList TransformerCfg::takeLines(const OrderedSubstitution& ordered) const {
+template <class Step>
+void TransformerCfg::substitute(QStringList& lines, Step step) const {
+  OrderedSubstitution ordered(lines);
+  step(ordered);
   m_isTooLarge = m_isTooLarge || ordered.isTooLarge();
-  return ordered.lines();
+  lines = ordered.lines();
 }
 
-bool TransformerCfg::bringsTokens(const ParameterSubstitution& values) const {
-  bool isInert = !values.bringsTokens();
-  forEachInputText([&](const QString&, const QString& text) { isInert = isInert && values.isInert(text); });
-  forEachOutputText([&](const QString&, const QString* featureType, const QString& functions) {
-    isInert = isInert && (!featureType || values.isInert(*featureType)) && values.isInert(functions);
-  });
-  return !isInert;
+port_texts::Texts TransformerCfg::portTexts() const {
+  port_texts::Texts texts;
+  texts.addInputs(*this, m_ports);
+  texts.addOutputs(*this);
+  return texts;
 }
 
-void TransformerCfg::fillInstanceTokens(
-    const std::function<bool(const QString& token)>& holds,
-    const std::function<void(const QString& token, const QString& text)>& substitute) const {
-  if (!m_baseGuid.isEmpty() && holds(kUuidToken)) {
-    substitute(kUuidToken, getParameterValue(kIdentifierParameter, UnpackLevel::Decoded) + QLatin1Char('_') +
-                               m_baseGuid + QString::number(m_instantiationCounter));
+bool TransformerCfg::bringsTokens(const ParameterSubstitution& values, const port_texts::Texts& ports) {
+  return values.bringsTokens() || !ports.allOf([&](const QString& text) { return values.isInert(text); });
+}
+
+void TransformerCfg::putInstanceTokens(Substitution& lines) const {
+  if (!m_baseGuid.isEmpty() && lines.contains(kUuidToken)) {
+    lines.substitute(kUuidToken, getParameterValue(kIdentifierParameter, UnpackLevel::Decoded) +
+                                     QLatin1Char('_') + m_baseGuid + QString::number(m_instantiationCounter));
   }
-  if (holds(kEncodedNameToken)) {
-    substitute(kEncodedNameToken,
-               encodeAroundReferences(stripBasicStringInfo(getParameterValue(kIdentifierParameter))));
+  if (lines.contains(kEncodedNameToken)) {
+    lines.substitute(kEncodedNameToken,
+                     encodeAroundReferences(stripBasicStringInfo(getParameterValue(kIdentifierParameter))));
   }
-  if (holds(kSchemaToken)) {
+  if (lines.contains(kSchemaToken)) {
     const QString type = QORXWwjdEncode(kSchemaType);
     QStringList schema;
     for (const QString& attribute : getInputAttributeUnion()) {
@@ -151,7 +149,7 @@ void TransformerCfg::fillInstanceTokens(
                << type;
       }
     }
-    substitute(kSchemaToken, QORXListToSdfString(schema, QLatin1Char(',')));
+    lines.substitute(kSchemaToken, QORXListToSdfString(schema, QLatin1Char(',')));
   }
 }
 
@@ -184,82 +182,23 @@ void TransformerCfg::removeOutputClause(QStringList& lines, const QString& tag, 
 
 void TransformerCfg::substParametersForMappingFile(MFBuffer& buffer, QStringList& lines) const {
   ParameterSubstitution values(*this, m_parameters.records());
-  substParameters(values, buffer, lines);
-}
-
-void TransformerCfg::substParameters(ParameterSubstitution& values, MFBuffer& buffer,
-                                     QStringList& lines) const {
   values.collect(buffer);
-  OrderedSubstitution ordered(lines);
-  const bool wantsList = ordered.contains(kValueListToken);
-  values.apply(ordered);
-  if (wantsList) {
-    ordered.substitute(kValueListToken, values.valueList());
-  }
-  lines = takeLines(ordered);
+  substitute(lines, [&values](Substitution& ordered) { values.putInto(ordered); });
 }
 
 // --- ports
 // --------------------------------------------------------------------------------------------------
 
 void TransformerCfg::substInputs(QStringList& lines) const {
-  OrderedSubstitution ordered(lines);
-  forEachInputText([&](const QString& token, const QString& text) { ordered.substitute(token, text); });
-  lines = takeLines(ordered);
+  port_texts::Texts texts;
+  texts.addInputs(*this, m_ports);
+  substitute(lines, [&texts](Substitution& ordered) { texts.putInto(ordered); });
 }
 
 void TransformerCfg::substOutputs(QStringList& lines) const {
-  OrderedSubstitution ordered(lines);
-  forEachOutputText([&](const QString& tag, const QString* featureType, const QString& functions) {
-    if (featureType) {
-      ordered.substitute(kOutputTokenStart + tag + kFeatureTypeTokenEnd, *featureType);
-      ordered.substitute(kOutputTokenStart + tag + kFunctionsTokenEnd, functions);
-    } else {
-      ordered.removeOutputClause(tag, false);
-    }
-  });
-  lines = takeLines(ordered);
-}
-
-void TransformerCfg::forEachInputText(
-    const std::function<void(const QString& token, const QString& text)>& visit) const {
-  QStringList tags;
-  getInputTags(tags);
-  port_texts::InputTexts all;
-  for (const QString& tag : std::as_const(tags)) {
-    visit(kInputTokenStart + tag + kInputTokenEnd, all.add(*this, m_ports, tag));
-  }
-  visit(kInputLinesToken, all.text());
-}
-
-void TransformerCfg::forEachOutputText(
-    const std::function<void(const QString& tag, const QString* featureType, const QString& functions)>&
-        visit) const {
-  QStringList tags;
-  getOutputTags(tags);
-  for (const QString& tag : std::as_const(tags)) {
-    QString featureType;
-    if (port_texts::isOutputWritten(*this, tag, featureType)) {
-      const QString word = quotifyStringForMF(featureType);
-      visit(tag, &word, port_texts::outputFunctions(*this, tag));
-    } else {
-      visit(tag, nullptr, QString());
-    }
-  }
-}
-
-void TransformerCfg::fillPorts(TemplateExpansion& expansion, const CompiledTemplate& compiled) const {
-  forEachInputText(
-      [&](const QString& token, const QString& text) { expansion.setValue(compiled.slotOf(token), text); });
-  forEachOutputText([&](const QString& tag, const QString* featureType, const QString& functions) {
-    const int typeSlot = compiled.slotOf(kOutputTokenStart + tag + kFeatureTypeTokenEnd);
-    if (featureType) {
-      expansion.setValue(typeSlot, *featureType);
-      expansion.setValue(compiled.slotOf(kOutputTokenStart + tag + kFunctionsTokenEnd), functions);
-    } else {
-      expansion.removeLinesOf(typeSlot);
-    }
-  });
+  port_texts::Texts texts;
+  texts.addOutputs(*this);
+  substitute(lines, [&texts](Substitution& ordered) { texts.putInto(ordered); });
 }
 
 QStringList TransformerCfg::getTransformFactoryInputLines() const {
@@ -445,7 +384,7 @@ void TransformerCfg::writeMultiProcessTransformFact(MFBuffer& buffer, const QStr
 
 QHash<QString, QString> TransformerCfg::findUnwritableValues() const {
   const ParameterSubstitution values(*this, m_parameters.records());
-  if (!bringsTokens(values)) {
+  if (!bringsTokens(values, portTexts())) {
     return MappingFileChecks(*this, m_parameters.records(), nullptr).find();
   }
   NullBuffer buffer;
