@@ -11,14 +11,11 @@
 #include <xercesc/framework/MemBufInputSource.hpp>
 #include <xercesc/parsers/XercesDOMParser.hpp>
 
+#include <bench/PeakMemory.h>
 #include <chrono>
 #include <cstdio>
-#include <fstream>
-#include <malloc.h>
 #include <map>
 #include <string>
-#include <sys/wait.h>
-#include <unistd.h>
 
 namespace {
 
@@ -194,40 +191,6 @@ double bestSeconds(Work&& work, int repetitions = kRepetitions) {
     best = std::min(best, std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count());
   }
   return best;
-}
-
-// Peak resident memory of the work in a process of its own, above what was resident before it, in bytes.
-template <class Work>
-double peakMemory(Work&& work) {
-  int ends[2];
-  if (pipe(ends) != 0)
-    return 0;
-  if (fork() == 0) {
-    const auto peak = [] {
-      std::ifstream status("/proc/self/status");
-      std::string word;
-      while (status >> word && word != "VmHWM:") {
-      }
-      double kilobytes = 0;
-      status >> kilobytes;
-      return kilobytes * 1024;
-    };
-    malloc_trim(0);
-    std::ofstream("/proc/self/clear_refs") << 5;
-    const double before = peak();
-    work();
-    const double used = peak() - before;
-    if (write(ends[1], &used, sizeof used) != sizeof used)
-      _exit(1);
-    _exit(0);
-  }
-  double used = 0;
-  if (read(ends[0], &used, sizeof used) != sizeof used)
-    used = 0;
-  wait(nullptr);
-  close(ends[0]);
-  close(ends[1]);
-  return used;
 }
 
 void printRatios() {

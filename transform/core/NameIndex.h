@@ -31,6 +31,10 @@ class ORX_EXPORT NameIndex {
   const Entry* find(const QString& name) const;
   // Adds the name, or gives it another place.
   void insert(const QString& name, qint64 place);
+  void remove(const QString& name);
+  // Of all names, whatever their places.
+  uint hash() const { return m_hash; }
+  bool isSharedWith(const NameIndex& other) const { return m_root.constData() == other.m_root.constData(); }
   void collect(Entries& entries) const;
   // What stands here and not in `other`. Parts that both share cost nothing. Gives up, with false, when it
   // finds more than `most`.
@@ -51,4 +55,5 @@ class ORX_EXPORT NameIndex {
 
   NodePointer m_root;  // null when empty
   int m_size = 0;
+  uint m_hash = 0;
 };

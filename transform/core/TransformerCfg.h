@@ -313,6 +313,7 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   QHash<QString, QStringList> getInputAttributes() const;
   // The same as setInputAttributes() and getOutputAttributes(), which are called with lists where the
   // object's class overrides what becomes of attributes; otherwise without any, at the cost of what changes.
+  const QHash<QString, AttributeSet>& arrivingAttributes() const { return m_ports.inputAttributes; }
   void setArrivingAttributes(const QHash<QString, AttributeSet>& attributes);
   AttributeSet leavingAttributes(const QString& tag) const;
   // By the order of the inputs, each name once.

@@ -117,26 +117,38 @@ void CompoundTransformerCfg::setInputAttributes(const QHash<QString, QStringList
 void CompoundTransformerCfg::putInputAttributes() const {
   if (m_network->attributeOwner() == this)
     return;
-  m_network->setInputAttributes(getInputAttributes());
+  m_network->getInputs();  // loads what is not loaded yet
+  if (m_network->answersWithSets())
+    m_network->setArrivingAttributes(arrivingAttributes());
+  else
+    m_network->setInputAttributes(getInputAttributes());
   m_network->setAttributeOwner(this);
 }
 
-QStringList CompoundTransformerCfg::getOutputAttributes(const QString& tag) const {
+void CompoundTransformerCfg::setArrivingAttributes(const QHash<QString, AttributeSet>& attributes) {
+  ports().inputAttributes = attributes;
   if (!m_network)
-    return QStringList();
+    return;
+  m_network->setAttributeOwner(nullptr);
   putInputAttributes();
-  QHash<QString, QString> origins;
-  return resolvedAttributes(m_network->getOutputAttributes(tag, origins));
 }
 
-QStringList CompoundTransformerCfg::resolvedAttributes(const QStringList& attributes) const {
-  QStringList resolved;
-  bool isChanged = false;
-  for (const QString& attribute : attributes) {
-    if (!attribute.contains(kMacroOpen)) {
-      resolved.append(attribute);
-      continue;
-    }
+QStringList CompoundTransformerCfg::getOutputAttributes(const QString& tag) const {
+  return leavingAttributes(tag).names();
+}
+
+AttributeSet CompoundTransformerCfg::leavingAttributes(const QString& tag) const {
+  if (!m_network)
+    return AttributeSet();
+  putInputAttributes();
+  if (m_network->answersWithSets())
+    return resolvedAttributes(m_network->leavingAttributes(tag));
+  QHash<QString, QString> origins;
+  return resolvedAttributes(AttributeSet(m_network->getOutputAttributes(tag, origins)));
+}
+
+AttributeSet CompoundTransformerCfg::resolvedAttributes(AttributeSet attributes) const {
+  for (const QString& attribute : attributes.withReferences()) {
     bool isUnset = false;
     const QString name = replaceParameterReferences(attribute, [&](const QString& parameter, QString& value) {
       if (!hasParameter(parameter))
@@ -147,13 +159,9 @@ QStringList CompoundTransformerCfg::resolvedAttributes(const QStringList& attrib
         value = QORXWwjdDecode(value);
       return true;
     });
-    isChanged = true;
-    if (!isUnset)
-      resolved.append(name);
+    attributes.rename(attribute, isUnset ? QString() : name);
   }
-  if (isChanged)
-    resolved.removeDuplicates();
-  return resolved;
+  return attributes;
 }
 
 // --- parameters ------------------------------------------------------------------------------------------

@@ -39,6 +39,9 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   // Names that refer to a parameter of this instance, "$(NAME)", are given with its value; left out without
   // one.
   QStringList getOutputAttributes(const QString& tag) const override;
+  // The same two with sets, see TransformerCfg: what is called for an object of this very class.
+  void setArrivingAttributes(const QHash<QString, AttributeSet>& attributes);
+  AttributeSet leavingAttributes(const QString& tag) const;
   bool parmValueAffectsOutputAttrs(const QString& parameter) const override;
   QStringList getDescriptionLines() const override;
   QStringList getChangeLog() const override;
@@ -99,7 +102,7 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
 
   void takeParameters();
   void putInputAttributes() const;
-  QStringList resolvedAttributes(const QStringList& attributes) const;
+  AttributeSet resolvedAttributes(AttributeSet attributes) const;
   Statements inputCollectors() const;
   Statements outputRenamers() const;
   // One line each.

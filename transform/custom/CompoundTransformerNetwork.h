@@ -9,6 +9,7 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/core/AttributeSet.h>
 #include <transform/custom/AttributePropogationMode.h>
 #include <transform/custom/CompoundTransformerParm.h>
 #include <transform/custom/ParallelSettings.h>
@@ -23,10 +24,12 @@
 #include <list>
 #include <map>
 #include <memory>
+#include <typeinfo>
 #include <vector>
 
 class CompoundTransformerNetworkListener;
 class NetworkListeners;
+struct MetAttributes;
 struct NetworkOrder;
 class InnerTransformerListener;
 class MFBuffer;
@@ -149,6 +152,11 @@ class ORX_EXPORT CompoundTransformerNetwork {
   QString getLoopOutput() const { return kLoopOutput; }
   // What was set on the input; with `withStatic` also what its author declared, each name once.
   QStringList getInputAttributes(const QString& input, bool withStatic) const;
+  // The same as setInputAttributes() and getOutputAttributes() without lists, for networks of the classes
+  // that say so: others may override those two.
+  bool answersWithSets() const { return m_answering && typeid(*this) == *m_answering; }
+  void setArrivingAttributes(const QHash<QString, AttributeSet>& attributes);
+  AttributeSet leavingAttributes(const QString& output) const;
   // The name under which an inner transformer's parameter is published.
   static QString createExposedParmName(const QString& transformerName, const QString& parameterName);
   const QString& extractError() const { return m_extractError; }
@@ -195,6 +203,8 @@ class ORX_EXPORT CompoundTransformerNetwork {
   void setCategory(const QString& category) { m_category = category; }
   void setProperties(const QHash<QString, QString>& properties) { m_properties = properties; }
   void setExtractError(const QString& error) { m_extractError = error; }
+  // Tells that objects of just this class leave queries for attributes to the base, once they are loaded.
+  void setAnswersWithSets(const std::type_info& type) { m_answering = &type; }
 
  private:
   struct AttributeMemo;
@@ -205,9 +215,9 @@ class ORX_EXPORT CompoundTransformerNetwork {
   bool removeNode(SubDocNetworkObj* node);
   void ensureOrders() const;
   void forgetOrders();
-  QStringList evaluate(SubDocNetworkObjOutput& output, const NetworkOrder& order,
-                       QHash<QString, QString>& origins) const;
-  QStringList arrivingAttributes() const;
+  AttributeSet leavingAttributes(const QString& output, MetAttributes& met) const;
+  AttributeSet evaluate(SubDocNetworkObjOutput& output, const NetworkOrder& order, MetAttributes& met) const;
+  AttributeSet arrivingAttributes() const;
 
   QString m_name;
   int m_version = 1;
@@ -233,6 +243,7 @@ class ORX_EXPORT CompoundTransformerNetwork {
 
   mutable bool m_ordersValid = false;
   std::unique_ptr<std::map<QString, NetworkOrder>> m_orders;  // by output
+  const std::type_info* m_answering = nullptr;
   const TransformerCfg* m_attributeOwner = nullptr;
   std::unique_ptr<InnerTransformerListener> m_innerListener;
   mutable std::unique_ptr<AttributeMemo> m_memo;  // of the nested query under way

@@ -35,7 +35,9 @@ QHash<QString, QString> descriptiveSettings(const QHash<QString, QString>& setti
 
 }  // namespace
 
-ExternalDocNetwork::ExternalDocNetwork() = default;
+ExternalDocNetwork::ExternalDocNetwork() {
+  setAnswersWithSets(typeid(ExternalDocNetwork));
+}
 ExternalDocNetwork::~ExternalDocNetwork() = default;
 
 void ExternalDocNetwork::takeSettings(const QHash<QString, QString>& settings) {

@@ -58,6 +58,7 @@ QString bodyName(const IXMLComponentReader& reader, const QString& name) {
 ExternalTransformerNetwork::ExternalTransformerNetwork(const QString& fileName, int version,
                                                        TransformerSource* manager)
     : m_fileName(fileName), m_manager(manager), m_insertMode(kEmbeddedByDefault) {
+  setAnswersWithSets(typeid(ExternalTransformerNetwork));
   setPythonVersion(QStringLiteral("27"));
   ParallelSettings parallel;
   parallel.parallelism = kNoParallelism;

@@ -2,8 +2,6 @@
 #include <transform/custom/SubDocNetworkObj.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 
-#include <QSet>
-
 #include <algorithm>
 
 SubDocNetworkObj::SubDocNetworkObj(Kind kind, int number, const QString& name)
@@ -96,20 +94,15 @@ void SubDocNetworkObj::forgetOutlets() {
     outlet.isCurrent = false;
 }
 
-void SubDocNetworkObj::fill(Outlet& outlet, QHash<QString, QString>& origins) {
+void SubDocNetworkObj::fill(Outlet& outlet, MetAttributes& met) {
   outlet.isCurrent = true;
   outlet.attributes = getAttributes(&outlet == &m_common ? QString() : static_cast<PortOutlet&>(outlet).port);
-  // A list that passes through unchanged stays one list, all of whose attributes are known already.
-  if (!sources().isEmpty() && sources().first().outlet->attributes == outlet.attributes)
-    outlet.attributes = sources().first().outlet->attributes;
-  else
-    noteOrigins(outlet.attributes, origins);
+  noteOrigins(outlet.attributes, met);
 }
 
-void SubDocNetworkObj::setLeaving(const QStringList& attributes) {
-  m_hasChanged = !m_isComputed || m_common.attributes != attributes;
-  if (!m_common.attributes.isSharedWith(attributes))
-    m_common.attributes = attributes;
+void SubDocNetworkObj::setLeaving(const AttributeSet& attributes) {
+  m_hasChanged = !m_isComputed || !(m_common.attributes == attributes);
+  m_common.attributes = attributes;
   m_common.isCurrent = true;
   m_isComputed = true;
   if (m_hasOutlets)
@@ -123,58 +116,37 @@ void SubDocNetworkObj::noteComputed(bool changed) {
     forgetOutlets();
 }
 
-void SubDocNetworkObj::noteOrigins(const QStringList& attributes, QHash<QString, QString>& origins) const {
-  for (const QString& attribute : attributes) {
-    if (!origins.contains(attribute))
-      origins.insert(attribute, name());
+void SubDocNetworkObj::noteOrigins(const AttributeSet& attributes, MetAttributes& met) const {
+  if (met.origins) {
+    for (const QString& attribute : attributes.missingIn(met.names))
+      met.origins->insert(attribute, name());
   }
+  met.names.add(attributes);
 }
 
-const QStringList& SubDocNetworkObj::collect(const Source* begin, const Source* end, QStringList& merged,
-                                             QHash<QString, QString>& origins) {
-  const QStringList* first = &merged;  // empty
-  QSet<QString> seen;
+AttributeSet SubDocNetworkObj::collect(const Source* begin, const Source* end, MetAttributes& met) {
+  AttributeSet all;
   for (const Source* source = begin; source != end; ++source) {
     if (!source->outlet->isCurrent)
-      source->node->fill(*source->outlet, origins);
-    const QStringList& attributes = source->outlet->attributes;
-    if (first->isEmpty()) {
-      first = &attributes;
-      continue;
-    }
-    if (attributes == *first)
-      continue;
-    if (first != &merged) {
-      merged = *first;
-      seen = QSet<QString>(merged.begin(), merged.end());
-      first = &merged;
-    }
-    for (const QString& attribute : attributes) {
-      const int before = seen.size();
-      seen.insert(attribute);
-      if (seen.size() != before)
-        merged.append(attribute);
-    }
+      source->node->fill(*source->outlet, met);
+    all.add(source->outlet->attributes);
   }
-  return *first;
+  return all;
 }
 
-const QStringList& SubDocNetworkObj::collect(QStringList& merged, QHash<QString, QString>& origins) {
+AttributeSet SubDocNetworkObj::collect(MetAttributes& met) {
   const Sources& all = sources();
-  return collect(all.begin(), all.end(), merged, origins);
+  return collect(all.begin(), all.end(), met);
 }
 
-QStringList SubDocNetworkObj::withCopies(const QString& port, const QStringList& attributes) const {
+AttributeSet SubDocNetworkObj::withCopies(const QString& port, const AttributeSet& attributes) const {
+  AttributeSet all = attributes;
   const auto at = m_copies.find(port);
   if (at == m_copies.end())
-    return attributes;
-  QStringList all = attributes;
-  QSet<QString> seen(attributes.begin(), attributes.end());
+    return all;
   for (const AttributeCopy& copy : at->second) {
-    if (seen.contains(copy.from) && !seen.contains(copy.to)) {
-      seen.insert(copy.to);
-      all.append(copy.to);
-    }
+    if (all.contains(copy.from))
+      all.add(copy.to);
   }
   return all;
 }

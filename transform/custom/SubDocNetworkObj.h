@@ -3,6 +3,7 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/core/AttributeSet.h>
 
 #include <QHash>
 #include <QString>
@@ -12,6 +13,12 @@
 #include <cstdint>
 #include <map>
 #include <vector>
+
+// What a query for attributes has met so far.
+struct MetAttributes {
+  AttributeSet names;
+  QHash<QString, QString>* origins = nullptr;  // the node that each came from first; null: nobody asks
+};
 
 class ORX_EXPORT SubDocNetworkObj {
  public:
@@ -30,10 +37,10 @@ class ORX_EXPORT SubDocNetworkObj {
   virtual ~SubDocNetworkObj();
 
   // Takes in the attributes that reach the node through its links; what leaves it follows from them.
-  // `origins` receives each attribute met for the first time, with the name of the node that it came from.
-  virtual void compute(QHash<QString, QString>& origins) = 0;
+  // `met` receives each attribute met for the first time, with the name of the node that it came from.
+  virtual void compute(MetAttributes& met) = 0;
   // What leaves the port; nothing before compute().
-  virtual QStringList getAttributes(const QString& port) const = 0;
+  virtual AttributeSet getAttributes(const QString& port) const = 0;
 
   Kind kind() const { return m_kind; }
   int number() const { return m_number; }
@@ -61,7 +68,7 @@ class ORX_EXPORT SubDocNetworkObj {
   void addAttributeCopy(const QString& port, const QString& from, const QString& to);
   const std::map<QString, std::vector<AttributeCopy>>& attributeCopies() const { return m_copies; }
   // `attributes`, and behind them the copies made at the port.
-  QStringList withCopies(const QString& port, const QStringList& attributes) const;
+  AttributeSet withCopies(const QString& port, const AttributeSet& attributes) const;
 
   static void addLink(SubDocNetworkObj& from, const QString& fromPort, SubDocNetworkObj& to,
                       const QString& toPort);
@@ -76,7 +83,7 @@ class ORX_EXPORT SubDocNetworkObj {
  protected:
   // What leaves by the ports of a node, kept until it is computed anew.
   struct Outlet {
-    QStringList attributes;
+    AttributeSet attributes;
     bool isCurrent = false;
   };
   // Where a link comes from.
@@ -93,18 +100,16 @@ class ORX_EXPORT SubDocNetworkObj {
 
   // Ports in name order, links in the order of adding.
   const Sources& sources();
-  // What the sources bring, each name once, in their order. `merged` is room for a list that none of them
-  // has by itself.
-  static const QStringList& collect(const Source* begin, const Source* end, QStringList& merged,
-                                    QHash<QString, QString>& origins);
+  // What the sources bring, in their order.
+  static AttributeSet collect(const Source* begin, const Source* end, MetAttributes& met);
   // The same over all ports.
-  const QStringList& collect(QStringList& merged, QHash<QString, QString>& origins);
+  AttributeSet collect(MetAttributes& met);
   // Enters those that were not met before as attributes of this node.
-  void noteOrigins(const QStringList& attributes, QHash<QString, QString>& origins) const;
+  void noteOrigins(const AttributeSet& attributes, MetAttributes& met) const;
 
   // Ends compute(). The same attributes leave by every port, but for copies.
-  void setLeaving(const QStringList& attributes);
-  const QStringList& leaving() const { return m_common.attributes; }
+  void setLeaving(const AttributeSet& attributes);
+  const AttributeSet& leaving() const { return m_common.attributes; }
   // Ends compute() where each port has to be asked.
   void noteComputed(bool changed);
   bool isComputed() const { return m_isComputed; }
@@ -120,7 +125,7 @@ class ORX_EXPORT SubDocNetworkObj {
 
   Outlet& outlet(const QString& port);
   Source sourceAt(const QString& port) { return {this, &outlet(port), m_serial}; }
-  void fill(Outlet& outlet, QHash<QString, QString>& origins);
+  void fill(Outlet& outlet, MetAttributes& met);
   void forgetOutlets();
 
   // What a query works with stands together.

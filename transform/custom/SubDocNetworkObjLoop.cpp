@@ -3,11 +3,10 @@
 SubDocNetworkObjLoop::SubDocNetworkObjLoop(const QString& name, int number)
     : SubDocNetworkObj(Kind::Loop, number, name) {}
 
-void SubDocNetworkObjLoop::compute(QHash<QString, QString>& origins) {
-  QStringList merged;
-  setLeaving(collect(merged, origins));
+void SubDocNetworkObjLoop::compute(MetAttributes& met) {
+  setLeaving(collect(met));
 }
 
-QStringList SubDocNetworkObjLoop::getAttributes(const QString& port) const {
-  return isComputed() ? withCopies(port, leaving()) : QStringList();
+AttributeSet SubDocNetworkObjLoop::getAttributes(const QString& port) const {
+  return isComputed() ? withCopies(port, leaving()) : AttributeSet();
 }

@@ -7,7 +7,7 @@ class ORX_EXPORT SubDocNetworkObjLoop : public SubDocNetworkObj {
  public:
   SubDocNetworkObjLoop(const QString& name, int number);
 
-  void compute(QHash<QString, QString>& origins) override;
+  void compute(MetAttributes& met) override;
   // What reaches the loop point passes on.
-  QStringList getAttributes(const QString& port) const override;
+  AttributeSet getAttributes(const QString& port) const override;
 };

@@ -14,17 +14,12 @@ void SubDocNetworkObjOutput::setMode(OutgoingAttributePropogationMode mode,
   m_ownAttributes = ownAttributes;
 }
 
-void SubDocNetworkObjOutput::compute(QHash<QString, QString>& origins) {
-  QStringList merged;
-  const QStringList& arriving = collect(merged, origins);
-  if (m_mode == kOutgoingOwnList) {
-    setLeaving(m_ownAttributes);
-    noteOrigins(m_ownAttributes, origins);
-  } else {
-    setLeaving(arriving);
-  }
+void SubDocNetworkObjOutput::compute(MetAttributes& met) {
+  const AttributeSet arriving = collect(met);
+  setLeaving(m_mode == kOutgoingOwnList ? AttributeSet(m_ownAttributes) : arriving);
+  noteOrigins(leaving(), met);
 }
 
-QStringList SubDocNetworkObjOutput::getAttributes(const QString&) const {
-  return isComputed() ? leaving() : QStringList();
+AttributeSet SubDocNetworkObjOutput::getAttributes(const QString&) const {
+  return isComputed() ? leaving() : AttributeSet();
 }

@@ -9,8 +9,8 @@ class ORX_EXPORT SubDocNetworkObjOutput : public SubDocNetworkObj {
   SubDocNetworkObjOutput(const QString& name, int number, OutgoingAttributePropogationMode mode,
                          const QStringList& ownAttributes, int position);
 
-  void compute(QHash<QString, QString>& origins) override;
-  QStringList getAttributes(const QString& port) const override;
+  void compute(MetAttributes& met) override;
+  AttributeSet getAttributes(const QString& port) const override;
 
   using SubDocNetworkObj::setName;
   // Among the output ports, as the document has them.

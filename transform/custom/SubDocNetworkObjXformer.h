@@ -15,9 +15,9 @@ class ORX_EXPORT SubDocNetworkObjXformer : public SubDocNetworkObj {
                           const QHash<QString, QStringList>& inputAttributes, int number);
   ~SubDocNetworkObjXformer() override;
 
-  void compute(QHash<QString, QString>& origins) override;
+  void compute(MetAttributes& met) override;
   // Asks the configuration.
-  QStringList getAttributes(const QString& port) const override;
+  AttributeSet getAttributes(const QString& port) const override;
   virtual TransformerCfg* getTransformer() const;
 
   // Attributes that a user added to what leaves an output, by output tag.
@@ -31,15 +31,15 @@ class ORX_EXPORT SubDocNetworkObjXformer : public SubDocNetworkObj {
   // What reached a port at the last compute().
   struct Inlet {
     QString port;
-    QStringList attributes;
+    AttributeSet attributes;
   };
 
-  QHash<QString, QStringList> arrivedByTag() const;
+  QHash<QString, AttributeSet> arrivedByTag() const;
 
   std::unique_ptr<TransformerCfg> m_cfg;
-  QHash<QString, QStringList> m_inputAttributes;
+  QHash<QString, AttributeSet> m_inputAttributes;
   QHash<QString, QStringList> m_exposed;
   ParameterLines m_parameterLines;
   std::vector<Inlet> m_inlets;
-  QHash<QString, QStringList> m_arrivedByTag;  // what the configuration is given
+  QHash<QString, AttributeSet> m_arrivedByTag;  // what the configuration is given
 };

@@ -23,9 +23,9 @@ void CustomDefinitions::addInstance(const TransformerCfg* instance) {
     return;
   m_roots.push_back(network);
   InnerAttributes::ByPort& arriving = m_arriving[network];
-  const InnerAttributes::ByPort added = instance->getInputAttributes();
+  const InnerAttributes::ByPort& added = instance->arrivingAttributes();
   for (auto port = added.cbegin(); port != added.cend(); ++port)
-    arriving[port.key()] += port.value();
+    arriving[port.key()].add(port.value());
 }
 
 bool CustomDefinitions::prepare(orx::Findings& diagnostics) {
@@ -78,10 +78,7 @@ QString CustomDefinitions::placeOf(CompoundTransformerNetwork& network, const QS
 void CustomDefinitions::passAttributes() {
   for (std::size_t number = m_definitions.size(); number-- > 0;) {
     CustomDefinition& definition = m_definitions[number];
-    InnerAttributes::ByPort arriving = m_arriving.take(&definition.network());
-    for (QStringList& attributes : arriving)
-      attributes.removeDuplicates();
-    definition.passAttributes(arriving);
+    definition.passAttributes(m_arriving.take(&definition.network()));
     if (number >= m_used)
       continue;
     for (const TransformerCfg* cfg : definition.customTransformers())

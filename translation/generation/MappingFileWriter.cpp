@@ -2,6 +2,7 @@
 #include <transform/core/SingleChoices.h>
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/TransformerCfg.h>
+#include <transform/custom/AttributeFlow.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/NestedQuestion.h>
@@ -200,8 +201,8 @@ void MappingFileWriter::pushAttributes() {
     if (found != known.constEnd())
       return found.value();
     const WorkspaceNode& source = m_workspace.nodes[at(link.source)];
-    AttributeSet attributes =
-        source.isTransformer() ? source.cfg->leavingAttributes(link.output) : AttributeSet(source.attributes);
+    AttributeSet attributes = source.isTransformer() ? attribute_flow::leaving(*source.cfg, link.output)
+                                                     : AttributeSet(source.attributes);
     attributes.add(source.exposed.value(link.output));
     attributes.add(m_copies[at(link.source)].value(link.output));
     return known.insert(link.output, attributes).value();
@@ -213,7 +214,7 @@ void MappingFileWriter::pushAttributes() {
       const WorkspaceLink& link = m_workspace.links[at(number)];
       arriving[link.input].add(attributesOf(link));
     }
-    m_workspace.nodes[at(target)].cfg->setArrivingAttributes(arriving);
+    attribute_flow::enter(*m_workspace.nodes[at(target)].cfg, arriving);
   }
 }
 

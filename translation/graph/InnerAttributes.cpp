@@ -1,4 +1,5 @@
 #include <transform/core/TransformerCfg.h>
+#include <transform/custom/AttributeFlow.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/SubDocNetworkObjInput.h>
 #include <transform/custom/SubDocNetworkObjLoop.h>
@@ -23,7 +24,7 @@ void InnerAttributes::pass(const ByPort& arriving) {
   for (int round = 0; round < kMostRounds; ++round) {
     m_leaving.clear();
     for (const Member& member : m_members)
-      member.cfg->setInputAttributes(collect(*member.node));
+      attribute_flow::enter(*member.cfg, collect(*member.node));
     if (!takeReturning())
       return;
   }
@@ -31,8 +32,11 @@ void InnerAttributes::pass(const ByPort& arriving) {
 
 void InnerAttributes::takeDeclared() {
   for (const SubDocNetworkObj* node : m_network.nodes()) {
-    if (const auto* input = dynamic_cast<const SubDocNetworkObjInput*>(node))
-      m_entering[input->name()] = input->staticAttributes() + m_entering.value(input->name());
+    if (const auto* input = dynamic_cast<const SubDocNetworkObjInput*>(node)) {
+      AttributeSet entering = input->staticAttributes();
+      entering.add(m_entering.value(input->name()));
+      m_entering[input->name()] = entering;
+    }
   }
 }
 
@@ -41,8 +45,8 @@ bool InnerAttributes::takeReturning() {
   for (const SubDocNetworkObj* node : m_network.nodes()) {
     if (!dynamic_cast<const SubDocNetworkObjLoop*>(node))
       continue;
-    for (const QStringList& attributes : collect(*node))
-      returning[node->name()] += attributes;
+    for (const AttributeSet& attributes : collect(*node))
+      returning[node->name()].add(attributes);
   }
   if (returning == m_returning)
     return false;
@@ -53,27 +57,26 @@ bool InnerAttributes::takeReturning() {
 InnerAttributes::ByPort InnerAttributes::collect(const SubDocNetworkObj& node) {
   ByPort collected;
   for (const auto& [port, links] : node.feeders()) {
-    QStringList& attributes = collected[port];
+    AttributeSet& attributes = collected[port];
     for (const SubDocNetworkObj::Link& link : links)
-      attributes += leaving(*link.node, link.port);
-    attributes.removeDuplicates();
+      attributes.add(leaving(*link.node, link.port));
   }
   return collected;
 }
 
-const QStringList& InnerAttributes::leaving(const SubDocNetworkObj& node, const QString& port) {
+const AttributeSet& InnerAttributes::leaving(const SubDocNetworkObj& node, const QString& port) {
   const auto key = qMakePair(&node, port);
   const auto known = m_leaving.constFind(key);
   if (known != m_leaving.constEnd())
     return *known;
-  QStringList attributes;
+  AttributeSet attributes;
   if (TransformerCfg* cfg = m_cfgs.value(&node)) {
-    attributes = cfg->getOutputAttributes(port) +
-                 static_cast<const SubDocNetworkObjXformer&>(node).exposedAttributes().value(port);
+    attributes = attribute_flow::leaving(*cfg, port);
+    attributes.add(static_cast<const SubDocNetworkObjXformer&>(node).exposedAttributes().value(port));
   } else {
     // An input and a loop point of one name are one flow.
-    attributes = m_entering.value(node.name()) + m_returning.value(node.name());
+    attributes = m_entering.value(node.name());
+    attributes.add(m_returning.value(node.name()));
   }
-  attributes.removeDuplicates();
   return *m_leaving.insert(key, node.withCopies(port, attributes));
 }

@@ -2,10 +2,11 @@
 // that lead to no output.
 #pragma once
 
+#include <transform/core/AttributeSet.h>
+
 #include <QHash>
 #include <QPair>
 #include <QString>
-#include <QStringList>
 
 #include <vector>
 
@@ -16,7 +17,7 @@ class TransformerCfg;
 
 class InnerAttributes {
  public:
-  using ByPort = QHash<QString, QStringList>;
+  using ByPort = QHash<QString, AttributeSet>;
   struct Member {
     const SubDocNetworkObjXformer* node;
     TransformerCfg* cfg;  // receives the attributes
@@ -31,7 +32,7 @@ class InnerAttributes {
 
  private:
   ByPort collect(const SubDocNetworkObj& node);
-  const QStringList& leaving(const SubDocNetworkObj& node, const QString& port);
+  const AttributeSet& leaving(const SubDocNetworkObj& node, const QString& port);
   void takeDeclared();
   // False when nothing else arrives at the loop points than in the round before.
   bool takeReturning();
@@ -41,5 +42,5 @@ class InnerAttributes {
   QHash<const SubDocNetworkObj*, TransformerCfg*> m_cfgs;
   ByPort m_entering;   // by input
   ByPort m_returning;  // by loop point
-  QHash<QPair<const SubDocNetworkObj*, QString>, QStringList> m_leaving;
+  QHash<QPair<const SubDocNetworkObj*, QString>, AttributeSet> m_leaving;
 };

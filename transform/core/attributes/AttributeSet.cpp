@@ -35,6 +35,14 @@ NameIndex::Entries inOrder(NameIndex::Entries entries) {
   return entries;
 }
 
+QStringList namesOf(NameIndex::Entries entries) {
+  QStringList names;
+  names.reserve(int(entries.size()));
+  for (const NameIndex::Entry* entry : inOrder(std::move(entries)))
+    names.append(entry->name);
+  return names;
+}
+
 }  // namespace
 
 const NameIndex::Entry* AttributeSet::find(const QString& name) const {
@@ -46,11 +54,7 @@ QStringList AttributeSet::names() const {
   entries.reserve(std::size_t(size()));
   m_plain.collect(entries);
   m_members.collect(entries);
-  QStringList names;
-  names.reserve(size());
-  for (const NameIndex::Entry* entry : inOrder(std::move(entries)))
-    names.append(entry->name);
-  return names;
+  return namesOf(std::move(entries));
 }
 
 bool AttributeSet::holds(const QString& reference) const {
@@ -62,7 +66,15 @@ bool AttributeSet::holds(const QString& reference) const {
   return contains(name) || m_lists.find(name);
 }
 
+bool operator==(const AttributeSet& left, const AttributeSet& right) {
+  if (left.m_plain.isSharedWith(right.m_plain) && left.m_members.isSharedWith(right.m_members))
+    return true;
+  return left.size() == right.size() && left.hash() == right.hash() && left.names() == right.names();
+}
+
 void AttributeSet::insert(const QString& name, qint64 place) {
+  if (name.contains(kMacroOpen))
+    m_open.insert(name, place);
   if (!name.contains(kListMark)) {
     m_plain.insert(name, place);
     return;
@@ -110,9 +122,39 @@ void AttributeSet::setInFrontOf(AttributeSet other) {
   *this = std::move(other);
 }
 
+QStringList AttributeSet::missingIn(const AttributeSet& other) const {
+  NameIndex::Entries entries;
+  m_plain.collectMissing(other.m_plain, std::size_t(size()), entries);
+  m_members.collectMissing(other.m_members, std::size_t(size()), entries);
+  return namesOf(std::move(entries));
+}
+
+QStringList AttributeSet::withReferences() const {
+  NameIndex::Entries entries;
+  m_open.collect(entries);
+  return namesOf(std::move(entries));
+}
+
+void AttributeSet::rename(const QString& name, const QString& other) {
+  const NameIndex::Entry* entry = find(name);
+  if (!entry || name == other)
+    return;
+  const qint64 place = entry->place;
+  (name.contains(kListMark) ? m_members : m_plain).remove(name);
+  m_open.remove(name);
+  const NameIndex::Entry* present = find(other);
+  if (!other.isEmpty() && (!present || present->place > place))
+    insert(other, place);
+}
+
 AttributeSet AttributeSet::withoutLists() const {
   AttributeSet result = *this;
   result.m_members = result.m_lists = NameIndex();
+  const QStringList open = m_open.size() == 0 ? QStringList() : withReferences();
+  for (const QString& name : open) {
+    if (name.contains(kListMark))
+      result.m_open.remove(name);
+  }
   return result;
 }
 

@@ -43,6 +43,16 @@ struct NameIndex::Node : QSharedData {
       entryBits = quint16(entryBits | bit);
     }
   }
+  void removeEntry(uint hash, const QString& name, int shift) {
+    const quint16 bit = shift < kBits ? bitOf(hash, shift) : quint16(0);
+    if (branchBits & bit) {
+      branches[indexIn(branchBits, bit)]->removeEntry(hash, name, shift + kBitsOfLevel);
+      return;
+    }
+    entries.erase(std::find_if(entries.begin(), entries.end(),
+                               [&name](const Entry& entry) { return entry.name == name; }));
+    entryBits = quint16(entryBits & ~bit);
+  }
   void setPlace(uint hash, const QString& name, qint64 place, int shift) {
     const quint16 bit = shift < kBits ? bitOf(hash, shift) : quint16(0);
     if (branchBits & bit) {
@@ -99,6 +109,18 @@ void NameIndex::insert(const QString& name, qint64 place) {
   }
   m_root->addEntry({name, hash, place}, 0);
   ++m_size;
+  m_hash ^= hash;
+}
+
+void NameIndex::remove(const QString& name) {
+  const uint hash = hashOf(name);
+  if (m_size == 0 || !find(m_root.constData(), 0, hash, name))
+    return;
+  m_hash ^= hash;
+  if (--m_size == 0)
+    m_root = nullptr;
+  else
+    m_root->removeEntry(hash, name, 0);
 }
 
 void NameIndex::collect(const Node& node, Entries& entries) {

@@ -8,8 +8,8 @@
 struct CompoundTransformerNetwork::AttributeMemo {
   struct Key {
     QString output;
-    QVector<QStringList> inputs;  // in the order of the ports
-    QStringList values;           // of the parameters that references inside may take
+    QVector<AttributeSet> inputs;  // in the order of the ports
+    QStringList values;            // of the parameters that references inside may take
 
     friend bool operator==(const Key& left, const Key& right) {
       return left.output == right.output && left.inputs == right.inputs && left.values == right.values;
@@ -20,5 +20,5 @@ struct CompoundTransformerNetwork::AttributeMemo {
   };
 
   quint64 query = 0;
-  QHash<Key, QStringList> answers;
+  QHash<Key, AttributeSet> answers;
 };

@@ -18,28 +18,28 @@ namespace {
 // taken as it is; so it is in cycles of many thousand nodes most of whose links run against the order.
 constexpr std::size_t kMostRoundsWithNewNames = 8;
 constexpr std::size_t kMostStepsInCycle = 10 * 1000 * 1000;
-// What the custom transformers inside may cost within one outermost query, in characters of the attributes
-// that reach them. Definitions that are placed in each other again and again, each time with other
+// What the custom transformers inside may cost within one outermost query, in attributes that reach them.
+// Definitions that are placed in each other again and again, each time with other
 // attributes, could ask for more than any machine has: what exceeds this is told, and gives what reaches it.
 constexpr qint64 kMostCost = 32 * 1024 * 1024;
 constexpr qint64 kCostOfQuestion = 512;
 
 constexpr auto kKind = NestedQuestion::Kind::Attributes;
 
-void computeCycle(const NetworkOrder::Cycle& cycle, QHash<QString, QString>& origins) {
+void computeCycle(const NetworkOrder::Cycle& cycle, MetAttributes& met) {
   for (SubDocNetworkObj* node : cycle.flow)
     node->beginQuery();
   std::size_t newNames = 0;
   std::size_t rounds =
       kMostRoundsWithNewNames + std::min(cycle.flow.size(), kMostStepsInCycle / cycle.flow.size());
   for (bool hasChanged = true; hasChanged && newNames < kMostRoundsWithNewNames && rounds > 0; --rounds) {
-    const int names = origins.size();
+    const int names = met.names.size();
     hasChanged = false;
     for (SubDocNetworkObj* node : cycle.flow) {
-      node->compute(origins);
+      node->compute(met);
       hasChanged = hasChanged || node->hasChanged();
     }
-    newNames += origins.size() > names ? 1 : 0;
+    newNames += met.names.size() > names ? 1 : 0;
   }
 }
 
@@ -49,11 +49,17 @@ void CompoundTransformerNetwork::setInputAttributes(const QString& input, const 
   const auto at = m_inputNodes.find(input);
   if (at == m_inputNodes.end())
     return;
-  at->second->setAttributes(attributes);
+  at->second->setAttributes(AttributeSet(attributes));
   m_attributeOwner = nullptr;
 }
 
 void CompoundTransformerNetwork::setInputAttributes(const QHash<QString, QStringList>& attributes) {
+  for (const auto& [name, node] : m_inputNodes)
+    node->setAttributes(AttributeSet(attributes.value(name)));
+  m_attributeOwner = nullptr;
+}
+
+void CompoundTransformerNetwork::setArrivingAttributes(const QHash<QString, AttributeSet>& attributes) {
   for (const auto& [name, node] : m_inputNodes)
     node->setAttributes(attributes.value(name));
   m_attributeOwner = nullptr;
@@ -63,38 +69,43 @@ void CompoundTransformerNetwork::setStaticInputAttributes(const QString& input,
                                                           const QStringList& attributes) {
   const auto at = m_inputNodes.find(input);
   if (at != m_inputNodes.end())
-    at->second->setStaticAttributes(attributes);
+    at->second->setStaticAttributes(AttributeSet(attributes));
 }
 
 QStringList CompoundTransformerNetwork::getInputAttributes(const QString& input, bool withStatic) const {
   const auto at = m_inputNodes.find(input);
   if (at == m_inputNodes.end())
     return QStringList();
-  if (!withStatic)
-    return at->second->setAttributes();
-  QStringList all = at->second->staticAttributes() + at->second->setAttributes();
-  all.removeDuplicates();
-  return all;
+  return (withStatic ? at->second->ownAttributes() : at->second->setAttributes()).names();
 }
 
-QStringList CompoundTransformerNetwork::arrivingAttributes() const {
-  QStringList all;
+AttributeSet CompoundTransformerNetwork::arrivingAttributes() const {
+  AttributeSet all;
   for (const QString& input : m_inputs)
-    all += getInputAttributes(input, true);
-  all.removeDuplicates();
+    all.add(m_inputNodes.at(input)->ownAttributes());
   return all;
 }
 
 QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& output,
                                                             QHash<QString, QString>& origins) const {
+  MetAttributes met{AttributeSet(origins.keys()), &origins};
+  return leavingAttributes(output, met).names();
+}
+
+AttributeSet CompoundTransformerNetwork::leavingAttributes(const QString& output) const {
+  MetAttributes met;
+  return leavingAttributes(output, met);
+}
+
+AttributeSet CompoundTransformerNetwork::leavingAttributes(const QString& output, MetAttributes& met) const {
   const auto node = m_outputNodes.find(output);
   // A network that is being worked out stands inside itself.
   if (node == m_outputNodes.end() || m_isEvaluating || NestedQuestion::depth(kKind) >= kDeepestNesting)
-    return QStringList();
+    return AttributeSet();
   ensureOrders();
   const NetworkOrder& order = m_orders->at(output);
   if (NestedQuestion::depth(kKind) == 0)
-    return evaluate(*node->second, order, origins);
+    return evaluate(*node->second, order, met);
 
   if (!m_memo)
     m_memo = std::make_unique<AttributeMemo>();
@@ -102,30 +113,28 @@ QStringList CompoundTransformerNetwork::getOutputAttributes(const QString& outpu
     m_memo->query = NestedQuestion::number(kKind);
     m_memo->answers.clear();
   }
+  AttributeMemo::Key key;
+  key.output = output;
   qint64 cost = kCostOfQuestion;
   for (const QString& input : m_inputs) {
-    for (const QString& attribute : m_inputNodes.at(input)->setAttributes())
-      cost += attribute.size();
+    key.inputs.append(m_inputNodes.at(input)->setAttributes());
+    cost += key.inputs.last().size();
   }
   if (!NestedQuestion::spend(kKind, cost, kMostCost))
     return arrivingAttributes();
-  AttributeMemo::Key key;
-  key.output = output;
-  for (const QString& input : m_inputs)
-    key.inputs.append(m_inputNodes.at(input)->setAttributes());
   for (const QString& parameter : m_parameterNames)
     key.values.append(m_attributeOwner ? m_attributeOwner->getParameterValue(parameter, UnpackLevel::Resolved)
                                        : QString());
   const auto known = m_memo->answers.constFind(key);
   if (known != m_memo->answers.constEnd())
     return *known;
-  const QStringList answer = evaluate(*node->second, order, origins);
+  const AttributeSet answer = evaluate(*node->second, order, met);
   m_memo->answers.insert(key, answer);
   return answer;
 }
 
-QStringList CompoundTransformerNetwork::evaluate(SubDocNetworkObjOutput& output, const NetworkOrder& order,
-                                                 QHash<QString, QString>& origins) const {
+AttributeSet CompoundTransformerNetwork::evaluate(SubDocNetworkObjOutput& output, const NetworkOrder& order,
+                                                  MetAttributes& met) const {
   const NestedQuestion question(kKind);
   const QScopedValueRollback<bool> evaluating(m_isEvaluating, true);
   auto cycle = order.cycles.begin();
@@ -133,10 +142,10 @@ QStringList CompoundTransformerNetwork::evaluate(SubDocNetworkObjOutput& output,
     if (cycle == order.cycles.end() || cycle->begin != at) {
       SubDocNetworkObj* node = order.nodes[at++];
       node->beginQuery();
-      node->compute(origins);
+      node->compute(met);
       continue;
     }
-    computeCycle(*cycle, origins);
+    computeCycle(*cycle, met);
     at = cycle->end;
     ++cycle;
   }

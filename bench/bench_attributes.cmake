@@ -1,0 +1,1 @@
+orx_bench(bench_attributes orx_translation)
