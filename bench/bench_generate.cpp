@@ -5,8 +5,8 @@
 #include <tests/translation/SmallWorkspace.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/registry/TransformerMgr.h>
+#include <translation/WorkspaceJudgement.h>
 #include <translation/WorkspaceTranslation.h>
-#include <translation/WorkspaceValidation.h>
 #include <translation/generation/MFDeviceBuffer.h>
 #include <translation/generation/MappingFileWriter.h>
 

@@ -1,13 +1,30 @@
 #include <transform/core/TransformerSource.h>
 #include <transform/files/AtomicFile.h>
+#include <transform/files/TemporaryFile.h>
 #include <translation/WorkspaceDocument.h>
+#include <translation/WorkspaceJudgement.h>
 #include <translation/WorkspaceTranslation.h>
-#include <translation/WorkspaceValidation.h>
 #include <translation/generation/MFDeviceBuffer.h>
 #include <translation/graph/Workspace.h>
 #include <translation/graph/WorkspaceBuilder.h>
 
-using orx::Rule;
+namespace {
+
+constexpr qint64 kChunk = 1024 * 1024;
+
+// False when the temporary file cannot be written or read; what fails at the place itself is told there.
+bool copy(TemporaryFile& from, QIODevice& to) {
+  if (!from.flush() || !from.seek(0))
+    return false;
+  while (!from.atEnd()) {
+    const QByteArray bytes = from.read(kChunk);
+    if (bytes.isEmpty() || to.write(bytes) != bytes.size())
+      return from.error() == QFileDevice::NoError;
+  }
+  return true;
+}
+
+}  // namespace
 
 std::unique_ptr<Workspace> readWorkspace(const TranslationRequest& request, TransformerSource& source,
                                          orx::Findings& diagnostics, QString& error) {
@@ -36,10 +53,20 @@ TranslationResult translateWorkspace(const TranslationRequest& request, Transfor
     error = output.errorString();
     return end(TranslationResult::Unwritable);
   }
+  // What goes to its place at once is held back until all of it is judged.
+  TemporaryFile held(QStringLiteral("orx-mf-XXXXXX"));
+  if (output.isDirect() && !held.open()) {
+    error = held.errorString();
+    return end(TranslationResult::Unwritable);
+  }
   {
-    MFDeviceBuffer buffer(output.device());
+    MFDeviceBuffer buffer(held.isOpen() ? held : output.device());
     if (!judgement.write(buffer))
       return end(TranslationResult::Refused);
+    if (held.isOpen() && (buffer.hasFailed() || !copy(held, output.device()))) {
+      error = held.errorString();
+      return end(TranslationResult::Unwritable);
+    }
   }
   if (!output.commit()) {
     error = output.errorString();

@@ -16,10 +16,8 @@
 #include <QHash>
 #include <QString>
 
-#include <memory>
 #include <vector>
 
-class MFBuffer;
 class TransformerSource;
 
 struct ORX_EXPORT ValidationReport {
@@ -29,33 +27,6 @@ struct ORX_EXPORT ValidationReport {
 
   bool isReadable() const { return readError.isEmpty(); }
   int count(orx::Severity severity) const;
-};
-
-// The judgement itself, for whoever wants to write what passes. The workspace is read and judged once.
-class ORX_EXPORT WorkspaceJudgement {
- public:
-  // `fileName` may be "-", standard input; `parameterValues` gives global parameters other values, by name.
-  // `source` is not owned.
-  WorkspaceJudgement(const QString& fileName, TransformerSource& source,
-                     const orx::RuleSettings& settings = {},
-                     const QHash<QString, QString>& parameterValues = {});
-  ~WorkspaceJudgement();
-  WorkspaceJudgement(const WorkspaceJudgement&) = delete;
-  WorkspaceJudgement& operator=(const WorkspaceJudgement&) = delete;
-
-  // Why the file cannot be read; empty when it can.
-  const QString& readError() const;
-  // With the severities of the settings, in the order of a report.
-  std::vector<orx::Finding> findings() const;
-  // Whether nothing that was found counts as an error.
-  bool allowsWriting() const;
-  // The mapping file. Call once, when allowsWriting() answers true. False when a transformer did not write
-  // its statements after all, which the findings then tell.
-  bool write(MFBuffer& buffer);
-
- private:
-  struct Work;
-  std::unique_ptr<Work> m_work;
 };
 
 // The judgement alone. What passes is written as well, to nowhere, so that nothing is left to be found.

@@ -84,6 +84,8 @@ def split(text, keyed=False):
         key = KEYED.match(text, at) if keyed else None
         if key or text[at] == '"':
             end = quote_end(text, key.end() if key else at) or -1
+            while not key and end > 0 and text[end:end + 2] == ',"':
+                end = quote_end(text, end + 1) or -1
         elif re.match(r"@\w+\(", text[at:]):
             end = call_end(text, at)
         else:
@@ -96,6 +98,8 @@ def split(text, keyed=False):
 def unquote(raw):
     if len(raw) < 2 or raw[0] != '"' or raw[-1] != '"':
         return raw
+    if quote_end(raw, 0) < len(raw):
+        return raw  # a list of such
     inner = raw[1:-1]
     tail = len(inner) - len(inner.rstrip("\\"))
     return inner[:len(inner) - tail].replace('\\"', '"') + "\\" * (tail // 2)

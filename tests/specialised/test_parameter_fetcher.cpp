@@ -156,6 +156,8 @@ TEST(ParameterFetcher, WorksInAWorkspace) {
   const std::tuple<int, QStringList, const char*, const char*> cases[] = {
       {3, {"ATTR_LIST", "$(TOWN) $(LIMIT)"}, "", "PARAMETERS {$(TOWN)} {$(LIMIT)}"},
       {2, {"ATTR_LIST", "$(TOWN),$(LIMIT)"}, "newer-version", "PARAMETERS \"$(TOWN)\",\"$(LIMIT)\""},
+      {2, {"ATTR_LIST", "\"$(TOWN)\",$(LIMIT)"}, "newer-version", "PARAMETERS \"$(TOWN)\",\"$(LIMIT)\""},
+      {3, {"ATTR_LIST", "{$(TOWN)} {$(LIMIT)}"}, "", "PARAMETERS {$(TOWN)} {$(LIMIT)}"},
       {3, {"ATTR_LIST", "$(LIMIT)"}, "unused-parameter", "PARAMETERS $(LIMIT)"},
       {3, {"ATTR_LIST", "$(TOWN) $(NO)"}, "unused-parameter invalid-value missing-attribute", ""},
       {1,

@@ -179,9 +179,11 @@ class SmallSource : public TransformerSource {
         QStringList{"FACTORY_DEF * " + name + "Factory FACTORY_NAME $(XFORMER_NAME) $(INPUT_LINES) P $(" +
                     parameter + ")"};
     for (const QString& tag : definition.outputTags) {
-      definition.templateLines << "FACTORY_DEF * TeeFactory INPUT FEATURE_TYPE $(XFORMER_NAME_ENCODED)|" +
-                                      tag + " OUTPUT FEATURE_TYPE $(OUTPUT_" + tag + "_FTYPE) $(OUTPUT_" +
-                                      tag + "_FUNCS)";
+      const QString inner = "$(XFORMER_NAME_ENCODED)|" + tag;
+      definition.templateLines << "FACTORY_DEF * TeeFactory FACTORY_NAME " + inner +
+                                      "_Router INPUT FEATURE_TYPE " + inner +
+                                      " OUTPUT FEATURE_TYPE $(OUTPUT_" + tag + "_FTYPE) $(OUTPUT_" + tag +
+                                      "_FUNCS)";
     }
     if (name == "Broken")
       definition.templateLines << "# $[";

@@ -43,17 +43,17 @@ TEST(Translation, WritesTheStatementsInOrder) {
   const QStringList lines = outcome.text.split('\n', Qt::SkipEmptyParts);
   ASSERT_EQ(lines.size(), 8) << outcome.text.toStdString();
   EXPECT_TRUE(lines.at(0).startsWith("# Written by orxt "));
-  EXPECT_EQ(lines.mid(1),
-            (QStringList{
-                "# kept as it stands ",
-                "MACRO Set 1",
-                "DEFAULT_MACRO Free a b",
-                "MACRO Free c",
-                "FACTORY_DEF * CopyFactory FACTORY_NAME C INPUT INPUT FEATURE_TYPE Parcels P ",
-                "FACTORY_DEF * TeeFactory INPUT FEATURE_TYPE C|OUTPUT OUTPUT FEATURE_TYPE C_OUTPUT ",
-                "FACTORY_DEF * TeeFactory FACTORY_NAME \"DATA Flooded Output Renamer/Nuker\" "
-                "INPUT FEATURE_TYPE C_OUTPUT OUTPUT FEATURE_TYPE Flooded",
-            }));
+  EXPECT_EQ(lines.mid(1), (QStringList{
+                              "# kept as it stands ",
+                              "MACRO Set 1",
+                              "DEFAULT_MACRO Free a b",
+                              "MACRO Free c",
+                              "FACTORY_DEF * CopyFactory FACTORY_NAME C INPUT INPUT FEATURE_TYPE Parcels P ",
+                              "FACTORY_DEF * TeeFactory FACTORY_NAME C|OUTPUT_Router INPUT FEATURE_TYPE "
+                              "C|OUTPUT OUTPUT FEATURE_TYPE C_OUTPUT ",
+                              "FACTORY_DEF * TeeFactory FACTORY_NAME \"DATA Flooded Output Renamer/Nuker\" "
+                              "INPUT FEATURE_TYPE C_OUTPUT OUTPUT FEATURE_TYPE Flooded",
+                          }));
 }
 
 TEST(Translation, FlowsKeepApart) {

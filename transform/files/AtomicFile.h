@@ -24,6 +24,8 @@ class ORX_EXPORT AtomicFile {
   // False when the place cannot be written; errorString() names the file and the reason. An open file that
   // was not committed is given up first.
   bool open();
+  // Whether what is written goes to its place at once, before commit().
+  bool isDirect() const { return m_device.isOpen() && m_temporaryName.isEmpty(); }
   // Valid after open(); owned by this object.
   QIODevice& device();
   // Puts the file in its place. False when anything written was lost; the file that stood there is then

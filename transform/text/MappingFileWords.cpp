@@ -6,6 +6,8 @@ namespace {
 
 const QLatin1Char kQuote('"');
 const QLatin1Char kBackslash('\\');
+// Between quoted texts that are a list: one word, which stands for itself.
+const QLatin1String kNextQuoted(",\"");
 
 bool isBlank(QChar c) {
   return c == QLatin1Char(' ') || c == QLatin1Char('\t');
@@ -72,6 +74,10 @@ bool MappingFileWords::next(MappingFileWord& word) {
   if (m_text.at(begin) == kQuote) {
     word.kind = MappingFileWord::Kind::Quoted;
     m_position = endOfQuote(begin, word);
+    while (word.isClosed && m_text.midRef(m_position, kNextQuoted.size()) == kNextQuoted) {
+      word.kind = MappingFileWord::Kind::Bare;
+      m_position = endOfQuote(m_position + 1, word);
+    }
     word.isGlued = word.isClosed && m_position < m_text.size() && !isBlank(m_text.at(m_position));
   } else {
     const QStringRef name = mappingFileCallName(m_text, begin, m_text.size());

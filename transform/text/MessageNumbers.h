@@ -421,6 +421,9 @@ constexpr long kStrayLine = 371320;
 
 // Judgement.
 constexpr long kParameterCircle = 371400;
+constexpr long kFaultyStatements = 371401;
+constexpr long kFaultyValue = 371402;
+constexpr long kFaultyHeaderLine = 371403;
 
 // Names.
 constexpr long kReferenceInName = 370940;

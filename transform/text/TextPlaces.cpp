@@ -30,7 +30,8 @@ bool isKeyword(const QString& word, const QSet<QString>& keys) {
 bool isBareWord(const QString& text) {
   MappingFileWords words(text);
   MappingFileWord word;
-  return words.next(word) && word.kind == MappingFileWord::Kind::Bare && word.text.size() == text.size();
+  return !text.startsWith(kQuote) && words.next(word) && word.kind == MappingFileWord::Kind::Bare &&
+         word.text.size() == text.size();
 }
 
 // Whether calls inside the words, too, come to an end.

@@ -25,6 +25,7 @@
 #include <translation/graph/FlowOrder.h>
 #include <translation/graph/InnerNames.h>
 #include <translation/graph/InstanceIdentity.h>
+#include <translation/mappingfile/WrittenCheck.h>
 
 #include <QBuffer>
 #include <QSet>
@@ -172,7 +173,16 @@ QByteArray CustomDefinition::block() const {
   return text + "# TRANSFORMER_END\n\n";
 }
 
-void CustomDefinition::write(MFBuffer& buffer) const {
+void CustomDefinition::write(MFBuffer& buffer, WrittenCheck* check) const {
+  if (check) {
+    check->begin({WrittenPlace::Kind::Node, 0, m_network.getName()});
+    // Behind the line that opens the block.
+    for (const Part& part : m_parts)
+      check->begin({WrittenPlace::Kind::Node, part.node->line(), title(part), part.cfg.get(),
+                    &part.node->parameterLines()},
+                   part.firstLine + 1);
+    check->begin({WrittenPlace::Kind::Node, 0, m_network.getName()}, m_portsLine + 1);
+  }
   buffer.write(block());
 }
 
@@ -322,10 +332,19 @@ QByteArray CustomDefinition::makeBody(orx::Findings& diagnostics) {
   device.open(QIODevice::WriteOnly);
   {
     MFDeviceBuffer buffer(device);
+    int counted = 0;
+    int lines = 0;
+    const auto nextLine = [&] {
+      lines += static_cast<int>(std::count(text.begin() + counted, text.end(), '\n'));
+      counted = text.size();
+      return lines;
+    };
     for (Part& part : m_parts) {
+      part.firstLine = nextLine();
       if (!part.cfg->instantiate(buffer, m_network.getName()))
         diagnostics.report(Rule::NotWritten, part.node->line(), title(part), {part.cfg->getName()});
     }
+    m_portsLine = nextLine();
     // What reaches an output leaves under the port's inner name; what reaches a loop point leaves by the
     // loop's output.
     for (const SubDocNetworkObj* node : m_network.nodes()) {

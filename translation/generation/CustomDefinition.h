@@ -19,6 +19,7 @@
 
 class ExternalDocNetwork;
 class MFBuffer;
+class WrittenCheck;
 class SubDocNetworkObj;
 class SubDocNetworkObjXformer;
 class TransformerCfg;
@@ -45,7 +46,7 @@ class CustomDefinition {
   // Checks what will be written, makes the text. False when anything forbids that, found here or before.
   bool prepare(orx::Findings& diagnostics);
   // All below: call after prepare() answered true.
-  void write(MFBuffer& buffer) const;
+  void write(MFBuffer& buffer, WrittenCheck* check) const;
   // The definition's own lines, without the marks around them and without their prefix.
   QStringList lines() const;
   // The first fields of the line that opens the block: name, version, category, GUID.
@@ -59,6 +60,7 @@ class CustomDefinition {
   struct Part {
     const SubDocNetworkObjXformer* node = nullptr;
     std::unique_ptr<TransformerCfg> cfg;
+    int firstLine = 0;  // in the body, from 0
   };
 
   bool order(orx::Findings& diagnostics);
@@ -83,4 +85,5 @@ class CustomDefinition {
   QHash<const SubDocNetworkObj*, QHash<QString, QString>> m_flows;  // of outputs that are connected, by port
   bool m_isArranged = false;
   QByteArray m_body;
+  int m_portsLine = 0;  // in the body, from 0: what leads to the outputs
 };

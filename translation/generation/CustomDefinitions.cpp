@@ -86,7 +86,7 @@ void CustomDefinitions::passAttributes() {
   }
 }
 
-void CustomDefinitions::write(MFBuffer& buffer) const {
+void CustomDefinitions::write(MFBuffer& buffer, WrittenCheck* check) const {
   for (std::size_t number = 0; number < m_used; ++number)
-    m_definitions[number].write(buffer);
+    m_definitions[number].write(buffer, check);
 }

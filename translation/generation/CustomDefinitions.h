@@ -14,6 +14,7 @@
 
 class CompoundTransformerNetwork;
 class MFBuffer;
+class WrittenCheck;
 
 class CustomDefinitions {
  public:
@@ -30,8 +31,8 @@ class CustomDefinitions {
 
   // Innermost first; to be written after prepare() answered true.
   const std::deque<CustomDefinition>& all() const { return m_definitions; }
-  // Writes those in use. Call after prepare().
-  void write(MFBuffer& buffer) const;
+  // Writes those in use, and tells the check, when there is one, who writes. Call after prepare().
+  void write(MFBuffer& buffer, WrittenCheck* check) const;
 
  private:
   void passAttributes();

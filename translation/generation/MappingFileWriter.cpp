@@ -20,9 +20,12 @@
 #include <translation/generation/RouteStatement.h>
 #include <translation/graph/FlowOrder.h>
 #include <translation/graph/InnerNames.h>
+#include <translation/mappingfile/HarmlessText.h>
+#include <translation/mappingfile/WrittenCheck.h>
 
 #include <QSet>
 
+#include <algorithm>
 #include <limits>
 
 namespace messages = orx::messages;
@@ -361,31 +364,80 @@ void MappingFileWriter::check() {
   }
 }
 
-bool MappingFileWriter::write(MFBuffer& buffer) {
+bool MappingFileWriter::write(MFBuffer& buffer, WrittenCheck* check) {
   writeStatement(buffer, QLatin1String("# Written by ") + programVersion());
-  if (!m_workspace.headerLines.isEmpty()) {
-    for (const QString& line : m_workspace.headerLines)
-      buffer.write(line.toUtf8() + '\n');
-    buffer.write(QByteArray(1, '\n'));
+  writeHeader(buffer, check);
+  writeParameters(buffer, check);
+  WrittenCheck* const ofNames = hasHarmfulNames() ? check : nullptr;
+  if (check && !ofNames)
+    check->skip();
+  writeFeatureTypes(buffer, ofNames);
+  m_definitions.write(buffer, check);
+  const bool isWritten = writeTransformers(buffer, check);
+  writeWriterRoutes(buffer, ofNames);
+  return isWritten;
+}
+
+bool MappingFileWriter::hasHarmfulNames() const {
+  const auto areHarmless = [](const QStringList& names) {
+    return std::all_of(names.begin(), names.end(), isHarmlessText);
+  };
+  return !std::all_of(m_workspace.nodes.begin(), m_workspace.nodes.end(),
+                      [&](const WorkspaceNode& node) {
+                        return isHarmlessText(node.name) && isHarmlessText(node.keyword) &&
+                               areHarmless(node.attributes) &&
+                               std::all_of(node.exposed.begin(), node.exposed.end(), areHarmless);
+                      }) ||
+         !std::all_of(m_workspace.attributeLinks.begin(), m_workspace.attributeLinks.end(),
+                      [&](const AttributeLink& link) {
+                        return areHarmless({link.from, link.to});
+                      });
+}
+
+void MappingFileWriter::writeHeader(MFBuffer& buffer, WrittenCheck* check) const {
+  if (m_workspace.headerLines.isEmpty())
+    return;
+  int number = m_workspace.firstHeaderLine;
+  for (const QString& line : m_workspace.headerLines) {
+    if (check)
+      check->begin({WrittenPlace::Kind::HeaderLine, number, QString()});
+    buffer.write(line.toUtf8() + '\n');
+    ++number;
   }
-  writeParameters(buffer);
-  writeFeatureTypes(buffer);
-  m_definitions.write(buffer);
+  buffer.write(QByteArray(1, '\n'));
+}
+
+// Only what is suspect is judged: what has a value of its own that may do harm, custom transformers, and the
+// first of each kind, whose template and defaults stand for those of all.
+bool MappingFileWriter::writeTransformers(MFBuffer& buffer, WrittenCheck* check) {
+  const bool judgesAll = hasHarmfulNames();
+  QSet<const ConfiguredDefinition*> seen;
   bool isWritten = true;
   for (const int number : m_order) {
     const WorkspaceNode& node = m_workspace.nodes[at(number)];
+    if (check) {
+      const bool isFirst = !seen.contains(node.cfg->definition());
+      seen.insert(node.cfg->definition());
+      if (judgesAll || isFirst || !node.isHarmless || isCustomTransformer(node.cfg.get()))
+        check->begin({WrittenPlace::Kind::Node, node.line, node.name, node.cfg.get(), &node.parameterLines});
+      else
+        check->skip();
+    }
     if (node.cfg->instantiate(buffer, m_workspace.fileName))
       continue;
     m_diagnostics.report(Rule::NotWritten, node.line, node.name, {node.name});
     isWritten = false;
   }
-  writeWriterRoutes(buffer);
+  if (check)
+    check->skip();
   return isWritten;
 }
 
-void MappingFileWriter::writeParameters(MFBuffer& buffer) const {
+void MappingFileWriter::writeParameters(MFBuffer& buffer, WrittenCheck* check) const {
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
     const QString name = parameter.name + QLatin1Char(' ');
+    if (check)
+      check->begin({WrittenPlace::Kind::Parameter, parameter.line, parameter.name});
     QStringList script;
     if (parameter.isComputed() && parameter.language == ScriptLanguage::Python)
       getPythonParameterLines(QString(), parameter.name, parameter.value, script);
@@ -400,11 +452,13 @@ void MappingFileWriter::writeParameters(MFBuffer& buffer) const {
   }
 }
 
-void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer) const {
+void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer, WrittenCheck* check) const {
   for (std::size_t node = 0; node < m_workspace.nodes.size(); ++node) {
     const WorkspaceNode& place = m_workspace.nodes[node];
     if (place.isTransformer())
       continue;
+    if (check)
+      check->begin({WrittenPlace::Kind::Node, place.line, place.name});
     const QString flow = m_flows[node].value(QString());
     if (flow != place.name) {
       const bool isReader = place.kind == WorkspaceNode::Kind::Reader;
@@ -422,11 +476,13 @@ void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer) const {
   }
 }
 
-void MappingFileWriter::writeWriterRoutes(MFBuffer& buffer) const {
+void MappingFileWriter::writeWriterRoutes(MFBuffer& buffer, WrittenCheck* check) const {
   for (std::size_t node = 0; node < m_workspace.nodes.size(); ++node) {
     const WorkspaceNode& place = m_workspace.nodes[node];
     if (place.kind != WorkspaceNode::Kind::Writer || m_incoming[node].empty())
       continue;
+    if (check)
+      check->begin({WrittenPlace::Kind::Node, place.line, place.name});
     QStringList flows;
     for (const int number : m_incoming[node]) {
       const WorkspaceLink& link = m_workspace.links[at(number)];

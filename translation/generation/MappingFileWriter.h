@@ -13,6 +13,7 @@
 class FlowNames;
 class InnerNames;
 class MFBuffer;
+class WrittenCheck;
 
 class MappingFileWriter {
  public:
@@ -25,8 +26,9 @@ class MappingFileWriter {
   // Whether prepare() could connect the transformers and tell them which attributes arrive.
   bool isConnected() const { return m_isConnected; }
   // The whole mapping file. Call after prepare(), and not when anything was found that forbids the writing.
-  // False when a transformer did not write its statements after all, which diagnostics tell.
-  bool write(MFBuffer& buffer);
+  // False when a transformer did not write its statements after all, which diagnostics tell. A check that
+  // judges what is written is the buffer at the same time, and is told who writes.
+  bool write(MFBuffer& buffer, WrittenCheck* check = nullptr);
 
  private:
   bool order();
@@ -47,9 +49,13 @@ class MappingFileWriter {
 
   // The flow that leaves a link's source through its port.
   const QString& flowOf(int node, const QString& output) const;
-  void writeParameters(MFBuffer& buffer) const;
-  void writeFeatureTypes(MFBuffer& buffer) const;
-  void writeWriterRoutes(MFBuffer& buffer) const;
+  void writeHeader(MFBuffer& buffer, WrittenCheck* check) const;
+  void writeParameters(MFBuffer& buffer, WrittenCheck* check) const;
+  void writeFeatureTypes(MFBuffer& buffer, WrittenCheck* check) const;
+  bool writeTransformers(MFBuffer& buffer, WrittenCheck* check);
+  void writeWriterRoutes(MFBuffer& buffer, WrittenCheck* check) const;
+  // Whether names alone may make any statement wrong.
+  bool hasHarmfulNames() const;
 
   Workspace& m_workspace;
   orx::Findings& m_diagnostics;

@@ -36,6 +36,7 @@ struct WorkspaceNode {
   std::unique_ptr<TransformerCfg> cfg;
   QHash<QString, QStringList> inputOrder;  // input tag to the flows that enter there, in order
   ParameterLines parameterLines;
+  bool isHarmless = true;  // no value that the document gives can mean anything to a mapping file
   QHash<QString, QStringList> exposed;  // output tag to the attributes that a user added there
 
   // Whether a link at this end was left out: it, or the node at its other end, is disabled or at fault.

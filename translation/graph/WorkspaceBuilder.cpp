@@ -10,6 +10,7 @@
 #include <translation/graph/InstanceIdentity.h>
 #include <translation/graph/NetworkDiagnostics.h>
 #include <translation/graph/WorkspaceBuilder.h>
+#include <translation/mappingfile/HarmlessText.h>
 
 namespace messages = orx::messages;
 
@@ -144,6 +145,8 @@ void WorkspaceBuilder::addTransformer(const TransformerStruct& record) {
   node.name = place.name;
   node.cfg->setBaseGuid(instanceStem(QStringList(), record.identifier, transformerTitle(record)));
   node.parameterLines = ParameterLines(record);
+  for (const XformParmStruct& parameter : record.parameters)
+    node.isHarmless = node.isHarmless && isHarmlessText(parameter.parmValue);
   node.exposed = place.ports.exposedAttributes(record);
   for (const QStringList& port : readPortOrder(record.inputFtOrder)) {
     const QString tag = place.ports.input(0, port.value(0));

@@ -32,27 +32,66 @@ int MappingFileStatement::lineAt(int offset) const {
 MappingFileReader::MappingFileReader(const QString& path, MappingFileReport& report)
     : m_lines(path), m_report(report), m_levels(1) {}
 
+MappingFileReader::MappingFileReader(MappingFileReport& report)
+    : m_lines(QString()), m_isFed(true), m_isWhole(false), m_report(report), m_levels(1) {}
+
 bool MappingFileReader::open() {
   const bool opened = m_lines.open();
   m_error = m_lines.errorString();
   return opened;
 }
 
+void MappingFileReader::feed(const QByteArray& bytes) {
+  if (m_fedBegin > 0) {
+    m_fed.remove(0, m_fedBegin);
+    m_fedSearched -= m_fedBegin;
+    m_fedBegin = 0;
+  }
+  m_fed += bytes;
+}
+
+bool MappingFileReader::takeFedLine(QByteArray& line) {
+  const int end = m_fed.indexOf('\n', m_fedSearched);
+  const int length = (end < 0 ? m_fed.size() : end) - m_fedBegin;
+  m_fedSearched = end < 0 ? m_fed.size() : end + 1;
+  if (length > LineReader::kLongestLine) {
+    m_report.add(Rule::LongStatement, m_number + 1, {QString::number(kLongestStatement / kMebibyte)});
+    m_fed.clear();
+    m_fedBegin = m_fedSearched = 0;
+    return false;
+  }
+  if (end < 0 && (!m_isWhole || length == 0))
+    return false;
+  line = m_fed.mid(m_fedBegin, length);
+  if (end >= 0 && line.endsWith('\r'))
+    line.chop(1);
+  m_fedBegin = m_fedSearched;
+  return true;
+}
+
+bool MappingFileReader::readLine(QByteArray& line) {
+  if (m_lines.next()) {
+    m_lastNumber = m_lines.number();
+    line = m_lines.line();
+    return true;
+  }
+  // A line that was counted but not given is too long; any other failure is the file's.
+  if (m_lines.failed() && m_lines.number() == m_lastNumber) {
+    m_error = m_lines.errorString();
+  } else if (m_lines.failed()) {
+    m_lastNumber = m_lines.number();
+    m_report.add(Rule::LongStatement, m_number + 1, {QString::number(kLongestStatement / kMebibyte)});
+  }
+  return false;
+}
+
 bool MappingFileReader::fetchLine() {
   if (m_splitNext == m_split.size()) {
-    if (!m_lines.next()) {
-      // A line that was counted but not given is too long; any other failure is the file's.
-      if (m_lines.failed() && m_lines.number() == m_lastNumber) {
-        m_error = m_lines.errorString();
-      } else if (m_lines.failed()) {
-        m_lastNumber = m_lines.number();
-        m_report.add(Rule::LongStatement, m_number + 1, {QString::number(kLongestStatement / kMebibyte)});
-      }
+    QByteArray line;
+    if (!(m_isFed ? takeFedLine(line) : readLine(line)))
       return false;
-    }
-    m_lastNumber = m_lines.number();
     // A carriage return alone ends a line as well.
-    m_split = m_lines.line().split('\r');
+    m_split = line.split('\r');
     m_splitNext = 0;
   }
   const QByteArray& bytes = m_split.at(m_splitNext++);
@@ -109,6 +148,8 @@ MappingFileReader::Item MappingFileReader::next() {
     if (taken != Taken::Nothing)
       return item;
   }
+  if (!m_isWhole)
+    return Item::More;
   if (closeLevel(innermost(), item))
     return item;
   if (m_levels.size() == 1)

@@ -1,6 +1,7 @@
 // Reads the statements of a mapping file, or of a file of custom transformers, one after the other: physical
 // lines are joined, comments left out, definitions of custom transformers and blocks of script lines told
-// apart. What is wrong with the lines is reported; memory is bounded by the longest statement.
+// apart. What is wrong with the lines is reported; memory is bounded by the longest statement. The text
+// comes from a file, or piece by piece from whoever writes it.
 #pragma once
 
 #include <transform/files/LineReader.h>
@@ -27,15 +28,20 @@ class MappingFileReader {
  public:
   static constexpr int kDeepestBlock = 64;
 
-  enum class Item { Statement, ScriptLine, BlockBegin, BlockEnd, End };
+  enum class Item { Statement, ScriptLine, BlockBegin, BlockEnd, More, End };
 
   // `report` is not owned.
   MappingFileReader(const QString& path, MappingFileReport& report);
+  // Of a text that feed() gives.
+  explicit MappingFileReader(MappingFileReport& report);
 
   // False when the file cannot be read; errorString() tells why.
   bool open();
+  // Adds to the text, in pieces of any size; endFeed() tells that it is whole.
+  void feed(const QByteArray& bytes);
+  void endFeed() { m_isWhole = true; }
   // The block that BlockBegin opens, and all that stands in it, comes before its BlockEnd. Every block ends,
-  // also one that the file leaves open.
+  // also one that the file leaves open. More tells that no whole line is left of what was fed.
   Item next();
   // Of a BlockBegin the fields behind the keyword.
   const MappingFileStatement& statement() const { return m_statement; }
@@ -58,6 +64,9 @@ class MappingFileReader {
   enum class Taken { Nothing, Item, ItemAgain };
 
   bool fetchLine();
+  // The next line without its end, of the file or of what was fed. False when there is none.
+  bool readLine(QByteArray& line);
+  bool takeFedLine(QByteArray& line);
   void checkBytes(const QByteArray& bytes);
   // Where the content of the line begins for the innermost level that it belongs to.
   int belongingLevels(int& offset) const;
@@ -71,6 +80,11 @@ class MappingFileReader {
   Level& innermost() { return m_levels.back(); }
 
   LineReader m_lines;
+  QByteArray m_fed;       // a text that comes in pieces
+  int m_fedBegin = 0;     // of what was not taken yet
+  int m_fedSearched = 0;  // up to where there is no line end
+  bool m_isFed = false;
+  bool m_isWhole = true;
   MappingFileReport& m_report;
   std::vector<Level> m_levels;
   MappingFileStatement m_statement;
