@@ -139,7 +139,7 @@ ValueFit ValueFit::of(const GUIType& type, const ChoiceList& choices, const QStr
 }
 
 std::vector<ValueFit> ValueFit::misfitsOf(const TransformParamCfg& parameter, const QString& value,
-                                           const Expand& expand) {
+                                          const Expand& expand) {
   std::vector<ValueFit> misfits;
   if (parameter.getName() == kProcessCountParameter && value == kNoProcesses)
     return misfits;
