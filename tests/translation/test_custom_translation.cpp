@@ -183,14 +183,17 @@ TEST(CustomTranslation, NestsUpTo64Deep) {
 
 TEST(CustomTranslation, TellsThatAnAnswerWouldCostTooMuch) {
   for (const int references : {1000, 1001}) {
-    SmallWorkspace workspace;
-    workspace.transformer(3, "SubDocumentTransformer", {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", "C"});
-    workspace.beginCustom("Cleaner", {"CATEGORY", "Mine"}).parameter("GUI TEXT N Name", "n");
+    SmallWorkspace workspace = nestedWorkspace(0, 0);
+    workspace.transformer(4, "Copy", {"XFORMER_NAME", "Behind"}).link(3, "fo 0", 4, "fi 0");
+    workspace.beginCustom("L-1")
+        .parameter("GUI TEXT N Name", "n")
+        .port(1, "IN", "true")
+        .port(2, "OUT", "false");
     workspace.transformer(3, "Add", {"XFORMER_NAME", "A", "NEW", QString("$(N)").repeated(references)});
-    workspace.endCustom();
+    workspace.link(1, "fo 0", 3, "fi 0").link(3, "fo 0", 2, "fi 0").endCustom();
     const Outcome outcome = translate(workspace);
     EXPECT_EQ(outcome.diagnostics.contains("nesting "), references > 1000)
-        << outcome.texts.join('\n').toStdString();
+        << outcome.diagnostics.join('|').toStdString();
   }
 }
 
