@@ -8,7 +8,7 @@
 #include <translation/WorkspaceJudgement.h>
 #include <translation/WorkspaceTranslation.h>
 #include <translation/generation/MFDeviceBuffer.h>
-#include <translation/generation/MappingFileWriter.h>
+#include <translation/generation/PreparedWorkspace.h>
 
 #include <QFile>
 #include <QTemporaryDir>
@@ -104,11 +104,11 @@ Times translate(const QString& file, const QString& written, TransformerMgr& reg
   if (!workspace)
     fail(diagnostics.all());
   times.read = microsecondsSince(start);
-  MappingFileWriter writer(*workspace, diagnostics);
-  if (!writer.prepare())
+  PreparedWorkspace prepared(*workspace, diagnostics);
+  if (diagnostics.hasErrors())
     fail(diagnostics.all());
   times.prepared = microsecondsSince(start);
-  writeTo(written, writer);
+  writeTo(written, prepared);
   times.written = microsecondsSince(start);
   return times;
 }

@@ -3,7 +3,7 @@
 #include <transform/custom/NestedNetworks.h>
 #include <translation/WorkspaceDocument.h>
 #include <translation/WorkspaceJudgement.h>
-#include <translation/generation/MappingFileWriter.h>
+#include <translation/generation/PreparedWorkspace.h>
 #include <translation/graph/WorkspaceBuilder.h>
 #include <translation/mappingfile/WrittenCheck.h>
 #include <translation/validation/DocumentChecks.h>
@@ -43,7 +43,7 @@ struct WorkspaceJudgement::Work {
   orx::RuleSettings settings;
   QString readError;
   std::unique_ptr<Workspace> workspace;  // null when there is no document to build it from
-  std::unique_ptr<MappingFileWriter> writer;
+  std::unique_ptr<PreparedWorkspace> prepared;
 };
 
 void WorkspaceJudgement::Work::judge(const QString& fileName,
@@ -54,10 +54,9 @@ void WorkspaceJudgement::Work::judge(const QString& fileName,
   WorkspaceBuilder builder(source, diagnostics, parameterValues);
   builder.includeUnused();
   workspace = builder.build(document.reader(), fileName, document.headerLines());
-  writer = std::make_unique<MappingFileWriter>(*workspace, diagnostics);
-  writer->prepare();
+  prepared = std::make_unique<PreparedWorkspace>(*workspace, diagnostics);
   WorkspaceChecks(document.reader(), document.headerLines(), source, settings, diagnostics)
-      .check(*workspace, writer->isConnected());
+      .check(*workspace, prepared->isConnected());
   checkDocument(document, diagnostics);
 }
 
@@ -80,14 +79,14 @@ std::vector<orx::Finding> WorkspaceJudgement::findings() const {
 
 bool WorkspaceJudgement::allowsWriting() const {
   const std::vector<orx::Finding>& all = m_work->diagnostics.all();
-  return m_work->writer && std::none_of(all.begin(), all.end(), [this](const orx::Finding& finding) {
+  return m_work->prepared && std::none_of(all.begin(), all.end(), [this](const orx::Finding& finding) {
            return m_work->settings.severity(finding.rule) == Severity::Error;
          });
 }
 
 bool WorkspaceJudgement::write(MFBuffer& buffer) {
   WrittenCheck check(buffer);
-  const bool isWritten = m_work->writer->write(check, &check);
+  const bool isWritten = m_work->prepared->write(check, &check);
   check.finish(
       [this](const QString& name, int version) {
         return isCustomTransformer(m_work->source.makeTransformer(name, version).get());

@@ -1,0 +1,177 @@
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/AttributeFlow.h>
+#include <translation/generation/FlowNames.h>
+#include <translation/generation/RouteStatement.h>
+#include <translation/generation/WorkspaceConnection.h>
+#include <translation/graph/FlowOrder.h>
+#include <translation/graph/InnerNames.h>
+
+#include <QSet>
+
+#include <algorithm>
+#include <limits>
+
+using orx::Rule;
+
+WorkspaceConnection::WorkspaceConnection(Workspace& workspace, orx::Findings& findings)
+    : m_workspace(workspace),
+      m_findings(findings),
+      m_flows(workspace.nodes.size()),
+      m_functions(workspace.nodes.size()),
+      m_copies(workspace.nodes.size()),
+      m_copiedFlows(workspace.nodes.size()),
+      m_incoming(workspace.nodes.size()),
+      m_isConnected(findOrder()) {
+  if (!m_isConnected)
+    return;
+  nameFlows();
+  connect();
+  pushAttributes();
+}
+
+bool WorkspaceConnection::findOrder() {
+  std::vector<std::pair<int, int>> edges;
+  edges.reserve(m_workspace.links.size());
+  for (const WorkspaceLink& link : m_workspace.links)
+    edges.emplace_back(link.source, link.target);
+  const FlowOrder flow = flowOrder(static_cast<int>(m_workspace.nodes.size()), edges);
+  for (const std::vector<int>& cycle : flow.cycles) {
+    QStringList names;
+    for (const int member : cycle)
+      names.append(m_workspace.nodes[at(member)].name);
+    m_findings.report(Rule::Cycle, m_workspace.nodes[at(cycle.front())].line, names.first(),
+                      {names.join(QLatin1String(", "))});
+  }
+  for (const int node : flow.order) {
+    if (m_workspace.nodes[at(node)].isTransformer())
+      m_order.push_back(node);
+  }
+  return flow.cycles.empty();
+}
+
+void WorkspaceConnection::nameFlows() {
+  std::vector<QHash<QString, QSet<QString>>> copied(m_workspace.nodes.size());
+  for (const AttributeLink& link : m_workspace.attributeLinks) {
+    const QString function = copyAttributeFunction(link.to, link.from);
+    QSet<QString>& known = copied[at(link.source)][link.output];
+    if (known.contains(function))
+      continue;
+    known.insert(function);
+    m_functions[at(link.source)][link.output].append(function);
+    m_copies[at(link.source)][link.output].append(link.to);
+  }
+
+  std::vector<QSet<QString>> connected(m_workspace.nodes.size());
+  for (const WorkspaceLink& link : m_workspace.links)
+    connected[at(link.source)].insert(link.output);
+
+  FlowNames names;
+  InnerNames inner;
+  const int count = static_cast<int>(m_workspace.nodes.size());
+  const auto claimTypes = [&](WorkspaceNode::Kind kind) {
+    for (int node = 0; node < count; ++node) {
+      if (m_workspace.nodes[at(node)].kind == kind)
+        m_flows[at(node)].insert(QString(), names.claim(m_workspace.nodes[at(node)].name));
+    }
+  };
+  // What a writer takes keeps the writer's own name, and the inner names of custom transformers are fixed, so
+  // those come first.
+  claimTypes(WorkspaceNode::Kind::Writer);
+  reserveInnerNames(names, inner);
+  claimTypes(WorkspaceNode::Kind::Reader);
+  for (int node = 0; node < count; ++node) {
+    const WorkspaceNode& place = m_workspace.nodes[at(node)];
+    if (place.kind == WorkspaceNode::Kind::Reader && m_functions[at(node)].contains(QString())) {
+      m_copiedFlows[at(node)] = names.claim(m_flows[at(node)].value(QString()));
+    } else if (place.isTransformer()) {
+      QStringList tags;
+      place.cfg->getOutputTags(tags);
+      for (const QString& tag : tags) {
+        if (connected[at(node)].contains(tag))
+          m_flows[at(node)].insert(tag, names.claim(outputFlowName(*place.cfg, place.name, tag)));
+        inner.addFlow(m_flows[at(node)].value(tag));
+      }
+    }
+    inner.addFlow(m_flows[at(node)].value(QString()));
+    inner.addFlow(m_copiedFlows[at(node)]);
+  }
+  for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all())
+    inner.addParameter(parameter.name);
+  inner.report(QString(), m_findings);
+}
+
+void WorkspaceConnection::reserveInnerNames(FlowNames& names, InnerNames& inner) {
+  for (const WorkspaceNode& node : m_workspace.nodes) {
+    if (!node.isTransformer())
+      continue;
+    inner.add(node.name, node.line, *node.cfg);
+    for (const QString& taken : names.reserve(*node.cfg, node.name))
+      m_findings.report(Rule::TakenName, node.line, node.name, {taken});
+  }
+}
+
+const QString& WorkspaceConnection::flowOf(const WorkspaceLink& link) const {
+  static const QString none;
+  if (!m_copiedFlows[at(link.source)].isEmpty())
+    return m_copiedFlows[at(link.source)];
+  const auto flow = m_flows[at(link.source)].constFind(link.output);
+  return flow == m_flows[at(link.source)].constEnd() ? none : flow.value();
+}
+
+void WorkspaceConnection::connect() {
+  for (std::size_t number = 0; number < m_workspace.links.size(); ++number)
+    m_incoming[at(m_workspace.links[number].target)].push_back(static_cast<int>(number));
+
+  for (std::size_t target = 0; target < m_workspace.nodes.size(); ++target) {
+    const WorkspaceNode& node = m_workspace.nodes[target];
+    QHash<QString, QHash<QString, int>> ranks;
+    for (auto port = node.inputOrder.cbegin(); port != node.inputOrder.cend(); ++port) {
+      for (int position = 0; position < port->size(); ++position)
+        ranks[port.key()].insert(port->at(position), position);
+    }
+    const auto rank = [&](int number) {
+      constexpr int last = std::numeric_limits<int>::max();
+      const WorkspaceLink& link = m_workspace.links[at(number)];
+      const int byOrder = ranks.isEmpty() ? last : ranks.value(link.input).value(flowOf(link), last);
+      return std::make_pair(byOrder, link.executionIndex < 0 ? last : link.executionIndex);
+    };
+    std::stable_sort(m_incoming[target].begin(), m_incoming[target].end(),
+                     [&](int left, int right) { return rank(left) < rank(right); });
+    if (!node.isTransformer())
+      continue;
+    for (const int number : m_incoming[target]) {
+      const WorkspaceLink& link = m_workspace.links[at(number)];
+      node.cfg->addInputFeatureType(link.input, flowOf(link));
+    }
+    for (auto flow = m_flows[target].cbegin(); flow != m_flows[target].cend(); ++flow)
+      node.cfg->setOutputFeatureType(flow.key(), flow.value());
+    for (auto functions = m_functions[target].cbegin(); functions != m_functions[target].cend(); ++functions)
+      node.cfg->setOutputTagFuncs(functions.key(), functions.value());
+  }
+}
+
+void WorkspaceConnection::pushAttributes() {
+  // What leaves an output is asked once, however many links take it on.
+  std::vector<QHash<QString, AttributeSet>> leaving(m_workspace.nodes.size());
+  const auto attributesOf = [&](const WorkspaceLink& link) -> const AttributeSet& {
+    QHash<QString, AttributeSet>& known = leaving[at(link.source)];
+    const auto found = known.constFind(link.output);
+    if (found != known.constEnd())
+      return found.value();
+    const WorkspaceNode& source = m_workspace.nodes[at(link.source)];
+    AttributeSet attributes = source.isTransformer() ? attribute_flow::leaving(*source.cfg, link.output)
+                                                     : AttributeSet(source.attributes);
+    attributes.add(source.exposed.value(link.output));
+    attributes.add(m_copies[at(link.source)].value(link.output));
+    return known.insert(link.output, attributes).value();
+  };
+
+  for (const int target : m_order) {
+    QHash<QString, AttributeSet> arriving;
+    for (const int number : m_incoming[at(target)]) {
+      const WorkspaceLink& link = m_workspace.links[at(number)];
+      arriving[link.input].add(attributesOf(link));
+    }
+    attribute_flow::enter(*m_workspace.nodes[at(target)].cfg, arriving);
+  }
+}

@@ -1,0 +1,162 @@
+#include <transform/core/SingleChoices.h>
+#include <transform/core/TransformParamCfg.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerCfg.h>
+#include <transform/custom/NestedNetworks.h>
+#include <transform/scripts/ScriptBlocks.h>
+#include <transform/text/MFBuffer.h>
+#include <transform/text/MacroText.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
+#include <transform/text/TextPlaces.h>
+#include <translation/graph/InnerNames.h>
+#include <translation/validation/WritingChecks.h>
+
+#include <algorithm>
+
+namespace messages = orx::messages;
+
+using orx::Rule;
+
+bool WritingChecks::checkText(const QString& text, const QString& what, int line, const QString& node) {
+  const bool isClosed = MFBuffer::closesDeferredMacros(text);
+  if (!isClosed)
+    m_findings.report(Rule::UnclosedReference, line, node, {what});
+  const bool isOneLine = TextPlaces::isOneLine(text);
+  if (!isOneLine)
+    m_findings.report(Rule::LineBreak, line, node, {what});
+  return isClosed && isOneLine;
+}
+
+void WritingChecks::checkWord(const QString& text, int line, const QString& node) {
+  if (!checkText(text, text, line, node))
+    return;
+  if (const long number = TextPlaces::refuse(TextPlace::Name, text))
+    m_findings.reportAs(Rule::UnwritableValue, number, line, node, {text});
+}
+
+void WritingChecks::checkNoReference(const QString& name, int line, const QString& node) {
+  if (beginsMacroReference(name))
+    m_findings.reportAs(Rule::UnwritableValue, messages::kReferenceInName, line, node, {name});
+}
+
+// Names of attributes are written wherever they are asked for.
+void WritingChecks::checkAttributes(const WorkspaceNode& node) {
+  for (const QString& attribute : node.attributes)
+    checkNoReference(attribute, node.line, node.name);
+  for (const QStringList& attributes : node.exposed) {
+    for (const QString& attribute : attributes)
+      checkNoReference(attribute, node.line, node.name);
+  }
+}
+
+// A script sees what stands before it.
+QString WritingChecks::refuseScript(const GlobalParameters::Parameter& parameter) const {
+  const bool isPython = parameter.language == ScriptLanguage::Python;
+  QString message;
+  if (isPython ? !canWritePythonParameter(QString(), parameter.name, parameter.value, message)
+               : !canWriteTclParameter(QString(), parameter.name, parameter.value, message))
+    return message;
+  const bool includesOthers =
+      std::any_of(m_workspace.headerLines.begin(), m_workspace.headerLines.end(),
+                  [](const QString& line) { return line.startsWith(QLatin1String("INCLUDE ")); });
+  const auto isSetBefore = [&](const QString& name) {
+    const GlobalParameters::Parameter* read = m_workspace.parameters.find(name);
+    return read ? read->setInHeader || read < &parameter : includesOthers;
+  };
+  return unsetReadByScript(isPython, parameter.name, parameter.value, isSetBefore,
+                           [&](const QString& name) { return m_workspace.parameters.find(name) != nullptr; });
+}
+
+void WritingChecks::checkChoices(const GlobalParameters::Parameter& parameter) {
+  const TransformParamCfg record(GUIType::fromGuiLine(parameter.promptLine));
+  const QString& value = parameter.currentValue();
+  const QString stored = single_choices::toStored(record, value);
+  QString reason;
+  if (stored != value)
+    reason = TransformResString(messages::kShownSideWritten, {value, stored});
+  else if (single_choices::refersToShownSide(record, value, [this](QString& text) {
+             text = m_workspace.parameters.resolve(MFBuffer::withOrdinaryMacros(text));
+             return true;
+           }))
+    reason = TransformResString(messages::kShownSideReferred);
+  if (!reason.isEmpty())
+    m_findings.reportUnwritable(parameter.line, QString(), parameter.name, reason);
+}
+
+void WritingChecks::checkParameter(const GlobalParameters::Parameter& parameter, const QString& value) {
+  const bool isSound = checkText(value, parameter.name, parameter.line, QString());
+  long reason = TextPlaces::refuse(TextPlace::MacroName, parameter.name);
+  if (reason == 0 && isSound)
+    reason = TextPlaces::refuse(TextPlace::MacroValue, value);
+  if (reason != 0)
+    m_findings.reportUnwritable(parameter.line, QString(), parameter.name, TransformResString(reason));
+}
+
+void WritingChecks::checkParameters() {
+  for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
+    if (parameter.isPublished)
+      checkChoices(parameter);
+    const QString script = parameter.isComputed() ? refuseScript(parameter) : QString();
+    if (!script.isEmpty())
+      m_findings.reportUnwritable(parameter.line, QString(), parameter.name, script);
+    if (!parameter.setInHeader)
+      checkParameter(parameter, parameter.value);
+    if (parameter.isOverridden)
+      checkParameter(parameter, parameter.overridingValue);
+  }
+  for (const std::vector<const GlobalParameters::Parameter*>& circle : m_workspace.parameters.circles()) {
+    QStringList names;
+    for (const GlobalParameters::Parameter* parameter : circle)
+      names.append(parameter->name);
+    m_findings.reportText(
+        Rule::Cycle, circle.front()->line, QString(),
+        TransformResString(orx::messages::kParameterCircle, names.join(QLatin1String(", "))));
+  }
+}
+
+void WritingChecks::check() {
+  checkParameters();
+  for (const WorkspaceNode& node : m_workspace.nodes) {
+    checkAttributes(node);
+    if (node.isTransformer()) {
+      checkTransformer(node);
+    } else {
+      checkWord(node.name, node.line, node.name);
+      checkWord(node.keyword, node.line, node.name);
+    }
+  }
+}
+
+void WritingChecks::checkTransformer(const WorkspaceNode& node) {
+  if (checkText(node.name, node.name, node.line, node.name))
+    checkNoReference(node.name, node.line, node.name);
+  if (!m_sound.contains(node.cfg->definition())) {
+    const std::size_t before = m_findings.all().size();
+    for (const QString& line : node.cfg->getTemplateLines())
+      checkText(line, node.cfg->getName(), node.line, node.name);
+    if (m_findings.all().size() == before)
+      m_sound.insert(node.cfg->definition());
+  }
+  const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(node.cfg.get());
+  const QHash<QString, QString> faults =
+      custom ? custom->findUnwritableParameters() : node.cfg->findUnwritableValues();
+  QString nestingFault = custom ? custom->instantiationFault() : QString();
+  if (custom && nestingFault.isEmpty() && !m_checked.contains(custom->getNetwork())) {
+    m_checked.insert(custom->getNetwork());
+    nestingFault = findPrefixFault(*custom->getNetwork());
+  }
+  if (!nestingFault.isEmpty())
+    m_findings.reportText(Rule::Nesting, node.line, node.name, nestingFault);
+  for (const QString& fault : custom ? custom->findUnwritablePorts() : QStringList())
+    m_findings.reportText(Rule::UnwritableValue, node.line, node.name, fault);
+  const QHash<QString, QString> replaced = InnerNames::findReplacedParameters(
+      node.name, *node.cfg, [this](const QString& name) { return m_workspace.parameters.find(name); });
+  for (const QString& parameter : node.cfg->getParameters()) {
+    if (replaced.contains(parameter))
+      m_findings.report(Rule::UnwritableValue, node.line, node.name, {parameter, replaced.value(parameter)});
+    const auto fault = faults.constFind(parameter);
+    if (fault != faults.constEnd())
+      m_findings.reportUnwritable(node.parameterLines.of(parameter), node.name, parameter, fault.value());
+  }
+}
