@@ -51,6 +51,24 @@ TEST(Values, WhatIsWritten) {
       {"TEXT", "ORX_CONDITIONAL:a,b c;@Value<leftparenthesis>x<rightparenthesis><semicolon>",
        "@EvaluateExpression(FDIV,STRING,P,@Choose(a<comma>b<space>c,@Value(x)<semicolon>))"},
       {"OMITTABLE TEXT_OR_ATTR", "<Unused>", "<Unused>"},
+      {"LOOKUP_CHOICE \"Deep Blue\",b%Red,R", "ORX_CONDITIONAL:x;Deep<space>Blue;Red",
+       "@EvaluateExpression(FDIV,STRING,P,@Choose(x,b,R))"},
+      {"LOOKUP_LISTBOX \"Deep Blue\",\"d<space>b\"%Red,R", "\"Deep Blue\"  Red other", "\"d b\"  R other"},
+      {"LOOKUP_LISTBOX \"Deep Blue\",b%Red,R", "Deep Blue", "b"},
+      {"LOOKUP_LISTBOX \"Deep Blue\",b%Red,R", "\"Deep Blue\" \"@Value(a b)\" Red$(M)",
+       "@EvaluateExpression(FDIV,STRING,P,b<space><quotationmark>@Value(a<space>b)<quotationmark><space>Red$("
+       "M))"},
+      {"LOOKUP_LISTBOX \"Deep Blue\",b%Red,R",
+       "ORX_CONDITIONAL:x;<quotationmark>Deep<space>Blue<quotationmark><space>Red;$(M)<space>Red",
+       "@EvaluateExpression(FDIV,STRING,P,@Choose(x,b<space>R,$(M)<space>R))"},
+      {"GUI_LINE_TABLE "
+       "<semicolon>,GUI<space>LOOKUP_CHOICE<space>A<space>Red<comma>R<space>A,GUI<space>TEXT<space>B"
+       "<space>B",
+       "Red;Red;ORX_CONDITIONAL:x;Red", "R;Red;@EvaluateExpression(FDIV,STRING,P.A,@Choose(x));Red"},
+      {"MULTIPARAMETER "
+       "<semicolon>,GUI<space>LOOKUP_CHOICE<space>A<space>Red<comma>R<space>A,GUI<space>TEXT<space>B"
+       "<space>B",
+       "A;Red;B;Red", "A;R;B;Red"},
   };
   for (const Case& c : cases) {
     const auto cfg = makeCfg({{}, {}, {{"P", c.type, c.value}}, {}});

@@ -140,6 +140,7 @@ TEST(Instance, WritesScriptsThatComputeTheInstancesMacros) {
   const QString prefix = makePrefixMacro("My Net");
   const QString code = QORXWwjdEncode("ORX_MacroValues['BASE']\n# $ORX_MacroValues(BASE)");
   OpenNetwork network("My Net");
+  network.publish("GUI TEXT BASE Base", "b");
   network.publish("GUI TEXT_EDIT_PYTHON_PARM PY Py", QORXWwjdEncode("1"));
   network.publish("GUI OPTIONAL TEXT_EDIT_TCL_PARM TC Tcl", QString());
   network.doneAdding(true);

@@ -433,5 +433,6 @@ constexpr long kParallelByFeature = 371323;
 constexpr long kNoParallelLevel = 371324;
 constexpr long kScriptReadsUnknown = 371325;
 constexpr long kScriptReadsLater = 371326;
+constexpr long kMemberLeftOut = 371327;
 
 }  // namespace orx::messages

@@ -38,6 +38,11 @@ ValueFit::Expand expanding(const TransformerCfg& cfg) {
   };
 }
 
+// Nothing looks these settings up when the mapping file runs, so what they refer to is judged in their place.
+bool isProcessSetting(const QString& name) {
+  return name == kProcessCountParameter || name == kGroupsOrderedParameter;
+}
+
 }  // namespace
 
 void fit_checks::checkTransformer(const TransformerCfg& cfg, const ParameterLines& lines,
@@ -47,9 +52,9 @@ void fit_checks::checkTransformer(const TransformerCfg& cfg, const ParameterLine
     if (name == kProcessCountDisplayParameter)
       continue;
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
-    const std::vector<ValueFit> misfits =
-        ValueFit::misfitsOf(*parameter, parameter->getValue(),
-                            references == References::Known ? expanding(cfg) : ValueFit::Expand());
+    const bool isExpanded = references == References::Known && isProcessSetting(name);
+    const std::vector<ValueFit> misfits = ValueFit::misfitsOf(
+        *parameter, parameter->getValue(), isExpanded ? expanding(cfg) : ValueFit::Expand());
     QString refusal;
     if (!misfits.empty() && cfg.validateParameter(name, refusal))
       report(misfits, *parameter, lines.of(name), title, findings);
@@ -64,19 +69,15 @@ void fit_checks::checkInside(const TransformerCfg& cfg, int line, const QString&
   const TransformerCfg* before = network->attributeOwner();
   network->setAttributeOwner(&cfg);
   for (const TransformerCfg* inner : network->getTransformers()) {
-    const QString path = title + QLatin1Char('/') + inner->getIdentifier();
     const ValueFit::Expand expand = expanding(*inner);
-    for (const QString& name : inner->getParameters()) {
+    for (const QLatin1String& name : {kProcessCountParameter, kGroupsOrderedParameter}) {
       const TransformParamCfg* parameter = inner->getParameterByMacroName(name);
-      if (name == kProcessCountDisplayParameter || !beginsMacroReference(parameter->getValue()))
+      if (!parameter || !beginsMacroReference(parameter->getValue()))
         continue;
+      const QString path = title + QLatin1Char('/') + inner->getIdentifier();
       report(ValueFit::misfitsOf(*parameter, parameter->getValue(), expand), *parameter, line, path,
              findings);
-      const bool isLookedUp = !isCustomTransformer(inner) && parameter->choices().hasLookup() &&
-                              !parameter->getValue().startsWith(kConditionalPrefix) &&
-                              name != kProcessCountParameter && name != kGroupsOrderedParameter;
-      if (!isLookedUp &&
-          single_choices::refersToShownSide(*parameter, parameter->getValue(), [&](QString& text) {
+      if (single_choices::refersToShownSide(*parameter, parameter->getValue(), [&](QString& text) {
             expand(text);
             return true;
           }))
@@ -97,13 +98,7 @@ void fit_checks::checkParameters(const IXMLComponentReader& reader, const Global
       const GlobalParameters::Parameter* known =
           document.isEmpty() ? parameters.find(parameter.getName()) : nullptr;
       const bool isSetElsewhere = known && (known->setInHeader || known->isOverridden);
-      // Inside a custom transformer the values of the instances count, which are judged there.
-      const auto expand = [&](QString& text) {
-        if (document.isEmpty())
-          text = parameters.resolve(MFBuffer::withOrdinaryMacros(text));
-      };
-      report(ValueFit::misfitsOf(parameter, isSetElsewhere ? known->currentValue() : record.defaultValue,
-                                 expand),
+      report(ValueFit::misfitsOf(parameter, isSetElsewhere ? known->currentValue() : record.defaultValue),
              parameter, isSetElsewhere ? known->line : record.line, document, findings);
     }
   }

@@ -34,6 +34,18 @@ using namespace lookup_checks;
 
 const QLatin1String kTclCall("@Tcl2(");
 
+// Whether the value leaves out a member that has to have one: its token would be left over.
+bool lacksMember(const QString& value, const MemberList& members) {
+  const QStringList parts = QORXSdfStringToList(value, members.separator());
+  return std::any_of(members.members().begin(), members.members().end(), [&](const GUIType& member) {
+    bool isGiven = member.getFlag(kGUITypeOptional) || member.getName() == kControllerQueryFile;
+    for (int i = 0; i + 1 < parts.size() && !isGiven; i += 2) {
+      isGiven = parts.at(i) == member.getName();
+    }
+    return !isGiven;
+  });
+}
+
 }  // namespace
 
 namespace mapping_file_checks {
@@ -72,6 +84,9 @@ long MappingFileChecks::refuse(const TransformParamCfg& record) const {
   }
   if (!m_written.contains(record)) {
     return 0;
+  }
+  if (record.isMultiParameter() && !isUnsetValue(stored) && lacksMember(stored, record.members())) {
+    return messages::kMemberLeftOut;
   }
   NullBuffer buffer;
   QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);

@@ -10,7 +10,6 @@
 #include <transform/findings/Refusal.h>
 #include <transform/text/MessageNumbers.h>
 
-#include <QSet>
 #include <QUrlQuery>
 
 #include <sys/stat.h>
@@ -69,22 +68,6 @@ bool isPlainFile(const QString& path) {
   return ::stat(QORXToLocal8Bit(path).constData(), &status) == 0 && !S_ISDIR(status.st_mode);
 }
 
-// Whether the value leaves out a member that has to have one.
-bool lacksMember(const QString& value, const MemberList& members, QString& prompt) {
-  const QStringList parts = QORXSdfStringToList(value, members.separator());
-  QSet<QString> given;
-  for (int i = 0; i + 1 < parts.size(); i += 2) {
-    given.insert(parts.at(i));
-  }
-  for (const GUIType& member : members.members()) {
-    if (!member.getFlag(kGUITypeOptional) && !given.contains(member.getName())) {
-      prompt = member.getDescription();
-      return !value.startsWith(kConditionalPrefix);
-    }
-  }
-  return false;
-}
-
 std::vector<TransformParamCfg> columnRecords(const MemberList& columns) {
   std::vector<TransformParamCfg> records;
   records.reserve(columns.members().size());
@@ -122,8 +105,7 @@ bool TransformerCfg::validateParameter(const QString& parameter, QString& messag
   }
   if (record->isMultiParameter()) {
     QString missingPrompt;
-    if (!checkMembers(value, *record, record->members(), missingPrompt) ||
-        lacksMember(value, record->members(), missingPrompt)) {
+    if (!checkMembers(value, *record, record->members(), missingPrompt)) {
       return orx::refuse(message, {Rule::MissingValue, messages::kMissingValue}, {missingPrompt});
     }
   }
