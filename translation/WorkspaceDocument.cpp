@@ -52,7 +52,7 @@ WorkspaceDocument::Reading WorkspaceDocument::readOpened(orx::Findings& diagnost
   }
   if (m_form != WorkspaceFile::Form::Unknown)
     WorkspaceFile::read(m_reader, m_input.path(), m_headerLines);
-  if (m_reader.getRootNode())
+  if (m_reader.GetDocumentType() != kUnknownDocument)
     return Reading::Done;
   diagnostics.report(Rule::NoDocument, 0, QString());
   return Reading::Refused;

@@ -112,8 +112,7 @@ TEST(DocumentCommands, EndWithTheStatusThatFits) {
       {{"format", "-i", "noise.orw"}, 1, "", "noise.orw: error: "},
       {{"format", "-i", "versions.ort"}, 1, "", "versions.ort: error: "},
       {{"format", "--drop", "conflict.orw"}, 1, "", "<<<<<<< ours"},
-      {{"format", "other.orw"}, 1, "", "FOO"},
-      {{"format", "--drop", "other.orw"}, 0, "<WORKSPACE", "warning"},
+      {{"format", "--drop", "other.orw"}, 1, "", "no workspace document"},
       {{"format", "small.orw", "-o", "/dev/full"}, 3, "", "/dev/full"},
       {{"format", "small.orw", "-o", "no/such/folder/x.orw"}, 3, "", "no/such/folder/x.orw"},
       {{"format", "--check", "small.orw"}, 1, "", "small.orw:2: error: "},
@@ -158,6 +157,9 @@ TEST(DocumentCommands, TellTheFormOfAFileAlike) {
       {notes, none, ""},
       {notes + xml, none, ""},
       {"FACTORY_DEF * X\n", none, ""},
+      {"<other/>\n", none, ""},
+      {"<?xml version='1.0'?>\n<svg xmlns='http://www.w3.org/2000/svg'/>\n", none, ""},
+      {"#! <Workspace/>\n", none, ""},
       {"", none, ""},
   };
   QTemporaryDir folder;

@@ -10,6 +10,7 @@
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/TransformerRecords.h>
 #include <transform/workspace/VersionStore.h>
+#include <transform/workspace/WorkspaceFile.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 #include <transform/workspace/XMLComponentReader.h>
 
@@ -176,13 +177,8 @@ void ExternalTransformerNetwork::loadBody() {
   if (version.byteLength < 0)
     throw WorkspaceLoaderException(TransformResString(messages::kFileChanged, m_fileName));
   XMLComponentReader reader;
-  {
-    QStringList headerLines;
-    QByteArray before;
-    QByteArray behind;
-    reader.ReadVersionedInput(plain.fileName(), version.byteOffset, version.byteLength, false, headerLines,
-                              before, behind);
-  }
+  QStringList headerLines;
+  WorkspaceFile::readVersion(reader, plain.fileName(), version, headerLines);
   m_library = std::make_unique<SubDocumentLibrary>(reader, m_manager);
   m_library->build(*this, bodyName(reader, getName()));
   m_library->forgetReader();

@@ -69,6 +69,14 @@ WorkspaceLoaderException noWorkspaceFile(const QString& fileName) {
                                   documentText(messages::kNoWorkspaceFile, {fileName}));
 }
 
+void readPiece(IXMLComponentReader& reader, const QString& fileName, const VersionInfo& version,
+               QStringList& headerLines) {
+  QByteArray before;
+  QByteArray behind;
+  reader.ReadVersionedInput(fileName, version.byteOffset, version.byteLength, true, headerLines, before,
+                            behind);
+}
+
 }  // namespace
 
 WorkspaceFile::Form WorkspaceFile::recognise(const QString& fileName) {
@@ -94,17 +102,20 @@ void WorkspaceFile::read(IXMLComponentReader& reader, const QString& fileName, Q
       const QList<VersionInfo> versions = VersionStore(plain.fileName()).versions(error);
       if (versions.isEmpty())
         break;
-      QByteArray before;
-      QByteArray behind;
-      const VersionInfo newest = VersionStore::newest(versions);
-      reader.ReadVersionedInput(fileName, newest.byteOffset, newest.byteLength, true, headerLines, before,
-                                behind);
+      readPiece(reader, fileName, VersionStore::newest(versions), headerLines);
       return;
     }
     case Form::Unknown:
       break;
   }
   throw noWorkspaceFile(fileName);
+}
+
+void WorkspaceFile::readVersion(IXMLComponentReader& reader, const QString& fileName,
+                                const VersionInfo& version, QStringList& headerLines) {
+  readPiece(reader, fileName, version, headerLines);
+  if (reader.GetDocumentType() == kUnknownDocument)
+    throw noWorkspaceFile(fileName);
 }
 
 WorkspaceFile::WorkspaceFile(const QString& fileName) {

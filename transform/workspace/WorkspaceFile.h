@@ -6,6 +6,7 @@
 
 #include <platform/Export.h>
 #include <transform/workspace/IXMLComponentReader.h>
+#include <transform/workspace/VersionInfo.h>
 #include <transform/workspace/XMLComponentWriter.h>
 
 #include <QByteArray>
@@ -28,6 +29,9 @@ class ORX_EXPORT WorkspaceFile {
   // Reads a file of any form with the reader's operation for it; of several versions the one with the
   // highest number. Throws WorkspaceLoaderException, also for a file of no known form.
   static void read(IXMLComponentReader& reader, const QString& fileName, QStringList& headerLines);
+  // One version of a file of several. Throws as above, also when the document is none of a workspace.
+  static void readVersion(IXMLComponentReader& reader, const QString& fileName, const VersionInfo& version,
+                          QStringList& headerLines);
 
   // A new workspace file: UTF-8, line feeds, no header.
   WorkspaceFile() = default;
