@@ -13,6 +13,7 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
   QTemporaryDir folder;
   write(folder.filePath("empty.orw"), "");
   write(folder.filePath("cut.orw"), readAll(samples().first()).left(3000));
+  write(folder.filePath("kept.mf"), "before");
   const QString good = samples().first();
   const CommandCase cases[] = {
       {{"--help"}, 0, "Example:", ""},
@@ -39,7 +40,7 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
       {{"transformers", "show", "GeometryBufferer"}, 0, "Parameters", ""},
       {{"transformers", "list", "--resources", sample("custom")}, 0, "[custom, version 2, ", ""},
       {{"transformers", "show", "Site Placer", "--resources", sample("custom")}, 0, "site_placer.ort", ""},
-      {{"generate", sample("station_catchments.orw")}, 1, "", "'Site Placer' of version "},
+      {{"generate", sample("station_catchments.orw"), "-o", "kept.mf"}, 1, "", "'Site Placer' of version "},
       {{"transformers", "show", "NoSuchThing"}, 1, "", "NoSuchThing"},
       {{"transformers", "show", "GeometryBufferer", "--version", "99"}, 1, "", "99"},
       {{"transformers", "show", "GeometryBufferer", "--version", "new"}, 2, "", "new"},
@@ -53,6 +54,7 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
   for (const CommandCase& test : cases)
     expectOutcome(test, folder.path());
   EXPECT_FALSE(QFile::exists(folder.filePath("cut.mf")));
+  EXPECT_EQ(readAll(folder.filePath("kept.mf")), QByteArray("before"));
 }
 
 TEST(CommandLine, TellsWhenItDoesNotSpeakTheLanguageOfTheEnvironment) {

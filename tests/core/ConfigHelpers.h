@@ -1,13 +1,13 @@
 // Short ways to make configuration objects for tests.
 #pragma once
 
+#include <tests/support/QtPrinters.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerDefinition.h>
 
 #include <QString>
 #include <QStringList>
 
-#include <ostream>
 #include <vector>
 
 inline QString qs(const char* text) {
@@ -17,14 +17,6 @@ inline QString qs(const char* text) {
 // "a b c" as a list.
 inline QStringList words(const char* text) {
   return qs(text).split(QLatin1Char(' '), Qt::SkipEmptyParts);
-}
-
-inline void PrintTo(const QString& text, std::ostream* out) {
-  *out << '"' << text.toUtf8().constData() << '"';
-}
-
-inline void PrintTo(const QStringList& list, std::ostream* out) {
-  *out << '[' << list.join(QLatin1String(" | ")).toUtf8().constData() << ']';
 }
 
 struct ConfigParameter {

@@ -3,6 +3,7 @@
 #include <transform/registry/DefinitionLint.h>
 
 #include <QElapsedTimer>
+#include <QFile>
 #include <QSet>
 #include <gtest/gtest.h>
 
@@ -11,60 +12,12 @@
 
 namespace {
 
-QByteArray parameter(const QByteArray& name, const QByteArray& type, const QByteArray& prompt,
-                     const QByteArray& value) {
-  return "PARAMETER_NAME: " + name + "\nPARAMETER_TYPE: " + type + "\nPARAMETER_PROMPT: " + prompt +
-         "\nPARAMETER_DEFAULT:" + (value.isEmpty() ? "" : " ") + value + '\n';
-}
-
 // Nothing in it is worth a word. Each case below spoils one piece.
-const QByteArray kSound =
-    "# A definition.\n"
-    "TRANSFORMER_NAME: Sound\n"
-    "VERSION: 2\n"
-    "CATEGORY: Tests\n"
-    "FEATURE_HOLDING: GROUPED\n"
-    "INPUT_TAGS: BASE EXTRA::More<space>Features\n"
-    "OUTPUT_TAGS: DONE LEFT\n"
-    "TAG_DESCRIPTION BASE features\n"
-    "TAG_DESCRIPTION EXTRA more\n"
-    "TAG_DESCRIPTION DONE what is done\n"
-    "TAG_DESCRIPTION LEFT what is left\n"
-    "PRESERVES_ATTRIBUTES: DONE:BASE LEFT =id\n"
-    "ATTRIBUTES_ADDED: DONE:$(RESULT) xml:lang\n"
-    "LIST_ACTION: DONE COLLECT EXTRA $(RESULT)\n"
-    "LIST_ACTION: <ALL> KEEP\n"
-    "PARAMETER_MAPPING: 1:OLD=TEXT\n"
-    "TAG_MAPPING: 2:O:GOOD=DONE\n"
-    "DEPENDENCY: if {![orx_fileExists /]} {return [join {no root}]}\n"
-    "MULTIPROCESS: GROUP_BY\n" +
-    parameter("TEXT", "TEXT_OR_ATTR_ENCODED", "Text", "two<space>words") +
-    parameter("RESULT", "OPTIONAL OMITTABLE NEW_ATTR_ENCODED", "Result", "") +
-    parameter("GROUP_BY", "OPTIONAL OMITTABLE ATTR_LIST_ENCODED", "Group By", "<UNUSED>") +
-    parameter("MODE", "LOOKUP_CHOICE \"All of it\",ALL%Some,SOME", "Mode", "ALL") +
-    parameter("FRAME", "OPTIONAL GROUP MODE%RESULT", "Frame", "") +
-    parameter("SIZE",
-              "MULTIPARAMETER "
-              "<semicolon>,GUI<space>FLOAT<space>WIDTH<space>Width,GUI<space>INT<space>STEPS<space>Steps",
-              "Size", "WIDTH;2.5;STEPS;3") +
-    parameter("TESTS", "LISTBOX A%B%\"C D\"", "Tests", "A \"C D\"") +
-    parameter("SCRIPT", "OPTIONAL OMITTABLE TEXT_EDIT_PYTHON", "Script", "a<space>=<space>1") +
-    "DESCRIPTION_START\nWhat it does.\nDESCRIPTION_END\n"
-    "TOOLTIP_START\n$(TEXT) $(WIDTH)\nTOOLTIP_END\n"
-    "CHANGE_LOG_START\nFirst.\nCHANGE_LOG_END\n"
-    "TEMPLATE_START\n"
-    "Tcl2 proc $(ORX_UUID)_f {a} { if {$a eq {}} { return 1 } else { return [string length $a] } }\n"
-    "MACRO own_macro $(MODE)\n"
-    "FACTORY_DEF * SoundFactory FACTORY_NAME $(XFORMER_NAME) $(INPUT_LINES) TEXT $(TEXT) W $(WIDTH) S "
-    "$(STEPS) T "
-    "$(TESTS) M $(own_macro) OUTPUT DONE FEATURE_TYPE $(XFORMER_NAME_ENCODED)|DONE\n"
-    "FACTORY_OPTION $(XFORMER_NAME_ENCODED) RESULT $(RESULT)\n"
-    "FACTORY_OPTION $(XFORMER_NAME_ENCODED) SCRIPT $(SCRIPT)\n"
-    "FACTORY_DEF * TeeFactory INPUT FEATURE_TYPE $(XFORMER_NAME_ENCODED)|DONE OUTPUT FEATURE_TYPE "
-    "$(OUTPUT_DONE_FTYPE) $(OUTPUT_DONE_FUNCS)\n"
-    "FACTORY_DEF * TeeFactory INPUT FEATURE_TYPE $(XFORMER_NAME_ENCODED)|LEFT OUTPUT FEATURE_TYPE "
-    "$(OUTPUT_LEFT_FTYPE) $(OUTPUT_LEFT_FUNCS)\n"
-    "TEMPLATE_END\n";
+const QByteArray kSound = [] {
+  QFile file(QStringLiteral(ORX_SOURCE_DIR "/tests/data/definitions/sound.ort"));
+  file.open(QIODevice::ReadOnly);  // each case asks for its piece of it
+  return file.readAll();
+}();
 
 struct Case {
   const char* rule;

@@ -294,47 +294,4 @@ TEST(Translation, RefusesWhatItCannotTranslate) {
   }
 }
 
-TEST(Translation, FilesThatCannotBeReadOrWritten) {
-  QTemporaryDir folder;
-  SmallSource source;
-  const QString good = copyBetween().save(folder);
-  const auto run = [&](const QString& input, const QString& output, QString& error) {
-    orx::Findings diagnostics(input);
-    return translateWorkspace({input, output, {}}, source, diagnostics, error);
-  };
-  QString error;
-  // What stood there before stays when the workspace is refused.
-  const QString output = folder.filePath("kept.mf");
-  QFile kept(output);
-  ASSERT_TRUE(kept.open(QIODevice::WriteOnly));
-  kept.write("before");
-  kept.close();
-  SmallWorkspace broken = copyBetween();
-  broken.transformer(7, "Nothing", {});
-  EXPECT_EQ(run(broken.save(folder, "broken.orw"), output, error), TranslationResult::Refused);
-  EXPECT_EQ(readAll(output), QString("before"));
-  EXPECT_EQ(run(good, output, error), TranslationResult::Done);
-  EXPECT_NE(readAll(output), QString("before"));
-}
-
-TEST(Translation, TruncatedDocumentsAreRefused) {
-  QTemporaryDir folder;
-  SmallSource source;
-  const QByteArray whole = copyBetween().text().toUtf8();
-  const int end = whole.indexOf("#! </WORKSPACE>");
-  for (int length = 0; length < end; length += 7) {
-    const QString path = folder.filePath("cut.orw");
-    QFile file(path);
-    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-    file.write(whole.left(length));
-    file.close();
-    orx::Findings diagnostics(path);
-    QString error;
-    EXPECT_EQ(translateWorkspace({path, folder.filePath("o"), {}}, source, diagnostics, error),
-              TranslationResult::Refused)
-        << length;
-    EXPECT_TRUE(diagnostics.hasErrors()) << length;
-  }
-}
-
 }  // namespace

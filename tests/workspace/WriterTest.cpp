@@ -1,5 +1,6 @@
 #include "DocumentContent.h"
 
+#include <QFile>
 #include <gtest/gtest.h>
 
 namespace {
@@ -62,48 +63,9 @@ TEST(Writer, LayoutIsExact) {
   port.attributes[1].attrValue = QLatin1String("");
   content.documents["z"].transformers = {transformer};
   content.documents["z"].ports = {port};
-  const QByteArray emptySections =
-      "<GLOBAL_PARAMETERS>\n</GLOBAL_PARAMETERS>\n<COMMENTS>\n</COMMENTS>\n<CONSTANTS>\n</CONSTANTS>\n"
-      "<BOOKMARKS>\n</BOOKMARKS>\n<TRANSFORMERS>\n</TRANSFORMERS>\n<FEAT_LINKS>\n</FEAT_LINKS>\n"
-      "<BREAKPOINTS>\n</BREAKPOINTS>\n<ATTR_LINKS>\n</ATTR_LINKS>\n";
-  const QByteArray transformers =
-      "<TRANSFORMERS>\n<TRANSFORMER\n  IDENTIFIER=\"5\"\n  TYPE=\"T\"\n  VERSION=\"0\"\n  POSITION=\"0.1 "
-      "2\"\n"
-      "  BOUNDING_RECT=\"0.1 2 1000000000000000000000 4\"\n  ORDER=\"-1\"\n  PARMS_EDITED=\"false\"\n"
-      "  ENABLED=\"true\"\n  LAST_PARM_EDIT=\"0\"\n>\n    <OUTPUT_FEAT NAME=\"\"/>\n"
-      "    <FEAT_COLLAPSED COLLAPSED=\"-1\"/>\n"
-      "    <XFORM_ATTR ATTR_NAME=\"\" IS_USER_CREATED=\"false\" FEAT_INDEX=\"-1\" ATTR_IS_ENABLED=\"true\""
-      " ATTR_VALUE=\"\"/>\n    <XFORM_PARM PARM_NAME=\"\" PARM_VALUE=\"say "
-      "&quot;x&quot;\"/>\n</TRANSFORMER>\n"
-      "</TRANSFORMERS>\n<SUBDOCUMENT_IOS>\n<SUBDOCUMENT_IO\n  IDENTIFIER=\"-1\"\n  NAME=\"\"\n  POSITION=\"0 "
-      "0\"\n"
-      "  BOUNDING_RECT=\"0 0 0 0\"\n  COLLAPSED=\"false\"\n  PUBLISHED=\"true\"\n  IS_SOURCE=\"false\"\n"
-      "  ATTR_MODE=\"0\"\n>\n    <XFORM_ATTR ATTR_NAME=\"\"/>\n    <XFORM_ATTR ATTR_NAME=\"\" "
-      "ATTR_VALUE=\"\"/>\n"
-      "</SUBDOCUMENT_IO>\n</SUBDOCUMENT_IOS>\n";
-  const QByteArray expected =
-      "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n<TRANSFORMER\n"
-      "  A=\"&quot;1&apos;&#10;&#9;&#13;&lt;&amp;&gt;\"\n  B=\"2\"\n>\n<DATASETS>\n<DATASET\n"
-      "  IS_SOURCE=\"false\"\n  ROLE=\"\"\n  FORMAT=\"\"\n  DATASET=\"\"\n  KEYWORD=\"\"\n"
-      "  MULTI_GEOM_ALLOWED=\"false\"\n  ATTR_MAX_LENGTH=\"-1\"\n  ATTR_CASE=\"\"\n  "
-      "ALLOWED_FEAT_TYPES=\"\"\n"
-      "  WRITE_DEFS=\"false\"\n  DEFLINE_TEMPLATE=\"\"\n  DEFLINE_ATTRS=\"false\"\n  EXPOSABLE_ATTRS=\"\"\n"
-      "  DEFLINE_PARMS=\"\"\n  ATTR_INDEX_TYPES=\"\"\n  ATTR_NAME_INVALID_CHARS=\"\"\n"
-      "  SUPPORTS_FEATURE_TYPE_FANOUT=\"true\"\n  ENABLED=\"true\"\n"
-      "  DYNAMIC_FEATURE_TYPES_LIST_ON_MERGE=\"true\"\n  DATASET_TYPE=\"\"\n  FEATURE_TYPES_LIST=\"\"\n"
-      "  FEAT_TYPE_VALIDATION_SCRIPT=\"\"\n  GENERATE_ORX_BUILD_NUM=\"0\"\n  NAME=\"\"\n>\n"
-      "<METAFILE_PARAMETER\n  NAME=\"M\"\n  "
-      "VALUE=\"\"\n/>\n</DATASET>\n</DATASETS>\n<DATA_TYPES>\n</DATA_TYPES>\n"
-      "<GEOM_TYPES>\n</GEOM_TYPES>\n<FEATURE_TYPES>\n</FEATURE_TYPES>\n<ORXSERVER>\n<SERVICES>\n<SERVICE\n"
-      "  NAME=\"\"\n>\n<PROPERTIES>\n<PROPERTY\n  CATEGORY=\"\"\n  NAME=\"\"\n  "
-      "VALUE=\"\"\n/>\n</PROPERTIES>\n"
-      "</SERVICE>\n</SERVICES>\n<REPOSITORY\n  "
-      "NAME=\"\"\n/>\n<MODIFICATIONS>\n</MODIFICATIONS>\n</ORXSERVER>\n" +
-      emptySections + "<SUBDOCUMENTS>\n<SUBDOCUMENT\n  NAME=\"z\"\n  C=\"\"\n>\n" +
-      QByteArray(emptySections).replace("<TRANSFORMERS>\n</TRANSFORMERS>\n", transformers) +
-      "</SUBDOCUMENT>\n<SUBDOCUMENT\n  NAME=\"a\"\n>\n" + emptySections +
-      "</SUBDOCUMENT>\n</SUBDOCUMENTS>\n<LOOKUP_TABLES>\n</LOOKUP_TABLES>\n</TRANSFORMER>\n";
-  EXPECT_EQ(written(content).toStdString(), expected.toStdString());
+  QFile file(QStringLiteral(ORX_SOURCE_DIR "/tests/data/documents/layout.xml"));
+  ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+  EXPECT_EQ(written(content).toStdString(), file.readAll().toStdString());
 }
 
 TEST(Writer, TypesAndModesAreWrittenByName) {
