@@ -35,12 +35,12 @@ bool MappingFileWriter::write(MFBuffer& buffer, WrittenCheck* check) {
   writeStatement(buffer, QLatin1String("# Written by ") + programVersion());
   writeHeader(buffer, check);
   writeParameters(buffer, check);
-  WrittenCheck* const ofNames = hasHarmfulNames() ? check : nullptr;
+  WrittenCheck* const ofNames = check && hasHarmfulNames() ? check : nullptr;
   if (check && !ofNames)
     check->skip();
   writeFeatureTypes(buffer, ofNames);
   m_definitions.write(buffer, check);
-  const bool isWritten = writeTransformers(buffer, check);
+  const bool isWritten = writeTransformers(buffer, check, ofNames != nullptr);
   writeWriterRoutes(buffer, ofNames);
   return isWritten;
 }
@@ -76,8 +76,7 @@ void MappingFileWriter::writeHeader(MFBuffer& buffer, WrittenCheck* check) const
 
 // Only what is suspect is judged: what has a value of its own that may do harm, custom transformers, and the
 // first of each kind, whose template and defaults stand for those of all.
-bool MappingFileWriter::writeTransformers(MFBuffer& buffer, WrittenCheck* check) {
-  const bool judgesAll = hasHarmfulNames();
+bool MappingFileWriter::writeTransformers(MFBuffer& buffer, WrittenCheck* check, bool judgesAll) {
   QSet<const ConfiguredDefinition*> seen;
   bool isWritten = true;
   for (const int number : m_connection.order()) {

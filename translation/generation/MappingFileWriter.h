@@ -24,7 +24,7 @@ class MappingFileWriter {
   void writeHeader(MFBuffer& buffer, WrittenCheck* check) const;
   void writeParameters(MFBuffer& buffer, WrittenCheck* check) const;
   void writeFeatureTypes(MFBuffer& buffer, WrittenCheck* check) const;
-  bool writeTransformers(MFBuffer& buffer, WrittenCheck* check);
+  bool writeTransformers(MFBuffer& buffer, WrittenCheck* check, bool judgesAll);
   void writeWriterRoutes(MFBuffer& buffer, WrittenCheck* check) const;
   // Whether names alone may make any statement wrong.
   bool hasHarmfulNames() const;
