@@ -316,9 +316,16 @@ TEST(CustomTranslation, WhatALoopIsHandedIsJudged) {
       {"TEXT_EDIT_TCL_PARM", "return<space>1", "4", {"unwritable-value L"}, ""},
       {"OPTIONAL TEXT_EDIT_TCL_PARM", "<Unused>", "4", {}, "MAX_LOOP_ITERATIONS:4 "},
       {"TEXT", "ORX_CONDITIONAL:1=1;a;b", "4", {"unwritable-value L"}, ""},
+      {"TEXT", "@Value(a)", "4", {"unwritable-value L"}, ""},
+      {"TEXT", "$(WORDS)", "4", {}, "P,$(WORDS)"},
+      {"TEXT", "$(LIST)", "4", {"unwritable-value L"}, ""},
+      {"TEXT_ENCODED", "x$(ENCODED)", "4", {"unwritable-value L"}, ""},
+      {"TEXT", "a,b;c", "4", {}, "P,a<comma>b<semicolon>c"},
   };
   for (const auto& test : cases) {
     SmallWorkspace workspace;
+    workspace.parameter("GUI TEXT WORDS W", "a b").parameter("GUI TEXT LIST L", "a,b");
+    workspace.parameter("GUI TEXT_ENCODED ENCODED E", "a<space>b");
     workspace.transformer(3, kInstance,
                           {"SUB_DOC_NAME", "Looper", "XFORMER_NAME", "L", "P", test.value,
                            "MAX_LOOP_ITERATIONS", test.maximum});

@@ -17,16 +17,7 @@ namespace messages = orx::messages;
 
 namespace {
 
-using carried_references::Expand;
-
-// Whether the text stays one piece of an expression, and is read there as what it is.
-bool fitsExpression(const QString& text, bool isEncoded) {
-  static const QString kActive = QStringLiteral(",()\"{}");
-  const QString known = withoutReferences(text);
-  const bool isActive = std::any_of(known.begin(), known.end(), [](QChar c) { return kActive.contains(c); });
-  // What is plain is decoded with the text around it.
-  return !isActive && !beginsValueReference(known) && (isEncoded || QORXWwjdDecode(known) == known);
-}
+using namespace carried_references;
 
 long refuseInExpression(const QString& part, bool isEncoded, const Expand& expand) {
   for (const MacroReference& reference : macroReferences(part)) {
@@ -65,6 +56,13 @@ bool keepsCells(const TransformParamCfg& record, const QString& value, const Exp
 }  // namespace
 
 namespace carried_references {
+
+bool fitsExpression(const QString& text, bool isEncoded) {
+  static const QString kActive = QStringLiteral(",()\"{}");
+  const QString known = withoutReferences(text);
+  const bool isActive = std::any_of(known.begin(), known.end(), [](QChar c) { return kActive.contains(c); });
+  return !isActive && !beginsValueReference(known) && (isEncoded || QORXWwjdDecode(known) == known);
+}
 
 long refuse(const TransformParamCfg& record, const QString& stored, TableForm form, const Expand& expand) {
   if (!beginsMacroReference(stored) || !MFBuffer::closesDeferredMacros(stored))

@@ -24,6 +24,10 @@ enum class TableForm { Packed, ByRows };
 ORX_EXPORT long refuse(const TransformParamCfg& record, const QString& stored, TableForm form,
                        const Expand& expand);
 
+// Whether a text that a reference brings stays one piece of an expression, and is read there as what it is.
+// Among word-encoded texts it is one itself; a plain one is decoded with the text around it.
+ORX_EXPORT bool fitsExpression(const QString& text, bool isEncoded);
+
 // Whether a list of word-encoded texts still holds the value as one, once the references in it are carried
 // out.
 ORX_EXPORT bool fitsEncodedList(const QString& value, const Expand& expand);

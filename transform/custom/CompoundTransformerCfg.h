@@ -12,7 +12,7 @@
 #include <optional>
 
 class CompoundTransformerNetwork;
-class LookedUpParameters;
+class ParameterPlaces;
 
 class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public CompoundTransformerNetworkListener {
  public:
@@ -110,7 +110,7 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   // The number of the message that says why, or 0.
   long refuseApart(const QString& parameter, const GUIType& type, const QString& stored) const;
   long refuseMacroValue(const QString& parameter, const QString& value,
-                        std::optional<LookedUpParameters>& lookedUp) const;
+                        std::optional<ParameterPlaces>& places) const;
   long refuseSetting(const QString& parameter) const;
   bool printsMacroNames() const;
   QString macroValue(const QString& parameter, const GUIType& type, const QString& prefixMacro) const;

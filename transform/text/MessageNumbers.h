@@ -256,6 +256,9 @@ constexpr long kBlankAtEnd = 370909;
 constexpr long kConditionInMacro = 370910;
 constexpr long kLoopInProcesses = 370911;
 constexpr long kSameLoopName = 370912;
+constexpr long kAttributeInMacro = 370913;
+constexpr long kReferenceForWorkers = 370914;
+constexpr long kBreaksInside = 370915;
 
 // Checks of definition files.
 constexpr long kDefinitionUnreadable = 371000;

@@ -1,3 +1,5 @@
+#include <transform/core/ExpressionWriter.h>
+#include <transform/core/Keywords.h>
 #include <transform/core/SingleChoices.h>
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/TransformerCfg.h>
@@ -89,6 +91,9 @@ void WritingChecks::checkParameter(const GlobalParameters::Parameter& parameter,
   long reason = TextPlaces::refuse(TextPlace::MacroName, parameter.name);
   if (reason == 0 && isSound)
     reason = TextPlaces::refuse(TextPlace::MacroValue, value);
+  // It has one value for all features.
+  if (reason == 0 && ExpressionWriter::needsWrapping(GUIType::fromGuiLine(parameter.promptLine), value))
+    reason = value.startsWith(kConditionalPrefix) ? messages::kConditionInMacro : messages::kAttributeInMacro;
   if (reason != 0)
     m_findings.reportUnwritable(parameter.line, QString(), parameter.name, TransformResString(reason));
 }

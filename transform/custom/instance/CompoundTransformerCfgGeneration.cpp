@@ -1,4 +1,6 @@
 // What an instance of a custom transformer writes into the mapping file.
+#include <transform/core/CarriedReferences.h>
+#include <transform/core/ExpressionWriter.h>
 #include <transform/core/LookupChecks.h>
 #include <transform/core/ParallelLevels.h>
 #include <transform/core/ParameterReferences.h>
@@ -11,9 +13,10 @@
 #include <transform/custom/ScriptParameters.h>
 #include <transform/custom/instance/CustomTransformerStatement.h>
 #include <transform/custom/instance/InstancePrototype.h>
-#include <transform/custom/instance/LookedUpParameters.h>
+#include <transform/custom/instance/ParameterPlaces.h>
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
@@ -220,7 +223,7 @@ QString CompoundTransformerCfg::macroValue(const QString& parameter, const GUITy
 QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const {
   const QString prefix = makePrefixMacro(getVisualName());
   const bool isApart = m_network && isRunApart(*m_network, *this);
-  std::optional<LookedUpParameters> lookedUp;  // found when the first value asks for them
+  std::optional<ParameterPlaces> places;  // found when the first value asks for them
   QHash<QString, QString> messages;
   QSet<QString> before;
   for (const QString& parameter : getParameters()) {
@@ -252,7 +255,7 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
     if (message.isEmpty() && !areClosed({lines}))
       message = TransformResString(messages::kUnclosedReference, parameter);
     if (message.isEmpty() && language == ScriptLanguage::None) {
-      if (const long number = refuseMacroValue(parameter, lines.first(), lookedUp))
+      if (const long number = refuseMacroValue(parameter, lines.first(), places))
         message = TransformResString(number);
     }
     if (!message.isEmpty())
@@ -274,9 +277,15 @@ long CompoundTransformerCfg::refuseApart(const QString& parameter, const GUIType
   if (scriptLanguage(type) != ScriptLanguage::None)
     return isUnsetValue(stored) ? 0 : messages::kScriptForWorkers;
   const TransformParamCfg* record = getParameterByMacroName(parameter);
-  return record && record->getFlag(kGUITypeInstanceMacros) && !ownReference(stored, *this).isEmpty()
-             ? messages::kOwnReferenceForWorkers
-             : 0;
+  if (record && record->getFlag(kGUITypeInstanceMacros) && !ownReference(stored, *this).isEmpty())
+    return messages::kOwnReferenceForWorkers;
+  const auto expand = [this](QString& text) {
+    text = MFBuffer::withOrdinaryMacros(text);
+    return !listener() || listener()->expandMacros(*this, text);
+  };
+  const bool isSound = !beginsMacroReference(stored) || !MFBuffer::closesDeferredMacros(stored) ||
+                       carried_references::fitsEncodedList(stripBasicStringInfo(stored), expand);
+  return isSound ? 0 : messages::kReferenceForWorkers;
 }
 
 // A Tcl script of the instance, or of one inside at any depth, prints the statement that sets its macro; the
@@ -366,7 +375,7 @@ QStringList CompoundTransformerCfg::findUnwritablePorts() const {
 
 // The inside is written once for all instances, so what its fragments cannot carry is found here.
 long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QString& value,
-                                              std::optional<LookedUpParameters>& lookedUp) const {
+                                              std::optional<ParameterPlaces>& places) const {
   const bool isName = parameter == kIdentifierParameter;
   if (const long number = TextPlaces::refuse(TextPlace::MacroValue, value))
     return number;
@@ -374,12 +383,17 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
     return number;
   if (isName && value != value.trimmed())
     return messages::kBlankAtEnd;
-  if (getParameterValue(parameter).startsWith(kConditionalPrefix))
+  const QString stored = getParameterValue(parameter);
+  if (stored.startsWith(kConditionalPrefix))
     return messages::kConditionInMacro;
   const TransformParamCfg* record = getParameterByMacroName(parameter);
   const auto expand = [this](QString& text) { return !listener() || listener()->expandMacros(*this, text); };
-  if (record && single_choices::refersToShownSide(*record, getParameterValue(parameter), expand))
+  if (record && single_choices::refersToShownSide(*record, stored, expand))
     return messages::kShownSideReferred;
+  const GUIType& type = getParameterGUIType(parameter);
+  if (ExpressionWriter::needsWrapping(type, stored) &&
+      !(type.getType() == kSetterAttributeType && isParmUsedAsAttributeSetterAttribute(parameter)))
+    return messages::kAttributeInMacro;
   QString expanded = MFBuffer::withOrdinaryMacros(value);
   const bool ends = !listener() || listener()->expandMacros(*this, expanded);
   // The name stands in quotes as it is.
@@ -389,11 +403,14 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
     return messages::kNoPrintedName;
   if (const long number = refuseSetting(parameter))
     return number;
-  if ((ends && lookup_checks::fitsFragment(expanded)) || !m_network)
+  if (!ends)
+    return messages::kGrowsWithoutEnd;
+  if (!m_network || ParameterPlaces::fitsEverywhere(expanded))
     return 0;
-  if (!lookedUp)
-    lookedUp.emplace(*m_network);
+  if (!places)
+    places.emplace(*m_network);
   if (isName)
-    return lookedUp->hasFragment() ? messages::kIdentifierInScript : 0;
-  return lookedUp->contains(parameter) ? messages::kValueInScript : 0;
+    return places->hasFragment() && !lookup_checks::fitsFragment(expanded) ? messages::kIdentifierInScript
+                                                                           : 0;
+  return places->refuse(parameter, expanded);
 }

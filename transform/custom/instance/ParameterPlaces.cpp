@@ -1,0 +1,147 @@
+#include <platform/qorxcore/Lists.h>
+#include <transform/core/AttributeReferences.h>
+#include <transform/core/CarriedReferences.h>
+#include <transform/core/ExpressionWriter.h>
+#include <transform/core/Keywords.h>
+#include <transform/core/LookupChecks.h>
+#include <transform/core/ParameterReferences.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/NestedNetworks.h>
+#include <transform/custom/instance/CustomTransformerStatement.h>
+#include <transform/custom/instance/ParameterPlaces.h>
+#include <transform/text/MFBuffer.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/TextPlaces.h>
+
+#include <algorithm>
+#include <typeinfo>
+
+namespace messages = orx::messages;
+
+namespace {
+
+bool fitsList(const QString& value) {
+  return carried_references::fitsEncodedList(QStringLiteral("$(x)"), [&value](QString& text) {
+    text = value;
+    return true;
+  });
+}
+
+bool isOneCell(const QString& value, QChar separator) {
+  return value.isEmpty() || QORXSdfStringToList(value, separator) == QStringList(value);
+}
+
+}  // namespace
+
+ParameterPlaces::ParameterPlaces(CompoundTransformerNetwork& network) {
+  const std::vector<CompoundTransformerNetwork*> networks = nestedNetworks(network);
+  UsesByNetwork uses;
+  for (const CompoundTransformerNetwork* nested : networks) {
+    Uses& own = uses[nested];
+    for (const TransformerCfg* cfg : nested->getTransformers()) {
+      if (isCustomTransformer(cfg))
+        addWorkers(*cfg, *nested, own);
+      else
+        addStatements(*cfg, *nested, own);
+    }
+    m_hasFragment = m_hasFragment ||
+                    std::any_of(own.begin(), own.end(), [](const Use& use) { return use.places & Fragment; });
+  }
+  // Innermost first, so that mostly one round suffices.
+  for (bool isChanged = true; isChanged;) {
+    isChanged = false;
+    for (auto nested = networks.rbegin(); nested != networks.rend(); ++nested)
+      isChanged = addFromWithin(**nested, uses) || isChanged;
+  }
+  m_uses = uses.value(&network);
+}
+
+// Notes the use for the parameters of the network that the value refers to; whether that is new.
+bool ParameterPlaces::add(const QString& value, const CompoundTransformerNetwork& network, const Use& use,
+                          Uses& uses) {
+  if (use.places == 0 || !value.contains(QLatin1Char('$')))
+    return false;
+  bool isNew = false;
+  anyParameterReference(MFBuffer::withOrdinaryMacros(value), [&](const QString& name) {
+    if (network.hasParameter(name)) {
+      Use& known = uses[name];
+      const QSet<QChar> separators = known.separators + use.separators;
+      isNew = isNew || (known.places | use.places) != known.places || separators != known.separators;
+      known = {known.places | use.places, separators};
+    }
+    return false;
+  });
+  return isNew;
+}
+
+void ParameterPlaces::addStatements(const TransformerCfg& cfg, const CompoundTransformerNetwork& network,
+                                    Uses& uses) {
+  for (const QString& parameter : cfg.getParameters()) {
+    const TransformParamCfg* record = cfg.getParameterByMacroName(parameter);
+    const QString& value = record->getValue();
+    if (!value.contains(QLatin1Char('$')))
+      continue;
+    if (record->choices().hasLookup())
+      add(value, network, {ORX_isListBoxType(*record) ? ListFragment : ChoiceFragment, {}}, uses);
+    forEachPart(*record, value, [&](const GUIType& type, const QString& part) {
+      if (!ExpressionWriter::needsWrapping(type, part))
+        return;
+      const bool isEncoded = type.valueIsEncoded() || part.startsWith(kConditionalPrefix);
+      add(part, network, {isEncoded ? Expression : PlainExpression, {}}, uses);
+    });
+    // A class of its own writes a table cell by cell.
+    if (record->isTable() && typeid(cfg) == typeid(TransformerCfg))
+      add(value, network, {Cell, {record->members().separator()}}, uses);
+  }
+}
+
+void ParameterPlaces::addWorkers(const TransformerCfg& cfg, const CompoundTransformerNetwork& network,
+                                 Uses& uses) {
+  if (!isRunApart(*networkOf(&cfg), cfg))
+    return;
+  for (const QString& parameter : cfg.getParameters())
+    add(cfg.getParameterValue(parameter), network, {WorkersList, {}}, uses);
+}
+
+// A parameter of a custom transformer further in has its places there: so have those that its value refers
+// to.
+bool ParameterPlaces::addFromWithin(const CompoundTransformerNetwork& network, UsesByNetwork& uses) {
+  bool isNew = false;
+  for (const TransformerCfg* cfg : network.getTransformers()) {
+    const CompoundTransformerNetwork* inner = networkOf(cfg);
+    const Uses within = inner ? uses.value(inner) : Uses();
+    for (auto use = within.cbegin(); use != within.cend(); ++use)
+      isNew = add(cfg->getParameterValue(use.key()), network, use.value(), uses[&network]) || isNew;
+  }
+  return isNew;
+}
+
+bool ParameterPlaces::fits(const Use& use, const QString& value) {
+  using carried_references::fitsExpression;
+  return (!(use.places & Expression) || fitsExpression(value, true)) &&
+         (!(use.places & PlainExpression) || fitsExpression(value, false)) &&
+         (!(use.places & WorkersList) || fitsList(value)) &&
+         std::all_of(use.separators.begin(), use.separators.end(),
+                     [&value](QChar separator) { return isOneCell(value, separator); });
+}
+
+long ParameterPlaces::refuse(const QString& parameter, const QString& value) const {
+  const Use use = m_uses.value(parameter);
+  if ((use.places & ChoiceFragment) && !lookup_checks::fitsFragment(value))
+    return messages::kValueInScript;
+  if ((use.places & ListFragment) && TextPlaces::refuse(TextPlace::TclBraces, value) != 0)
+    return messages::kValueInScript;
+  return fits(use, value) ? 0 : messages::kBreaksInside;
+}
+
+bool ParameterPlaces::fitsEverywhere(const QString& value) {
+  const bool isPlain = std::all_of(value.begin(), value.end(), [](QChar c) {
+    return c.isLetterOrNumber() || c == QLatin1Char('_') || c == QLatin1Char('.') || c == QLatin1Char('-');
+  });
+  if (isPlain)
+    return true;
+  static const Use all{Expression | PlainExpression | WorkersList | Cell,
+                       {QLatin1Char(','), QLatin1Char(';'), QLatin1Char(' '), QLatin1Char('|')}};
+  return lookup_checks::fitsFragment(value) && fits(all, value);
+}
