@@ -18,6 +18,8 @@ class ORX_EXPORT AttributeSet {
 
   bool isEmpty() const { return size() == 0; }
   int size() const { return m_plain.size() + m_members.size(); }
+  // Of all names together.
+  qint64 characters() const { return m_plain.characters() + m_members.characters(); }
   // The list, made anew for who asks: its cost is that of all names.
   QStringList names() const;
   // The same names in the same order; compared one by one only where the sets do not share their data.

@@ -34,6 +34,7 @@ class ORX_EXPORT NameIndex {
   void remove(const QString& name);
   // Of all names, whatever their places.
   uint hash() const { return m_hash; }
+  qint64 characters() const { return m_characters; }
   bool isSharedWith(const NameIndex& other) const { return m_root.constData() == other.m_root.constData(); }
   void collect(Entries& entries) const;
   // What stands here and not in `other`. Parts that both share cost nothing. Gives up, with false, when it
@@ -56,4 +57,5 @@ class ORX_EXPORT NameIndex {
   NodePointer m_root;  // null when empty
   int m_size = 0;
   uint m_hash = 0;
+  qint64 m_characters = 0;
 };

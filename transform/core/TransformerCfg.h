@@ -35,6 +35,7 @@ class DefinitionDirectory;
 class IORXSession;
 class MFBuffer;
 class ParameterSubstitution;
+class PortTexts;
 class QTextStream;
 class Substitution;
 class TransformerCfgListener;
@@ -42,10 +43,6 @@ class TransformerSource;
 class WorkspaceParameterDirectory;
 struct PreservedAttributes;
 struct TransformerDefinition;
-
-namespace port_texts {
-class Texts;
-}
 
 // What addAttributesToList() adds: attributes that a parameter's value names.
 struct AddAttributesInfo {
@@ -461,9 +458,9 @@ class ORX_EXPORT TransformerCfg : public ITransformerCfg {
   // Runs the step over the lines; notes when a substitution would have grown beyond all measure.
   template <class Step>
   void substitute(QStringList& lines, Step step) const;
-  port_texts::Texts portTexts() const;
+  PortTexts portTexts() const;
   // Whether some text that is to be inserted holds a token itself, so that the order matters.
-  static bool bringsTokens(const ParameterSubstitution& values, const port_texts::Texts& ports);
+  static bool bringsTokens(const ParameterSubstitution& values, const PortTexts& ports);
   void putInstanceTokens(Substitution& lines) const;
   QString lookedUp(MFBuffer& buffer, const QString& name, const TransformParamCfg& record,
                    const QString& value) const;

@@ -110,6 +110,7 @@ void NameIndex::insert(const QString& name, qint64 place) {
   m_root->addEntry({name, hash, place}, 0);
   ++m_size;
   m_hash ^= hash;
+  m_characters += name.size();
 }
 
 void NameIndex::remove(const QString& name) {
@@ -117,6 +118,7 @@ void NameIndex::remove(const QString& name) {
   if (m_size == 0 || !find(m_root.constData(), 0, hash, name))
     return;
   m_hash ^= hash;
+  m_characters -= name.size();
   if (--m_size == 0)
     m_root = nullptr;
   else

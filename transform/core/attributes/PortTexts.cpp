@@ -34,13 +34,15 @@ QStringList inputLines(const TransformerCfg& cfg, const PortTables& ports, const
   return lines;
 }
 
-void Texts::addInputs(const TransformerCfg& cfg, const PortTables& ports) {
+}  // namespace port_texts
+
+void PortTexts::addInputs(const TransformerCfg& cfg, const PortTables& ports) {
   QString all;
   QStringList tags;
   cfg.getInputTags(tags);
   for (const QString& tag : std::as_const(tags)) {
     QString text;
-    for (const QString& line : inputLines(cfg, ports, tag)) {
+    for (const QString& line : port_texts::inputLines(cfg, ports, tag)) {
       text += (text.isEmpty() ? QString() : QString(kIndent)) + line + QLatin1Char('\n');
     }
     all += (all.isEmpty() ? QString() : QString(kIndent)) + text;
@@ -49,7 +51,7 @@ void Texts::addInputs(const TransformerCfg& cfg, const PortTables& ports) {
   m_texts.push_back({kInputLinesToken, all});
 }
 
-void Texts::addOutputs(const TransformerCfg& cfg) {
+void PortTexts::addOutputs(const TransformerCfg& cfg) {
   QStringList tags;
   cfg.getOutputTags(tags);
   for (const QString& tag : std::as_const(tags)) {
@@ -68,7 +70,7 @@ void Texts::addOutputs(const TransformerCfg& cfg) {
   }
 }
 
-void Texts::putInto(Substitution& lines) const {
+void PortTexts::putInto(Substitution& lines) const {
   for (const Text& text : m_texts) {
     if (text.isRemoved) {
       lines.removeOutput(text.token);
@@ -77,5 +79,3 @@ void Texts::putInto(Substitution& lines) const {
     }
   }
 }
-
-}  // namespace port_texts

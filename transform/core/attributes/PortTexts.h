@@ -17,8 +17,10 @@ namespace port_texts {
 // "INPUT NAME FEATURE_TYPE type[ filter]" for each feature type that is connected to the tag.
 QStringList inputLines(const TransformerCfg& cfg, const PortTables& ports, const QString& tag);
 
+}  // namespace port_texts
+
 // What the tokens of inputs and outputs stand for, each in the order in which it is put in.
-class Texts {
+class PortTexts {
  public:
   void addInputs(const TransformerCfg& cfg, const PortTables& ports);
   void addOutputs(const TransformerCfg& cfg);
@@ -38,5 +40,3 @@ class Texts {
 
   std::vector<Text> m_texts;
 };
-
-}  // namespace port_texts

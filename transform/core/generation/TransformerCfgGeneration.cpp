@@ -86,7 +86,7 @@ bool TransformerCfg::expandTemplate(MFBuffer& buffer, QStringList& lines) {
   ParameterSubstitution values(*this, m_parameters.records());
   if (compiled && compiled->isPlain() && compiled->hasOneLineClauses() &&
       typeid(*this) == typeid(TransformerCfg)) {
-    const port_texts::Texts ports = portTexts();
+    const PortTexts ports = portTexts();
     if (!bringsTokens(values, ports)) {
       TemplateExpansion expansion(*compiled);
       ports.putInto(expansion);
@@ -120,14 +120,14 @@ void TransformerCfg::substitute(QStringList& lines, Step step) const {
   lines = ordered.lines();
 }
 
-port_texts::Texts TransformerCfg::portTexts() const {
-  port_texts::Texts texts;
+PortTexts TransformerCfg::portTexts() const {
+  PortTexts texts;
   texts.addInputs(*this, m_ports);
   texts.addOutputs(*this);
   return texts;
 }
 
-bool TransformerCfg::bringsTokens(const ParameterSubstitution& values, const port_texts::Texts& ports) {
+bool TransformerCfg::bringsTokens(const ParameterSubstitution& values, const PortTexts& ports) {
   return values.bringsTokens() || !ports.allOf([&](const QString& text) { return values.isInert(text); });
 }
 
@@ -190,13 +190,13 @@ void TransformerCfg::substParametersForMappingFile(MFBuffer& buffer, QStringList
 // --------------------------------------------------------------------------------------------------
 
 void TransformerCfg::substInputs(QStringList& lines) const {
-  port_texts::Texts texts;
+  PortTexts texts;
   texts.addInputs(*this, m_ports);
   substitute(lines, [&texts](Substitution& ordered) { texts.putInto(ordered); });
 }
 
 void TransformerCfg::substOutputs(QStringList& lines) const {
-  port_texts::Texts texts;
+  PortTexts texts;
   texts.addOutputs(*this);
   substitute(lines, [&texts](Substitution& ordered) { texts.putInto(ordered); });
 }

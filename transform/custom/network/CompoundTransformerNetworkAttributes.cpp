@@ -18,8 +18,8 @@ namespace {
 // taken as it is; so it is in cycles of many thousand nodes most of whose links run against the order.
 constexpr std::size_t kMostRoundsWithNewNames = 8;
 constexpr std::size_t kMostStepsInCycle = 10 * 1000 * 1000;
-// What the custom transformers inside may cost within one outermost query, in attributes that reach them.
-// Definitions that are placed in each other again and again, each time with other
+// What the custom transformers inside may cost within one outermost query, in characters of the attributes
+// that reach them. Definitions that are placed in each other again and again, each time with other
 // attributes, could ask for more than any machine has: what exceeds this is told, and gives what reaches it.
 constexpr qint64 kMostCost = 32 * 1024 * 1024;
 constexpr qint64 kCostOfQuestion = 512;
@@ -118,7 +118,7 @@ AttributeSet CompoundTransformerNetwork::leavingAttributes(const QString& output
   qint64 cost = kCostOfQuestion;
   for (const QString& input : m_inputs) {
     key.inputs.append(m_inputNodes.at(input)->setAttributes());
-    cost += key.inputs.last().size();
+    cost += key.inputs.last().characters();
   }
   if (!NestedQuestion::spend(kKind, cost, kMostCost))
     return arrivingAttributes();
