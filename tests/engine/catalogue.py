@@ -10,7 +10,7 @@ class Definition:
     def __init__(self):
         self.name, self.version, self.inputs, self.outputs = "", 0, [], []
         self.aliases, self.parameters = {}, []
-        self.kind, self.statements = "", []
+        self.kind, self.statements, self.grouped = "", [], ""
 
     def keys_of(self, parameter):
         return [key for key, value in self.statements if value == f"$({parameter})"]
@@ -68,6 +68,8 @@ def _definitions(text, kinds):
                     current.aliases[name] = alias or name
         elif keyword == "TRANSFORMER_NAME:":
             current.name = value
+        elif keyword == "MULTIPROCESS:":
+            current.grouped = value
         elif keyword == "VERSION:":
             current.version = int(value)
         elif keyword == "PARAMETER_NAME:":

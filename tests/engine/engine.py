@@ -60,7 +60,7 @@ class Run:
             name, value = (re.split(r"[ \t]+", rest, maxsplit=1) + [""])[:2]
             name = self.macros.expand(name)
             if keyword == "MACRO" or name not in self.macros:
-                self.macros[name] = self.macros.expand(value.strip(" \t"))
+                self.macros[name] = self.macros.expand_early(value.strip(" \t"))
         elif body == "INCLUDE PYTHON":
             self.macros.update(scripts.run_python(lines, self.macros))
         elif body == "INCLUDE TCL":
@@ -145,9 +145,10 @@ class Run:
         for key, value in zip(listed[::2], listed[1::2]):
             self.macros[made.name + "_" + decode(key)] = decode(value)
         back = made.name + "_" + settings.get("LOOPBACK_INPUT_TAG", "")
-        count = len(self.factories)
+        count, workers = len(self.factories), self.workers
         for turn in range(2 if "LOOPBACK_INPUT_TAG" in settings else 1):
             del self.factories[count:]
+            self.workers = dict(workers)
             self.flow = inner = flow.Flow(types)
             self.include(f"{name}:{version}", blocks)
             came = inner.types.get(f"{made.name}_{settings.get('LOOPBACK_OUTPUT_TAG', '')}", set())
@@ -168,7 +169,7 @@ class Run:
 
     def complaints(self, feature):
         """Everything that an engine would stumble over."""
-        found = self.faults + [f"no such macro: {name}" for name in sorted(set(self.macros.unset))]
+        found = self.faults + [f"no such macro: {name}" for name in sorted({*self.macros.unset, *(set(self.macros.early) - set(self.macros))})]
         found += ["no statement: " + body[:80] for body in self.unknown]
         for made in self.factories:
             if made.kind != "TeeFactory" and not made.kind.startswith("TransformFact:"):

@@ -4,6 +4,8 @@ from collections import namedtuple
 
 from words import Fault, decode, split, unquote
 
+SETTINGS = {"PARALLELISM": "MINIMAL|MODERATE|AGGRESSIVE|EXTREME", "PROCESS_SETTING": "Yes|No",
+            "MAX_LOOP_ITERATIONS": "[0-9]+", "RUN": "STATEMENTS|DEFINITION"}
 Input = namedtuple("Input", "port type filter")
 Output = namedtuple("Output", "port type functions")
 
@@ -84,6 +86,8 @@ def _meta(made, raw, macros):
         if not colon or not re.fullmatch("[A-Z_]+", key):
             raise Fault("no setting KEY:VALUE: " + raw[at][:60])
         made.settings.append((key, macros.expand(unquote(value))))
+        if not re.fullmatch(SETTINGS.get(key, "(?s:.*)"), made.settings[-1][1]):
+            raise Fault(f"{key} is {made.settings[-1][1][:60]!r}")
         at += 1
     return at
 

@@ -9,7 +9,8 @@ ALWAYS_SET = {"ORX_HOME": "/home/orx", "WORKSPACE_NAME": "sample", "ORX_MF_NAME"
 class Macros(dict):
     def __init__(self):
         super().__init__(ALWAYS_SET)
-        self.unset = []
+        self.unset = []  # what statements referred to
+        self.early = []  # what values referred to, which are looked at again where they are used
 
     def expand(self, text, depth=0):
         if depth > DEEPEST:
@@ -30,6 +31,13 @@ class Macros(dict):
                 self.unset.append(name)
                 result += "$(" + name + ")"
             at = end
+
+    def expand_early(self, text):
+        before = len(self.unset)
+        result = self.expand(text)
+        self.early += self.unset[before:]
+        del self.unset[before:]
+        return result
 
     def expand_inner(self, text):
         """Only what stands inside references: for the one setting that names macros."""

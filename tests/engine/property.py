@@ -153,6 +153,13 @@ class Property:
                         expected = expected.strip(" \t")
                     for key in node.definition.keys_of(member) if expected is not None else []:
                         yield from self.value(run, case, made, key, kind.type, expected, part)
+            level = made and node.values.get("ORX_PROCESS_COUNT")
+            if level and level.expected:
+                expected = resolve(level.expected, scope, around)
+                came = [each.values("PARALLELISM") for each in run.factories
+                        if each.name == name and each.kind.startswith("TransformFact:")]
+                if came not in ([], [[expected]]):
+                    yield ("value", f"{name}: the level {came}", f"not {expected!r} of {level.stored!r}")
 
     def value(self, run, case, made, key, kind, expected, part):
         stood = made.values(key)
@@ -176,18 +183,19 @@ def resolve(expected, scope, around):
     if isinstance(expected, tuple) and expected[0] == "table":
         cells = [resolve(each, scope, around) for each in expected[3]]
         return None if None in cells else (*expected[:3], cells)
+    if isinstance(expected, tuple) and expected[0] == "formula":
+        text = resolve(expected[1], scope, around)
+        return None if text is None else ("formula", text)
     if not isinstance(expected, list):
         return expected
-    result = ""
+    pieces = []
     for piece in expected:
         if isinstance(piece, tuple):
             value = around[-1][1].values[piece[1]] if around else \
                 next(value for name, _, _, value in scope.parameters if name == piece[1])
-            piece = value.expected
-        if piece is None:
-            return None
-        result += piece
-    return result
+            piece = resolve(value.expected, *((around[-1][0], around[:-1]) if around else (scope, around)))
+        pieces.append(piece)
+    return None if None in pieces else "".join(pieces)
 
 
 def back(run, case, kind, expected, stood):

@@ -11,6 +11,9 @@ NUMBERS = ["0", "1", "-3", "25", "100"]
 PASSIVE = ("DISCLOSUREGROUP", "GROUP", "NAMEDGROUP", "DIVIDER", "MESSAGE", "PUBLISHED_PARAMETER",
            "PUBLISHED_PARAMETER_LIST", "TEXT_EDIT_PYTHON_PARM", "TEXT_EDIT_TCL_PARM")
 WITH_CONFIG = ("ATTR", "CHOICE", "LISTBOX", "LOOKUP", "CHECKBOX", "FILE", "NAMED", "RANGE", "TEXT_EDIT_PARM")
+LOOKUP = [("First one", "ONE"), ("Second, one", "TWO"), ("THREE", "3")]
+CONFIG = {"LOOKUP_CHOICE": '"First one",ONE%"Second, one",TWO%THREE,3 '}
+LEVELS = {"No Parallelism": "NO_PARALLELISM", "Minimal": "MINIMAL", "Extreme": "EXTREME"}
 
 
 class Value:
@@ -18,6 +21,7 @@ class Value:
 
     def __init__(self, stored, expected=None):
         self.stored, self.expected = stored, expected
+        self.fixed = False  # whether instances keep it
 
 
 def is_encoded(kind):
@@ -49,7 +53,7 @@ def make(case, parameter, scope):
     if kind == "MULTIPARAMETER":
         return multi(case, parameter, scope)
     if "CHOICE" in kind or "LISTBOX" in kind or kind == "CHECKBOX":
-        return choice(case, parameter)
+        return choice(case, parameter, scope)
     if kind.startswith(("INT", "FLOAT", "RANGE")):
         return numeric(case, kind, scope)
     if kind.startswith("EXPRESSION"):
@@ -59,7 +63,7 @@ def make(case, parameter, scope):
     return text(case, kind, scope)
 
 
-def choice(case, parameter):
+def choice(case, parameter, scope):
     rng, kind = case.random, parameter.type
     if kind == "CHECKBOX":
         stored = rng.choice(parameter.config.split("%") if parameter.config else ["YES", "NO"])
@@ -70,12 +74,35 @@ def choice(case, parameter):
     if "LISTBOX" in kind:
         picked = rng.sample(sides, rng.randint(1, len(sides)))
         at = rng.randrange(2)
-        return Value(pack([side[at] for side in picked], " "), pack([side[1] for side in picked], " "))
-    shown, stored = rng.choice(sides)
-    if rng.random() < 0.05:
-        wrong = case.text(stored, "choice")
-        return Value(wrong, stored if wrong == stored else None)
-    return Value(shown if parameter.lookup else rng.choice([shown, stored]), stored)
+        given, stored = pack([side[at] for side in picked], " "), pack([side[1] for side in picked], " ")
+    else:
+        shown, stored = rng.choice(sides)
+        if rng.random() < 0.05:
+            wrong = case.text(stored, "choice")
+            return Value(wrong, stored if wrong == stored else None)
+        given = shown if parameter.lookup else rng.choice([shown, stored])
+    if rng.random() < 0.05 and scope.referable:
+        return conditional(case, kind, scope, [(given, stored)] * 2)
+    return referred(case, scope, "TEXT", given, stored) if rng.random() < 0.1 else Value(given, stored)
+
+
+def referred(case, scope, kind, given, expected):
+    """A reference to a parameter made for it, whose value is `given`."""
+    name = f"R{len(scope.parameters)}"
+    value = Value(given, expected)
+    value.fixed = True
+    scope.parameters.append((name, kind, "Prompt", value))
+    return Value(f"$({name})", [("macro", name)])
+
+
+def level(case, scope):
+    shown, stored = case.random.choice(list(LEVELS.items()))
+    given = case.text(case.random.choice([shown, stored]), "parallel")
+    if given not in (shown, stored):
+        return Value(given)
+    if case.random.random() < 0.1 and scope.referable:
+        return conditional(case, "CHOICE", scope, [(given, stored)] * 2)
+    return referred(case, scope, "TEXT", given, stored) if case.random.random() < 0.2 else Value(given, stored)
 
 
 def numeric(case, kind, scope):
@@ -87,6 +114,10 @@ def numeric(case, kind, scope):
         name = scope.referable[0]
         return Value(reference(name, is_encoded(kind)), case.feature.get(name))
     number = rng.choice(NUMBERS[3:])
+    if rng.random() < 0.05:
+        return referred(case, scope, "FLOAT", number, number)
+    if rng.random() < 0.05:
+        return referred(case, scope, "TEXT", given := case.text(number, "referred number"), given)
     return Value(number, number)
 
 
@@ -118,29 +149,37 @@ def text(case, kind, scope):
         name, value = rng.choice(macros)
         parts.append((f"$({name})", ("macro", name)))
     elif rng.random() < 0.1 and scope.referable and may_refer(kind):
-        return conditional(case, kind, scope)
+        return conditional(case, kind, scope, [(text, text) for text in
+                                               (case.text("yes", "conditional"), case.text("no", "conditional"))])
+    elif case.siblings and rng.random() < 0.02:
+        parts.append((f"$({rng.choice(case.siblings)})", None))
     values = [meaning for _, meaning in parts]
     return Value("".join(part for part, _ in parts), None if None in values else values)
 
 
-def conditional(case, kind, scope):
+def conditional(case, kind, scope, results):
+    """`results` are what is given, and what is to come back, of a condition that holds and of one that does not."""
     name = case.random.choice(scope.referable)
     limit = case.random.choice(["0", "99999"])
-    yes, no = case.text("yes", "conditional"), case.text("no", "conditional")
+    (yes, first), (no, second) = results
     condition = "@Value(" + reference(name, False)[7:-1] + ") > " + limit
     return Value("ORX_CONDITIONAL:" + ";".join(map(encode, (condition, yes, no))),
-                 [yes if float(case.feature.get(name)) > float(limit) else no])
+                 [first if float(case.feature.get(name)) > float(limit) else second])
 
 
 def expression(case, scope):
-    if not scope.referable:
-        formula = "1 = 2"
-    else:
-        name = case.random.choice(scope.referable)
-        formula = "@Value(" + reference(name, False)[7:-1] + ") = 3"
-    if case.random.random() < 0.3:
-        formula += ' or "' + case.text("t", "formula").replace('"', '""') + '" = "t"'
-    return Value(encode(formula), ("formula", formula))
+    rng, parts = case.random, ["1 = 2"]
+    if scope.referable:
+        parts = ["@Value(" + reference(rng.choice(scope.referable), False)[7:-1] + ") = 3"]
+    stored = encode(parts[0])
+    encoded = [name for name, kind, _, _ in scope.parameters if kind == "TEXT_ENCODED"]
+    if rng.random() < 0.3:
+        parts.append(' or "' + case.text("t", "formula").replace('"', '""') + '" = "t"')
+        stored += encode(parts[-1])
+    elif encoded and rng.random() < 0.3:
+        parts += [' or "', ("macro", encoded[0]), '" = "t"']
+        stored += encode(' or "') + f"$({encoded[0]})" + encode('" = "t"')
+    return Value(stored, ("formula", parts))
 
 
 def attributes(case, kind, scope):

@@ -4,7 +4,7 @@ import re
 from html import escape
 
 from functions import Feature
-from values import MEANS, NUMBERS, Value, make
+from values import CONFIG, LOOKUP, MEANS, NUMBERS, Value, is_encoded, level, make, reference
 from words import decode, encode
 
 HOSTILE = [
@@ -15,7 +15,14 @@ HOSTILE = [
     "OUTPUT", "FEATURE_TYPE", "1 OUTPUT X", "a OUTPUT x FEATURE_TYPE y", "FACTORY_DEF * TeeFactory", "MACRO HIT 1",
     'INCLUDE [ puts "MACRO HIT 1" ]', "line\nbreak", "\r", "<space>", "<", ">", "é", "日本", "😀", "\u00a0", "\u3000",
     "x" * 300, "END_INCLUDE", "# TRANSFORMER_END", "a|b", "a_OUTPUT", "%1", "&amp;", "0", "YES", "a:b", "\\n", "\\t",
-    "]]>", "a/b", "a.b{0}", "<Unused>"]
+    "]]>", "a/b", "a.b{0}", "<Unused>", "$(P0)", "$[P0]", "$($(P1))", "$(VALUE)", '"$(P0)","$(P1)"', "1e5", "1;2", "-"]
+# Whole lines of headers, good and bad.
+HEADERS = [
+    "MACRO H one", "DEFAULT_MACRO H $(P0)", "MACRO H", "MACRO", "GUI TEXT H Prompt", "# a comment", "INCLUDE [ puts {MACRO H 2} ]",
+    "INCLUDE [ puts {MACRO H 2}", "INCLUDE PYTHON\nreturn {'H': '1'}\nEND_INCLUDE", "INCLUDE PYTHON\nreturn {", "INCLUDE PYTHON",
+    "INCLUDE TCL\nputs {MACRO H 1}\nEND_INCLUDE", "INCLUDE TCL\nset x {\nEND_INCLUDE", "END_INCLUDE", "# TRANSFORMER_END",
+    "# TRANSFORMER_BEGIN X,1", "FACTORY_DEF *", 'FACTORY_DEF * TeeFactory FACTORY_NAME "x INPUT FEATURE_TYPE a', "MACRO H \\",
+    "Tcl2 proc h {} {return 1}", "Tcl2 proc h {} {", "MACRO H $(H)", "MACRO P0 $(H)", "INCLUDE_CUSTOM_TRANSFORMER_VER Nope:1"]
 # Not drawn while it is being mended: where a text stands, and which texts, as patterns.
 KNOWN = [
     (".*_ENCODED", "^@Value"),
@@ -63,7 +70,9 @@ class Case:
         self.rate = self.random.choice([0.03, 0.1, 0.3])
         self.drawn = 0
         self.main = Scope()
+        self.siblings = []
         self._fill(self.main, 0)
+        self.header = [self.random.choice(HEADERS) for _ in range(self.random.choice([0] * 9 + [1, 2]))]
         self.linked = next((each for each in self.customs if each.around is self.main), None) \
             if self.random.random() < 0.1 else None
         if self.linked:
@@ -131,19 +140,25 @@ class Case:
 
     def _parameter(self, scope, at):
         rng = self.random
-        scripts = ["SCRIPT", "TEXT_ENCODED"] if scope.name and not scope.loops else []
-        kind = rng.choice(["TEXT_ENCODED", "TEXT", "FLOAT", *scripts])
-        name = f"P{at}"
+        scripts = ["SCRIPT", "TEXT_ENCODED"] if not scope.loops else []
+        kind = rng.choice(["TEXT_ENCODED", "TEXT", "FLOAT", "LOOKUP_CHOICE", *scripts])
         prompt = self.text("Prompt", "prompt")
-        value = self.constant(kind, prompt)
+        value = self.constant(kind, None if scope.name else scope)
         kind = value.kind if kind == "SCRIPT" else kind
-        scope.parameters.append((name, kind, prompt, value))
+        scope.parameters.append((f"P{at}", kind, prompt, value))
 
-    def constant(self, kind, seed_text="t"):
-        """A value of a parameter of a document."""
+    def constant(self, kind, scope):
+        """A value of a parameter of a document; what it refers to are the parameters of `scope`."""
+        same = [name for name, of, _, _ in scope.parameters
+                if of == kind or kind == "TEXT_ENCODED" and is_encoded(of)] if scope else []
+        if same and kind != "SCRIPT" and self.random.random() < 0.25:
+            name = self.random.choice(same)
+            return Value(f"$({name})", [("macro", name)])
         if kind == "FLOAT":
             number = self.random.choice(NUMBERS)
             return Value(number, number)
+        if kind == "LOOKUP_CHOICE":
+            return Value(*self.random.choice([(side, stored) for shown, stored in LOOKUP for side in (shown, stored)]))
         if kind == "SCRIPT":
             text, python = self.text("t", "script"), self.random.random() < 0.5
             code = (f"x = {text!r}\n# {text.splitlines()[0] if text.split() else ''}\nreturn 'v1'" if python else
@@ -151,6 +166,9 @@ class Case:
             value = Value(encode(code), "v1")
             value.kind = "TEXT_EDIT_PYTHON_PARM" if python else "TEXT_EDIT_TCL_PARM"
             return value
+        if scope and scope.referable and self.random.random() < 0.05:
+            name = self.random.choice(scope.referable)
+            return Value(reference(name, kind == "TEXT_ENCODED"), self.feature.get(name))
         text = self.text("t", kind)
         if kind == "TEXT_ENCODED":
             return Value(encode(text), text)
@@ -173,7 +191,7 @@ class Case:
         if mode < 0.2:
             custom.settings["BLOCKED_LOOPING"] = "yes"
         elif mode < 0.4:
-            custom.settings["PARALLELISM"] = rng.choice(["MINIMAL", "EXTREME"])
+            custom.settings["PARALLELISM"] = self.text(rng.choice(["MINIMAL", "EXTREME"]), "parallel")
             custom.settings["PARALLEL_GROUP_BY"] = (
                 self.text("attr", "parallel") if rng.random() < 0.2 else self.main.attributes[0])
         self._fill(custom, depth + 1)
@@ -196,10 +214,8 @@ class Case:
             node.inputs = [port.name for port, kind in custom.ports if kind == "true"]
             node.outputs = [port.name for port, kind in custom.ports if kind == "false"]
             for name, kind, _, default in custom.parameters:
-                node.values[name] = default if rng.random() < 0.3 else \
-                    self.constant("SCRIPT" if kind.endswith("_PARM") else kind)
-                if kind.endswith("_PARM"):
-                    node.values[name] = default
+                node.values[name] = default if rng.random() < 0.3 or kind.endswith("_PARM") or default.fixed else \
+                    self.constant(kind, scope)
             if custom.loops == "loop":
                 node.values["MAX_LOOP_ITERATIONS"] = Value(
                     self.text("9", "loop setting") if rng.random() < 0.2 else rng.choice(NUMBERS[3:]))
@@ -209,10 +225,13 @@ class Case:
             typed = rng.random() < 0.2
             node.definition = rng.choice([each for each in self.catalogue if each.name.startswith("Typed") == typed])
             node.inputs, node.outputs = list(node.definition.inputs), list(node.definition.outputs)
+            self.siblings = [parameter.name for parameter in node.definition.parameters]
             for parameter in node.definition.parameters:
                 value = make(self, parameter, scope)
                 if value is not None:
                     node.values[parameter.name] = value
+            if node.definition.grouped and rng.random() < 0.3:
+                node.values["ORX_PROCESS_COUNT"] = level(self, scope)
         scope.nodes.append(node)
 
     def _connect(self, scope):
@@ -250,7 +269,8 @@ class Case:
                                                   "KEYWORD": keyword, "IDENTIFIER": str(node.number)}, inner)
         xml = ('<?xml version="1.0" encoding="UTF-8" ?>\n<WORKSPACE>\n' + section("FEATURE_TYPES", [types]) +
                self._sections(main) + section("SUBDOCUMENTS", [subs]) + "</WORKSPACE>\n")
-        return "".join(f"#! {line}\n" for line in xml.split("\n") if line) + "#! START_HEADER\n#! END_HEADER\n"
+        return "".join(f"#! {line}\n" for line in xml.split("\n") if line) + "".join(
+            f"{line}\n" for line in ["#! START_HEADER", *self.header, "#! END_HEADER"])
 
     def _sections(self, scope):
         nodes = []
@@ -272,7 +292,7 @@ class Case:
             for at, (a, out, b, into) in enumerate(scope.links)]
         ports = [element("SUBDOCUMENT_IO", {"IDENTIFIER": str(node.number), "NAME": node.name, "IS_SOURCE": kind})
                  for node, kind in scope.ports]
-        parameters = [element("GLOBAL_PARAMETER", {"GUI_LINE": f"GUI {kind} {name} {prompt}",
+        parameters = [element("GLOBAL_PARAMETER", {"GUI_LINE": f"GUI {kind} {name} {CONFIG.get(kind, '')}{prompt}",
                                                    "DEFAULT_VALUE": value.stored})
                       for name, kind, prompt, value in scope.parameters]
         return section("GLOBAL_PARAMETERS", parameters) + section("TRANSFORMERS", nodes) + (
