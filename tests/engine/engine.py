@@ -81,7 +81,9 @@ class Run:
             self.option(rest)
         elif keyword in ("READER_FEATURE_TYPE", "WRITER_FEATURE_TYPE"):
             self.route(keyword, [self.macros.expand(unquote(word.raw)) for word in split(rest)])
-        elif keyword != "GUI":
+        elif keyword == "GUI":
+            self.macros.prompted.update(rest.split())
+        else:
             self.unknown.append(body)
 
     def written(self, lines, blocks):
@@ -169,7 +171,7 @@ class Run:
 
     def complaints(self, feature):
         """Everything that an engine would stumble over."""
-        found = self.faults + [f"no such macro: {name}" for name in sorted({*self.macros.unset, *(set(self.macros.early) - set(self.macros))})]
+        found = self.faults + [f"no such macro: {name}" for name in sorted({*self.macros.unset, *(set(self.macros.early) - set(self.macros))} - self.macros.prompted)]
         found += ["no statement: " + body[:80] for body in self.unknown]
         for made in self.factories:
             if made.kind != "TeeFactory" and not made.kind.startswith("TransformFact:"):

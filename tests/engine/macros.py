@@ -10,6 +10,7 @@ class Macros(dict):
     def __init__(self):
         super().__init__(ALWAYS_SET)
         self.unset = []  # what statements referred to
+        self.prompted = set()  # what prompt lines name: whoever runs the file gives these a value
         self.early = []  # what values referred to, which are looked at again where they are used
 
     def expand(self, text, depth=0):

@@ -16,7 +16,7 @@ import values
 import workspaces
 from engine import Engine, Run
 from functions import attributes_in, formula, shown
-from words import Fault, decode, unpack
+from words import Fault, decode, pack, unpack
 
 # Families that are known and not mended yet: the check, and a pattern of what it says.
 EXCLUDED = []
@@ -107,7 +107,7 @@ class Property:
         found = [("lint", each, "") for each in linted]
         found += [("engine", each, "") for each in run.complaints(case.feature)]
         found += [*self.flows(case, run), *self.values(case, run)]
-        if twin:
+        if twin and "<Unused>" not in (text for _, _, text in case.used):  # which is no value at all
             found += [("shape", *each) for each in difference(run.shapes, self.read(tame, twin).shapes)]
         return found
 
@@ -215,6 +215,8 @@ def back(run, case, kind, expected, stood):
         return "table", separator, kinds, [cell if each in ("", ("list", [])) else each
                                            for each, cell in zip(came, cells)]
     came = run.value(stood, case.feature)
+    if "LISTBOX" in kind:
+        return pack(unpack(came, " "), " ")
     return decode(came) if encoded else came.strip(" \t")
 
 

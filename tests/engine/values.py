@@ -89,10 +89,10 @@ def choice(case, parameter, scope):
 def referred(case, scope, kind, given, expected):
     """A reference to a parameter made for it, whose value is `given`."""
     name = f"R{len(scope.parameters)}"
-    value = Value(given, expected)
+    value = Value(given, given)
     value.fixed = True
     scope.parameters.append((name, kind, "Prompt", value))
-    return Value(f"$({name})", [("macro", name)])
+    return Value(f"$({name})", [expected])
 
 
 def level(case, scope):

@@ -67,12 +67,12 @@ class Case:
     def __init__(self, catalogue, seed, tame, skipped=(), dropped=()):
         self.random, self.tame, self.skipped, self.seed = random.Random(seed), tame, set(skipped), seed
         self.catalogue, self.feature, self.customs, self.used = catalogue, Feature(), [], []
-        self.rate = self.random.choice([0.03, 0.1, 0.3])
+        self.rate = self.random.choice([0.02, 0.05, 0.15])
         self.drawn = 0
         self.main = Scope()
         self.siblings = []
         self._fill(self.main, 0)
-        self.header = [self.random.choice(HEADERS) for _ in range(self.random.choice([0] * 9 + [1, 2]))]
+        self.header = [self.random.choice(HEADERS) for _ in range(self.random.choice([0] * 24 + [1, 2]))]
         self.linked = next((each for each in self.customs if each.around is self.main), None) \
             if self.random.random() < 0.1 else None
         if self.linked:
@@ -166,7 +166,7 @@ class Case:
             value = Value(encode(code), "v1")
             value.kind = "TEXT_EDIT_PYTHON_PARM" if python else "TEXT_EDIT_TCL_PARM"
             return value
-        if scope and scope.referable and self.random.random() < 0.05:
+        if scope and scope.referable and self.random.random() < 0.01:
             name = self.random.choice(scope.referable)
             return Value(reference(name, kind == "TEXT_ENCODED"), self.feature.get(name))
         text = self.text("t", kind)
