@@ -104,7 +104,7 @@ def formula(parts, divides):
         for digits, quoted, name, sign, other in TOKEN.findall(part.strip()):
             if other:
                 raise Fault(f"no formula: {parts}")
-            tokens.append(("value", number(digits)) if digits else ("name", name) if name else
+            tokens.append(("value", number(digits)) if digits else ("name", name.lower()) if name else
                           ("sign", sign) if sign else ("value", quoted.replace('""', '"')))
     value, at = _binary(tokens, 0, 0, divides)
     if at != len(tokens):

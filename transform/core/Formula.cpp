@@ -113,10 +113,13 @@ bool Formula::take(int& position, bool wantsOperand, Token& token) const {
     return finish(Kind::Sign, start + 1);
   }
   if (c == QLatin1Char('"')) {
-    return finish(Kind::Text, textEnd(m_text, start));
+    const int end = textEnd(m_text, start);
+    // A reference in a text is one all the same where the formula is written.
+    return valueReferences(m_text.mid(start, end - start)).empty() && finish(Kind::Text, end);
   }
   if (m_text.midRef(start, kValueReference.size()) == kValueReference) {
-    return finish(Kind::Attribute, endOfValueReference(m_text, start));
+    const int end = endOfValueReference(m_text, start);
+    return end != start + kValueReference.size() + 1 && finish(Kind::Attribute, end);
   }
   if (isDigit(c) || c == QLatin1Char('.')) {
     return finish(Kind::Number, numberEnd(m_text, start));

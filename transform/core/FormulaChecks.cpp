@@ -11,13 +11,14 @@ namespace {
 
 const QLatin1Char kPartSeparator(';');
 
-void add(QStringList& formulas, QString text, bool isEncoded, const ExpandReferences& expand) {
+void add(QStringList& formulas, QString text, bool isEncoded, bool isCondition,
+         const ExpandReferences& expand) {
   if (expand && beginsMacroReference(text)) {
     expand(text);
   }
   const QString decoded = isEncoded ? QORXWwjdDecode(text) : text;
   const bool isUnset = decoded.trimmed().isEmpty() || text == kUnusedValue || decoded == kUnusedValue;
-  if (!isUnset && !decoded.contains(kMacroOpen) && !decoded.contains(kDeferredOpen)) {
+  if ((isCondition || !isUnset) && !decoded.contains(kMacroOpen) && !decoded.contains(kDeferredOpen)) {
     formulas.append(decoded);
   }
 }
@@ -30,7 +31,7 @@ QStringList formulasIn(const GUIType& type, const QString& value, const ExpandRe
   QStringList formulas;
   if (!value.startsWith(kConditionalPrefix)) {
     if (isExpression || (isComputed && ExpressionWriter::needsWrapping(type, value))) {
-      add(formulas, value, type.valueIsEncoded(), expand);
+      add(formulas, value, type.valueIsEncoded(), false, expand);
     }
     return formulas;
   }
@@ -38,7 +39,7 @@ QStringList formulasIn(const GUIType& type, const QString& value, const ExpandRe
   for (int i = 0; i < parts.size(); ++i) {
     const bool isResult = i % 2 == 1 || i + 1 == parts.size();
     if (isComputed || !isResult) {
-      add(formulas, parts.at(i), true, expand);
+      add(formulas, parts.at(i), true, !isResult, expand);
     }
   }
   return formulas;

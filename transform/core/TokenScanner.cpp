@@ -1,4 +1,22 @@
+#include <transform/core/GenerationKeywords.h>
+#include <transform/core/Keywords.h>
 #include <transform/core/TokenScanner.h>
+
+namespace {
+
+bool hasTag(const QString& name, QLatin1String start, QLatin1String end) {
+  return name.size() > start.size() + end.size() && name.startsWith(start) && name.endsWith(end);
+}
+
+}  // namespace
+
+bool isReservedToken(const QString& name) {
+  return name == kInputLinesToken || name == kUuidToken || name == kEncodedNameToken ||
+         name == kIdentifierParameter || name == kSchemaToken || name == kValueListToken ||
+         hasTag(name, kInputTokenStart, kInputTokenEnd) ||
+         hasTag(name, kOutputTokenStart, kFeatureTypeTokenEnd) ||
+         hasTag(name, kOutputTokenStart, kFunctionsTokenEnd);
+}
 
 namespace {
 

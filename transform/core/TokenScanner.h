@@ -4,6 +4,9 @@
 
 #include <QString>
 
+// Whether a template's token of that name stands for something of the instance: its ports, name or schema.
+bool isReservedToken(const QString& name);
+
 class TokenScanner {
  public:
   // The text must outlive the scanner.

@@ -141,10 +141,13 @@ AttributeSet CompoundTransformerCfg::leavingAttributes(const QString& tag) const
   if (!m_network)
     return AttributeSet();
   putInputAttributes();
-  if (m_network->answersWithSets())
-    return resolvedAttributes(m_network->leavingAttributes(tag));
   QHash<QString, QString> origins;
-  return resolvedAttributes(AttributeSet(m_network->getOutputAttributes(tag, origins)));
+  AttributeSet leaving = resolvedAttributes(m_network->answersWithSets()
+                                                ? m_network->leavingAttributes(tag)
+                                                : AttributeSet(m_network->getOutputAttributes(tag, origins)));
+  if (m_network->blockedLooping())
+    leaving.add(attributesListedBy(kIterationCountParameter));
+  return leaving;
 }
 
 AttributeSet CompoundTransformerCfg::resolvedAttributes(AttributeSet attributes) const {

@@ -11,6 +11,15 @@
 
 using orx::Rule;
 
+namespace {
+
+// A name with blanks that is not word-encoded would be cut.
+bool hasWords(const QString& description, int most) {
+  return description.split(QLatin1Char(' '), Qt::SkipEmptyParts).size() <= most;
+}
+
+}  // namespace
+
 DocumentBinding::DocumentBinding(const IXMLComponentReader& reader, TransformerSource& source,
                                  orx::Findings& findings, const WorkspaceParameterDirectory* parameters,
                                  TransformerCfgListener* listener)
@@ -166,7 +175,7 @@ bool DocumentBinding::readPort(const LinkStruct& record, const Place& place, boo
   unsigned number = 0;
   QString name;
   const QString& description = isOutput ? record.sourcePortDesc : record.targetPortDesc;
-  if (readFeaturePort(description, isOutput, number, name))
+  if (hasWords(description, 3) && readFeaturePort(description, isOutput, number, name))
     return findPort(record, place, isOutput, number, name, tag);
   reportPort(record, place, description);
   return false;
@@ -196,7 +205,8 @@ std::optional<DocumentBinding::AttributeCopy> DocumentBinding::attributeCopy(con
     bool isFeaturePort = false;
     bool isOutput = false;
     unsigned ignored = 0;
-    return decodePortDescription(description, isFeaturePort, isOutput, wantsOutput ? port : ignored, ignored,
+    return hasWords(description, 4) &&
+           decodePortDescription(description, isFeaturePort, isOutput, wantsOutput ? port : ignored, ignored,
                                  attribute) &&
            !isFeaturePort && isOutput == wantsOutput && !attribute.isEmpty();
   };

@@ -135,7 +135,14 @@ void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer, WrittenCheck* check)
                       quotifyStringForMF(place.keyword) + QLatin1Char(' ') +
                       (isReader ? type + QLatin1Char(' ') + shownFlow : shownFlow + QLatin1Char(' ') + type));
     }
+  }
+  // Factories stand behind all types.
+  for (int node = 0; node < static_cast<int>(m_workspace.nodes.size()); ++node) {
+    const WorkspaceNode& place = m_workspace.nodes[at(node)];
+    const QString flow = m_connection.flowOfType(node);
     if (!m_connection.flowBehindCopies(node).isEmpty()) {
+      if (check)
+        check->begin({WrittenPlace::Kind::Node, place.line, place.name});
       writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + QLatin1String(" Attribute Copier"),
                  {flow}, m_connection.flowBehindCopies(node), m_connection.functionsOfType(node));
     }

@@ -1,5 +1,4 @@
-#include <transform/core/GenerationKeywords.h>
-#include <transform/core/Keywords.h>
+#include <transform/core/TokenScanner.h>
 #include <transform/text/GlobalMacros.h>
 #include <translation/mappingfile/MappingFileMacros.h>
 #include <translation/mappingfile/MappingFileReader.h>
@@ -19,18 +18,6 @@ constexpr int kLongestName = 1024;
 bool endsScriptWord(QChar c) {
   return c.isSpace() ||
          (c.unicode() < 0x80 && c.unicode() != 0 && std::strchr("'\"{}[]()<>;,$\\", c.unicode()));
-}
-
-bool hasTag(const QString& name, QLatin1String start, QLatin1String end) {
-  return name.size() > start.size() + end.size() && name.startsWith(start) && name.endsWith(end);
-}
-
-bool isTemplateToken(const QString& name) {
-  return name == kInputLinesToken || name == kUuidToken || name == kEncodedNameToken ||
-         name == kIdentifierParameter || name == kSchemaToken || name == kValueListToken ||
-         hasTag(name, kInputTokenStart, kInputTokenEnd) ||
-         hasTag(name, kOutputTokenStart, kFeatureTypeTokenEnd) ||
-         hasTag(name, kOutputTokenStart, kFunctionsTokenEnd);
 }
 
 }  // namespace
@@ -127,7 +114,7 @@ void MappingFileMacros::finish(const QSet<int>& openBlocks, MappingFileReport& r
       report.add(Rule::LateMacro, reference.line, {reference.name, QString::number(line)});
     if (line > 0)
       continue;
-    if (isTemplateToken(reference.name)) {
+    if (isReservedToken(reference.name)) {
       report.add(Rule::LeftToken, reference.line, {reference.name});
     } else if (!openBlocks.contains(reference.block) &&
                (reference.use == Use::Now || !isKnown(reference.name))) {

@@ -11,6 +11,7 @@
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/IXMLComponentReader.h>
+#include <translation/MappingFileLint.h>
 #include <translation/graph/ReferencedNames.h>
 #include <translation/graph/Workspace.h>
 #include <translation/validation/FitChecks.h>
@@ -142,6 +143,12 @@ void WorkspaceChecks::checkLinked(const ExternalTransformerNetwork& linked, cons
   }
   for (const orx::Finding& finding : found.all())
     m_diagnostics.add(finding);
+  // An engine runs the statements of the file, not its document.
+  for (const orx::Finding& finding :
+       lintMappingFile(linked.getFileName(), linked.getFileName(), {}).findings) {
+    if (m_settings.severity(finding.rule) == orx::Severity::Error)
+      m_diagnostics.add(finding);
+  }
 }
 
 void WorkspaceChecks::checkAge(const TransformerCfg& cfg, int line, const QString& title,

@@ -1,15 +1,19 @@
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/SingleChoices.h>
+#include <transform/core/TokenScanner.h>
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerCfg.h>
+#include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/scripts/ScriptBlocks.h>
+#include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
+#include <transform/text/TextHelpers.h>
 #include <transform/text/TextPlaces.h>
 #include <translation/graph/InnerNames.h>
 #include <translation/validation/WritingChecks.h>
@@ -98,8 +102,42 @@ void WritingChecks::checkParameter(const GlobalParameters::Parameter& parameter,
     m_findings.reportUnwritable(parameter.line, QString(), parameter.name, TransformResString(reason));
 }
 
+// Some names are set by others than the parameter.
+void WritingChecks::checkParameterName(const GlobalParameters::Parameter& parameter) {
+  if (isReservedToken(parameter.name) || (!parameter.setInHeader && isGlobalMacro(parameter.name)))
+    m_findings.reportAs(Rule::TakenName, messages::kNameOfTheSystem, parameter.line, QString(),
+                        {parameter.name});
+}
+
+void WritingChecks::checkPrefixMacros() {
+  std::vector<const CompoundTransformerNetwork*> networks;
+  for (const ExternalDocNetwork* network : m_workspace.customTransformers())
+    networks.push_back(network);
+  for (const ExternalTransformerNetwork* network : m_workspace.linkedCustomTransformers)
+    networks.push_back(network);
+  for (const CompoundTransformerNetwork* network : networks) {
+    const GlobalParameters::Parameter* parameter =
+        m_workspace.parameters.find(makePrefixMacro(network->getName()));
+    if (parameter)
+      m_findings.reportAs(Rule::TakenName, messages::kPrefixMacroTaken, parameter->line, QString(),
+                          {parameter->name, network->getName()});
+  }
+}
+
+void WritingChecks::checkType(const WorkspaceNode& node) {
+  checkWord(node.name, node.line, node.name);
+  checkWord(node.keyword, node.line, node.name);
+  const auto type = qMakePair(static_cast<int>(node.kind), qMakePair(node.keyword, node.name));
+  if (m_types.contains(type))
+    m_findings.reportAs(Rule::TakenName, messages::kTypeTwice, node.line, node.name,
+                        {node.name, node.keyword});
+  m_types.insert(type);
+}
+
 void WritingChecks::checkParameters() {
+  checkPrefixMacros();
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
+    checkParameterName(parameter);
     if (parameter.isPublished)
       checkChoices(parameter);
     const QString script = parameter.isComputed() ? refuseScript(parameter) : QString();
@@ -124,12 +162,10 @@ void WritingChecks::check() {
   checkParameters();
   for (const WorkspaceNode& node : m_workspace.nodes) {
     checkAttributes(node);
-    if (node.isTransformer()) {
+    if (node.isTransformer())
       checkTransformer(node);
-    } else {
-      checkWord(node.name, node.line, node.name);
-      checkWord(node.keyword, node.line, node.name);
-    }
+    else
+      checkType(node);
   }
 }
 

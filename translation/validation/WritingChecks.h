@@ -21,6 +21,9 @@ class WritingChecks {
 
  private:
   void checkParameters();
+  void checkParameterName(const GlobalParameters::Parameter& parameter);
+  void checkPrefixMacros();
+  void checkType(const WorkspaceNode& node);
   QString refuseScript(const GlobalParameters::Parameter& parameter) const;
   void checkChoices(const GlobalParameters::Parameter& parameter);
   void checkParameter(const GlobalParameters::Parameter& parameter, const QString& value);
@@ -34,5 +37,6 @@ class WritingChecks {
   const Workspace& m_workspace;
   orx::Findings& m_findings;
   QSet<const CompoundTransformerNetwork*> m_checked;
-  QSet<const ConfiguredDefinition*> m_sound;  // whose template needs no second look
+  QSet<QPair<int, QPair<QString, QString>>> m_types;  // kind, keyword and name of those that were checked
+  QSet<const ConfiguredDefinition*> m_sound;          // whose template needs no second look
 };
