@@ -16,10 +16,6 @@
 
 namespace {
 
-QString text(const char* utf8) {
-  return QString::fromUtf8(utf8);
-}
-
 QByteArray contentOf(const QString& name) {
   QFile file(name);
   return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(cannot be read)");
@@ -94,7 +90,7 @@ TEST_F(AtomicFiles, AppearsWhenCommittedAndNeverWithout) {
     }
     EXPECT_EQ(contentOf(path(name)), "head\n" + large);
   }
-  EXPECT_EQ(entries(), (QStringList{text("new"), text("old")}));
+  EXPECT_EQ(entries(), (QStringList{"new", "old"}));
 }
 
 TEST_F(AtomicFiles, KeepsPermissions) {
@@ -116,11 +112,11 @@ TEST_F(AtomicFiles, KeepsPermissions) {
 
 TEST_F(AtomicFiles, FollowsLinksToFilesThatStandAndThatDoNot) {
   put(path("target"), "old");
-  ASSERT_TRUE(QDir(m_folder.path()).mkdir(text("sub")));
-  ASSERT_TRUE(QFile::link(text("target"), path("link")));
-  ASSERT_TRUE(QFile::link(text("../link"), path("sub/chain")));
-  ASSERT_TRUE(QFile::link(text("missing"), path("dangling")));
-  ASSERT_TRUE(QFile::link(text("loop"), path("loop")));
+  ASSERT_TRUE(QDir(m_folder.path()).mkdir("sub"));
+  ASSERT_TRUE(QFile::link("target", path("link")));
+  ASSERT_TRUE(QFile::link("../link", path("sub/chain")));
+  ASSERT_TRUE(QFile::link("missing", path("dangling")));
+  ASSERT_TRUE(QFile::link("loop", path("loop")));
   const std::tuple<const char*, const char*> cases[] = {
       {"link", "target"}, {"sub/chain", "target"}, {"dangling", "missing"}};
   for (const auto& [name, target] : cases) {
@@ -151,13 +147,13 @@ TEST_F(AtomicFiles, NamesFileAndReasonWhenThePlaceIsNoGood) {
     EXPECT_FALSE(file.commit());
     EXPECT_EQ(file.device().write("x"), -1);
   }
-  EXPECT_EQ(entries(), QStringList{text("file")});
+  EXPECT_EQ(entries(), QStringList{"file"});
 }
 
 TEST_F(AtomicFiles, RefusesWhatMayNotBeWritten) {
   put(path("readonly"), "old");
   ASSERT_EQ(::chmod(path("readonly").toUtf8().constData(), 0444), 0);
-  ASSERT_TRUE(QDir(m_folder.path()).mkdir(text("closed")));
+  ASSERT_TRUE(QDir(m_folder.path()).mkdir("closed"));
   ASSERT_EQ(::chmod(path("closed").toUtf8().constData(), 0555), 0);
   ASSERT_EQ(::chmod(m_folder.path().toUtf8().constData(), 0777), 0);
   {
@@ -174,16 +170,16 @@ TEST_F(AtomicFiles, RefusesWhatMayNotBeWritten) {
 
 TEST_F(AtomicFiles, ReportsAFullDeviceHoweverLittleWasWritten) {
   for (const int size : {1, 70 * 1000, 300 * 1000}) {
-    AtomicFile file(text("/dev/full"));
+    AtomicFile file("/dev/full");
     ASSERT_TRUE(file.open()) << qPrintable(file.errorString());
     file.device().write(QByteArray(size, 'x'));
     file.device().write("more");  // a writer that does not look at results
     EXPECT_FALSE(file.commit()) << size;
-    EXPECT_EQ(file.errorString(), text("/dev/full: ") + qt_error_string(ENOSPC));
+    EXPECT_EQ(file.errorString(), QString("/dev/full: ") + qt_error_string(ENOSPC));
   }
-  AtomicFile sink(text("/dev/null"));
+  AtomicFile sink("/dev/null");
   EXPECT_TRUE(sink.open() && sink.device().write("x") == 1 && sink.commit());
-  EXPECT_TRUE(QFileInfo(text("/dev/null")).exists());
+  EXPECT_TRUE(QFileInfo("/dev/null").exists());
 }
 
 TEST_F(AtomicFiles, WritesToStandardOutputByEitherName) {
@@ -207,7 +203,7 @@ TEST_F(AtomicFiles, SeesAClosedPipeAndLivesOn) {
   int ends[2];
   ASSERT_EQ(::pipe(ends), 0);
   ::close(ends[0]);
-  AtomicFile file(text("-"));
+  AtomicFile file("-");
   {
     const StandardOutputAs broken(ends[1]);
     EXPECT_TRUE(file.open());
@@ -215,7 +211,7 @@ TEST_F(AtomicFiles, SeesAClosedPipeAndLivesOn) {
   }
   ::close(ends[1]);
   EXPECT_FALSE(file.commit());
-  EXPECT_EQ(file.errorString(), text("standard output: ") + qt_error_string(EPIPE));
+  EXPECT_EQ(file.errorString(), QString("standard output: ") + qt_error_string(EPIPE));
   sigset_t pending;
   ASSERT_EQ(::sigpending(&pending), 0);
   EXPECT_EQ(::sigismember(&pending, SIGPIPE), 0);
@@ -224,7 +220,7 @@ TEST_F(AtomicFiles, SeesAClosedPipeAndLivesOn) {
 TEST_F(AtomicFiles, FindsItsPlaceAfterAChangeOfFolder) {
   const QString before = QDir::currentPath();
   ASSERT_TRUE(QDir::setCurrent(m_folder.path()));
-  AtomicFile file(text("relative.txt"));
+  AtomicFile file("relative.txt");
   EXPECT_TRUE(file.open());
   file.device().write("here");
   ASSERT_TRUE(QDir::setCurrent(before));
@@ -235,10 +231,10 @@ TEST_F(AtomicFiles, FindsItsPlaceAfterAChangeOfFolder) {
 TEST_F(AtomicFiles, ReportsAPlaceThatWasTakenMeanwhile) {
   AtomicFile file(path("taken"));
   ASSERT_TRUE(file.open());
-  ASSERT_TRUE(QDir(m_folder.path()).mkdir(text("taken")));
+  ASSERT_TRUE(QDir(m_folder.path()).mkdir("taken"));
   EXPECT_FALSE(file.commit());
   EXPECT_FALSE(file.errorString().isEmpty());
-  EXPECT_EQ(entries(), QStringList{text("taken")});
+  EXPECT_EQ(entries(), QStringList{"taken"});
 }
 
 using FolderListings = AtomicFiles;
@@ -247,15 +243,13 @@ TEST_F(FolderListings, SortsByCodeAndTellsFailureFromEmpty) {
   for (const char* name : {"b.ort", "B.ort", "a.ort", "\xc3\xa4.ort", "a.txt", ".hidden.ort"}) {
     put(m_folder.filePath(QString::fromUtf8(name)), "x");
   }
-  ASSERT_TRUE(QDir(m_folder.path()).mkdir(text("sub.ort")));
-  ASSERT_TRUE(QFile::link(text("a.txt"), path("link.ort")));
-  ASSERT_TRUE(QFile::link(text("nowhere"), path("dangling.ort")));
-  EXPECT_EQ(
-      FolderListing::files(m_folder.path(), text(".ort")).names(),
-      (QStringList{text("B.ort"), text("a.ort"), text("b.ort"), text("link.ort"), text("\xc3\xa4.ort")}));
-  EXPECT_EQ(FolderListing::files(m_folder.path(), text(".ort")).unusableNames(),
-            QStringList{text("dangling.ort")});
-  EXPECT_EQ(FolderListing::folders(m_folder.path()).names(), QStringList{text("sub.ort")});
+  ASSERT_TRUE(QDir(m_folder.path()).mkdir("sub.ort"));
+  ASSERT_TRUE(QFile::link("a.txt", path("link.ort")));
+  ASSERT_TRUE(QFile::link("nowhere", path("dangling.ort")));
+  EXPECT_EQ(FolderListing::files(m_folder.path(), ".ort").names(),
+            (QStringList{"B.ort", "a.ort", "b.ort", "link.ort", "\xc3\xa4.ort"}));
+  EXPECT_EQ(FolderListing::files(m_folder.path(), ".ort").unusableNames(), QStringList{"dangling.ort"});
+  EXPECT_EQ(FolderListing::folders(m_folder.path()).names(), QStringList{"sub.ort"});
   const FolderListing empty = FolderListing::files(path("sub.ort"));
   EXPECT_TRUE(empty.names().isEmpty());
   EXPECT_FALSE(empty.failed());
@@ -311,7 +305,7 @@ TEST_F(LineReaders, NamesAFileThatCannotBeRead) {
 TEST(TemporaryFiles, ArePrivateAndGoAway) {
   QString name;
   {
-    TemporaryFile file(text("orx-test-XXXXXX"));
+    TemporaryFile file("orx-test-XXXXXX");
     ASSERT_TRUE(file.open());
     name = file.fileName();
     EXPECT_EQ(modeOf(name), 0600u);

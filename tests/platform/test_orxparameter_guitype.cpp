@@ -9,10 +9,6 @@
 
 namespace {
 
-QString u8(const char* text) {
-  return QString::fromUtf8(text);
-}
-
 // Taken while this file's own objects are made, which may be before the library's other objects are.
 const GUIType copiedEarly = GUIType::kNullGuiType;
 const QString typeReadEarly = GUIType::kNullGuiType.getType();
@@ -100,17 +96,17 @@ TEST(GUIType, ReadsPromptLines) {
       };
   for (const auto& [line, wantedType, name, config, prompt, flags, written] : cases) {
     SCOPED_TRACE(line);
-    const GUIType type = GUIType::fromGuiLine(u8(line));
-    EXPECT_EQ(type.getType(), u8(wantedType));
-    EXPECT_EQ(type.getName(), u8(name));
-    EXPECT_EQ(type.getConfigToken(), u8(config));
-    EXPECT_EQ(type.getDescription(), u8(prompt));
+    const GUIType type = GUIType::fromGuiLine(line);
+    EXPECT_EQ(type.getType(), wantedType);
+    EXPECT_EQ(type.getName(), name);
+    EXPECT_EQ(type.getConfigToken(), config);
+    EXPECT_EQ(type.getDescription(), prompt);
     EXPECT_EQ(type.getFlags(), flags);
-    EXPECT_EQ(type.getAsString(), u8(written ? written : line));
+    EXPECT_EQ(type.getAsString(), written ? written : line);
   }
   for (const char* line : {"", "GUI", "GUI ", "GUI TEXT", "GUI TEXT  ", "GUI OPTIONAL TEXT", " GUI TEXT A p",
                            "gui TEXT A p", "GUITEXT A p", "GUI\tTEXT A p", "GUI OPTIONAL OMITTABLE"}) {
-    EXPECT_EQ(GUIType::fromGuiLine(u8(line)), GUIType::kNullGuiType) << line;
+    EXPECT_EQ(GUIType::fromGuiLine(line), GUIType::kNullGuiType) << line;
   }
 }
 
@@ -130,16 +126,16 @@ TEST(GUIType, ReadsTypeTexts) {
   };
   for (const auto& [text, wantedType, config, written] : cases) {
     SCOPED_TRACE(text);
-    const GUIType type = GUIType::fromTransformerTypeString(u8(text), u8("N"), u8("P"));
-    EXPECT_EQ(type.getType(), u8(wantedType));
-    EXPECT_EQ(type.getConfigToken(), u8(config));
-    EXPECT_EQ(type.getTypeText(), u8(written));
-    EXPECT_EQ(type.getName(), u8("N"));
-    EXPECT_EQ(type.getDescription(), u8("P"));
+    const GUIType type = GUIType::fromTransformerTypeString(text, "N", "P");
+    EXPECT_EQ(type.getType(), wantedType);
+    EXPECT_EQ(type.getConfigToken(), config);
+    EXPECT_EQ(type.getTypeText(), written);
+    EXPECT_EQ(type.getName(), "N");
+    EXPECT_EQ(type.getDescription(), "P");
   }
-  EXPECT_FALSE(GUIType::fromTransformerTypeString(u8("WIBBLE")).isKnown());
+  EXPECT_FALSE(GUIType::fromTransformerTypeString("WIBBLE").isKnown());
   for (const char* text : {"", "  ", "OPTIONAL", "OPTIONAL OMITTABLE "}) {
-    EXPECT_TRUE(GUIType::fromTransformerTypeString(u8(text), u8("N")).isNull()) << text;
+    EXPECT_TRUE(GUIType::fromTransformerTypeString(text, "N").isNull()) << text;
   }
 }
 
@@ -148,7 +144,7 @@ TEST(GUIType, NullTypeServesDuringStaticInitialisation) {
   EXPECT_TRUE(typeReadEarly.isEmpty());
   EXPECT_EQ(GUIType::kNullGuiType.getAsString(), QString());
   GUIType changed = copiedEarly;
-  changed.setDescription(u8("P"));
+  changed.setDescription("P");
   EXPECT_TRUE(GUIType::kNullGuiType.getDescription().isEmpty());
 }
 
@@ -166,8 +162,8 @@ TEST(GUITypeTable, IsSortedDocumentedAndTellsEncodedTypes) {
 }
 
 TEST(ConfigToken, PiecesComeBackUnquoted) {
-  EXPECT_EQ(ORX_splitConfig(u8("a,b%\"c%d\"e%%\"\"%5\"%"), QLatin1Char('%')),
-            (QStringList{u8("a,b"), u8("c%de"), u8(""), u8("5\"")}));
+  EXPECT_EQ(ORX_splitConfig("a,b%\"c%d\"e%%\"\"%5\"%", QLatin1Char('%')),
+            (QStringList{"a,b", "c%de", "", "5\""}));
 }
 
 // Content made to hurt: must end soon, with a result that survives being written and read.

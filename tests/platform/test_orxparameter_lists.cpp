@@ -7,10 +7,6 @@
 
 namespace {
 
-QString u8(const char* text) {
-  return QString::fromUtf8(text);
-}
-
 // `shown=stored` of every entry, separated by "|".
 QString entriesOf(const ChoiceList& choices) {
   QStringList texts;
@@ -25,11 +21,10 @@ GUIType typeOf(const QString& text) {
 }
 
 GUIType multiParameter(QChar separator, const char* line1, const char* line2) {
-  const std::vector<GUIType> members = {GUIType::fromGuiLine(u8(line1)), GUIType::kNullGuiType,
-                                        GUIType::fromGuiLine(u8(line2))};
+  const std::vector<GUIType> members = {GUIType::fromGuiLine(line1), GUIType::kNullGuiType,
+                                        GUIType::fromGuiLine(line2)};
   return GUIType::fromTransformerTypeString(
-      QLatin1String("MULTIPARAMETER ") + MemberList::configToken(separator, members), u8("MULTI"),
-      u8("Both"));
+      QLatin1String("MULTIPARAMETER ") + MemberList::configToken(separator, members), "MULTI", "Both");
 }
 
 }  // namespace
@@ -51,19 +46,19 @@ TEST(ChoiceList, ReadsConfigurations) {
   };
   for (const auto& [type, entries, lookup] : cases) {
     SCOPED_TRACE(type);
-    const ChoiceList choices(typeOf(u8(type)));
-    EXPECT_EQ(entriesOf(choices), u8(entries));
+    const ChoiceList choices(typeOf(type));
+    EXPECT_EQ(entriesOf(choices), entries);
     EXPECT_EQ(choices.hasLookup(), lookup);
     EXPECT_EQ(choices.isEmpty(), choices.entries().empty());
   }
 }
 
 TEST(ChoiceList, LookupLinesMapAPlainChoice) {
-  ChoiceList choices(typeOf(u8("CHOICE \"No Parallelism\"%A%B")));
+  ChoiceList choices(typeOf("CHOICE \"No Parallelism\"%A%B"));
   const ChoiceList before = choices;
-  choices.addLookup(u8("\"No Parallelism\",NO_PARALLELISM%B,A"));
-  choices.addLookup(u8("A,1%Extra one,two<space>words"));
-  EXPECT_EQ(entriesOf(choices), u8("No Parallelism=NO_PARALLELISM|A=1|B=A|Extra one=two words"));
+  choices.addLookup("\"No Parallelism\",NO_PARALLELISM%B,A");
+  choices.addLookup("A,1%Extra one,two<space>words");
+  EXPECT_EQ(entriesOf(choices), "No Parallelism=NO_PARALLELISM|A=1|B=A|Extra one=two words");
   EXPECT_TRUE(choices.hasLookup());
   EXPECT_FALSE(before.hasLookup());
   EXPECT_EQ(before.entries().size(), 3u);
@@ -78,16 +73,16 @@ TEST(ChoiceList, LookupLinesMapAPlainChoice) {
   };
   for (const auto& [value, contained, stored, shown] : cases) {
     SCOPED_TRACE(value);
-    EXPECT_EQ(choices.contains(u8(value)), contained);
-    EXPECT_EQ(choices.toStored(u8(value)), u8(stored));
-    EXPECT_EQ(choices.toShown(u8(value)), u8(shown));
+    EXPECT_EQ(choices.contains(value), contained);
+    EXPECT_EQ(choices.toStored(value), stored);
+    EXPECT_EQ(choices.toShown(value), shown);
   }
 
   // A new stored side takes the old one out of use; the next entry that stores the same steps in.
-  ChoiceList same(typeOf(u8("LOOKUP_CHOICE A,1%B,1")));
-  EXPECT_EQ(same.toShown(u8("1")), u8("A"));
-  same.addLookup(u8("A,2"));
-  EXPECT_EQ(same.toShown(u8("1")), u8("B"));
+  ChoiceList same(typeOf("LOOKUP_CHOICE A,1%B,1"));
+  EXPECT_EQ(same.toShown("1"), "A");
+  same.addLookup("A,2");
+  EXPECT_EQ(same.toShown("1"), "B");
 }
 
 TEST(ChoiceList, TellsChoiceTypes) {
@@ -110,20 +105,20 @@ TEST(MemberList, ConfigurationIsOneTokenAndComesBack) {
   for (const char* separator : {",", " ", ";", "\"", "%", "<", "\n"}) {
     SCOPED_TRACE(separator);
     const GUIType type =
-        multiParameter(u8(separator).front(), "GUI OPTIONAL CHOICE A \"x y\"%z First, \"100%\"",
+        multiParameter(QString(separator).front(), "GUI OPTIONAL CHOICE A \"x y\"%z First, \"100%\"",
                        "GUI TEXT_ENCODED B Second\nline");
     EXPECT_FALSE(type.getConfigToken().contains(QLatin1Char(' ')));
     const GUIType read = GUIType::fromGuiLine(type.getAsString());
     EXPECT_EQ(read, type);
-    EXPECT_EQ(read.getMacroNames(), (QStringList{u8("MULTI"), u8("A"), u8("B")}));
+    EXPECT_EQ(read.getMacroNames(), (QStringList{"MULTI", "A", "B"}));
 
     const MemberList list(read);
-    EXPECT_EQ(list.separator(), u8(separator).front());
+    EXPECT_EQ(list.separator(), QString(separator).front());
     ASSERT_EQ(list.members().size(), 2u);
-    EXPECT_EQ(list.members()[0].getConfigToken(), u8("\"x y\"%z"));
-    ASSERT_NE(list.find(u8("B")), nullptr);
-    EXPECT_EQ(list.find(u8("B"))->getDescription(), u8("Second\nline"));
-    EXPECT_EQ(list.find(u8("C")), nullptr);
+    EXPECT_EQ(list.members()[0].getConfigToken(), "\"x y\"%z");
+    ASSERT_NE(list.find("B"), nullptr);
+    EXPECT_EQ(list.find("B")->getDescription(), "Second\nline");
+    EXPECT_EQ(list.find("C"), nullptr);
     EXPECT_EQ(MemberList::configToken(list.separator(), list.members()), type.getConfigToken());
   }
 }
@@ -140,7 +135,7 @@ TEST(MemberList, FaultyConfigurations) {
   };
   for (const auto& [type, separator, members] : cases) {
     SCOPED_TRACE(type);
-    const MemberList list(typeOf(u8(type)));
+    const MemberList list(typeOf(type));
     EXPECT_EQ(list.separator(), separator);
     EXPECT_EQ(int(list.members().size()), members);
   }
@@ -166,10 +161,10 @@ TEST(MemberList, SettingOnePartLeavesTheOthersAlone) {
   const MemberList list(multiParameter(QLatin1Char(';'), "GUI TEXT A a", "GUI TEXT B b"));
   for (const auto& [value, member, part, wantedResult] : cases) {
     SCOPED_TRACE(value);
-    const QString result = list.withMemberValue(u8(value), u8(member), u8(part));
-    EXPECT_EQ(result, u8(wantedResult));
-    EXPECT_EQ(list.memberValue(result, u8(member)), u8(part));
+    const QString result = list.withMemberValue(value, member, part);
+    EXPECT_EQ(result, wantedResult);
+    EXPECT_EQ(list.memberValue(result, member), part);
   }
-  EXPECT_EQ(list.memberValue(u8("A;1;B;2"), u8("1")), QString());
-  EXPECT_EQ(list.memberValue(u8("A;1;B"), u8("B")), QString());
+  EXPECT_EQ(list.memberValue("A;1;B;2", "1"), QString());
+  EXPECT_EQ(list.memberValue("A;1;B", "B"), QString());
 }

@@ -8,10 +8,6 @@
 
 namespace {
 
-QString text(const char* utf8) {
-  return QString::fromUtf8(utf8);
-}
-
 class Utilities : public testing::Test {
  protected:
   void SetUp() override {
@@ -30,10 +26,10 @@ class Utilities : public testing::Test {
     for (int at = 0; at < m_before.size(); ++at) {
       m_wasSet.at(at) ? qputenv(kVariables[at], m_before.at(at)) : qunsetenv(kVariables[at]);
     }
-    QORXSetLanguage(text("en"));
+    QORXSetLanguage("en");
   }
 
-  QString path(const char* name) const { return m_root + QLatin1Char('/') + text(name); }
+  QString path(const char* name) const { return m_root + QLatin1Char('/') + QString(name); }
   // Makes the folders on the way, too.
   QString put(const char* name, const QByteArray& content = "x") const {
     const QFileInfo info(path(name));
@@ -62,20 +58,20 @@ TEST_F(Utilities, FoldersComeInLoadingOrder) {
   const QString formats = put("extra formats/a.fmt");
   ASSERT_TRUE(QDir().mkpath(path("home/transformers/empty")));
   qputenv("ORX_TRANSFORMER_PATH",
-          (text(":/nowhere:") + custom + text("/:") + zebra + QLatin1Char(':')).toUtf8());
+          (QString(":/nowhere:") + custom + "/:" + zebra + QLatin1Char(':')).toUtf8());
   qputenv("ORX_FORMAT_PATH", formats.toUtf8());
 
-  EXPECT_EQ(ORX_resourceDirectories(text("transformer")), (QStringList{zebra, apple, data, custom}));
+  EXPECT_EQ(ORX_resourceDirectories("transformer"), (QStringList{zebra, apple, data, custom}));
   const QString home = put("home/transformers/a.ort");
-  EXPECT_EQ(ORX_resourceDirectories(text("transformer")), (QStringList{home, zebra, apple, data, custom}));
-  EXPECT_EQ(ORX_resourceDirectories(text("format")), (QStringList{path("home/formats"), formats}));
+  EXPECT_EQ(ORX_resourceDirectories("transformer"), (QStringList{home, zebra, apple, data, custom}));
+  EXPECT_EQ(ORX_resourceDirectories("format"), (QStringList{path("home/formats"), formats}));
 }
 
 TEST_F(Utilities, FoldersAreGivenOnceWhateverTheirName) {
   const QString home = put("home/transformers/a.ort");
   ASSERT_TRUE(QFile::link(home, path("alias")));
   qputenv("ORX_TRANSFORMER_PATH", path("alias").toUtf8());
-  EXPECT_EQ(ORX_resourceDirectories(text("transformer")), QStringList{home});
+  EXPECT_EQ(ORX_resourceDirectories("transformer"), QStringList{home});
 }
 
 TEST_F(Utilities, UserFolderHasADefault) {
@@ -83,14 +79,14 @@ TEST_F(Utilities, UserFolderHasADefault) {
   qputenv("HOME", path("user").toUtf8());
   for (const char* unusable : {"", "relative/path"}) {
     qputenv("XDG_DATA_HOME", unusable);
-    EXPECT_EQ(ORX_resourceDirectories(text("transformer")), QStringList{user}) << unusable;
+    EXPECT_EQ(ORX_resourceDirectories("transformer"), QStringList{user}) << unusable;
   }
 }
 
 TEST_F(Utilities, OddKindsHaveNoFolders) {
   put("home/secrets/a");
   for (const char* kind : {"", "../secret", "a/b", ".", "\xc3\xa4"}) {
-    EXPECT_TRUE(ORX_resourceDirectories(text(kind)).isEmpty()) << kind;
+    EXPECT_TRUE(ORX_resourceDirectories(kind).isEmpty()) << kind;
   }
 }
 
@@ -99,9 +95,9 @@ TEST_F(Utilities, AddedFoldersStandBehindAllOthers) {
   const QString listed = put("listed/a.ort");
   const QString added = put("added/a.ort");
   qputenv("ORX_TRANSFORMER_PATH", listed.toUtf8());
-  ORX_addResourceDirectory(added + text("/."));
+  ORX_addResourceDirectory(added + "/.");
   ORX_addResourceDirectory(added);
-  EXPECT_EQ(ORX_resourceDirectories(text("transformer")), (QStringList{home, listed, added}));
+  EXPECT_EQ(ORX_resourceDirectories("transformer"), (QStringList{home, listed, added}));
 }
 
 TEST_F(Utilities, MessagesComeInTheCurrentLanguageElseInEnglish) {
@@ -118,11 +114,11 @@ TEST_F(Utilities, MessagesComeInTheCurrentLanguageElseInEnglish) {
       {"en", -7, true, "seven"}};
   const ORXLocalizedMessageDatabase database;
   for (const auto& [language, number, known, wantedMessage] : cases) {
-    QORXSetLanguage(text(language));
+    QORXSetLanguage(language);
     QORXString message;
-    message.assign(text("left over"));
+    message.assign("left over");
     EXPECT_EQ(database.getMessage(number, message), known) << number;
-    EXPECT_EQ(message.toQString(), text(wantedMessage)) << number;
+    EXPECT_EQ(message.toQString(), wantedMessage) << number;
   }
 }
 
@@ -130,7 +126,7 @@ TEST_F(Utilities, MessagesMayStandElsewhereOrNowhere) {
   const QString folder = put("elsewhere/en.msg", "1\telsewhere\n");
   QORXString message;
   EXPECT_TRUE(ORXLocalizedMessageDatabase(folder).getMessage(1, message));
-  EXPECT_EQ(message.toQString(), text("elsewhere"));
+  EXPECT_EQ(message.toQString(), "elsewhere");
   EXPECT_FALSE(ORXLocalizedMessageDatabase(path("missing")).getMessage(1, message));
   EXPECT_TRUE(message.toQString().isEmpty());
 }

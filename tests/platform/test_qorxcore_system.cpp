@@ -9,21 +9,17 @@
 
 namespace {
 
-QString text(const char* utf8) {
-  return QString::fromUtf8(utf8);
-}
-
 TEST(Language, ReadsLocaleNames) {
   const std::tuple<const char*, const char*> cases[] = {
       {"de", "de"},    {"DE", "de"},   {"de_AT.UTF-8", "de"}, {"fr.UTF-8", "fr"}, {"fr@euro", "fr"},
       {"pt-BR", "pt"}, {"C", "en"},    {"C.UTF-8", "en"},     {"POSIX", "en"},    {"gsw_CH", "en"},
       {"", "en"},      {"../x", "en"}, {"d1", "en"},          {"d", "en"},        {"\xc3\xa4\xc3\xa4", "en"}};
   for (const auto& [locale, language] : cases) {
-    QORXSetLanguage(text("xx"));
-    QORXSetLanguage(text(locale));
-    EXPECT_EQ(QORXLanguage(), text(language)) << locale;
+    QORXSetLanguage("xx");
+    QORXSetLanguage(locale);
+    EXPECT_EQ(QORXLanguage(), language) << locale;
   }
-  QORXSetLanguage(text("en"));
+  QORXSetLanguage("en");
 }
 
 TEST(Language, FirstUseReadsTheEnvironment) {
@@ -50,27 +46,27 @@ TEST(Language, FirstUseReadsTheEnvironment) {
 TEST(Local8Bit, IsUtf8WithNullsKept) {
   const QByteArray bytes("\xc3\xa4\0b", 4);
   EXPECT_EQ(QORXToLocal8Bit(QORXFromLocal8Bit(bytes)), bytes);
-  EXPECT_EQ(QORXFromLocal8Bit(bytes), text("\xc3\xa4") + QChar(0) + text("b"));
+  EXPECT_EQ(QORXFromLocal8Bit(bytes), QString("\xc3\xa4") + QChar(0) + QString("b"));
 }
 
 TEST(FileNames, BecomePretty) {
   const QString here = QDir::currentPath();
   const std::tuple<const char*, QString> cases[] = {{"", QString()},
-                                                    {"/a//b/./c/../d/", text("/a/b/d")},
-                                                    {"/", text("/")},
-                                                    {"/..", text("/")},
-                                                    {"/../../a", text("/a")},
-                                                    {"a/b", here + text("/a/b")},
+                                                    {"/a//b/./c/../d/", "/a/b/d"},
+                                                    {"/", "/"},
+                                                    {"/..", "/"},
+                                                    {"/../../a", "/a"},
+                                                    {"a/b", here + "/a/b"},
                                                     {".", here},
-                                                    {"a\\b\\..\\c", here + text("/a/c")},
-                                                    {"/a\\b", text("/a\\b")},
-                                                    {"C:\\data\\x.orw", text("C:/data/x.orw")},
-                                                    {"c:/data/../x.orw", text("c:/x.orw")},
-                                                    {"a:b", here + text("/a:b")},
-                                                    {"\xc3\xa4:/x", here + text("/\xc3\xa4:/x")},
-                                                    {"\\\\server\\share", text("/server/share")}};
+                                                    {"a\\b\\..\\c", here + "/a/c"},
+                                                    {"/a\\b", "/a\\b"},
+                                                    {"C:\\data\\x.orw", "C:/data/x.orw"},
+                                                    {"c:/data/../x.orw", "c:/x.orw"},
+                                                    {"a:b", here + "/a:b"},
+                                                    {"\xc3\xa4:/x", here + "/\xc3\xa4:/x"},
+                                                    {"\\\\server\\share", "/server/share"}};
   for (const auto& [name, pretty] : cases) {
-    EXPECT_EQ(QORXPrettyUpFileName(text(name)), pretty) << name;
+    EXPECT_EQ(QORXPrettyUpFileName(name), pretty) << name;
   }
 }
 
@@ -78,20 +74,20 @@ TEST(FileNames, KeepABackslashThatIsPartOfAName) {
   QTemporaryDir folder;
   const QString before = QDir::currentPath();
   ASSERT_TRUE(QDir::setCurrent(folder.path()));
-  const QString pretty = QDir::currentPath() + text("/odd\\name");
-  ASSERT_TRUE(QFile(text("odd\\name")).open(QIODevice::WriteOnly));
-  EXPECT_EQ(QORXPrettyUpFileName(text("odd\\name")), pretty);
+  const QString pretty = QDir::currentPath() + QString("/odd\\name");
+  ASSERT_TRUE(QFile("odd\\name").open(QIODevice::WriteOnly));
+  EXPECT_EQ(QORXPrettyUpFileName("odd\\name"), pretty);
   ASSERT_TRUE(QDir::setCurrent(before));
 }
 
 TEST(Home, FollowsTheEnvironmentAndFallsBackToTheSourceTree) {
   const QByteArray before = qgetenv("ORX_HOME");
   qputenv("ORX_HOME", "/some//home/");
-  EXPECT_EQ(QORXOrxHome(), text("/some/home"));
+  EXPECT_EQ(QORXOrxHome(), "/some/home");
   qputenv("ORX_HOME", "relative");
-  EXPECT_EQ(QORXOrxHome(), QDir::currentPath() + text("/relative"));
+  EXPECT_EQ(QORXOrxHome(), QDir::currentPath() + QString("/relative"));
   qunsetenv("ORX_HOME");
-  EXPECT_EQ(QORXOrxHome(), text(ORX_SOURCE_DIR "/resources"));
+  EXPECT_EQ(QORXOrxHome(), ORX_SOURCE_DIR "/resources");
   qputenv("ORX_HOME", before);
 }
 

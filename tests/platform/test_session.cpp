@@ -4,10 +4,6 @@
 
 namespace {
 
-QString text(const char* utf8) {
-  return QString::fromUtf8(utf8);
-}
-
 TEST(ClosedString, KeepsNullsAndOwnsItsBytes) {
   char bytes[] = {'a', '\0', 'b'};
   ORXString string;
@@ -24,36 +20,36 @@ TEST(ClosedString, KeepsNullsAndOwnsItsBytes) {
 
 TEST(ClosedString, ConvertsBothWays) {
   for (const QString& plain :
-       {QString(), text("plain"), text("\xc3\xa4\xf0\x9f\x97\xba"), "a" + QString(QChar(0))})
+       QStringList{QString(), "plain", "\xc3\xa4\xf0\x9f\x97\xba", "a" + QString(QChar(0))})
     EXPECT_EQ(ORXToQString(ORXString(plain)), plain);
 }
 
 TEST(ClosedStringArray, GrowsWithSteadyAddresses) {
-  ORXStringArray array(QStringList{text("\xc3\xa4"), QString()});
+  ORXStringArray array(QStringList{"\xc3\xa4", QString()});
   const IORXString& first = array.elementAt(0);
   for (int count = 0; count < 1000; ++count) {
     array.append("a\0b", 3);
   }
   EXPECT_EQ(array.entries(), 1002u);
-  EXPECT_EQ(ORXToQString(first), text("\xc3\xa4"));
+  EXPECT_EQ(ORXToQString(first), "\xc3\xa4");
   EXPECT_EQ(array.elementAt(1001).length(), 3u);
   EXPECT_EQ(array.elementAt(1002).length(), 0u);
-  ORXAssign(array, {text("x"), text("y")});
-  EXPECT_EQ(ORXToQStringList(array), (QStringList{text("x"), text("y")}));
+  ORXAssign(array, {"x", "y"});
+  EXPECT_EQ(ORXToQStringList(array), (QStringList{"x", "y"}));
   array.clear();
   EXPECT_TRUE(ORXToQStringList(array).isEmpty());
 }
 
 TEST(Session, KeepsSettingsByName) {
   ORXSession session;
-  QString value = text("untouched");
-  EXPECT_FALSE(session.getSetting(text("name"), value));
-  EXPECT_EQ(value, text("untouched"));
-  for (const QString& set : {QString(), text("later")}) {
-    session.setSetting(text("name"), set);
-    EXPECT_TRUE(session.getSetting(text("name"), value) && value == set);
+  QString value = "untouched";
+  EXPECT_FALSE(session.getSetting("name", value));
+  EXPECT_EQ(value, "untouched");
+  for (const QString& set : QStringList{QString(), "later"}) {
+    session.setSetting("name", set);
+    EXPECT_TRUE(session.getSetting("name", value) && value == set);
   }
-  EXPECT_FALSE(session.getSetting(text("NAME"), value));
+  EXPECT_FALSE(session.getSetting("NAME", value));
 }
 
 }  // namespace
