@@ -10,13 +10,9 @@
 
 #include <vector>
 
-inline QString qs(const char* text) {
-  return QString::fromUtf8(text);
-}
-
 // "a b c" as a list.
 inline QStringList words(const char* text) {
-  return qs(text).split(QLatin1Char(' '), Qt::SkipEmptyParts);
+  return QString(text).split(QLatin1Char(' '), Qt::SkipEmptyParts);
 }
 
 struct ConfigParameter {
@@ -28,15 +24,15 @@ struct ConfigParameter {
 
 inline TransformerDefinition makeDefinition(const std::vector<ConfigParameter>& parameters) {
   TransformerDefinition definition;
-  definition.name = qs("Sorter");
+  definition.name = "Sorter";
   definition.version = 3;
   definition.inputTags = words("IN:ENTRY OTHER");
   definition.outputTags = words("OUT REST");
   for (const ConfigParameter& parameter : parameters) {
-    definition.parameterNames << qs(parameter.name);
-    definition.parameterTypes << qs(parameter.type);
-    definition.parameterPrompts << qs(parameter.prompt);
-    definition.parameterDefaults << qs(parameter.defaultValue);
+    definition.parameterNames << parameter.name;
+    definition.parameterTypes << parameter.type;
+    definition.parameterPrompts << parameter.prompt;
+    definition.parameterDefaults << parameter.defaultValue;
   }
   return definition;
 }

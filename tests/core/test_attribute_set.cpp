@@ -18,7 +18,7 @@ QStringList united(QStringList left, const QStringList& right) {
 TEST(AttributeSet, IsAListInWhichEachNameStandsOnce) {
   std::mt19937 random(7);
   const auto below = [&random](std::size_t limit) { return random() % limit; };
-  const QString shapes[] = {qs("a%1"), qs("l%1{}"), qs("l{}.m%1"), qs("l%1{}.m{}.n")};
+  const QString shapes[] = {"a%1", "l%1{}", "l{}.m%1", "l%1{}.m{}.n"};
   const auto name = [&] { return shapes[below(4)].arg(below(300)); };
   for (int round = 0; round < 200; ++round) {
     std::vector<std::pair<AttributeSet, QStringList>> made(4);
@@ -52,7 +52,7 @@ TEST(AttributeSet, IsAListInWhichEachNameStandsOnce) {
         default:
           if (below(8) == 0) {
             set = set.withoutLists();
-            list = list.filter(QRegularExpression(qs("^[^{]*$")));
+            list = list.filter(QRegularExpression("^[^{]*$"));
           }
       }
       ASSERT_EQ(set.names(), list);
@@ -61,7 +61,7 @@ TEST(AttributeSet, IsAListInWhichEachNameStandsOnce) {
     for (const auto& [set, list] : made) {
       for (const QString& each : list)
         ASSERT_TRUE(set.contains(each));
-      ASSERT_FALSE(set.contains(qs("b")));
+      ASSERT_FALSE(set.contains("b"));
     }
   }
 }
@@ -69,10 +69,10 @@ TEST(AttributeSet, IsAListInWhichEachNameStandsOnce) {
 TEST(AttributeSet, ListsAreThereWithTheirMembers) {
   AttributeSet set(words("a l{} l{}.m m{}.n{}.o"));
   for (const char* held : {"a", "l{}", "l{0}", "l{}.m", "l{12}.m", "m{}", "m{3}", "m{}.n{}", "m{1}.n{2}.o"})
-    EXPECT_TRUE(set.holds(qs(held))) << held;
+    EXPECT_TRUE(set.holds(held)) << held;
   for (const char* absent : {"", "l", "l{x}.m", "l{}.n", "n{}", "m{", "m{}.n"})
-    EXPECT_FALSE(set.holds(qs(absent))) << absent;
-  EXPECT_FALSE(set.withoutLists().holds(qs("l{}")));
+    EXPECT_FALSE(set.holds(absent)) << absent;
+  EXPECT_FALSE(set.withoutLists().holds("l{}"));
 }
 
 }  // namespace

@@ -25,12 +25,12 @@ std::unique_ptr<TransformerCfg> makePropagating(const PropagationCase& c) {
   definition.preservesAttributes = words(c.preserves);
   definition.attributesAdded = words(c.added);
   for (const char* action : c.listActions) {
-    definition.listActions << qs(action);
+    definition.listActions << action;
   }
   auto cfg = std::make_unique<TransformerCfg>();
   cfg->configure(definition);
-  cfg->setInputAttributes(qs("OTHER"), words("b a l{}.y"));
-  cfg->setInputAttributes(qs("IN"), words("a l{} l{}.x a"));
+  cfg->setInputAttributes("OTHER", words("b a l{}.y"));
+  cfg->setInputAttributes("IN", words("a l{} l{}.x a"));
   return cfg;
 }
 
@@ -56,33 +56,33 @@ TEST(ConfigAttributes, Propagation) {
   };
   for (const PropagationCase& c : cases) {
     const auto cfg = makePropagating(c);
-    EXPECT_EQ(cfg->getOutputAttributes(qs("OUT")).join(QLatin1Char('|')), qs(c.out)) << c.what;
-    EXPECT_EQ(cfg->getOutputAttributes(qs("REST")).join(QLatin1Char('|')), qs(c.rest)) << c.what;
+    EXPECT_EQ(cfg->getOutputAttributes("OUT").join(QLatin1Char('|')), c.out) << c.what;
+    EXPECT_EQ(cfg->getOutputAttributes("REST").join(QLatin1Char('|')), c.rest) << c.what;
   }
 }
 
 TEST(ConfigAttributes, ParametersOfTheRulesAffectTheOutput) {
   const auto cfg = makePropagating({"", "", "$(NEW)", {"OUT EXPLODE $(LIST)"}, "", ""});
-  EXPECT_TRUE(cfg->parmValueAffectsOutputAttrs(qs("NEW")));
-  EXPECT_TRUE(cfg->parmValueAffectsOutputAttrs(qs("LIST")));
-  EXPECT_FALSE(cfg->parmValueAffectsOutputAttrs(qs("MANY")));
+  EXPECT_TRUE(cfg->parmValueAffectsOutputAttrs("NEW"));
+  EXPECT_TRUE(cfg->parmValueAffectsOutputAttrs("LIST"));
+  EXPECT_FALSE(cfg->parmValueAffectsOutputAttrs("MANY"));
   cfg->updatePreservesAttributes(words("=a"));
-  EXPECT_EQ(cfg->getOutputAttributes(qs("REST")), QStringList({qs("a"), qs("n 1")}));
+  EXPECT_EQ(cfg->getOutputAttributes("REST"), QStringList({"a", "n 1"}));
 }
 
 TEST(ConfigAttributes, ManyAttributesTakeTimeInProportion) {
   const auto cfg = makePropagating({"", "<ALL>", "$(MANY)", {}, "", ""});
   QStringList names;
   for (int i = 0; i < 200000; ++i) {
-    names << qs("a") + QString::number(i);
+    names << QString("a") + QString::number(i);
   }
-  cfg->setInputAttributes(qs("IN"), names);
-  cfg->setInputAttributes(qs("OTHER"), names);
-  cfg->setParameterValue(qs("MANY"), names.join(QLatin1Char(',')), true);
-  EXPECT_EQ(cfg->getOutputAttributes(qs("OUT")), names);
+  cfg->setInputAttributes("IN", names);
+  cfg->setInputAttributes("OTHER", names);
+  cfg->setParameterValue("MANY", names.join(QLatin1Char(',')), true);
+  EXPECT_EQ(cfg->getOutputAttributes("OUT"), names);
   QStringList missing;
   bool hasReferences = false;
-  cfg->getMissingAttributeReferences(qs("MANY"), missing, hasReferences);
+  cfg->getMissingAttributeReferences("MANY", missing, hasReferences);
   EXPECT_TRUE(missing.isEmpty());
 }
 
@@ -123,8 +123,7 @@ TEST(ConfigAttributes, References) {
   for (const auto& c : cases) {
     TransformerCfg cfg;
     cfg.configure(makeDefinition({{"P", c.type, "P", c.value}}));
-    EXPECT_EQ(cfg.getAttributeNamesInValue(qs("P")).join(QLatin1Char('|')), qs(c.names))
-        << c.type << " " << c.value;
+    EXPECT_EQ(cfg.getAttributeNamesInValue("P").join(QLatin1Char('|')), c.names) << c.type << " " << c.value;
   }
 }
 
@@ -147,11 +146,11 @@ TEST(ConfigAttributes, MissingReferences) {
   for (const auto& c : cases) {
     TransformerCfg cfg;
     cfg.configure(makeDefinition({{"P", c.type, "P", c.value}}));
-    cfg.setInputAttributes(qs("IN"), words("a"));
-    cfg.setInputAttributes(qs("OTHER"), words("b l{}.x"));
+    cfg.setInputAttributes("IN", words("a"));
+    cfg.setInputAttributes("OTHER", words("b l{}.x"));
     QStringList missing = words("stale");
     bool hasReferences = !c.hasReferences;
-    cfg.getMissingAttributeReferences(qs("P"), missing, hasReferences);
+    cfg.getMissingAttributeReferences("P", missing, hasReferences);
     EXPECT_EQ(missing, words(c.missing)) << c.value;
     EXPECT_EQ(hasReferences, c.hasReferences) << c.value;
   }
@@ -160,8 +159,8 @@ TEST(ConfigAttributes, MissingReferences) {
 TEST(ConfigAttributes, HostileReferencesTakeTimeInProportion) {
   const int count = 100000;
   AttributeSet reaching;
-  reaching.add({qs("l{}.").repeated(count) + qs("x")});
-  EXPECT_FALSE(reaching.holds(qs("l{")));
+  reaching.add({QString("l{}.").repeated(count) + QString("x")});
+  EXPECT_FALSE(reaching.holds("l{"));
 }
 
 TEST(ConfigAttributes, ByType) {
@@ -170,21 +169,21 @@ TEST(ConfigAttributes, ByType) {
                                 {"L", "ATTR_LIST_ENCODED", "", "b<space>1,a,z"},
                                 {"N", "NEW_ATTR", "", "n"},
                                 {"T", "TEXT", "", "t"}}));
-  cfg.setInputAttributes(qs("IN"), {qs("a"), qs("b 1")});
+  cfg.setInputAttributes("IN", {"a", "b 1"});
   const struct {
     const char* type;
     bool onlyInputs;
     QStringList names;
   } cases[] = {
-      {"ATTR", false, {qs("a"), qs("b 1"), qs("z")}},
-      {"ATTR", true, {qs("a"), qs("b 1")}},
-      {"ATTR_LIST", false, {qs("b 1"), qs("a"), qs("z")}},
-      {"NEW_ATTR", false, {qs("n")}},
+      {"ATTR", false, {"a", "b 1", "z"}},
+      {"ATTR", true, {"a", "b 1"}},
+      {"ATTR_LIST", false, {"b 1", "a", "z"}},
+      {"NEW_ATTR", false, {"n"}},
       {"NEW_ATTR", true, {}},
   };
   for (const auto& c : cases) {
     QStringList names = words("stale");
-    cfg.getAttributesByType(qs(c.type), names, c.onlyInputs);
+    cfg.getAttributesByType(c.type, names, c.onlyInputs);
     EXPECT_EQ(names, c.names) << c.type << c.onlyInputs;
   }
 }

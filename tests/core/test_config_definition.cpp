@@ -16,7 +16,7 @@ TEST(ConfigDefinition, NewObjectHasTheDocumentedDefaults) {
   EXPECT_EQ(cfg.replacedByVersion(), -1);
   EXPECT_TRUE(cfg.strictParameterValidation() && cfg.isVisible() && cfg.dependencyMet());
   EXPECT_FALSE(cfg.isDeprecated() || cfg.nukersRequired());
-  EXPECT_TRUE(cfg.getParameterGUIType(qs("ANY")).isNull());
+  EXPECT_TRUE(cfg.getParameterGUIType("ANY").isNull());
 }
 
 TEST(ConfigDefinition, VisibilityAndDeprecation) {
@@ -35,7 +35,7 @@ TEST(ConfigDefinition, VisibilityAndDeprecation) {
     TransformerDefinition definition = makeDefinition({});
     definition.visible = c.visible;
     definition.allowed = c.allowed;
-    definition.replacedBy = qs(c.replacedBy);
+    definition.replacedBy = c.replacedBy;
     TransformerCfg cfg;
     cfg.configure(definition);
     EXPECT_EQ(cfg.isVisible(), c.isVisible) << c.replacedBy;
@@ -57,10 +57,10 @@ TEST(ConfigDefinition, TagTokens) {
       {"IN:", "IN", "", ""},
   };
   for (const auto& c : cases) {
-    const TagList list = TagList::parse({qs(c.token), qs("IN:AGAIN"), qs(":NONE")});
-    EXPECT_EQ(list.tags, QStringList(qs(c.tag))) << c.token;
-    EXPECT_EQ(list.aliases.value(qs(c.tag)), qs(c.alias)) << c.token;
-    EXPECT_EQ(list.shownNames.value(qs(c.tag)), qs(c.shown)) << c.token;
+    const TagList list = TagList::parse({c.token, "IN:AGAIN", ":NONE"});
+    EXPECT_EQ(list.tags, QStringList(c.tag)) << c.token;
+    EXPECT_EQ(list.aliases.value(c.tag), c.alias) << c.token;
+    EXPECT_EQ(list.shownNames.value(c.tag), c.shown) << c.token;
   }
 }
 
@@ -68,18 +68,19 @@ TEST(ConfigDefinition, FaultyParameterEntriesAreReportedAndTheRestIsKept) {
   TransformerDefinition definition = makeDefinition(
       {{"A", "INT", "", "1"}, {"A", "TEXT", "", "2"}, {"", "TEXT"}, {"B", "", "", "x"}, {"C", "SUNDIAL"}});
   definition.parameterTypes.removeLast();  // fewer types than names
-  definition.listActions << qs("OUT COLLECT IN");
-  definition.parameterMapping << qs("OLD");
-  definition.tagMapping << qs(":") << qs("X:A=B");
-  definition.preservesAttributes << qs("NOWHERE:IN");
+  definition.listActions << "OUT COLLECT IN";
+  definition.parameterMapping << "OLD";
+  definition.tagMapping << ":"
+                        << "X:A=B";
+  definition.preservesAttributes << "NOWHERE:IN";
   QString text;
   QTextStream log(&text);
   TransformerCfg cfg;
   cfg.configure(definition, nullptr, &log);
   log.flush();
   EXPECT_EQ(cfg.getParameters(), words("A B C XFORMER_NAME"));
-  EXPECT_EQ(cfg.getParameterValue(qs("A")), qs("1"));
-  EXPECT_EQ(cfg.getParameterType(qs("B")), qs("TEXT"));
+  EXPECT_EQ(cfg.getParameterValue("A"), "1");
+  EXPECT_EQ(cfg.getParameterType("B"), "TEXT");
   const char* reported[] = {"PARAMETER_NAME: missing or there twice: A\n",
                             "PARAMETER_TYPE: missing, taken as TEXT: B\n",
                             "LIST_ACTION: not understood: OUT COLLECT IN\n",
@@ -87,7 +88,7 @@ TEST(ConfigDefinition, FaultyParameterEntriesAreReportedAndTheRestIsKept) {
                             "TAG_MAPPING: no renaming: X:A=B\n",
                             "PRESERVES_ATTRIBUTES: no output: NOWHERE:IN\n"};
   for (const char* line : reported) {
-    EXPECT_TRUE(text.contains(qs("Sorter version 3: ") + qs(line))) << line << "\n" << text.toStdString();
+    EXPECT_TRUE(text.contains(QString("Sorter version 3: ") + line)) << line << "\n" << text.toStdString();
   }
 }
 
@@ -95,10 +96,10 @@ TEST(ConfigDefinition, DefaultParameters) {
   TransformerCfg plain;
   plain.configure(makeDefinition({}));
   EXPECT_EQ(plain.getParameters(), words("XFORMER_NAME"));
-  EXPECT_EQ(plain.getParameterPrompt(qs("XFORMER_NAME")), qs("Transformer Name"));
+  EXPECT_EQ(plain.getParameterPrompt("XFORMER_NAME"), "Transformer Name");
 
   TransformerDefinition definition = makeDefinition({{"GROUP_BY", "OPTIONAL ATTR_LIST", "Group By"}});
-  definition.multiProcess = qs("GROUP_BY");
+  definition.multiProcess = "GROUP_BY";
   definition.attributesAdded = words("OUT:$(GROUP_BY) OUT:parts");
   definition.tooltipLines = words("$(GROUP_BY)");
   TransformerCfg grouped;
@@ -106,39 +107,40 @@ TEST(ConfigDefinition, DefaultParameters) {
   EXPECT_EQ(
       grouped.getParameters(),
       words("GROUP_BY XFORMER_NAME ORX_PROCESS_COUNT ORX_PROCESS_COUNTDISP ORX_PROCESS_GROUPS_ORDERED"));
-  EXPECT_EQ(grouped.getParameterValue(qs("GROUP_BY")), qs("<UNUSED>"));
-  EXPECT_EQ(grouped.getParameterValue(qs("ORX_PROCESS_COUNT")), qs("No Parallelism"));
-  const ChoiceList& levels = grouped.getParameterByMacroName(qs("ORX_PROCESS_COUNT"))->choices();
+  EXPECT_EQ(grouped.getParameterValue("GROUP_BY"), "<UNUSED>");
+  EXPECT_EQ(grouped.getParameterValue("ORX_PROCESS_COUNT"), "No Parallelism");
+  const ChoiceList& levels = grouped.getParameterByMacroName("ORX_PROCESS_COUNT")->choices();
   EXPECT_EQ(levels.entries().size(), 5u);
   for (const auto& [value, shown] :
        {std::pair("EXTREME", "Extreme"), {"Minimal", "Minimal"}, {"$(X)", "$(X)"}}) {
-    grouped.setParameterValue(qs("ORX_PROCESS_COUNT"), qs(value), false);
-    grouped.setParameterValue(qs("ORX_PROCESS_COUNTDISP"), qs("Moderate"), false);
-    EXPECT_EQ(grouped.getParameterValue(qs("ORX_PROCESS_COUNTDISP")), qs(shown));
+    grouped.setParameterValue("ORX_PROCESS_COUNT", value, false);
+    grouped.setParameterValue("ORX_PROCESS_COUNTDISP", "Moderate", false);
+    EXPECT_EQ(grouped.getParameterValue("ORX_PROCESS_COUNTDISP"), shown);
   }
-  EXPECT_EQ(levels.toStored(qs("Extreme")), qs("EXTREME"));
+  EXPECT_EQ(levels.toStored("Extreme"), "EXTREME");
   // Unused, it names no attribute, wherever it is looked at.
   QString message;
   for (const char* unused : {"<UNUSED>", ""}) {
     QStringList lines;
-    grouped.setParameterValue(qs("GROUP_BY"), qs(unused), false);
+    grouped.setParameterValue("GROUP_BY", unused, false);
     grouped.getTooltipLines(lines, false);
     EXPECT_EQ(lines, QStringList("(not set)"));
-    EXPECT_EQ(grouped.getOutputAttributes(qs("OUT")), words("parts"));
-    EXPECT_TRUE(grouped.validateParameter(qs("GROUP_BY"), message)) << message.toStdString();
-    EXPECT_TRUE(grouped.getAttributeNamesInValue(qs("GROUP_BY")).isEmpty());
+    EXPECT_EQ(grouped.getOutputAttributes("OUT"), words("parts"));
+    EXPECT_TRUE(grouped.validateParameter("GROUP_BY", message)) << message.toStdString();
+    EXPECT_TRUE(grouped.getAttributeNamesInValue("GROUP_BY").isEmpty());
   }
-  grouped.setParameterValue(qs("GROUP_BY"), qs("zone,b"), false);
-  EXPECT_EQ(grouped.getOutputAttributes(qs("OUT")), words("zone b parts"));
+  grouped.setParameterValue("GROUP_BY", "zone,b", false);
+  EXPECT_EQ(grouped.getOutputAttributes("OUT"), words("zone b parts"));
   QHash<QString, QString> table;
-  EXPECT_TRUE(grouped.getParameterLookupTable(qs("ORX_PROCESS_GROUPS_ORDERED"), QString(), table));
+  EXPECT_TRUE(grouped.getParameterLookupTable("ORX_PROCESS_GROUPS_ORDERED", QString(), table));
   EXPECT_EQ(table.size(), 2);
 }
 
 TEST(ConfigDefinition, ATransformerUnderTheHomeIsBuiltIn) {
   for (const bool isBuiltIn : {true, false}) {
     TransformerDefinition definition = makeDefinition({});
-    definition.filePath = (isBuiltIn ? QORXOrxHome() : QORXOrxHome() + qs("2")) + qs("/transformers/x.ort");
+    definition.filePath =
+        (isBuiltIn ? QORXOrxHome() : QORXOrxHome() + QString("2")) + QString("/transformers/x.ort");
     TransformerCfg cfg;
     cfg.configure(definition);
     EXPECT_EQ(cfg.transformerType() == TransformerCfg::kBuiltIn, isBuiltIn);
@@ -150,29 +152,29 @@ TEST(ConfigDefinition, CopiesShareTheDefinitionUntilOneIsLocalised) {
   prototype.configure(makeDefinition({{"A", "TEXT"}}));
   const std::unique_ptr<TransformerCfg> copy(prototype.getCopy());
   EXPECT_EQ(copy->definition(), prototype.definition());
-  copy->setLocalizedName(qs("Sortierer"));
+  copy->setLocalizedName("Sortierer");
   EXPECT_NE(copy->definition(), prototype.definition());
-  EXPECT_EQ(copy->getVisualName(), qs("Sortierer"));
-  EXPECT_EQ(prototype.getLocalizedName(), qs("Sorter"));
-  EXPECT_EQ(copy->getSavedName(), qs("Sorter"));
-  copy->setSavedName(qs("Ordner"));
-  EXPECT_EQ(copy->getSavedName(), qs("Ordner"));
+  EXPECT_EQ(copy->getVisualName(), "Sortierer");
+  EXPECT_EQ(prototype.getLocalizedName(), "Sorter");
+  EXPECT_EQ(copy->getSavedName(), "Sorter");
+  copy->setSavedName("Ordner");
+  EXPECT_EQ(copy->getSavedName(), "Ordner");
 }
 
 TEST(ConfigDefinition, CopiesHoldTheirOwnValuesPortsAndIdentity) {
   TransformerCfg prototype;
   prototype.configure(makeDefinition({{"A", "TEXT", "A", "1"}}));
-  prototype.setBaseGuid(qs("stem"));
-  prototype.setInputAttributes(qs("IN"), words("x"));
+  prototype.setBaseGuid("stem");
+  prototype.setInputAttributes("IN", words("x"));
   const std::unique_ptr<TransformerCfg> copy(prototype.getCopy());
   EXPECT_EQ(copy->getBaseGuid(), QString());
-  copy->setParameterValue(qs("A"), qs("2"), true);
-  copy->setInputAttributes(qs("IN"), words("y"));
-  copy->addInputFeatureType(qs("roads"));
-  copy->addParameter(TransformParamCfg(GUIType::fromTransformerTypeString(qs("TEXT"), qs("B"))));
-  EXPECT_EQ(prototype.getParameterValue(qs("A")), qs("1"));
+  copy->setParameterValue("A", "2", true);
+  copy->setInputAttributes("IN", words("y"));
+  copy->addInputFeatureType("roads");
+  copy->addParameter(TransformParamCfg(GUIType::fromTransformerTypeString("TEXT", "B")));
+  EXPECT_EQ(prototype.getParameterValue("A"), "1");
   EXPECT_EQ(prototype.getInputAttributeUnion(), words("x"));
-  EXPECT_TRUE(prototype.getInputFeatureTypes(qs("IN")).isEmpty());
+  EXPECT_TRUE(prototype.getInputFeatureTypes("IN").isEmpty());
   EXPECT_EQ(prototype.getParameters(), words("A XFORMER_NAME"));
   copy->setLastParmEditBuild(15179);
   prototype.copyValues(copy.get());
@@ -186,14 +188,14 @@ TEST(ConfigDefinition, UpgradeFollowsTheMappings) {
   old.inputTags = words("A B");
   TransformerCfg older;
   older.configure(old);
-  older.setBaseGuid(qs("stem"));
-  older.setIdentifier(qs("S_1"));
-  older.setParameterValue(qs("MODE"), qs("b"), true);
-  older.setParameterValue(qs("KEPT"), qs("k"), true);
-  older.setParameterValue(qs("EARLY"), qs("e"), true);
-  older.addInputFeatureType(qs("A"), qs("roads"));
-  older.setInputAttributes(qs("B"), words("x"));
-  older.setOutputFeatureType(qs("OUT"), qs("sorted"));
+  older.setBaseGuid("stem");
+  older.setIdentifier("S_1");
+  older.setParameterValue("MODE", "b", true);
+  older.setParameterValue("KEPT", "k", true);
+  older.setParameterValue("EARLY", "e", true);
+  older.addInputFeatureType("A", "roads");
+  older.setInputAttributes("B", words("x"));
+  older.setOutputFeatureType("OUT", "sorted");
 
   TransformerDefinition now =
       makeDefinition({{"METHOD", "TEXT"}, {"KEPT", "TEXT"}, {"EARLY", "TEXT"}, {"LATE", "TEXT"}});
@@ -204,19 +206,19 @@ TEST(ConfigDefinition, UpgradeFollowsTheMappings) {
   TransformerCfg newer;
   newer.configure(now);
   EXPECT_TRUE(newer.upgradeTransformer(&older));
-  EXPECT_EQ(newer.getParameterValue(qs("METHOD")), qs("b"));
-  EXPECT_EQ(newer.getParameterValue(qs("KEPT")), qs("k"));
-  EXPECT_EQ(newer.getParameterValue(qs("EARLY")), qs("e"));  // renamed in a version it already has
-  EXPECT_EQ(newer.getParameterValue(qs("LATE")), QString());
-  EXPECT_EQ(newer.getIdentifier(), qs("S_1"));
-  EXPECT_EQ(newer.getBaseGuid(), qs("stem"));
-  EXPECT_EQ(newer.getInputFeatureTypes(qs("FIRST")), words("roads"));
-  EXPECT_EQ(newer.getInputAttributes().value(qs("SECOND")), words("x"));
+  EXPECT_EQ(newer.getParameterValue("METHOD"), "b");
+  EXPECT_EQ(newer.getParameterValue("KEPT"), "k");
+  EXPECT_EQ(newer.getParameterValue("EARLY"), "e");  // renamed in a version it already has
+  EXPECT_EQ(newer.getParameterValue("LATE"), QString());
+  EXPECT_EQ(newer.getIdentifier(), "S_1");
+  EXPECT_EQ(newer.getBaseGuid(), "stem");
+  EXPECT_EQ(newer.getInputFeatureTypes("FIRST"), words("roads"));
+  EXPECT_EQ(newer.getInputAttributes().value("SECOND"), words("x"));
   QString featureType;
-  EXPECT_TRUE(newer.getOutputFeatureType(qs("SORTED"), featureType));
-  EXPECT_EQ(featureType, qs("sorted"));
+  EXPECT_TRUE(newer.getOutputFeatureType("SORTED", featureType));
+  EXPECT_EQ(featureType, "sorted");
 
-  older.setParameterValue(qs("GONE"), qs("something"), true);
+  older.setParameterValue("GONE", "something", true);
   EXPECT_FALSE(newer.upgradeTransformer(&older)) << "a value without a place has to be told";
 }
 

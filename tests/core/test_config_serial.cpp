@@ -21,29 +21,29 @@ const std::vector<ConfigParameter> kParameters = {{"A", "TEXT"}, {"B", "ATTR"}};
 TEST(ConfigSerial, ListsAreAppended) {
   TransformerCfg cfg;
   cfg.configure(makeDefinition(kParameters));
-  QHash<QString, QString> fields{{qs("INPUT_FILTERS"), qs("IN,\"f,g\"")},
-                                 {qs("INPUT_ATTRS"), qs("IN,\"a,b\"")},
-                                 {qs("OUTPUT_FEATURE_TYPES"), qs("OUT,t")},
-                                 {qs("OUTPUT_FUNCTIONS"), qs("OUT,\"x,y\",REST")}};
+  QHash<QString, QString> fields{{"INPUT_FILTERS", "IN,\"f,g\""},
+                                 {"INPUT_ATTRS", "IN,\"a,b\""},
+                                 {"OUTPUT_FEATURE_TYPES", "OUT,t"},
+                                 {"OUTPUT_FUNCTIONS", "OUT,\"x,y\",REST"}};
   cfg.deserialize(fields);
   cfg.deserialize(fields);
   const QHash<QString, QString> twice = fieldsOf(cfg.serialize());
-  EXPECT_EQ(twice.value(qs("INPUT_FILTERS")), qs("IN,\"f,g,f,g\""));
-  EXPECT_EQ(twice.value(qs("INPUT_ATTRS")), qs("IN,\"a,b\""));
-  EXPECT_EQ(twice.value(qs("OUTPUT_FEATURE_TYPES")), qs("OUT,t"));
-  EXPECT_EQ(twice.value(qs("OUTPUT_FUNCTIONS")), qs("OUT,\"x,y,x,y\""));
+  EXPECT_EQ(twice.value("INPUT_FILTERS"), "IN,\"f,g,f,g\"");
+  EXPECT_EQ(twice.value("INPUT_ATTRS"), "IN,\"a,b\"");
+  EXPECT_EQ(twice.value("OUTPUT_FEATURE_TYPES"), "OUT,t");
+  EXPECT_EQ(twice.value("OUTPUT_FUNCTIONS"), "OUT,\"x,y,x,y\"");
 }
 
 TEST(ConfigSerial, KeysStandInTheirOrder) {
   TransformerCfg cfg;
   cfg.configure(makeDefinition(kParameters));
-  cfg.addInputFeatureType(qs("OTHER"), qs("o"));
-  cfg.addInputFeatureType(qs("ZZZ"), qs("z"));
-  cfg.addInputFeatureType(qs("IN"), qs("i"));
+  cfg.addInputFeatureType("OTHER", "o");
+  cfg.addInputFeatureType("ZZZ", "z");
+  cfg.addInputFeatureType("IN", "i");
   EXPECT_EQ(cfg.serialize(),
-            qs("NAME,Sorter,VERSION,3,PARAMETER_VALUES,\"A,\"\"\"\",B,\"\"\"\",XFORMER_NAME,\"\"\"\"\","
-               "INPUT_FEATURE_TYPES,\"IN,i,OTHER,o,ZZZ,z\",INPUT_FILTERS,\"\",INPUT_ATTRS,\"\","
-               "OUTPUT_FEATURE_TYPES,\"\",OUTPUT_FUNCTIONS,\"\""));
+            "NAME,Sorter,VERSION,3,PARAMETER_VALUES,\"A,\"\"\"\",B,\"\"\"\",XFORMER_NAME,\"\"\"\"\","
+            "INPUT_FEATURE_TYPES,\"IN,i,OTHER,o,ZZZ,z\",INPUT_FILTERS,\"\",INPUT_ATTRS,\"\","
+            "OUTPUT_FEATURE_TYPES,\"\",OUTPUT_FUNCTIONS,\"\"");
 }
 
 TEST(ConfigSerial, PartialFields) {
@@ -63,12 +63,12 @@ TEST(ConfigSerial, PartialFields) {
   for (const auto& c : cases) {
     TransformerCfg cfg;
     cfg.configure(makeDefinition(kParameters));
-    cfg.setParameterValue(qs("A"), qs("old"), true);
-    QHash<QString, QString> fields{{qs(c.key), qs(c.value)}};
+    cfg.setParameterValue("A", "old", true);
+    QHash<QString, QString> fields{{c.key, c.value}};
     cfg.deserialize(fields);
     cfg.deserialize(fields);
-    EXPECT_EQ(cfg.getParameterValue(qs("A")), qs(c.a)) << c.value;
-    EXPECT_EQ(cfg.getInputFeatureTypes(qs("IN")), words(c.featureTypes)) << c.value;
+    EXPECT_EQ(cfg.getParameterValue("A"), c.a) << c.value;
+    EXPECT_EQ(cfg.getInputFeatureTypes("IN"), words(c.featureTypes)) << c.value;
   }
 }
 

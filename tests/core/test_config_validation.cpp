@@ -22,17 +22,17 @@ const char kLooseTable[] =
 
 struct Connections : DefinitionDirectory {
   bool isConnectionKnown(const QString& encodedName) const override {
-    return encodedName == qs("My<space>Base");
+    return encodedName == QString("My<space>Base");
   }
   const MemberList* memberDefinitions(const GUIType&) const override { return nullptr; }
 };
 
 struct Accepting : TransformerCfgListener {
   bool acceptsValue(const TransformerCfg&, const QString&, const QString& value) const override {
-    return value == qs("accepted");
+    return value == QString("accepted");
   }
   QString resolveUserTypedMacro(const TransformerCfg&, const QString& value, UnpackLevel) const override {
-    return QString(value).replace(qs("$(F_USERTYPED)"), qs("Grüße.txt"));
+    return QString(value).replace("$(F_USERTYPED)", "Grüße.txt");
   }
 };
 
@@ -50,27 +50,27 @@ struct ValidationCase {
 class ConfigValidation : public ::testing::Test {
  protected:
   void SetUp() override {
-    QFile file(m_folder.filePath(qs("Grüße.txt")));
+    QFile file(m_folder.filePath("Grüße.txt"));
     ASSERT_TRUE(file.open(QIODevice::WriteOnly));
     ASSERT_TRUE(QDir::setCurrent(m_folder.path()));
   }
   void TearDown() override {
-    QORXSetLanguage(qs("en"));
+    QORXSetLanguage("en");
     QDir::setCurrent(QDir::rootPath());
   }
 
   void check(const ValidationCase& c, TransformerCfgListener* listener = nullptr) {
     TransformerCfg cfg;
     cfg.configure(makeDefinition({{"P", c.type, c.prompt, c.value}}));
-    cfg.setInputAttributes(qs("IN"), words("here"));
+    cfg.setInputAttributes("IN", words("here"));
     cfg.setDefinitionDirectory(&m_connections);
     cfg.setListener(listener);
     for (const char* language : {"en", "de", "fr"}) {
-      QORXSetLanguage(qs(language));
-      const QString untouched = qs("untouched");
+      QORXSetLanguage(language);
+      const QString untouched = "untouched";
       QString message = untouched;
-      EXPECT_EQ(cfg.validateParameter(qs("P"), message), c.valid) << c.type << " = " << c.value;
-      EXPECT_EQ(message, c.message == kNoMessage ? untouched : TransformResString(c.message, qs(c.argument)))
+      EXPECT_EQ(cfg.validateParameter("P", message), c.valid) << c.type << " = " << c.value;
+      EXPECT_EQ(message, c.message == kNoMessage ? untouched : TransformResString(c.message, c.argument))
           << c.type << " = " << c.value;
     }
   }
@@ -157,14 +157,14 @@ TEST_F(ConfigValidation, WithListener) {
 TEST_F(ConfigValidation, MissingNamesAreCutAtOneHundredCharacters) {
   QStringList names;
   for (int i = 0; i < 40; ++i) {
-    names << qs("a_rather_long_name_") + QString::number(i);
+    names << QString("a_rather_long_name_") + QString::number(i);
   }
   TransformerCfg cfg;
   cfg.configure(makeDefinition({{"P", "ATTR_LIST", "A"}}));
-  cfg.setParameterValue(qs("P"), names.join(QLatin1Char(',')), true);
+  cfg.setParameterValue("P", names.join(QLatin1Char(',')), true);
   QString message;
-  EXPECT_FALSE(cfg.validateParameter(qs("P"), message));
-  const QString quoted = qs("'") + names.join(qs("' '")) + qs("'");
+  EXPECT_FALSE(cfg.validateParameter("P", message));
+  const QString quoted = QString("'") + names.join("' '") + QString("'");
   EXPECT_EQ(message, TransformResString(370607, quoted.left(100)));
 }
 
@@ -195,9 +195,9 @@ TEST_F(ConfigValidation, FormulasAreReadWhereverTheyStand) {
        "k;1;k;@Value(a)*", false},
   };
   for (const auto& c : cases) {
-    const TransformParamCfg parameter(GUIType::fromTransformerTypeString(qs(c.type), qs("P"), qs("P")));
+    const TransformParamCfg parameter(GUIType::fromTransformerTypeString(c.type, "P", "P"));
     QString message;
-    EXPECT_EQ(checkFormulas(parameter, qs(c.value), message), c.isSound) << c.type << " " << c.value;
+    EXPECT_EQ(checkFormulas(parameter, c.value, message), c.isSound) << c.type << " " << c.value;
   }
 }
 
@@ -206,12 +206,12 @@ TEST_F(ConfigValidation, AllParameters) {
   cfg.configure(makeDefinition({{"A", "TEXT", "First"}, {"B", "TEXT", "Second"}}));
   QString message;
   EXPECT_FALSE(cfg.validateParameters(message));
-  EXPECT_EQ(message, TransformResString(370608, qs("First")));
+  EXPECT_EQ(message, TransformResString(370608, "First"));
   QStringList names = words("B A NONE");
   QHash<QString, QString> messages;
   EXPECT_FALSE(cfg.validateParameters(names, messages));
   EXPECT_EQ(messages.size(), 3);
-  EXPECT_EQ(messages.value(qs("B")), TransformResString(370608, qs("Second")));
+  EXPECT_EQ(messages.value("B"), TransformResString(370608, "Second"));
 }
 
 }  // namespace

@@ -11,11 +11,11 @@ const char kTwoMembers[] =
 
 struct RecordingListener : TransformerCfgListener {
   QString rewriteValue(const TransformerCfg&, const QString&, const QString& value) override {
-    return value + qs("!");
+    return value + "!";
   }
   void parameterChanged(TransformerCfg&, const QString& parameter, const QString& oldValue,
                         const QString& newValue) override {
-    calls << parameter + qs(":") + oldValue + qs(">") + newValue;
+    calls << parameter + ":" + oldValue + ">" + newValue;
   }
   QStringList calls;
 };
@@ -42,8 +42,8 @@ TEST(ConfigValues, StoredForms) {
   for (const auto& c : cases) {
     TransformerCfg cfg;
     cfg.configure(makeDefinition({{"P", c.type}}));
-    EXPECT_TRUE(cfg.setParameterValue(qs("P"), qs(c.set), true));
-    EXPECT_EQ(cfg.getParameterValue(qs("P")), qs(c.stored)) << c.type << " " << c.set;
+    EXPECT_TRUE(cfg.setParameterValue("P", c.set, true));
+    EXPECT_EQ(cfg.getParameterValue("P"), c.stored) << c.type << " " << c.set;
   }
 }
 
@@ -59,8 +59,8 @@ TEST(ConfigValues, IdentifiersAreCutShorterThanTheyMayBe) {
                {"XFORMER_NAME", 1025, 1023},
                {"P", 1025, 1025}};
   for (const auto& c : cases) {
-    cfg.setParameterValue(qs(c.name), QString(c.length, QLatin1Char('x')), true);
-    EXPECT_EQ(cfg.getParameterValue(qs(c.name)).size(), c.stored) << c.name << c.length;
+    cfg.setParameterValue(c.name, QString(c.length, QLatin1Char('x')), true);
+    EXPECT_EQ(cfg.getParameterValue(c.name).size(), c.stored) << c.name << c.length;
   }
 }
 
@@ -69,31 +69,30 @@ TEST(ConfigValues, ListenerRewritesOnlyWhenNotified) {
   cfg.configure(makeDefinition({{"P", "TEXT", "", "0"}}));
   RecordingListener listener;
   cfg.setListener(&listener);
-  EXPECT_TRUE(cfg.setParameterValue(qs("P"), qs("1"), true));
-  EXPECT_TRUE(cfg.setParameterValue(qs("P"), qs("2"), false));
-  EXPECT_FALSE(cfg.setParameterValue(qs("NONE"), qs("3"), true));
+  EXPECT_TRUE(cfg.setParameterValue("P", "1", true));
+  EXPECT_TRUE(cfg.setParameterValue("P", "2", false));
+  EXPECT_FALSE(cfg.setParameterValue("NONE", "3", true));
   EXPECT_EQ(listener.calls, words("P:0>1! P:1!>2"));
-  QHash<QString, QString> fields{{qs("PARAMETER_VALUES"), qs("P,9")}};
+  QHash<QString, QString> fields{{"PARAMETER_VALUES", "P,9"}};
   cfg.deserialize(fields);
-  EXPECT_EQ(cfg.getParameterValue(qs("P")), qs("9"));
+  EXPECT_EQ(cfg.getParameterValue("P"), "9");
   EXPECT_EQ(listener.calls.size(), 2) << "restored values are not told";
 }
 
 TEST(ConfigValues, MembersAreReachedByTheirNames) {
   TransformerCfg cfg;
   cfg.configure(makeDefinition({{"Z_PAIR", kTwoMembers, "Pair"}, {"B_PAIR", kTwoMembers, "Pair"}}));
-  ASSERT_NE(cfg.getParameterByMacroName(qs("KEY")), nullptr);
-  EXPECT_EQ(cfg.getParameterByMacroName(qs("KEY"))->getName(), qs("B_PAIR"))
-      << "the first in name order answers";
-  EXPECT_FALSE(cfg.hasParameter(qs("KEY")));
-  EXPECT_TRUE(cfg.setParameterValue(qs("KEY"), qs("&id"), true));
-  EXPECT_TRUE(cfg.setParameterValue(qs("TO"), qs("&x;y"), true));
-  EXPECT_EQ(cfg.getParameterValue(qs("KEY")), qs("id"));
-  EXPECT_EQ(cfg.getParameterValue(qs("TO")), qs("<commercialat>Value<leftparenthesis>x;y<rightparenthesis>"));
-  EXPECT_TRUE(cfg.setParameterValue(qs("KEY"), qs("other"), true));
-  EXPECT_EQ(cfg.getParameterValue(qs("TO")), qs("<commercialat>Value<leftparenthesis>x;y<rightparenthesis>"));
-  EXPECT_EQ(cfg.getParameterValue(qs("Z_PAIR")), QString());
-  EXPECT_EQ(cfg.getParameterDisplayValue(qs("B_PAIR")), qs("Key: other, Target: @Value(x;y)"));
+  ASSERT_NE(cfg.getParameterByMacroName("KEY"), nullptr);
+  EXPECT_EQ(cfg.getParameterByMacroName("KEY")->getName(), "B_PAIR") << "the first in name order answers";
+  EXPECT_FALSE(cfg.hasParameter("KEY"));
+  EXPECT_TRUE(cfg.setParameterValue("KEY", "&id", true));
+  EXPECT_TRUE(cfg.setParameterValue("TO", "&x;y", true));
+  EXPECT_EQ(cfg.getParameterValue("KEY"), "id");
+  EXPECT_EQ(cfg.getParameterValue("TO"), "<commercialat>Value<leftparenthesis>x;y<rightparenthesis>");
+  EXPECT_TRUE(cfg.setParameterValue("KEY", "other", true));
+  EXPECT_EQ(cfg.getParameterValue("TO"), "<commercialat>Value<leftparenthesis>x;y<rightparenthesis>");
+  EXPECT_EQ(cfg.getParameterValue("Z_PAIR"), QString());
+  EXPECT_EQ(cfg.getParameterDisplayValue("B_PAIR"), "Key: other, Target: @Value(x;y)");
 }
 
 TEST(ConfigValues, ShownAsPeopleReadThem) {
@@ -114,37 +113,37 @@ TEST(ConfigValues, ShownAsPeopleReadThem) {
   for (const auto& c : cases) {
     TransformerCfg cfg;
     cfg.configure(makeDefinition({{"P", c.type, "Prompt", c.value}}));
-    EXPECT_EQ(cfg.getParameterDisplayValue(qs("P")), qs(c.shown)) << c.type;
-    EXPECT_EQ(cfg.formatParamDisplayString(qs("P"), qs(c.value), true), qs("Prompt: ") + qs(c.shown));
+    EXPECT_EQ(cfg.getParameterDisplayValue("P"), c.shown) << c.type;
+    EXPECT_EQ(cfg.formatParamDisplayString("P", c.value, true), QString("Prompt: ") + QString(c.shown));
   }
   TransformerCfg cfg;
   cfg.configure(makeDefinition({{"P", "TEXT_ENCODED", "Prompt", "<lessthansign>space<greaterthansign>"}}));
   TransformerCfgListener listener;
   cfg.setListener(&listener);
-  EXPECT_EQ(cfg.getParameterDisplayValue(qs("P"), UnpackLevel::Decoded), qs("<space>")) << "decoded once";
+  EXPECT_EQ(cfg.getParameterDisplayValue("P", UnpackLevel::Decoded), "<space>") << "decoded once";
 }
 
 TEST(ConfigValues, Tooltips) {
   struct Customised : TransformerCfg {
     void tooltipCustomizations(QHash<QString, QString>& tokens, QStringList& lines,
                                QString& title) const override {
-      tokens.insert(qs("EXTRA"), qs("$(P) & more"));
-      lines << qs("x < y");
-      title = qs("A & B");
+      tokens.insert("EXTRA", "$(P) & more");
+      lines << "x < y";
+      title = "A & B";
     }
   };
   TransformerDefinition definition = makeDefinition({{"P", "TEXT", "", "<a>$(Q)"}, {"Q", "TEXT", "", ""}});
-  definition.tooltipLines << qs("is $(P), $(Q), $(EXTRA), $(NOBODY) and $(open");
+  definition.tooltipLines << "is $(P), $(Q), $(EXTRA), $(NOBODY) and $(open";
   Customised cfg;
   cfg.configure(definition);
   QStringList lines;
   cfg.getTooltipLines(lines, false);
-  EXPECT_EQ(lines, QStringList({qs("A & B"), qs("is <a>$(Q), (not set), $(P) & more, $(NOBODY) and $(open"),
-                                qs("x < y")}));
+  EXPECT_EQ(lines,
+            QStringList({"A & B", "is <a>$(Q), (not set), $(P) & more, $(NOBODY) and $(open", "x < y"}));
   cfg.getTooltipLines(lines, true);
-  EXPECT_EQ(lines, QStringList({qs("<b>A &amp; B</b>"),
-                                qs("is &lt;a&gt;$(Q), (not set), $(P) &amp; more, $(NOBODY) and $(open"),
-                                qs("x &lt; y")}));
+  EXPECT_EQ(lines,
+            QStringList({"<b>A &amp; B</b>",
+                         "is &lt;a&gt;$(Q), (not set), $(P) &amp; more, $(NOBODY) and $(open", "x &lt; y"}));
 }
 
 TEST(ConfigValues, SupportedValueTypes) {
@@ -163,7 +162,7 @@ TEST(ConfigValues, SupportedValueTypes) {
   for (const auto& c : cases) {
     TransformerCfg cfg;
     cfg.configure(makeDefinition({{"P", c.type, c.prompt}}));
-    EXPECT_EQ(cfg.getSupportedValueTypes(qs("P")), words(c.types)) << c.type;
+    EXPECT_EQ(cfg.getSupportedValueTypes("P"), words(c.types)) << c.type;
   }
 }
 
@@ -182,36 +181,36 @@ TEST(ConfigValues, GroupsFollowTheirParameter) {
       {"none", "DYNGROUP_FORMATS_1=none:"},
   };
   for (const auto& c : cases) {
-    cfg.setParameterValue(qs("FORMATS"), qs(c.value), true);
+    cfg.setParameterValue("FORMATS", c.value, true);
     QStringList groups;
     for (const QString& name : cfg.getParameters()) {
-      if (name.startsWith(qs("DYNGROUP_"))) {
-        EXPECT_TRUE(cfg.getGuiLine(name).startsWith(qs("GUI NAMEDGROUP NO_EDIT ") + name));
-        groups << name + qs("=") + cfg.getParameterValue(name) + qs(":") +
+      if (name.startsWith("DYNGROUP_")) {
+        EXPECT_TRUE(cfg.getGuiLine(name).startsWith(QString("GUI NAMEDGROUP NO_EDIT ") + name));
+        groups << name + "=" + cfg.getParameterValue(name) + ":" +
                       cfg.getParameterGUIType(name).getConfigToken();
       }
     }
-    EXPECT_EQ(groups.join(QLatin1Char(' ')), qs(c.groups)) << c.value;
+    EXPECT_EQ(groups.join(QLatin1Char(' ')), c.groups) << c.value;
   }
 }
 
 TEST(ConfigValues, RecordsStayPutWhileValuesChange) {
   TransformerCfg cfg;
   cfg.configure(makeDefinition({{"A", "TEXT"}, {"B", "TEXT"}}));
-  TransformParamCfg* record = cfg.getParameterByMacroName(qs("B"));
-  cfg.setParameterValue(qs("A"), qs("1"), true);
-  cfg.setParameterValue(qs("B"), qs("2"), true);
-  EXPECT_EQ(cfg.getParameterByMacroName(qs("B")), record);
-  EXPECT_EQ(record->getValue(), qs("2"));
-  record->setTypeFromGUILine(qs("CHOICE a%b"));
-  EXPECT_EQ(record->getName(), qs("B"));
-  EXPECT_TRUE(record->choices().contains(qs("b")));
-  EXPECT_EQ(record->getTypeWithConfig(), qs("CHOICE a%b"));
+  TransformParamCfg* record = cfg.getParameterByMacroName("B");
+  cfg.setParameterValue("A", "1", true);
+  cfg.setParameterValue("B", "2", true);
+  EXPECT_EQ(cfg.getParameterByMacroName("B"), record);
+  EXPECT_EQ(record->getValue(), "2");
+  record->setTypeFromGUILine("CHOICE a%b");
+  EXPECT_EQ(record->getName(), "B");
+  EXPECT_TRUE(record->choices().contains("b"));
+  EXPECT_EQ(record->getTypeWithConfig(), "CHOICE a%b");
 
-  TransformParamCfg looked(GUIType::fromTransformerTypeString(qs("CHOICE a%b"), qs("C")), {qs("a,1")});
-  looked.setTypeFromGUILine(qs("CHOICE a%b"));
-  EXPECT_EQ(looked.choices().toStored(qs("a")), qs("1"));
-  looked.setTypeFromGUILine(qs("CHOICE a%c"));
+  TransformParamCfg looked(GUIType::fromTransformerTypeString("CHOICE a%b", "C"), {"a,1"});
+  looked.setTypeFromGUILine("CHOICE a%b");
+  EXPECT_EQ(looked.choices().toStored("a"), "1");
+  looked.setTypeFromGUILine("CHOICE a%c");
   EXPECT_FALSE(looked.choices().hasLookup());
 }
 

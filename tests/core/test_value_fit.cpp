@@ -36,10 +36,10 @@ TEST(ValueFit, OnlyPlainValuesAreJudged) {
       {"TEXT", "x|1", "", Misfit::None},
   };
   for (const auto& c : cases) {
-    const GUIType type = GUIType::fromTransformerTypeString(qs(c.type), qs("P"));
-    for (const QString& value : qs(c.fitting).split('|'))
+    const GUIType type = GUIType::fromTransformerTypeString(c.type, "P");
+    for (const QString& value : QString(c.fitting).split('|'))
       EXPECT_TRUE(ValueFit::of(type, value).fits()) << c.type << ": " << value.toStdString();
-    for (const QString& value : qs(c.unfit).split('|', Qt::SkipEmptyParts)) {
+    for (const QString& value : QString(c.unfit).split('|', Qt::SkipEmptyParts)) {
       const ValueFit fit = ValueFit::of(type, value);
       EXPECT_EQ(fit.misfit, c.misfit) << c.type << ": " << value.toStdString();
       EXPECT_TRUE(value.contains(fit.value));
@@ -61,11 +61,11 @@ TEST(ValueFit, PartsAreJudgedByTheirOwnTypes) {
       {"MULTIPARAMETER <semicolon>,GUI<space>INT<space>A<space>First", "ORX_CONDITIONAL:A;1.5", ""},
   };
   for (const auto& c : cases) {
-    const TransformParamCfg parameter(GUIType::fromTransformerTypeString(qs(c.type), qs("P")));
+    const TransformParamCfg parameter(GUIType::fromTransformerTypeString(c.type, "P"));
     QStringList found;
-    for (const ValueFit& fit : ValueFit::misfitsOf(parameter, qs(c.value)))
+    for (const ValueFit& fit : ValueFit::misfitsOf(parameter, c.value))
       found.append(fit.prompt + '=' + fit.value);
-    EXPECT_EQ(found.join(' '), qs(c.misfits)) << c.value;
+    EXPECT_EQ(found.join(' '), c.misfits) << c.value;
   }
 }
 
