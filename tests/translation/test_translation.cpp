@@ -3,27 +3,6 @@
 
 namespace {
 
-using Change = std::function<void(SmallWorkspace&)>;
-
-Change node(const QString& type, const QStringList& parameters, const QStringList& extra = {}, int id = 7) {
-  return [=](SmallWorkspace& w) { w.transformer(id, type, parameters, extra); };
-}
-Change valued(const QString& value) {
-  return node("Copy", {"XFORMER_NAME", "N", "VALUE", value});
-}
-Change linked(int from, const QString& output, int to, const QString& input) {
-  return [=](SmallWorkspace& w) { w.link(from, output, to, input); };
-}
-Change parameter(const QString& guiLine, const QString& value) {
-  return [=](SmallWorkspace& w) { w.parameter(guiLine, value); };
-}
-Change reading(const QString& name) {
-  return [=](SmallWorkspace& w) { w.reader(9, name).link(9, "fo 0", 3, "fi 0 INPUT"); };
-}
-Change port(const QString& name) {
-  return [=](SmallWorkspace& w) { w.port(9, name, "false").link(3, "fo 0", 9, "fi 0"); };
-}
-
 SmallWorkspace copyBetween() {
   SmallWorkspace workspace;
   workspace.reader(1, "Parcels", {"id", "area"})
@@ -126,25 +105,6 @@ TEST(Translation, AttributeLinksCopyAttributes) {
   EXPECT_FALSE(text.contains("(id,id)"));
 }
 
-// A custom transformer with a parameter, an inner "Copy" and an output fed by two inner ports.
-SmallWorkspace withCustom(const std::function<void(SmallWorkspace&)>& change = {}) {
-  SmallWorkspace workspace;
-  workspace.reader(1, "Parcels", {"id"}).writer(2, "Flooded");
-  workspace.transformer(3, "SubDocumentTransformer",
-                        {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", "First", "LIMIT", "7"});
-  workspace.link(1, "fo 0", 3, "fi 0 IN").link(3, "fo 0 OUT", 2, "fi 0");
-  workspace.beginCustom("Cleaner", {"CATEGORY", "Mine"}).port(1, "IN", "true").port(2, "OUT", "false");
-  workspace.parameter("GUI TEXT LIMIT Limit", "5");
-  workspace.transformer(3, "Copy", {"XFORMER_NAME", "C", "VALUE", "$(LIMIT)"});
-  workspace.link(1, "fo 0", 3, "fi 0 INPUT")
-      .link(3, "fo 0 OUTPUT", 2, "fi 0")
-      .link(3, "fo 1 REST", 2, "fi 0");
-  if (change)
-    change(workspace);
-  workspace.endCustom();
-  return workspace;
-}
-
 TEST(Translation, MacrosInLookupsAreJudgedByTheirValues) {
   const struct {
     QString value;        // of the choice
@@ -216,81 +176,6 @@ TEST(Translation, LookupsInsideCustomTransformersAreJudgedByTheInstances) {
     workspace.beginCustom("Cleaner", {"CATEGORY", "Mine"}).parameter("GUI TEXT LIMIT Limit", "Fast");
     workspace.transformer(3, test.type, {"XFORMER_NAME", "P", "MODE", test.inner}).endCustom();
     EXPECT_EQ(translate(workspace).diagnostics, test.diagnostics) << test.inner << ' ' << test.value;
-  }
-}
-
-void expectRefused(const SmallWorkspace& workspace, const QStringList& diagnostics) {
-  const Outcome outcome = translate(workspace);
-  for (const QString& diagnostic : diagnostics)
-    EXPECT_TRUE(outcome.diagnostics.contains(diagnostic)) << outcome.diagnostics.join('|').toStdString();
-  EXPECT_EQ(outcome.result, TranslationResult::Refused);
-  EXPECT_EQ(outcome.text, QString());
-}
-
-TEST(Translation, RefusesFaultyCustomTransformers) {
-  const std::pair<Change, const char*> cases[] = {
-      {node("Nothing", {"XFORMER_NAME", "N"}, {}, 9), "unknown-transformer Cleaner/N"},
-      {linked(1, "fo 0", 77, "fi 0"), "dangling-link Cleaner"},
-      {linked(3, "fo 0 OUTPUT", 3, "fi 0 INPUT"), "cycle Cleaner"},
-      {valued("$[x"), "unwritable-value Cleaner/N"},
-      {node("Broken", {"XFORMER_NAME", "N"}), "not-written Cleaner/N"},
-      {port("A\nB"), "line-break Cleaner"},
-      {port("IN"), "duplicate-name Cleaner/IN"},
-  };
-  for (const auto& [change, diagnostic] : cases)
-    expectRefused(withCustom(change), {diagnostic});
-  for (const char* name : {"Cleaner (2)", "A,B", "A$B", "A "}) {
-    SmallWorkspace workspace;
-    workspace.transformer(3, "SubDocumentTransformer", {"SUB_DOC_NAME", name, "XFORMER_NAME", "First"});
-    expectRefused(workspace.beginCustom(name, {}).endCustom(), {"nesting First"});
-  }
-}
-
-TEST(Translation, RefusesWhatItCannotTranslate) {
-  const QString tooLong = QString("x").repeated(1030);
-  const std::pair<Change, QStringList> cases[] = {
-      {node("Nothing", {"XFORMER_NAME", "N"}), {"unknown-transformer N"}},
-      {node("Copy", {"XFORMER_NAME", "N"}, {"VERSION", "9"}), {"unknown-version N"}},
-      {node("SubDocumentTransformer", {"XFORMER_NAME", "N"}), {"custom-transformer N"}},
-      {node("Copy", {"COLOUR", "red"}), {"unknown-parameter Copy_7"}},
-      {node("Copy", {"XFORMER_NAME", "C"}), {"duplicate-name C"}},
-      {[&](SmallWorkspace& w) {
-         node("Copy", {"XFORMER_NAME", tooLong})(w);
-         node("Copy", {"XFORMER_NAME", tooLong + "x"}, {}, 8)(w);
-       },
-       {"duplicate-name " + tooLong.left(1023)}},
-      {node("Copy", {"XFORMER_NAME", "N"}, {}, 1), {"duplicate-number N"}},
-      {linked(3, "fo 0 OUTPUT", 77, "fi 0"), {"dangling-link "}},
-      {linked(2, "fo 0", 3, "fi 0 INPUT"), {"bad-port Flooded"}},
-      {linked(3, "xo 0 OUTPUT", 2, "fi 0"), {"bad-port C"}},
-      {linked(3, "fo 0 OUTPUT", 2, "fo 0"), {"bad-port Flooded"}},
-      {linked(1, "fo 0", 3, "fi 0 MIDDLE"), {"unknown-input C"}},
-      {linked(3, "fo 2", 2, "fi 0"), {"unknown-output C"}},
-      {linked(3, "fo 1 REST", 3, "fi 0 INPUT"), {"cycle C"}},
-      {parameter("nonsense", ""), {"bad-prompt-line "}},
-      {parameter("GUI TEXT A P", "$[B"), {"unclosed-reference "}},
-      {parameter("GUI TEXT A P", "a\nb"), {"line-break "}},
-      {parameter("GUI TEXT A P", "a\\"), {"unwritable-value "}},
-      {parameter("GUI TEXT \"A B\" P", "a"), {"unwritable-value "}},
-      {parameter("GUI TEXT A<u000a>B P", "a"), {"unwritable-value "}},
-      {reading("$[B]$["), {"unclosed-reference $[B]$["}},
-      {reading("a\\\" b"), {"unwritable-value a\\\" b"}},
-      {valued("$[x"), {"unwritable-value N"}},
-      {valued("a OUTPUT x FEATURE_TYPE y"), {"unwritable-value N"}},
-      {valued("@EvaluateExpression("), {"unwritable-value N"}},
-      {valued("P"), {"unwritable-value N"}},
-      {node("Copy", {"XFORMER_NAME", "a\\\" b"}), {"unwritable-value a\\\" b"}},
-      {[](SmallWorkspace& w) {
-         node("Nothing", {})(w);
-         node("Copy", {"XFORMER_NAME", "C"}, {}, 8)(w);
-         w.link(3, "fo 8", 2, "fi 0");
-       },
-       {"unknown-transformer Nothing_7", "duplicate-name C", "unknown-output C"}},
-  };
-  for (const auto& [change, diagnostics] : cases) {
-    SmallWorkspace workspace = copyBetween();
-    change(workspace);
-    expectRefused(workspace, diagnostics);
   }
 }
 
