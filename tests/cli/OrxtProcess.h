@@ -1,8 +1,9 @@
 // Runs the command and gives back what it did.
 #pragma once
 
+#include <tests/support/Files.h>
+
 #include <QDir>
-#include <QFile>
 #include <QProcess>
 #include <QString>
 #include <QStringList>
@@ -44,17 +45,6 @@ inline QStringList samples() {
   for (const QString& name : QDir(QStringLiteral(ORX_SOURCE_DIR) + "/samples").entryList({"*.orw"}))
     result << sample(name);
   return result;
-}
-
-inline QByteArray readAll(const QString& path) {
-  QFile file(path);
-  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-}
-
-inline void write(const QString& path, const QByteArray& bytes) {
-  QFile file(path);
-  ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-  ASSERT_EQ(file.write(bytes), bytes.size());
 }
 
 // One command line: its exit status and a piece of each stream; an empty piece means that nothing may be

@@ -11,9 +11,9 @@ namespace {
 
 TEST(CommandLine, EndsWithTheStatusThatFits) {
   QTemporaryDir folder;
-  write(folder.filePath("empty.orw"), "");
-  write(folder.filePath("cut.orw"), readAll(samples().first()).left(3000));
-  write(folder.filePath("kept.mf"), "before");
+  put(folder.filePath("empty.orw"), "");
+  put(folder.filePath("cut.orw"), readAll(samples().first()).left(3000));
+  put(folder.filePath("kept.mf"), "before");
   const QString good = samples().first();
   const CommandCase cases[] = {
       {{"--help"}, 0, "Example:", ""},
@@ -68,7 +68,7 @@ TEST(CommandLine, TellsWhenItDoesNotSpeakTheLanguageOfTheEnvironment) {
 
 TEST(CommandLine, GeneratesManyWorkspacesAtOnce) {
   QTemporaryDir folder;
-  write(folder.filePath("broken.orw"), "#! <WORKSPACE><TRANSFORMERS>\n");
+  put(folder.filePath("broken.orw"), "#! <WORKSPACE><TRANSFORMERS>\n");
   QStringList arguments = {"generate", "--resources", sample("custom"), "-d", "out",
                            "--jobs",   "3",           "broken.orw"};
   arguments += samples();

@@ -25,14 +25,14 @@ QByteArray definition(const char* name, int version, const QByteArray& header, c
 class Catalogue : public testing::Test {
  protected:
   void SetUp() override {
-    write(m_folder.filePath("animals.ort"),
-          definition("Xerus", 1, "CATEGORY: Rodents", "Sleeps beside the quokka.") +
-              definition("Yak", 1, "CATEGORY: Quokka Matters", "Grazes on stony ground.") +
-              definition("Zebra", 1, "ALIASES: QuokkaFriend\nCATEGORY: Rodents", "Runs.") +
-              definition("QuokkaFeeder", 1, "CATEGORY: Rodents", "Gives leaves. Takes nothing.") +
-              definition("Quokka", 1, "CATEGORY: Rodents", "Old.", "Born & <raised>") +
-              definition("Quokka", 3, "CATEGORY: Rodents", "Smiles on stony ground.", "Eats \"leaves\"") +
-              definition("QuokkaGone", 2, "CATEGORY: Rodents\nVISIBLE: NO\nREPLACED_BY: Quokka", "Gone."));
+    put(m_folder.filePath("animals.ort"),
+        definition("Xerus", 1, "CATEGORY: Rodents", "Sleeps beside the quokka.") +
+            definition("Yak", 1, "CATEGORY: Quokka Matters", "Grazes on stony ground.") +
+            definition("Zebra", 1, "ALIASES: QuokkaFriend\nCATEGORY: Rodents", "Runs.") +
+            definition("QuokkaFeeder", 1, "CATEGORY: Rodents", "Gives leaves. Takes nothing.") +
+            definition("Quokka", 1, "CATEGORY: Rodents", "Old.", "Born & <raised>") +
+            definition("Quokka", 3, "CATEGORY: Rodents", "Smiles on stony ground.", "Eats \"leaves\"") +
+            definition("QuokkaGone", 2, "CATEGORY: Rodents\nVISIBLE: NO\nREPLACED_BY: Quokka", "Gone."));
   }
 
   Outcome transformers(const QStringList& arguments) const {
@@ -315,7 +315,7 @@ TEST(CatalogueSchema, SaysWhatEachTypeTakes) {
             "N;4;T;x");
   parameter("ROWS", "GUI_LINE_TABLE <semicolon>,GUI<space>TEXT<space>K<space>K,GUI<space>INT<space>V<space>V",
             "a;1;b;2");
-  write(folder.filePath("types.ort"), definition("SchemaTypes", 2, header, "All types."));
+  put(folder.filePath("types.ort"), definition("SchemaTypes", 2, header, "All types."));
   const Outcome run = orxt(
       {"transformers", "show", "SchemaTypes", "--schema", "--version", "2", "--resources", folder.path()});
   const QJsonObject schema = QJsonDocument::fromJson(run.out.toUtf8()).object();

@@ -39,15 +39,15 @@ QJsonArray infoJson(const QStringList& files, const QString& folder = QString(),
 TEST(DocumentCommands, EndWithTheStatusThatFits) {
   QTemporaryDir folder;
   const QString good = samples().first();
-  write(folder.filePath("empty.orw"), "");
-  write(folder.filePath("cut.orw"), readAll(good).left(3000));
-  write(folder.filePath("noise.orw"), QByteArray("\xff\x00\x1b[2J#!", 9).repeated(5000));
-  write(folder.filePath("lossy.orw"), withLosses());
-  write(folder.filePath("small.orw"), kSmall);
-  write(folder.filePath("conflict.orw"), QByteArray(kSmall) + "\n<<<<<<< ours\n");
-  write(folder.filePath("other.orw"), "<FOO/>");
-  write(folder.filePath("versions.ort"), kVersions);
-  write(folder.filePath("hollow.ort"), "# ORW custom transformers\n");
+  put(folder.filePath("empty.orw"), "");
+  put(folder.filePath("cut.orw"), readAll(good).left(3000));
+  put(folder.filePath("noise.orw"), QByteArray("\xff\x00\x1b[2J#!", 9).repeated(5000));
+  put(folder.filePath("lossy.orw"), withLosses());
+  put(folder.filePath("small.orw"), kSmall);
+  put(folder.filePath("conflict.orw"), QByteArray(kSmall) + "\n<<<<<<< ours\n");
+  put(folder.filePath("other.orw"), "<FOO/>");
+  put(folder.filePath("versions.ort"), kVersions);
+  put(folder.filePath("hollow.ort"), "# ORW custom transformers\n");
   const CommandCase cases[] = {
       {{"info", "--help"}, 0, "Example:", ""},
       {{"format", "--help"}, 0, "--drop", ""},
@@ -124,7 +124,7 @@ TEST(DocumentCommands, TellTheFormOfAFileAlike) {
   };
   QTemporaryDir folder;
   for (const auto& form : forms) {
-    write(folder.filePath("file"), form.bytes);
+    put(folder.filePath("file"), form.bytes);
     const std::string begin = form.bytes.left(60).toStdString() + " ...\n";
     const QStringList commands[] = {{"info", "file"},
                                     {"format", "--drop", "file"},
@@ -162,7 +162,7 @@ TEST(FormatCommand, TheSamplesAreCanonical) {
 TEST(FormatCommand, ListsEveryLossAndWritesNothingUnlessTold) {
   QTemporaryDir folder;
   const QString file = folder.filePath("lossy.orw");
-  write(file, withLosses());
+  put(file, withLosses());
   const char* const losses[] = {"lossy.orw:4: %1: the attribute FANOUT ", "lossy.orw:10: %1: the constant ",
                                 "lossy.orw:12: %1: the attribute WHIM ",
                                 "lossy.orw:20: %1: the element ODDITIES "};
@@ -216,7 +216,7 @@ TEST(FormatCommand, KeepsWhatStandsAroundTheDocument) {
   };
   for (const auto& test : cases) {
     const QString file = folder.filePath("file.orw");
-    write(file, test.before);
+    put(file, test.before);
     ASSERT_TRUE(QFile::setPermissions(file, QFile::ReadOwner | QFile::WriteOwner));
     EXPECT_EQ(orxt({"format", "-i", file}).status, 0) << test.name;
     EXPECT_EQ(readAll(file), test.after) << test.name;
@@ -279,7 +279,7 @@ TEST(InfoCommand, NeverPrintsPasswordsOrTerminalControls) {
 
 TEST(InfoCommand, ListsStoredVersionsAndSkipsWhatCannotBeRead) {
   QTemporaryDir folder;
-  write(folder.filePath("cleaner.ort"), kVersions);
+  put(folder.filePath("cleaner.ort"), kVersions);
   const Outcome mixed = orxt({"info", "--json", "missing.ort", "cleaner.ort"}, folder.path());
   EXPECT_EQ(mixed.status, 3);
   const QJsonArray files = QJsonDocument::fromJson(mixed.out.toUtf8()).array();

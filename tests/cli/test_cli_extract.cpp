@@ -41,7 +41,7 @@ TEST(ExtractCommand, AFileTranslatesToWhatTheEmbeddedOneDid) {
   ASSERT_EQ(extracted.status, 0) << extracted.err.toStdString();
   EXPECT_EQ(extracted.err, QString());
 
-  write(folder.filePath("linked.orw"), linkedWorkspace());
+  put(folder.filePath("linked.orw"), linkedWorkspace());
   const Outcome linked = orxt({"generate", "linked.orw", "--resources", "shared"}, folder.path());
   EXPECT_EQ(linked.status, 0) << linked.err.toStdString();
   const QString embedded = text(sample("land_cover.mf"));
@@ -78,13 +78,13 @@ TEST(ExtractCommand, ANewVersionGoesInFrontAndLeavesTheOthersAlone) {
 
 TEST(ExtractCommand, SaysWhatItCannotDo) {
   QTemporaryDir folder;
-  write(folder.filePath("other.ort"), "TRANSFORMER_NAME: Other\n");
+  put(folder.filePath("other.ort"), "TRANSFORMER_NAME: Other\n");
   QByteArray comma = readAll(sample("land_cover.orw"));
-  write(folder.filePath("comma.orw"), comma.replace("Tidy Area", "Tidy, Area"));
+  put(folder.filePath("comma.orw"), comma.replace("Tidy Area", "Tidy, Area"));
   QByteArray global = readAll(sample("land_cover.orw"));
-  write(folder.filePath("global.orw"), global.replace("VALUE=\"0.05\"", "VALUE=\"$(SURVEY_YEAR)\""));
+  put(folder.filePath("global.orw"), global.replace("VALUE=\"0.05\"", "VALUE=\"$(SURVEY_YEAR)\""));
   QByteArray unknown = readAll(sample("land_cover.orw"));
-  write(folder.filePath("unknown.orw"), unknown.replace("TYPE=\"VertexThinner\"", "TYPE=\"Nothing\""));
+  put(folder.filePath("unknown.orw"), unknown.replace("TYPE=\"VertexThinner\"", "TYPE=\"Nothing\""));
   const QString good = sample("land_cover.orw");
   const struct {
     QStringList arguments;

@@ -35,11 +35,11 @@ TEST(Lint, TellsTheKindOfAFileByNameAndContent) {
   const QByteArray definition = "TRANSFORMER_NAME: A\nCOLOUR: red\nTEMPLATE_START\nTEMPLATE_END\n";
   const QByteArray custom =
       "# ORW custom transformers\n# TRANSFORMER_BEGIN A,1,T\n# MACRO\n# TRANSFORMER_END\n";
-  write(folder.filePath("inner/a.mf"), mapping);
-  write(folder.filePath("inner/b.ort"), definition);
-  write(folder.filePath("c.ort"), custom);
-  write(folder.filePath("d.txt"), mapping);
-  write(folder.filePath("e.txt"), definition);
+  put(folder.filePath("inner/a.mf"), mapping);
+  put(folder.filePath("inner/b.ort"), definition);
+  put(folder.filePath("c.ort"), custom);
+  put(folder.filePath("d.txt"), mapping);
+  put(folder.filePath("e.txt"), definition);
   const CommandCase cases[] = {
       {{"lint", "inner/a.mf"}, 1, "", "a.mf:1: error: "},
       {{"lint", "inner"}, 1, "", "inner/b.ort:2: error: "},

@@ -1,5 +1,6 @@
 // Networks from documents: inside a workspace, and in files of their own.
 #include "CustomFixtures.h"
+#include <tests/support/Files.h>
 #include <tests/support/QtPrinters.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/SubDocumentLibrary.h>
@@ -8,7 +9,6 @@
 #include <transform/workspace/XMLComponentReader.h>
 
 #include <QDir>
-#include <QFile>
 #include <QTemporaryDir>
 #include <gtest/gtest.h>
 
@@ -39,10 +39,8 @@ class DocumentNetwork : public testing::Test {
   QString path(const char* name) const { return folder.filePath(QLatin1String(name)); }
 
   QString write(const char* name, const QByteArray& bytes) const {
-    QFile file(path(name));
-    EXPECT_TRUE(file.open(QIODevice::WriteOnly));
-    file.write(bytes);
-    return file.fileName();
+    put(path(name), bytes);
+    return path(name);
   }
 
   // Puts a version into a file of versions.
@@ -337,19 +335,14 @@ TEST_F(DocumentNetwork, QuestionsAboutTheInsideLoadTheBody) {
   EXPECT_FALSE(network.isBodyLoaded()) << "the header answers these";
 }
 
-QByteArray bytesOf(const QString& fileName) {
-  QFile file(fileName);
-  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
-}
-
 TEST_F(DocumentNetwork, ExtractsAndDeletesVersions) {
   store("v.ort", names("Net,1,Cat"), {{"Net", split("in OLD")}});
-  const QByteArray onlyFirst = bytesOf(path("v.ort"));
+  const QByteArray onlyFirst = readAll(path("v.ort"));
   const QString file =
       store("v.ort", names("Net,2,Cat,{G},Linked by Default,no,HIGH,g"), {{"Net", split("in NEW")}});
   ExternalTransformerNetwork first(file, 1, &definitions);
   EXPECT_TRUE(first.extractToFile(path("copy.ort"))) << qPrintable(first.extractError());
-  EXPECT_EQ(bytesOf(path("copy.ort")), onlyFirst);
+  EXPECT_EQ(readAll(path("copy.ort")), onlyFirst);
 
   ExternalTransformerNetwork network(file, 2, &definitions);
   network.turnOffMultiProcessing();
@@ -368,7 +361,7 @@ TEST_F(DocumentNetwork, ExtractsAndDeletesVersions) {
 
   EXPECT_TRUE(network.isDefinitionDeletable());
   EXPECT_TRUE(network.deleteDefinition());
-  EXPECT_EQ(bytesOf(file), onlyFirst);
+  EXPECT_EQ(readAll(file), onlyFirst);
   EXPECT_FALSE(network.deleteDefinition()) << "it is gone already";
   EXPECT_FALSE(network.extractToFile(path("copy.ort")));
   EXPECT_TRUE(ExternalTransformerNetwork(file, 1, &definitions).deleteDefinition());

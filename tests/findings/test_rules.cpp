@@ -1,4 +1,5 @@
 // The table of rules, its description for people, and what settings may do to it.
+#include <tests/support/Files.h>
 #include <tests/support/QtPrinters.h>
 #include <transform/findings/Refusal.h>
 #include <transform/findings/RuleSettings.h>
@@ -7,7 +8,6 @@
 #include <transform/text/MessageStrings.h>
 
 #include <QDir>
-#include <QFile>
 #include <QRegularExpression>
 #include <gtest/gtest.h>
 
@@ -28,9 +28,8 @@ QString about(orx::RuleKind kind) {
 }
 
 TEST(Rules, AreDescribedInTheirOrder) {
-  QFile file(QStringLiteral(ORX_SOURCE_DIR) + "/docs/diagnostics.md");
-  ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-  const QStringList sections = QString::fromUtf8(file.readAll()).split("\n## ").mid(1);
+  const QString text = QString::fromUtf8(readAll(ORX_SOURCE_DIR "/docs/diagnostics.md"));
+  const QStringList sections = text.split("\n## ").mid(1);
   ASSERT_EQ(sections.size(), static_cast<int>(orx::ruleTable().size()));
   static const QRegularExpression kForm(
       "^([a-z0-9-]+)\n\nSeverity: ([a-z, ]+)\n\n> ([^\n]+)\n\nMeaning: [^\n].{15,}\n\nRemedy: [^\n].{10,}$",
@@ -59,11 +58,8 @@ TEST(Rules, AreShownByExamples) {
   QByteArray said;
   for (const char* folder : {"/tests/data/broken/", "/tests/data/broken/mapping-files/"}) {
     const QString path = QStringLiteral(ORX_SOURCE_DIR) + folder;
-    for (const QString& name : QDir(path).entryList({"*.expected"})) {
-      QFile file(path + name);
-      ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-      said += file.readAll();
-    }
+    for (const QString& name : QDir(path).entryList({"*.expected"}))
+      said += readAll(path + name);
   }
   QStringList missing;
   for (const orx::RuleRow& rule : orx::ruleTable()) {

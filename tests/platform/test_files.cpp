@@ -1,10 +1,10 @@
+#include <tests/support/Files.h>
 #include <transform/files/AtomicFile.h>
 #include <transform/files/FolderListing.h>
 #include <transform/files/LineReader.h>
 #include <transform/files/TemporaryFile.h>
 
 #include <QDir>
-#include <QFile>
 #include <QTemporaryDir>
 #include <gtest/gtest.h>
 
@@ -15,17 +15,6 @@
 #include <unistd.h>
 
 namespace {
-
-QByteArray contentOf(const QString& name) {
-  QFile file(name);
-  return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(cannot be read)");
-}
-
-void put(const QString& name, const QByteArray& content) {
-  QFile file(name);
-  ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-  ASSERT_EQ(file.write(content), content.size());
-}
 
 unsigned modeOf(const QString& name) {
   struct stat status {};
@@ -78,17 +67,17 @@ class AtomicFiles : public testing::Test {
 TEST_F(AtomicFiles, AppearsWhenCommittedAndNeverWithout) {
   put(path("old"), "old");
   for (const char* name : {"new", "old"}) {
-    const QByteArray before = contentOf(path(name));
+    const QByteArray before = readAll(path(name));
     const QByteArray large(300 * 1000, 'x');
     for (const bool isCommitted : {false, true}) {
       AtomicFile file(path(name));
       ASSERT_TRUE(file.open()) << qPrintable(file.errorString());
       file.device().write("head\n");
       file.device().write(large);
-      EXPECT_EQ(contentOf(path(name)), before);
+      EXPECT_EQ(readAll(path(name)), before);
       EXPECT_TRUE(!isCommitted || (file.commit() && !file.commit()));
     }
-    EXPECT_EQ(contentOf(path(name)), "head\n" + large);
+    EXPECT_EQ(readAll(path(name)), "head\n" + large);
   }
   EXPECT_EQ(entries(), (QStringList{"new", "old"}));
 }
@@ -102,7 +91,7 @@ TEST_F(AtomicFiles, KeepsPermissions) {
     ASSERT_TRUE(file.open());
     ASSERT_TRUE(file.commit());
     EXPECT_EQ(modeOf(path("kept")), mode);
-    EXPECT_EQ(contentOf(path("kept")), "");
+    EXPECT_EQ(readAll(path("kept")), "");
   }
   AtomicFile fresh(path("fresh"));
   EXPECT_TRUE(fresh.open() && fresh.commit());
@@ -125,7 +114,7 @@ TEST_F(AtomicFiles, FollowsLinksToFilesThatStandAndThatDoNot) {
     file.device().write(name);
     ASSERT_TRUE(file.commit()) << name;
     EXPECT_TRUE(QFileInfo(path(name)).isSymLink());
-    EXPECT_EQ(contentOf(path(target)), name);
+    EXPECT_EQ(readAll(path(target)), name);
   }
   AtomicFile loop(path("loop"));
   EXPECT_FALSE(loop.open());
@@ -165,7 +154,7 @@ TEST_F(AtomicFiles, RefusesWhatMayNotBeWritten) {
       EXPECT_TRUE(file.errorString().endsWith(qt_error_string(EACCES))) << qPrintable(file.errorString());
     }
   }
-  EXPECT_EQ(contentOf(path("readonly")), "old");
+  EXPECT_EQ(readAll(path("readonly")), "old");
 }
 
 TEST_F(AtomicFiles, ReportsAFullDeviceHoweverLittleWasWritten) {
@@ -192,7 +181,7 @@ TEST_F(AtomicFiles, WritesToStandardOutputByEitherName) {
     AtomicFile file(QString::fromLatin1(name));
     EXPECT_TRUE(file.open() && file.device().write(QByteArray(name) + "\n") > 0 && file.commit());
   }
-  EXPECT_EQ(contentOf(path("redirected")), "before\n-\n/dev/stdout\n/dev/fd/1\n/proc/self/fd/1\n");
+  EXPECT_EQ(readAll(path("redirected")), "before\n-\n/dev/stdout\n/dev/fd/1\n/proc/self/fd/1\n");
   struct stat after {};
   ASSERT_EQ(::stat(path("redirected").toUtf8().constData(), &after), 0);
   EXPECT_EQ(before.st_ino, after.st_ino);
@@ -225,7 +214,7 @@ TEST_F(AtomicFiles, FindsItsPlaceAfterAChangeOfFolder) {
   file.device().write("here");
   ASSERT_TRUE(QDir::setCurrent(before));
   EXPECT_TRUE(file.commit()) << qPrintable(file.errorString());
-  EXPECT_EQ(contentOf(path("relative.txt")), "here");
+  EXPECT_EQ(readAll(path("relative.txt")), "here");
 }
 
 TEST_F(AtomicFiles, ReportsAPlaceThatWasTakenMeanwhile) {

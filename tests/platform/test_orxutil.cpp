@@ -1,8 +1,8 @@
 #include <platform/orxutil/orxutil.h>
 #include <platform/qorxcore/Language.h>
+#include <tests/support/Files.h>
 
 #include <QDir>
-#include <QFile>
 #include <QTemporaryDir>
 #include <gtest/gtest.h>
 
@@ -34,9 +34,7 @@ class Utilities : public testing::Test {
   QString put(const char* name, const QByteArray& content = "x") const {
     const QFileInfo info(path(name));
     EXPECT_TRUE(QDir().mkpath(info.path()));
-    QFile file(info.filePath());
-    EXPECT_TRUE(file.open(QIODevice::WriteOnly));
-    file.write(content);
+    ::put(info.filePath(), content);
     return info.path();
   }
 

@@ -1,7 +1,7 @@
 #include <tests/registry/RegistryFolders.h>
+#include <tests/support/Files.h>
 
 #include <QDir>
-#include <QFile>
 #include <QFileInfo>
 #include <gtest/gtest.h>
 
@@ -33,8 +33,7 @@ void RegistryFolders::set(const char* variable, const QString& value) {
 QString RegistryFolders::write(const QString& name, const QByteArray& content) {
   const QString whole = path(name);
   QDir().mkpath(QFileInfo(whole).path());
-  QFile file(whole);
-  EXPECT_TRUE(file.open(QIODevice::WriteOnly) && file.write(content) == content.size()) << qPrintable(whole);
+  put(whole, content);
   return whole;
 }
 

@@ -1,9 +1,9 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <tests/registry/RegistryFolders.h>
+#include <tests/support/Files.h>
 #include <transform/registry/DefinitionLint.h>
 
 #include <QElapsedTimer>
-#include <QFile>
 #include <QSet>
 #include <gtest/gtest.h>
 
@@ -13,11 +13,7 @@
 namespace {
 
 // Nothing in it is worth a word. Each case below spoils one piece.
-const QByteArray kSound = [] {
-  QFile file(QStringLiteral(ORX_SOURCE_DIR "/tests/data/definitions/sound.ort"));
-  file.open(QIODevice::ReadOnly);  // each case asks for its piece of it
-  return file.readAll();
-}();
+const QByteArray kSound = readAll(ORX_SOURCE_DIR "/tests/data/definitions/sound.ort");
 
 struct Case {
   const char* rule;

@@ -1,4 +1,5 @@
 #include <tests/registry/DefinitionFields.h>
+#include <tests/support/Files.h>
 #include <transform/registry/loading/CompanionFileParser.h>
 #include <transform/registry/loading/DefinitionFileParser.h>
 #include <transform/registry/loading/DefinitionIndex.h>
@@ -6,7 +7,6 @@
 
 #include <QBuffer>
 #include <QDirIterator>
-#include <QFile>
 #include <gtest/gtest.h>
 
 namespace {
@@ -147,10 +147,8 @@ TEST(DefinitionIndex, AgreesWithTheParser) {
   QDirIterator files(ORX_SOURCE_DIR "/fuzz/corpus/definitions", {"*.ort"});
   std::size_t found = 0;
   while (files.hasNext()) {
-    QFile file(files.next());
-    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    SCOPED_TRACE(file.fileName().toStdString());
-    const QByteArray text = file.readAll();
+    const QByteArray text = readAll(files.next());
+    SCOPED_TRACE(files.filePath().toStdString());
     const auto parser = parse(text, "f.ort");
     DefinitionIndex index;
     index.read(text);

@@ -1,19 +1,17 @@
 // The reference for whoever writes definitions says all there is to say, and nothing else.
 #include <platform/orxparameter/GUITypeTable.h>
 #include <tests/registry/RegistryFolders.h>
+#include <tests/support/Files.h>
 #include <transform/registry/DefinitionLint.h>
 #include <transform/registry/loading/DefinitionKeywords.h>
 
-#include <QFile>
 #include <QStringList>
 #include <gtest/gtest.h>
 
 namespace {
 
 QString reference() {
-  QFile file(QStringLiteral(ORX_SOURCE_DIR "/docs/definition-files.md"));
-  EXPECT_TRUE(file.open(QIODevice::ReadOnly));
-  return QString::fromUtf8(file.readAll());
+  return QString::fromUtf8(readAll(ORX_SOURCE_DIR "/docs/definition-files.md"));
 }
 
 // The rows of the table under a heading, without its head: cells of each, without code marks.

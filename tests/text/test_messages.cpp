@@ -1,8 +1,8 @@
 #include <platform/qorxcore/Language.h>
+#include <tests/support/Files.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QDirIterator>
-#include <QFile>
 #include <QHash>
 #include <QMap>
 #include <QRegularExpression>
@@ -15,10 +15,9 @@
 namespace {
 
 QMap<long, QString> readMessages(const QString& language) {
-  QFile file(QStringLiteral(ORX_SOURCE_DIR "/resources/messages/") + language + QStringLiteral(".msg"));
-  EXPECT_TRUE(file.open(QIODevice::ReadOnly));
+  const QByteArray text = readAll(ORX_SOURCE_DIR "/resources/messages/" + language + ".msg");
   QMap<long, QString> messages;
-  for (const QString& line : QString::fromUtf8(file.readAll()).split('\n')) {
+  for (const QString& line : QString::fromUtf8(text).split('\n')) {
     if (line.isEmpty() || line.startsWith('#')) {
       continue;
     }
@@ -57,9 +56,8 @@ QMap<QString, QString> readSources() {
     QDirIterator files(QStringLiteral(ORX_SOURCE_DIR "/") + folder, {"*.h", "*.cpp"}, QDir::Files,
                        QDirIterator::Subdirectories);
     while (files.hasNext()) {
-      QFile file(files.next());
-      EXPECT_TRUE(file.open(QIODevice::ReadOnly)) << file.fileName().toStdString();
-      sources.insert(file.fileName(), QString::fromUtf8(file.readAll()));
+      const QString path = files.next();
+      sources.insert(path, QString::fromUtf8(readAll(path)));
     }
   }
   return sources;

@@ -1,4 +1,5 @@
 #include <platform/session/ORXString.h>
+#include <tests/support/Files.h>
 #include <transform/text/MFFileBuffer.h>
 
 #include <QTemporaryDir>
@@ -10,10 +11,7 @@ class MFBufferTest : public testing::Test {
  protected:
   QString path() const { return m_folder.filePath("out.txt"); }
 
-  QByteArray bytes() const {
-    QFile file(path());
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(no file)");
-  }
+  QByteArray bytes() const { return readAll(path()); }
 
   // What a buffer writes for these texts and one flush.
   QByteArray written(const QStringList& texts, bool mangled = false, bool replaceDeferred = false) {

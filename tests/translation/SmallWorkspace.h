@@ -2,11 +2,11 @@
 // files.
 #pragma once
 
+#include <tests/support/Files.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerDefinition.h>
 #include <transform/core/TransformerSource.h>
 
-#include <QFile>
 #include <QString>
 #include <QStringList>
 #include <QTemporaryDir>
@@ -91,9 +91,7 @@ class SmallWorkspace {
   }
   QString save(const QTemporaryDir& folder, const QString& name = "test.orw") const {
     const QString path = folder.filePath(name);
-    QFile file(path);
-    if (!file.open(QIODevice::WriteOnly) || file.write(text().toUtf8()) < 0)
-      return QString();
+    put(path, text().toUtf8());
     return path;
   }
 

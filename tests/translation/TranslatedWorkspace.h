@@ -23,11 +23,6 @@ inline QStringList describe(const orx::Findings& diagnostics) {
   return result;
 }
 
-inline QString readAll(const QString& path) {
-  QFile file(path);
-  return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
-}
-
 // Small workspaces have loose ends; these rules have tests of their own.
 inline orx::RuleSettings withoutLooseEnds() {
   orx::RuleSettings settings;
@@ -52,7 +47,7 @@ inline Outcome translate(const SmallWorkspace& workspace, TransformerSource& sou
   for (const orx::Finding& diagnostic : diagnostics.all())
     outcome.texts << diagnostic.text;
   // Continuation lines joined and padding dropped: what is compared is the statements.
-  outcome.text = readAll(output)
+  outcome.text = QString::fromUtf8(QFile::exists(output) ? readAll(output) : "")
                      .replace(QRegularExpression(" +\\\\\n(# )?"), " ")
                      .replace(QRegularExpression(" +"), " ")
                      .replace("\n\n", "\n");

@@ -37,12 +37,10 @@ QByteArray enciphered(const QByteArray& plain) {
 }
 
 bool decipher(const QString& fileName, const QString& plainCopy) {
-  QFile file(fileName);
-  QFile copy(plainCopy);
-  if (!file.open(QIODevice::ReadOnly) || !copy.open(QIODevice::WriteOnly))
-    return false;
-  const QByteArray text = file.readAll().trimmed();
-  return text.startsWith(kSecret) && copy.write(QByteArray::fromBase64(text.mid(kSecret.size()))) > 0;
+  const QByteArray text = readAll(fileName).trimmed();
+  if (text.startsWith(kSecret))
+    put(plainCopy, QByteArray::fromBase64(text.mid(kSecret.size())));
+  return text.startsWith(kSecret);
 }
 
 class LinkedTranslation : public testing::Test {
@@ -208,9 +206,7 @@ TEST_F(LinkedTranslation, EncipheredOnesAreReadByARoutine) {
   for (const QByteArray& line : tidyDocument().split('\n'))
     comments += "#! " + line + '\n';
   store(tidyDocument());
-  QFile whole(file);
-  ASSERT_TRUE(whole.open(QIODevice::ReadOnly));
-  const QByteArray plainFile = whole.readAll();
+  const QByteArray plainFile = readAll(file);
   const struct {
     const char* promise;
     std::function<void()> make;

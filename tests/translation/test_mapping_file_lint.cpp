@@ -1,9 +1,9 @@
 // Mapping files of any content end in findings: quickly, with bounded memory, whatever stands in them.
+#include <tests/support/Files.h>
 #include <tests/support/QtPrinters.h>
 #include <translation/MappingFileLint.h>
 
 #include <QElapsedTimer>
-#include <QFile>
 #include <QMap>
 #include <QTemporaryDir>
 #include <gtest/gtest.h>
@@ -14,9 +14,7 @@ namespace {
 QStringList rulesOf(const QByteArray& text) {
   QTemporaryDir folder;
   const QString path = folder.filePath("f.mf");
-  QFile file(path);
-  EXPECT_TRUE(file.open(QIODevice::WriteOnly) && file.write(text) == text.size());
-  file.close();
+  put(path, text);
   const MappingFileFindings result = lintMappingFile(path, "f.mf", {});
   EXPECT_EQ(result.readError, QString());
   QStringList rules;

@@ -158,9 +158,3 @@ ScratchFile::ScratchFile(const QByteArray& content) {
 ScratchFile::~ScratchFile() {
   QFile::remove(m_name);
 }
-
-QByteArray ScratchFile::content() const {
-  QFile file(m_name);
-  EXPECT_TRUE(file.open(QIODevice::ReadOnly));
-  return file.readAll();
-}

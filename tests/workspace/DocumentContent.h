@@ -2,6 +2,7 @@
 #pragma once
 
 #include "RandomRecords.h"
+#include <tests/support/Files.h>
 #include <transform/workspace/XMLComponentReader.h>
 #include <transform/workspace/XMLComponentWriter.h>
 
@@ -48,7 +49,7 @@ class ScratchFile {
   explicit ScratchFile(const QByteArray& content);
   ~ScratchFile();
   const QString& name() const { return m_name; }
-  QByteArray content() const;
+  QByteArray content() const { return readAll(m_name); }
 
  private:
   QString m_name;

@@ -201,9 +201,8 @@ TEST(Reading, FilesAreSplitAndLinesAreThoseOfTheFile) {
   QHash<QString, QString> macros;
   const QString xml = XMLComponentReader::SplitWorkspace(file.name(), lines, &prompts, &macros);
   QFile xmlFile(xml);
-  ASSERT_TRUE(xmlFile.open(QIODevice::ReadOnly));
   EXPECT_TRUE(
-      xmlFile.readAll().startsWith("<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\r\n<WORKSPACE>\r\n<TRANS"));
+      readAll(xml).startsWith("<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\r\n<WORKSPACE>\r\n<TRANS"));
   EXPECT_EQ(xmlFile.permissions() & (QFile::ReadGroup | QFile::ReadOther | QFile::WriteOther), 0);
   EXPECT_TRUE(xmlFile.remove());
   EXPECT_EQ(prompts, (QHash<QString, QString>{{"NAME", "GUI TEXT NAME The name:"}}));
@@ -263,11 +262,9 @@ TEST(Reading, EmbeddedDocumentsAreFoundByLine) {
 TEST(Reading, EncipheredFilesAreReadFromAPlainCopy) {
   QString copy;
   ORW_setDecipherRoutine([&](const QString& fileName, const QString& plainCopy) {
-    QFile in(fileName);
-    QFile out(plainCopy);
     copy = plainCopy;
-    return in.open(QIODevice::ReadOnly) && in.read(6) == "CIPHER" && out.open(QIODevice::WriteOnly) &&
-           out.write("#! <WORKSPACE A='plain'/>\n") > 0;
+    put(plainCopy, "#! <WORKSPACE A='plain'/>\n");
+    return readAll(fileName) == "CIPHER";
   });
   EXPECT_TRUE(ORW_hasDecipherRoutine());
   XMLComponentReader reader;

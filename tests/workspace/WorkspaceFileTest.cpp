@@ -145,9 +145,7 @@ TEST(VersionStore, FurtherVersionsLeaveTheEarlierBytesAlone) {
     const QStringList fields{QString::fromUtf8("N\xc3\xa9"), QString::number(version), "Cat", "{12-34}"};
     ASSERT_TRUE(store.insert(fields, {"FACTORY_DEF a", ""}, written(contents.back()), error))
         << error.toStdString();
-    QFile file(name);
-    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-    const QByteArray bytes = file.readAll();
+    const QByteArray bytes = readAll(name);
     EXPECT_TRUE(bytes.startsWith("# ORW custom transformers\n# TRANSFORMER_BEGIN N\xc3\xa9,"));
     EXPECT_TRUE(bytes.endsWith(earlier));
     earlier = bytes.mid(bytes.indexOf('\n') + 1);
@@ -189,9 +187,7 @@ TEST(VersionStore, FurtherVersionsLeaveTheEarlierBytesAlone) {
     EXPECT_FALSE(error.isEmpty());
   }
   EXPECT_FALSE(store.insert({"a", "4", "c"}, {"TRANSFORMER_END"}, document, error));
-  QFile file(name);
-  ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-  EXPECT_TRUE(file.readAll().endsWith(earlier));
+  EXPECT_TRUE(readAll(name).endsWith(earlier));
   const ScratchFile other("#! <WORKSPACE/>\n");
   EXPECT_FALSE(VersionStore(other.name()).insert({"a", "4", "c"}, {}, document, error));
 }

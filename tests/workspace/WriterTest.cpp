@@ -63,9 +63,8 @@ TEST(Writer, LayoutIsExact) {
   port.attributes[1].attrValue = QLatin1String("");
   content.documents["z"].transformers = {transformer};
   content.documents["z"].ports = {port};
-  QFile file(QStringLiteral(ORX_SOURCE_DIR "/tests/data/documents/layout.xml"));
-  ASSERT_TRUE(file.open(QIODevice::ReadOnly));
-  EXPECT_EQ(written(content).toStdString(), file.readAll().toStdString());
+  EXPECT_EQ(written(content).toStdString(),
+            readAll(ORX_SOURCE_DIR "/tests/data/documents/layout.xml").toStdString());
 }
 
 TEST(Writer, TypesAndModesAreWrittenByName) {
