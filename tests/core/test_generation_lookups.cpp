@@ -44,29 +44,6 @@ QString expanded(const QString& text) {
   return expandMacros(text, {{"Q", "q"}});
 }
 
-QStringList expandedAll(QStringList texts) {
-  for (QString& text : texts) {
-    text = expanded(text);
-  }
-  return texts;
-}
-
-// Whether the fragment defines the macro, with this value but for blanks around it.
-bool defines(const QStringList& statements, const QString& given, const QString& expected) {
-  TestEngine engine(macrosOf(given));
-  engine.run(statements);
-  return engine.error.isEmpty() && engine.macros.value("mac", "?") == expanded(expected).trimmed() &&
-         engine.macros.size() == 3;
-}
-
-bool complains(const QStringList& statements, const BoxLookup& lookup) {
-  TestEngine engine(macrosOf(""));
-  engine.run(statements);
-  return engine.error == "exit" && !engine.macros.contains("mac") &&
-         engine.messages ==
-             QStringList(expanded(lookup.identifier + " - '" + lookup.prompt + "' must be given a value."));
-}
-
 // The entries as the configuration gives them: a line break in a shown side is kept as its word there.
 QVector<Entry> entriesOf(const QVector<Entry>& given) {
   QVector<Entry> entries;
@@ -91,32 +68,73 @@ struct Counts {
   }
 };
 
-QStringList written(const std::function<void(MFBuffer&)>& write) {
-  TextBuffer buffer;
-  write(buffer);
-  return readStatements(buffer.text());
-}
+// What a writer leaves behind: the statement, and the call for the value when the statement does not define
+// the macro itself.
+class Fragment {
+ public:
+  explicit Fragment(const std::function<QString(MFBuffer&)>& write) {
+    TextBuffer buffer;
+    m_call = write(buffer);
+    m_statements = readStatements(buffer.text());
+  }
+  bool isOneStatement() const {
+    return m_statements.size() == 1 && !m_call.contains('\n') && !m_call.contains('\r');
+  }
+  // Whether a run gives this value and touches nothing else; blanks around a macro's value do not count.
+  bool gives(const QString& given, const QString& expected) const {
+    TestEngine engine(macrosOf(given));
+    engine.run(m_statements);
+    if (!m_call.isEmpty())
+      return engine.call(m_call) == expanded(expected) && engine.error.isEmpty();
+    return engine.error.isEmpty() && engine.macros.value("mac", "?") == expanded(expected).trimmed() &&
+           engine.macros.size() == 3;
+  }
+  bool givesAll(const QVector<Entry>& entries) const {
+    return std::all_of(entries.begin(), entries.end(),
+                       [&](const Entry& entry) { return gives(entry.first, entry.second); });
+  }
+  bool givesList(const QVector<Entry>& entries) const {
+    QStringList shown;
+    QStringList stored;
+    for (const Entry& entry : entries) {
+      shown << entry.first;
+      stored << expanded(entry.second);
+    }
+    TestEngine engine(macrosOf(QORXListToSdfString(shown, ' ')));
+    engine.run(m_statements);
+    return engine.error.isEmpty() && engine.macros.size() == 3 &&
+           QORXSdfStringToList(engine.macros.value("mac"), ' ') == stored;
+  }
+  // Whether no value is taken as the parameter says: as one, or with a complaint.
+  bool knowsEmpty(const BoxLookup& lookup) const {
+    if (lookup.isOptional)
+      return gives("", "");
+    TestEngine engine(macrosOf(""));
+    engine.run(m_statements);
+    return engine.error == "exit" && !engine.macros.contains("mac") &&
+           engine.messages ==
+               QStringList(expanded(lookup.identifier + " - '" + lookup.prompt + "' must be given a value."));
+  }
+
+ private:
+  QString m_call;
+  QStringList m_statements;
+};
 
 bool choiceBoxIsRight(const QVector<Entry>& given, const BoxLookup& lookup) {
   const QVector<Entry> entries = entriesOf(given);
-  const QStringList statements =
-      written([&](MFBuffer& buffer) { lookup_writers::writeChoiceBox(buffer, choicesOf(entries), lookup); });
-  if (statements.size() != 1) {
-    return false;
-  }
-  bool right = true;
-  bool emptyIsChoice = false;
-  for (const Entry& entry : entries) {
-    emptyIsChoice = emptyIsChoice || entry.first.isEmpty();
-    right = right && (lookup.value != "$(G)" || defines(statements, entry.first, entry.second));
-  }
-  right = right && defines(statements, "other", QString(lookup.value).replace("$(G)", "other"));
-  right = right && (showsQuestionMark(entries) ||
-                    defines(statements, "?", QString(lookup.value).replace("$(G)", "?")));
-  if (!emptyIsChoice && lookup.value == "$(G)") {
-    right = right && (lookup.isOptional ? defines(statements, "", "") : complains(statements, lookup));
-  }
-  return right;
+  const Fragment fragment([&](MFBuffer& buffer) {
+    lookup_writers::writeChoiceBox(buffer, choicesOf(entries), lookup);
+    return QString();
+  });
+  const auto valueFor = [&](const char* text) { return QString(lookup.value).replace("$(G)", text); };
+  const bool isPlain = lookup.value == "$(G)";
+  const bool emptyIsChoice =
+      std::any_of(entries.begin(), entries.end(), [](const Entry& entry) { return entry.first.isEmpty(); });
+  return fragment.isOneStatement() && (!isPlain || fragment.givesAll(entries)) &&
+         fragment.gives("other", valueFor("other")) &&
+         (showsQuestionMark(entries) || fragment.gives("?", valueFor("?"))) &&
+         (!isPlain || emptyIsChoice || fragment.knowsEmpty(lookup));
 }
 
 TEST(Lookups, ChoiceBoxRefusesExactlyWhatGoesWrong) {
@@ -149,29 +167,18 @@ TEST(Lookups, ChoiceBoxRefusesExactlyWhatGoesWrong) {
 
 bool listBoxIsRight(const QVector<Entry>& given, const BoxLookup& lookup) {
   const QVector<Entry> entries = entriesOf(given);
-  const ChoiceList choices = choicesOf(entries);
-  const QStringList statements =
-      written([&](MFBuffer& buffer) { lookup_writers::writeListBox(buffer, choices, lookup); });
-  if (statements.size() != 1) {
-    return false;
-  }
-  const auto isMapped = [&](const QStringList& shown, const QStringList& stored) {
-    TestEngine engine(macrosOf(QORXListToSdfString(shown, ' ')));
-    engine.run(statements);
-    return engine.error.isEmpty() && engine.macros.size() == 3 &&
-           QORXSdfStringToList(engine.macros.value("mac"), ' ') == expandedAll(stored);
-  };
-  bool right = lookup.isOptional ? defines(statements, "", "") : complains(statements, lookup);
-  right = right && (showsQuestionMark(entries) || isMapped({"?"}, {"?"}));
-  for (const Entry& first : entries) {
-    right = right && isMapped({first.first}, {first.second});
-    for (const Entry& second : entries) {
-      right = right && isMapped({first.first, second.first}, {first.second, second.second});
-      for (const Entry& third : entries) {
-        right = right && isMapped({first.first, second.first, third.first},
-                                  {first.second, second.second, third.second});
-      }
-    }
+  const Fragment fragment([&](MFBuffer& buffer) {
+    lookup_writers::writeListBox(buffer, choicesOf(entries), lookup);
+    return QString();
+  });
+  bool right = fragment.isOneStatement() && fragment.knowsEmpty(lookup) &&
+               (showsQuestionMark(entries) || fragment.givesList({{"?", "?"}}));
+  QVector<QVector<Entry>> lists{{}};
+  for (int i = 0; right && i < lists.size(); ++i) {
+    const QVector<Entry> list = lists.at(i);
+    right = list.isEmpty() || fragment.givesList(list);
+    for (const Entry& entry : list.size() < 3 ? entries : QVector<Entry>())
+      lists.append(list + QVector<Entry>{entry});
   }
   return right;
 }
@@ -201,24 +208,13 @@ TEST(Lookups, ListBoxRefusesExactlyWhatGoesWrong) {
 bool procedureIsRight(const QVector<Entry>& given, const QString& value) {
   const QVector<Entry> entries = entriesOf(given);
   const ChoiceList choices = choicesOf(entries);
-  QString call;
-  const QStringList statements = written(
-      [&](MFBuffer& buffer) { call = lookup_writers::writeChoiceProcedure(buffer, choices, "g1_P", value); });
-  if (statements.size() != 1 || call.contains('\n') || call.contains('\r')) {
-    return false;
-  }
-  const auto gives = [&](const QString& text, const QString& expected) {
-    TestEngine engine(macrosOf(text));
-    engine.run(statements);
-    return engine.error.isEmpty() && engine.call(call) == expanded(expected) && engine.error.isEmpty();
-  };
-  bool right =
-      gives("other", value == "$(G)" ? "other" : choices.toStored(QString(value).replace("$(G)", "other")));
-  right = right && (value != "$(G)" || showsQuestionMark(entries) || gives("?", "?"));
-  for (const Entry& entry : entries) {
-    right = right && (value != "$(G)" || gives(entry.first, entry.second));
-  }
-  return right;
+  const Fragment fragment(
+      [&](MFBuffer& buffer) { return lookup_writers::writeChoiceProcedure(buffer, choices, "g1_P", value); });
+  if (value != "$(G)")
+    return fragment.isOneStatement() &&
+           fragment.gives("other", choices.toStored(QString(value).replace("$(G)", "other")));
+  return fragment.isOneStatement() && fragment.gives("other", "other") && fragment.givesAll(entries) &&
+         (showsQuestionMark(entries) || fragment.gives("?", "?"));
 }
 
 TEST(Lookups, ChoiceProcedureRefusesExactlyWhatGoesWrong) {
