@@ -43,6 +43,11 @@ TransformerMgr& RegistryFolders::load() {
   return registry;
 }
 
+QByteArray tidyDocument(int build) {
+  return readAll(ORX_SOURCE_DIR "/tests/data/documents/tidy.xml")
+      .replace("_BUILD=\"1\"", "_BUILD=\"" + QByteArray::number(build) + '"');
+}
+
 QByteArray definitionText(const char* name, int version, const QByteArray& header) {
   return QByteArray("TRANSFORMER_NAME: ") + name + "\nVERSION: " + QByteArray::number(version) +
          "\nINPUT_TAGS: INPUT\nOUTPUT_TAGS: OUTPUT\n" + header +

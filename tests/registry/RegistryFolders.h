@@ -37,5 +37,7 @@ class RegistryFolders {
   std::map<QByteArray, QByteArray> m_before;
 };
 
+// The document of the custom transformer "Tidy": IN, OUT, LIMIT, inside "Other".
+QByteArray tidyDocument(int build = 1);
 // A definition with one input, one output and, between the two, the given header lines.
 QByteArray definitionText(const char* name, int version, const QByteArray& header = QByteArray());

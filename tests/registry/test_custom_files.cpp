@@ -15,22 +15,9 @@ namespace {
 
 using Copy = std::unique_ptr<TransformerCfg>;
 
-// A document with the custom transformer "Cleaner": input IN, output `output`, parameter LIMIT.
-QByteArray document(const QString& output, int build) {
-  return QString(
-             "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n"
-             "<TRANSFORMER>\n<SUBDOCUMENTS>\n<SUBDOCUMENT NAME=\"Cleaner\" LAST_SAVE_BUILD=\"%2\">\n"
-             "<GLOBAL_PARAMETERS>\n<GLOBAL_PARAMETER GUI_LINE=\"GUI TEXT LIMIT Limit\" "
-             "DEFAULT_VALUE=\"5\"/>\n"
-             "</GLOBAL_PARAMETERS>\n<SUBDOCUMENT_IOS>\n"
-             "<SUBDOCUMENT_IO IDENTIFIER=\"1\" NAME=\"IN\" IS_SOURCE=\"true\"/>\n"
-             "<SUBDOCUMENT_IO IDENTIFIER=\"2\" NAME=\"%1\" IS_SOURCE=\"false\"/>\n</SUBDOCUMENT_IOS>\n"
-             "<FEAT_LINKS>\n<FEAT_LINK IDENTIFIER=\"1\" SOURCE_NODE=\"1\" TARGET_NODE=\"2\" "
-             "SOURCE_PORT_DESC=\"fo 0\" TARGET_PORT_DESC=\"fi 0\"/>\n</FEAT_LINKS>\n"
-             "</SUBDOCUMENT>\n</SUBDOCUMENTS>\n</TRANSFORMER>\n")
-      .arg(output)
-      .arg(build)
-      .toUtf8();
+// The document of the custom transformer "Cleaner".
+QByteArray document(const QByteArray& output, int build) {
+  return tidyDocument(build).replace("Tidy", "Cleaner").replace("\"OUT\"", '"' + output + '"');
 }
 
 // Puts versions in front of each other, the last one given first in the file: version, build.
@@ -39,7 +26,7 @@ void writeVersions(const QString& path, const std::vector<std::pair<int, int>>& 
     QString error;
     ASSERT_TRUE(VersionStore(path).insert(
         {"Cleaner", QString::number(version), "Mine", QString("{GUID%1}").arg(version)}, {},
-        document(QString("OUT%1").arg(version), build), error))
+        document("OUT" + QByteArray::number(version), build), error))
         << error.toStdString();
   }
 }

@@ -10,25 +10,6 @@
 #include <QDir>
 
 namespace {
-// -----------------------------------------------------------------------------------
-
-// The document of the custom transformer "Tidy": IN, OUT, LIMIT, inside "Other".
-QByteArray tidyDocument(int build = 1) {
-  return QString(
-             "<?xml version=\"1.0\" encoding=\"UTF-8\" ?>\n<TRANSFORMER>\n<SUBDOCUMENTS>\n"
-             "<SUBDOCUMENT NAME=\"Tidy\" LAST_SAVE_BUILD=\"%1\">\n<GLOBAL_PARAMETERS>\n"
-             "<GLOBAL_PARAMETER GUI_LINE=\"GUI TEXT LIMIT Limit\" DEFAULT_VALUE=\"5\"/>\n"
-             "</GLOBAL_PARAMETERS>\n<TRANSFORMERS>\n<TRANSFORMER IDENTIFIER=\"3\" TYPE=\"Other\" "
-             "VERSION=\"1\"/>\n"
-             "</TRANSFORMERS>\n<SUBDOCUMENT_IOS>\n"
-             "<SUBDOCUMENT_IO IDENTIFIER=\"1\" NAME=\"IN\" IS_SOURCE=\"true\"/>\n"
-             "<SUBDOCUMENT_IO IDENTIFIER=\"2\" NAME=\"OUT\" IS_SOURCE=\"false\"/>\n</SUBDOCUMENT_IOS>\n"
-             "<FEAT_LINKS>\n<FEAT_LINK IDENTIFIER=\"1\" SOURCE_NODE=\"1\" TARGET_NODE=\"2\" "
-             "SOURCE_PORT_DESC=\"fo 0\" TARGET_PORT_DESC=\"fi 0\"/>\n</FEAT_LINKS>\n"
-             "</SUBDOCUMENT>\n</SUBDOCUMENTS>\n</TRANSFORMER>\n")
-      .arg(build)
-      .toUtf8();
-}
 
 const QByteArray kSecret = QByteArrayLiteral("ORW-SECRET ");
 
