@@ -1,6 +1,7 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <platform/session/session.h>
 #include <tests/registry/RegistryFolders.h>
+#include <tests/support/LanguageGuard.h>
 #include <transform/core/TransformerCfg.h>
 
 #include <gtest/gtest.h>
@@ -11,17 +12,6 @@
 namespace {
 
 using Copy = std::unique_ptr<TransformerCfg>;
-
-class LanguageGuard {
- public:
-  explicit LanguageGuard(const char* language) : m_before(QORXLanguage()) {
-    QORXSetLanguage(QString::fromLatin1(language));
-  }
-  ~LanguageGuard() { QORXSetLanguage(m_before); }
-
- private:
-  QString m_before;
-};
 
 }  // namespace
 

@@ -1,5 +1,6 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <platform/session/session.h>
+#include <tests/support/LanguageGuard.h>
 #include <tests/support/QtPrinters.h>
 #include <tests/support/TextBuffer.h>
 #include <transform/core/TransformerCfg.h>
@@ -37,11 +38,8 @@ class ShippedDefinitions : public testing::TestWithParam<const char*> {
     qputenv("ORX_HOME", kResources.toUtf8());
     qputenv("XDG_DATA_HOME", QByteArray(ORX_BINARY_DIR "/nothing"));
     qputenv("ORX_TRANSFORMER_PATH", QByteArray());
-    m_language = QORXLanguage();
-    QORXSetLanguage(QString::fromLatin1(GetParam()));
     registry().loadTransformers(&m_session);
   }
-  void TearDown() override { QORXSetLanguage(m_language); }
   static TransformerMgr& registry() { return TransformerMgr::getTransformerMgr(); }
 
   // A copy of every version of every definition.
@@ -56,7 +54,7 @@ class ShippedDefinitions : public testing::TestWithParam<const char*> {
     }
   }
 
-  QString m_language;
+  const LanguageGuard m_language{GetParam()};
   ORXSession m_session;
 };
 

@@ -1,5 +1,5 @@
-#include <platform/qorxcore/Language.h>
 #include <tests/support/Files.h>
+#include <tests/support/LanguageGuard.h>
 #include <transform/text/MessageStrings.h>
 
 #include <QDirIterator>
@@ -39,15 +39,6 @@ QSet<QString> placeholders(const QString& text) {
   }
   return found;
 }
-
-class LanguageGuard {
- public:
-  explicit LanguageGuard(const QString& language) : m_before(QORXLanguage()) { QORXSetLanguage(language); }
-  ~LanguageGuard() { QORXSetLanguage(m_before); }
-
- private:
-  QString m_before;
-};
 
 // Of the library and the command, by path.
 QMap<QString, QString> readSources() {
