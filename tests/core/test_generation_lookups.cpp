@@ -280,6 +280,7 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
     TestParameter parameter;
     QString line;
     long number;  // 0: fine
+    QStringList arguments = {};
   };
   const QString members =
       "MULTIPARAMETER " + MemberList::configToken(',', {GUIType::fromGuiLine("GUI TEXT A a"),
@@ -332,6 +333,13 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", members, "A,in $(B),B,OUTPUT"}, "K $(A)", kKeywordInValue},
       {{"P", members, "A,$(B)@Value(a),B,@Value(b)"}, "K $(A)", kReferenceBreaks},
       {{"P", members, "A,$(B)@Value(a),B,b c"}, "K $(A)", 0},
+      {{"P", members, "A,x"}, "K $(A)", kMemberLeftOut, {"B"}},
+      {{"P", members, "A,x,B"}, "K $(A)", kMemberLeftOut, {"B"}},
+      {{"P", members, "A,x,B,y,C"}, "K $(A)", kNoSuchPart, {"C", "A, B"}},
+      {{"P", members, "@Value(a)"}, "K $(A)", kNoSuchPart, {"@Value(a)", "A, B"}},
+      {{"P", members, "A,x,B,y,A,x"}, "K $(A)", kPartTwice, {"A"}},
+      {{"P", members, "A,x,B,y,ORX_CONTROLLER_QUERY_FILE,z"}, "K $(A)", 0},
+      {{"P", members, "ORX_CONDITIONAL:1;A<comma>x<comma>B<comma>y"}, "K $(A)", kConditionForParts},
       // What the listener knows.
       {{"P", "TEXT_OR_ATTR", "$(Gabc)@Value(a)"}, "K $(P)", 0},
       {{"P", "TEXT_OR_ATTR", "$(Ga,b)@Value(a)"}, "K $(P)", kReferenceBreaks},
@@ -353,7 +361,7 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
     QHash<QString, QString> expected;
     if (c.number != 0) {
       ASSERT_FALSE(TransformResString(c.number).isEmpty());
-      expected.insert(c.parameter.name, TransformResString(c.number));
+      expected.insert(c.parameter.name, TransformResString(c.number, c.arguments));
     }
     EXPECT_EQ(cfg->findUnwritableValues(), expected)
         << c.parameter.type.toStdString() << ' ' << c.parameter.value.toStdString() << ' '

@@ -112,6 +112,35 @@ TEST(Values, MembersAndCells) {
                          "@EvaluateExpression(FDIV,INT,T.B,@Value(z))"}));
 }
 
+TEST(Values, MembersWithoutValues) {
+  struct Case {
+    const char* flags;
+    const char* flagsOfB;
+    const char* value;
+    const char* written;
+  };
+  const Case cases[] = {
+      {"OPTIONAL ", "", "", "K A|K B"},
+      {"OPTIONAL ", "", "<Unused>", "K A|K B"},
+      {"OPTIONAL OMITTABLE ", "", "", ""},
+      {"OPTIONAL OMITTABLE ", "", "<Unused>", ""},
+      {"OPTIONAL OMITTABLE ", "OPTIONAL ", "A,1", "K A 1|K B"},
+      {"", "OPTIONAL ", "A,1", "K A 1|K B"},
+      {"", "OPTIONAL OMITTABLE ", "A,1", "K A 1"},
+      {"", "OPTIONAL OMITTABLE ", "A,1,B", "K A 1"},
+      {"", "OPTIONAL OMITTABLE ", "A,1,B,<Unused>", "K A 1"},
+      {"", "OPTIONAL OMITTABLE ", "A,1,B,2", "K A 1|K B 2"},
+  };
+  for (const Case& c : cases) {
+    const QString config =
+        MemberList::configToken(',', {GUIType::fromGuiLine("GUI INT A a"),
+                                      GUIType::fromGuiLine(QString("GUI %1INT B b").arg(c.flagsOfB))});
+    const auto cfg = makeCfg(
+        {{}, {}, {{"M", c.flags + QString("MULTIPARAMETER ") + config, c.value}}, {"K A $(A)", "K B $(B)"}});
+    EXPECT_EQ(statementsOf(*cfg).join('|').toStdString(), c.written) << c.flags << c.flagsOfB << c.value;
+  }
+}
+
 TEST(Values, EncodingAroundReferences) {
   const QVector<QPair<QString, QString>> cases{
       {"a b", "a<space>b"},

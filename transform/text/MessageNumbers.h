@@ -440,5 +440,8 @@ constexpr long kNoParallelLevel = 371324;
 constexpr long kScriptReadsUnknown = 371325;
 constexpr long kScriptReadsLater = 371326;
 constexpr long kMemberLeftOut = 371327;
+constexpr long kNoSuchPart = 371328;
+constexpr long kPartTwice = 371329;
+constexpr long kConditionForParts = 371330;
 
 }  // namespace orx::messages

@@ -103,20 +103,27 @@ void ParameterSubstitution::collect(std::size_t position, MFBuffer& buffer) {
   const QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
   if (record.isMultiParameter()) {
     const QStringList parts = partsOf(record, value);
-    QSet<QString> given;
+    QHash<QString, QString> given;
     for (int i = 0; i + 1 < parts.size(); i += 2) {
-      add(parts.at(i), parts.at(i + 1), record.members().find(parts.at(i)), true);
-      given.insert(parts.at(i));
+      if (!given.contains(parts.at(i))) {
+        add(parts.at(i), parts.at(i + 1), record.members().find(parts.at(i)), true);
+        given.insert(parts.at(i), parts.at(i + 1));
+      }
     }
+    const bool isOmitted = isUnsetValue(value) && record.getFlag(kGUITypeOmittable);
     for (const GUIType& member : record.members().members()) {
-      if (!given.contains(member.getName())) {
-        add(member.getName(), QString(), nullptr, false);
+      const QString& token = member.getName();
+      if (isOmitted || (member.getFlag(kGUITypeOmittable) && isUnsetValue(given.value(token)))) {
+        entry.removed << token;
+      }
+      if (!given.contains(token)) {
+        add(token, QString(), nullptr, false);
       }
     }
     return;
   }
   if (isUnsetValue(value) && record.getFlag(kGUITypeOmittable)) {
-    entry.removesLines = true;
+    entry.removed << name;
     return;
   }
   add(name, value, &record, name != kIdentifierParameter && WrittenValues::hasValue(record));
@@ -136,9 +143,9 @@ QHash<QString, QString> ParameterSubstitution::byToken() const {
 
 void ParameterSubstitution::putInto(Substitution& lines) const {
   const bool wantsList = lines.contains(kValueListToken);
-  for (std::size_t position = 0; position < m_entries.size(); ++position) {
-    if (m_entries[position].removesLines) {
-      lines.removeLinesWith(m_records[position].getName());
+  for (const Entry& entry : m_entries) {
+    for (const QString& token : entry.removed) {
+      lines.removeLinesWith(token);
     }
   }
   for (const Entry& entry : m_entries) {

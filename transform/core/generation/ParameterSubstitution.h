@@ -44,7 +44,7 @@ class ParameterSubstitution {
     bool isListed;  // in the value list
   };
   struct Entry {
-    bool removesLines = false;
+    QStringList removed;  // tokens whose lines go away
     std::vector<Token> tokens;
   };
 

@@ -34,16 +34,37 @@ using namespace lookup_checks;
 
 const QLatin1String kTclCall("@Tcl2(");
 
-// Whether the value leaves out a member that has to have one: its token would be left over.
-bool lacksMember(const QString& value, const MemberList& members) {
+// The tokens of members stand for the parts of the value that bear their names, so that a part of another
+// name would be lost, and one that is missing would leave its token empty.
+QString faultOfParts(const QString& value, const MemberList& members) {
+  if (value.startsWith(kConditionalPrefix)) {
+    return TransformResString(messages::kConditionForParts);
+  }
   const QStringList parts = QORXSdfStringToList(value, members.separator());
-  return std::any_of(members.members().begin(), members.members().end(), [&](const GUIType& member) {
-    bool isGiven = member.getFlag(kGUITypeOptional) || member.getName() == kControllerQueryFile;
-    for (int i = 0; i + 1 < parts.size() && !isGiven; i += 2) {
-      isGiven = parts.at(i) == member.getName();
+  QSet<QString> given;
+  for (int i = 0; i < parts.size(); i += 2) {
+    const QString& name = parts.at(i);
+    if (!members.find(name) && name != kControllerQueryFile) {
+      QStringList known;
+      for (const GUIType& member : members.members()) {
+        known << member.getName();
+      }
+      return TransformResString(messages::kNoSuchPart, {name, known.join(QLatin1String(", "))});
     }
-    return !isGiven;
-  });
+    if (given.contains(name)) {
+      return TransformResString(messages::kPartTwice, name);
+    }
+    if (i + 1 < parts.size()) {
+      given.insert(name);
+    }
+  }
+  for (const GUIType& member : members.members()) {
+    const QString& name = member.getName();
+    if (!member.getFlag(kGUITypeOptional) && name != kControllerQueryFile && !given.contains(name)) {
+      return TransformResString(messages::kMemberLeftOut, name);
+    }
+  }
+  return QString();
 }
 
 }  // namespace
@@ -66,16 +87,21 @@ MappingFileChecks::MappingFileChecks(const TransformerCfg& cfg, const std::vecto
 QHash<QString, QString> MappingFileChecks::find() const {
   QHash<QString, QString> messages;
   for (const TransformParamCfg& record : m_records) {
-    if (const long number = refuse(record)) {
+    const QString stored = stripBasicStringInfo(m_cfg.getParameterValue(record.getName()));
+    const QString fault = record.isMultiParameter() && !isUnsetValue(stored)
+                              ? faultOfParts(stored, record.members())
+                              : QString();
+    if (!fault.isEmpty()) {
+      messages.insert(record.getName(), fault);
+    } else if (const long number = refuse(record, stored)) {
       messages.insert(record.getName(), TransformResString(number));
     }
   }
   return messages;
 }
 
-long MappingFileChecks::refuse(const TransformParamCfg& record) const {
+long MappingFileChecks::refuse(const TransformParamCfg& record, const QString& stored) const {
   const QString& name = record.getName();
-  const QString stored = stripBasicStringInfo(m_cfg.getParameterValue(name));
   if (const long number = refuseParallelSetting(record, stored)) {
     return number;
   }
@@ -84,9 +110,6 @@ long MappingFileChecks::refuse(const TransformParamCfg& record) const {
   }
   if (!m_written.contains(record)) {
     return 0;
-  }
-  if (record.isMultiParameter() && !isUnsetValue(stored) && lacksMember(stored, record.members())) {
-    return messages::kMemberLeftOut;
   }
   NullBuffer buffer;
   QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);

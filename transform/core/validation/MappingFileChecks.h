@@ -31,7 +31,7 @@ class MappingFileChecks {
 
  private:
   // Message numbers, 0 for nothing to refuse.
-  long refuse(const TransformParamCfg& record) const;
+  long refuse(const TransformParamCfg& record, const QString& stored) const;
   long refuseIdentifier(const QString& value) const;
   long refuseLookup(const TransformParamCfg& record, const QString& value) const;
   long refuseParallelSetting(const TransformParamCfg& record, const QString& stored) const;

@@ -44,12 +44,24 @@ QString sortedList(const QSet<QString>& names) {
 }  // namespace
 
 TemplateLint::TemplateLint(const LintedDefinition& definition, LintReport& report)
-    : m_definition(definition), m_report(report) {
+    : m_definition(definition), m_report(report), m_tokens(definition.parameterNames()) {
+  QSet<QString> members;
   for (const LintedParameter& parameter : definition.parameters()) {
-    if (parameter.type.getFlag(kGUITypeOmittable)) {
+    const bool isOmittable = parameter.type.getFlag(kGUITypeOmittable);
+    if (parameter.type.getType() == kMultiParameterType) {
+      m_tokens.remove(parameter.name);
+      const MemberList list(parameter.type);
+      for (const GUIType& member : list.members()) {
+        members.insert(member.getName());
+        if (isOmittable || member.getFlag(kGUITypeOmittable)) {
+          m_omittables.insert(member.getName());
+        }
+      }
+    } else if (isOmittable) {
       m_omittables.insert(parameter.name);
     }
   }
+  m_tokens += members;
 }
 
 void TemplateLint::add(Rule rule, long message, int line, const QStringList& arguments) {
@@ -129,7 +141,7 @@ TemplateLint::LineTokens TemplateLint::takeTokens(const DefinitionLine& line) {
   while (scanner.next()) {
     const QString token = scanner.name().toString();
     // A parameter may bear a name that looks like a port's.
-    if (m_definition.parameterNames().contains(token) && !isInstanceToken(token)) {
+    if (m_tokens.contains(token) && !isInstanceToken(token)) {
       tokens.parameters.insert(token);
       m_used.insert(token);
     } else if (token == kValueListToken) {

@@ -34,6 +34,7 @@ class TemplateLint {
 
   const LintedDefinition& m_definition;
   LintReport& m_report;
+  QSet<QString> m_tokens;  // of the parameters; a multi-parameter has only those of its members
   QSet<QString> m_omittables;
   QSet<QString> m_macros;  // that statements of the template define
   QSet<QString> m_used;    // parameters
