@@ -4,6 +4,7 @@
 #include <transform/custom/ExternalDocNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
+#include <transform/findings/Refusal.h>
 #include <transform/workspace/DocumentCopy.h>
 #include <transform/workspace/TransformerRecords.h>
 #include <translation/CustomExtraction.h>
@@ -59,9 +60,11 @@ bool CustomExtraction::prepare(const QString& name, int version, orx::Findings& 
   ExternalDocNetwork* network = library.network(name);
   if (!network || !makeDefinition(library, diagnostics))
     return false;
+  const orx::RefusalListener listener;
   const QString fault = findPrefixFault(*network);
   if (!fault.isEmpty()) {
-    diagnostics.reportText(Rule::Nesting, m_reader.GetDocumentLine(name), name, fault);
+    diagnostics.reportText(Rule::Nesting, m_reader.GetDocumentLine(name), name, fault,
+                           listener.refusal().message);
     return false;
   }
   const int stored = version > 0 ? version : network->getVersion();

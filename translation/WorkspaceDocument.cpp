@@ -81,6 +81,24 @@ std::vector<WorkspaceLossReport::Loss> WorkspaceDocument::losses() const {
   return losses;
 }
 
+orx::Finding WorkspaceDocument::findingOf(const WorkspaceLossReport::Loss& loss) {
+  using Kind = WorkspaceLossReport::Kind;
+  orx::Finding finding;
+  finding.rule = Rule::LostContent;
+  finding.line = loss.line;
+  finding.text = loss.describe();
+  finding.message = loss.message();
+  if (loss.kind == Kind::MalformedValue)
+    finding.rule = Rule::MalformedValue;
+  else if (loss.kind == Kind::UnknownAttribute)
+    finding.rule = Rule::UnknownAttribute;
+  else if (loss.kind == Kind::UnknownElement || loss.kind == Kind::RepeatedElement || loss.kind == Kind::Text)
+    finding.rule = Rule::UnknownElement;
+  else if (loss.kind == Kind::RawLine)
+    finding.rule = Rule::StrayLine;
+  return finding;
+}
+
 bool WorkspaceDocument::canonicalBytes(QByteArray& bytes, QString& error) const {
   return bytesWith([this](XMLComponentWriter& writer) { copyDocument(m_reader, writer); }, bytes, error);
 }

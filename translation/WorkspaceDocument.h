@@ -52,6 +52,8 @@ class ORX_EXPORT WorkspaceDocument {
 
   // What canonicalBytes() would leave out.
   std::vector<WorkspaceLossReport::Loss> losses() const;
+  // A loss as a finding, under the rule that judges the same content, or else the one for all other losses.
+  static orx::Finding findingOf(const WorkspaceLossReport::Loss& loss);
   // The file with every record of the document written again, and all around it as it was. False when
   // something that was read cannot be written; `error` says what. Not for a file of versions, of which none
   // is rewritten once it is stored.

@@ -174,6 +174,8 @@ TEST(FormatCommand, ListsEveryLossAndWritesNothingUnlessTold) {
     for (const char* const loss : losses)
       EXPECT_TRUE(run.err.contains(QString(loss).arg("error"))) << loss << "\n" << run.err.toStdString();
     EXPECT_EQ(run.err.count('\n'), 5) << run.err.toStdString();
+    for (const char* const rule : {"lost-content", "unknown-attribute", "unknown-element"})
+      EXPECT_TRUE(run.err.contains(QString(" [%1]\n").arg(rule))) << rule;
   }
   EXPECT_EQ(readAll(file), withLosses());
   EXPECT_FALSE(QFile::exists(folder.filePath("out.orw")));

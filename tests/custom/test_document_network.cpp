@@ -4,6 +4,7 @@
 #include <tests/support/QtPrinters.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/SubDocumentLibrary.h>
+#include <transform/text/MessageStrings.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 #include <transform/workspace/XMLComponentReader.h>
@@ -139,6 +140,7 @@ TEST_F(DocumentNetwork, TellsWhatIsWrongAndBuildsTheRest) {
     ASSERT_EQ(network->problems().size(), 1U) << row.document;
     const orx::Finding& problem = network->problems().front();
     EXPECT_EQ(problem.rule, row.rule) << row.document;
+    EXPECT_FALSE(TransformResString(problem.message).isEmpty()) << row.document;
     EXPECT_EQ(problem.node, row.node) << row.document;
     EXPECT_TRUE(problem.text.contains(row.inText)) << qPrintable(problem.text);
     EXPECT_GT(problem.line, 0) << row.document;

@@ -6,6 +6,7 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/custom/instance/InstancePrototype.h>
+#include <transform/findings/Refusal.h>
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
@@ -355,9 +356,12 @@ void CompoundTransformerCfg::turnOffMultiProcessing() {
 }
 
 QString CompoundTransformerCfg::instantiationFault() const {
-  if (!m_network)
-    return TransformResString(messages::kNoInstance, getName());
-  QString fault = findNameFault(getName());
+  QString fault;
+  if (!m_network) {
+    orx::refuse(fault, {orx::Rule::Nesting, messages::kNoInstance}, {getName()});
+    return fault;
+  }
+  fault = findNameFault(getName());
   if (fault.isEmpty() && TextPlaces::refuse(TextPlace::MacroName, makePrefixMacro(getVisualName())) != 0)
     fault = findNameFault(getVisualName());
   return fault.isEmpty() ? findNestingFault(*m_network) : fault;

@@ -5,6 +5,7 @@
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/DocumentBinding.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/findings/Refusal.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
@@ -84,13 +85,14 @@ std::unique_ptr<TransformerCfg> DocumentBinding::make(const TransformerStruct& r
     return nullptr;
   }
   QString refusal;
+  const orx::RefusalListener listener;
   std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(type, record.version, &refusal);
   if (cfg)
     return cfg;
   if (!refusal.isEmpty()) {
-    const bool isOfDocument = m_reader.GetSubDocList().contains(type);
-    m_findings.reportText(isOfDocument ? Rule::Nesting : Rule::CustomTransformerFault, record.line, title,
-                          refusal);
+    const bool isNesting = listener.refusal().rule == Rule::Nesting;
+    m_findings.reportText(isNesting ? Rule::Nesting : Rule::CustomTransformerFault, record.line, title,
+                          refusal, isNesting ? listener.refusal().message : 0);
     return nullptr;
   }
   const QString version = QString::number(record.version);

@@ -3,6 +3,7 @@
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/findings/Refusal.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
@@ -89,6 +90,12 @@ QString circle(const std::vector<OpenNetwork>& open, const CompoundTransformerNe
   return names.join(QLatin1String(" > "));
 }
 
+QString nestingFault(long message, const QStringList& arguments) {
+  QString fault;
+  orx::refuse(fault, {orx::Rule::Nesting, message}, arguments);
+  return fault;
+}
+
 }  // namespace
 
 QString findNameFault(const QString& name) {
@@ -96,7 +103,7 @@ QString findNameFault(const QString& name) {
   const bool fits = TextPlaces::refuse(TextPlace::MacroName, makePrefixMacro(name)) == 0 &&
                     TextPlaces::refuse(TextPlace::HeaderField, name) == 0 &&
                     TextPlaces::refuse(TextPlace::Word, name) == 0;
-  return fits ? QString() : TransformResString(messages::kNoMacroName, name);
+  return fits ? QString() : nestingFault(messages::kNoMacroName, {name});
 }
 
 QString findNestingFault(CompoundTransformerNetwork& root) {
@@ -110,9 +117,8 @@ QString findNestingFault(CompoundTransformerNetwork& root) {
       for (const CompoundTransformerNetwork* inner : level.inner)
         depth = std::max(depth, depths.value(inner) + 1);
       if (depth > CompoundTransformerNetwork::kDeepestNesting) {
-        return TransformResString(
-            messages::kNestedTooDeep,
-            {root.getName(), QString::number(CompoundTransformerNetwork::kDeepestNesting)});
+        return nestingFault(messages::kNestedTooDeep,
+                            {root.getName(), QString::number(CompoundTransformerNetwork::kDeepestNesting)});
       }
       depths.insert(level.network, depth);
       open.pop_back();
@@ -124,7 +130,7 @@ QString findNestingFault(CompoundTransformerNetwork& root) {
       depths.insert(inner, kOpen);
       open.push_back(openNetwork(*inner));
     } else if (*known == kOpen) {
-      return TransformResString(messages::kContainsItself, {inner->getName(), circle(open, inner)});
+      return nestingFault(messages::kContainsItself, {inner->getName(), circle(open, inner)});
     }
   }
   return QString();
@@ -145,7 +151,7 @@ QString findPrefixFault(CompoundTransformerNetwork& root) {
       continue;
     for (const CompoundTransformerNetwork* inner : nestedNetworks(*outer)) {
       if (inner != outer && makePrefixMacro(inner->getName()) == prefix) {
-        return TransformResString(messages::kSamePrefix, {outer->getName(), inner->getName(), prefix});
+        return nestingFault(messages::kSamePrefix, {outer->getName(), inner->getName(), prefix});
       }
     }
   }

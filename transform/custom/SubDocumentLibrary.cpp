@@ -4,6 +4,7 @@
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
+#include <transform/findings/Refusal.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/IXMLComponentReader.h>
@@ -41,7 +42,8 @@ SubDocumentLibrary::Entry* SubDocumentLibrary::find(const QString& name, QString
   if (m_open.contains(name)) {
     const QStringList way = m_open.mid(m_open.indexOf(name)) << name;
     if (refusal)
-      *refusal = TransformResString(messages::kContainsItself, {name, way.join(QLatin1String(" > "))});
+      orx::refuse(*refusal, {orx::Rule::Nesting, messages::kContainsItself},
+                  {name, way.join(QLatin1String(" > "))});
     return nullptr;
   }
   // Bounds the recursion; what is built already is judged by its depth.
@@ -94,9 +96,9 @@ std::unique_ptr<TransformerCfg> SubDocumentLibrary::makeTransformer(const QStrin
   const int depth = m_open.size() + entry->depth;
   if (!entry->isBuilt || depth > CompoundTransformerNetwork::kDeepestNesting) {
     if (refusal)
-      *refusal = TransformResString(messages::kNestedTooDeep,
-                                    {m_open.isEmpty() ? name : m_open.first(),
-                                     QString::number(CompoundTransformerNetwork::kDeepestNesting)});
+      orx::refuse(*refusal, {orx::Rule::Nesting, messages::kNestedTooDeep},
+                  {m_open.isEmpty() ? name : m_open.first(),
+                   QString::number(CompoundTransformerNetwork::kDeepestNesting)});
     return nullptr;
   }
   if (!m_open.isEmpty()) {

@@ -31,20 +31,20 @@ void Findings::reportAs(Rule rule, long message, int line, const QString& node,
   add(std::move(finding));
 }
 
-void Findings::reportText(Rule rule, int line, const QString& node, const QString& text) {
+void Findings::reportText(Rule rule, int line, const QString& node, const QString& text, long message) {
   Finding finding;
   finding.rule = rule;
   finding.line = line;
   finding.node = node;
   finding.text = text;
+  finding.message = message;
   add(std::move(finding));
 }
 
 void Findings::reportParameter(Rule rule, long message, int line, const QString& node,
                                const QString& parameter, const QString& text) {
-  reportText(rule, line, node, text);
+  reportText(rule, line, node, text, message);
   m_all.back().parameter = parameter;
-  m_all.back().message = message;
 }
 
 void Findings::reportUnwritable(int line, const QString& node, const QString& parameter,

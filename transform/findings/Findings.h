@@ -24,7 +24,7 @@ class ORX_EXPORT Findings {
   void reportAs(Rule rule, long message, int line, const QString& node,
                 const QStringList& arguments = QStringList());
   // With a text that another part of the system has put together.
-  void reportText(Rule rule, int line, const QString& node, const QString& text);
+  void reportText(Rule rule, int line, const QString& node, const QString& text, long message = 0);
   // About one parameter of the node, with a text made from the message.
   void reportParameter(Rule rule, long message, int line, const QString& node, const QString& parameter,
                        const QString& text);

@@ -98,6 +98,8 @@ const std::vector<RuleRow>& ruleTable() {
        messages::kUnknownDocumentAttribute},
       {Rule::StrayLine, QLatin1String("stray-line"), Severity::Warning, RuleKind::Judgement,
        messages::kStrayLine},
+      // What is lost, and why, is the text.
+      {Rule::LostContent, QLatin1String("lost-content"), Severity::Error, RuleKind::Judgement, 0},
       {Rule::UnfitChoice, QLatin1String("unfit-choice"), Severity::Error, RuleKind::Judgement,
        messages::kUnfitChoice},
       {Rule::UnfitNumber, QLatin1String("unfit-number"), Severity::Error, RuleKind::Judgement,

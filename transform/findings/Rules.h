@@ -69,6 +69,7 @@ enum class Rule {
   UnknownElement,
   UnknownAttribute,
   StrayLine,
+  LostContent,
   UnfitChoice,
   UnfitNumber,
   // Of mapping files.

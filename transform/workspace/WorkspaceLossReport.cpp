@@ -34,37 +34,63 @@ WorkspaceLossReport::WorkspaceLossReport(const XMLComponentReader& reader) {
                    [](const Loss& left, const Loss& right) { return left.line < right.line; });
 }
 
+long WorkspaceLossReport::Loss::message() const {
+  switch (kind) {
+    case Kind::Root:
+      return messages::kLostRoot;
+    case Kind::Constant:
+      return messages::kLostConstant;
+    case Kind::ReadOnlyAttribute:
+      return messages::kReadOnlyAttribute;
+    case Kind::UnknownAttribute:
+      return messages::kUnknownAttribute;
+    case Kind::MalformedValue:
+      return messages::kMalformedValue;
+    case Kind::UnknownElement:
+      return messages::kUnknownElement;
+    case Kind::RepeatedElement:
+      return messages::kRepeatedElement;
+    case Kind::SubDocument:
+      return attribute.isEmpty() ? messages::kNamelessSubDocument : messages::kRepeatedSubDocument;
+    case Kind::Text:
+      return messages::kLostText;
+    case Kind::Comment:
+      return messages::kLostComment;
+    case Kind::Instruction:
+      return messages::kLostInstruction;
+    case Kind::Declaration:
+      return messages::kLostDeclaration;
+    case Kind::ChangedValue:
+      return messages::kChangedValue;
+    case Kind::RawLine:
+      return messages::kMovedLine;
+  }
+  return 0;
+}
+
 QString WorkspaceLossReport::Loss::describe() const {
   switch (kind) {
     case Kind::Root:
-      return documentText(messages::kLostRoot, {element, words::kWorkspace.toQString()});
+      return documentText(message(), {element, words::kWorkspace.toQString()});
     case Kind::Constant:
-      return documentText(messages::kLostConstant, {element});
-    case Kind::ReadOnlyAttribute:
-      return documentText(messages::kReadOnlyAttribute, {attribute, element});
-    case Kind::UnknownAttribute:
-      return documentText(messages::kUnknownAttribute, {attribute, element});
-    case Kind::MalformedValue:
-      return documentText(messages::kMalformedValue, {attribute, element, value});
     case Kind::UnknownElement:
-      return documentText(messages::kUnknownElement, {element});
     case Kind::RepeatedElement:
-      return documentText(messages::kRepeatedElement, {element});
-    case Kind::SubDocument:
-      return attribute.isEmpty() ? documentText(messages::kNamelessSubDocument)
-                                 : documentText(messages::kRepeatedSubDocument, {attribute});
-    case Kind::Text:
-      return documentText(messages::kLostText);
-    case Kind::Comment:
-      return documentText(messages::kLostComment);
-    case Kind::Instruction:
-      return documentText(messages::kLostInstruction);
-    case Kind::Declaration:
-      return documentText(messages::kLostDeclaration);
+      return documentText(message(), {element});
+    case Kind::ReadOnlyAttribute:
+    case Kind::UnknownAttribute:
+      return documentText(message(), {attribute, element});
+    case Kind::MalformedValue:
     case Kind::ChangedValue:
-      return documentText(messages::kChangedValue, {attribute, element, value});
+      return documentText(message(), {attribute, element, value});
+    case Kind::SubDocument:
+      return documentText(message(), attribute.isEmpty() ? QStringList() : QStringList(attribute));
     case Kind::RawLine:
-      return documentText(messages::kMovedLine, {value});
+      return documentText(message(), {value});
+    case Kind::Text:
+    case Kind::Comment:
+    case Kind::Instruction:
+    case Kind::Declaration:
+      break;
   }
-  return QString();
+  return documentText(message());
 }

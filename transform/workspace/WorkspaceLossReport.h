@@ -34,8 +34,9 @@ class ORX_EXPORT WorkspaceLossReport {
     QString attribute;  // its name, or the name of the sub-document
     QString value;      // as it stands; of a changed value, as it would be written; of a raw line, its text
 
-    // One sentence for the user, without the place.
+    // One sentence for the user, without the place, and the number of its message.
     QString describe() const;
+    long message() const;
   };
 
   // Reads the reader's document; the reader is not kept.

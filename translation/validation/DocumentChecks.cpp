@@ -24,7 +24,7 @@ void reportLoss(const WorkspaceLossReport::Loss& loss, orx::Findings& findings) 
       break;
     case Kind::RepeatedElement:
     case Kind::Text:
-      findings.reportText(Rule::UnknownElement, loss.line, QString(), loss.describe());
+      findings.add(WorkspaceDocument::findingOf(loss));
       break;
     case Kind::RawLine:
       findings.report(Rule::StrayLine, loss.line, QString(), {loss.value});

@@ -7,6 +7,7 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/findings/Refusal.h>
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
@@ -154,7 +155,8 @@ void WritingChecks::checkParameters() {
       names.append(parameter->name);
     m_findings.reportText(
         Rule::Cycle, circle.front()->line, QString(),
-        TransformResString(orx::messages::kParameterCircle, names.join(QLatin1String(", "))));
+        TransformResString(orx::messages::kParameterCircle, names.join(QLatin1String(", "))),
+        orx::messages::kParameterCircle);
   }
 }
 
@@ -182,13 +184,14 @@ void WritingChecks::checkTransformer(const WorkspaceNode& node) {
   const auto* custom = dynamic_cast<const CompoundTransformerCfg*>(node.cfg.get());
   const QHash<QString, QString> faults =
       custom ? custom->findUnwritableParameters() : node.cfg->findUnwritableValues();
+  const orx::RefusalListener nesting;
   QString nestingFault = custom ? custom->instantiationFault() : QString();
   if (custom && nestingFault.isEmpty() && !m_checked.contains(custom->getNetwork())) {
     m_checked.insert(custom->getNetwork());
     nestingFault = findPrefixFault(*custom->getNetwork());
   }
   if (!nestingFault.isEmpty())
-    m_findings.reportText(Rule::Nesting, node.line, node.name, nestingFault);
+    m_findings.reportText(Rule::Nesting, node.line, node.name, nestingFault, nesting.refusal().message);
   for (const QString& fault : custom ? custom->findUnwritablePorts() : QStringList())
     m_findings.reportText(Rule::UnwritableValue, node.line, node.name, fault);
   const QHash<QString, QString> replaced = InnerNames::findReplacedParameters(

@@ -108,9 +108,12 @@ void ExtractCommand::warn(const WorkspaceDocument& document, const CustomExtract
   }
   const QStringList names = extraction.names();
   for (const WorkspaceLossReport::Loss& loss : document.losses()) {
-    if (extraction.parts().contains(documentAt(document.reader(), names, loss.line)))
-      console.showFinding(
-          shownName, loss.line, Severity::Warning,
-          TransformResString(messages::kNotInFile, onOneLine(loss.describe(), kLongestFinding)));
+    if (!extraction.parts().contains(documentAt(document.reader(), names, loss.line)))
+      continue;
+    orx::Finding finding = WorkspaceDocument::findingOf(loss);
+    finding.file = shownName;
+    finding.severity = Severity::Warning;
+    finding.text = TransformResString(messages::kNotInFile, onOneLine(finding.text, kLongestFinding));
+    console.show(finding);
   }
 }

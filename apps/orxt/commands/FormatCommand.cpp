@@ -112,8 +112,11 @@ bool FormatCommand::mayLose(const WorkspaceDocument& document, const QString& sh
                             Console& console) const {
   const std::vector<WorkspaceLossReport::Loss> losses = document.losses();
   for (const WorkspaceLossReport::Loss& loss : losses) {
-    console.showFinding(shownName, loss.line, m_drop ? Severity::Warning : Severity::Error,
-                        onOneLine(loss.describe(), kLongestFinding));
+    orx::Finding finding = WorkspaceDocument::findingOf(loss);
+    finding.file = shownName;
+    finding.severity = m_drop ? Severity::Warning : Severity::Error;
+    finding.text = onOneLine(finding.text, kLongestFinding);
+    console.show(finding);
   }
   if (losses.empty() || m_drop)
     return true;
