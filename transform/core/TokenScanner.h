@@ -2,10 +2,12 @@
 // holds none of "$", "(" and ")".
 #pragma once
 
+#include <platform/Export.h>
+
 #include <QString>
 
 // Whether a template's token of that name stands for something of the instance: its ports, name or schema.
-bool isReservedToken(const QString& name);
+ORX_EXPORT bool isReservedToken(const QString& name);
 
 class TokenScanner {
  public:
