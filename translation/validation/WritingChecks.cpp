@@ -128,6 +128,13 @@ void WritingChecks::checkPrefixMacros() {
 void WritingChecks::checkType(const WorkspaceNode& node) {
   checkWord(node.name, node.line, node.name);
   checkWord(node.keyword, node.line, node.name);
+  // A reader's flows may be named apart; what stands before a writer, or copies attributes, bears one name.
+  const auto copies = [&](const AttributeLink& link) {
+    return &m_workspace.nodes[static_cast<std::size_t>(link.source)] == &node;
+  };
+  if (node.kind == WorkspaceNode::Kind::Reader &&
+      std::none_of(m_workspace.attributeLinks.begin(), m_workspace.attributeLinks.end(), copies))
+    return;
   const auto type = qMakePair(static_cast<int>(node.kind), qMakePair(node.keyword, node.name));
   if (m_types.contains(type))
     m_findings.reportAs(Rule::TakenName, messages::kTypeTwice, node.line, node.name,
