@@ -143,7 +143,10 @@ void WorkspaceChecks::checkLinked(const ExternalTransformerNetwork& linked, cons
   }
   for (const orx::Finding& finding : found.all())
     m_diagnostics.add(finding);
-  // An engine runs the statements of the file, not its document.
+  // An engine runs the statements of the file, not its document; several versions may stand in one.
+  if (m_lintedFiles.contains(linked.getFileName()))
+    return;
+  m_lintedFiles.insert(linked.getFileName());
   for (const orx::Finding& finding :
        lintMappingFile(linked.getFileName(), linked.getFileName(), {}).findings) {
     if (m_settings.severity(finding.rule) == orx::Severity::Error)

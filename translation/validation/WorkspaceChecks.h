@@ -6,6 +6,7 @@
 #include <translation/validation/ValueChecks.h>
 
 #include <QHash>
+#include <QSet>
 #include <QString>
 #include <QStringList>
 
@@ -61,5 +62,6 @@ class WorkspaceChecks {
   ValueChecks m_values;
   QStringList m_parameterNames;
   bool m_includesOthers = false;       // the header takes in files that may set further parameters
+  QSet<QString> m_lintedFiles;         // of linked custom transformers
   QHash<QString, int> m_newestByName;  // -1: not known outside the document
 };

@@ -125,15 +125,11 @@ void WritingChecks::checkPrefixMacros() {
   }
 }
 
-void WritingChecks::checkType(const WorkspaceNode& node) {
+void WritingChecks::checkType(const WorkspaceNode& node, bool isCopying) {
   checkWord(node.name, node.line, node.name);
   checkWord(node.keyword, node.line, node.name);
   // A reader's flows may be named apart; what stands before a writer, or copies attributes, bears one name.
-  const auto copies = [&](const AttributeLink& link) {
-    return &m_workspace.nodes[static_cast<std::size_t>(link.source)] == &node;
-  };
-  if (node.kind == WorkspaceNode::Kind::Reader &&
-      std::none_of(m_workspace.attributeLinks.begin(), m_workspace.attributeLinks.end(), copies))
+  if (node.kind == WorkspaceNode::Kind::Reader && !isCopying)
     return;
   const auto type = qMakePair(static_cast<int>(node.kind), qMakePair(node.keyword, node.name));
   if (m_types.contains(type))
@@ -169,12 +165,16 @@ void WritingChecks::checkParameters() {
 
 void WritingChecks::check() {
   checkParameters();
-  for (const WorkspaceNode& node : m_workspace.nodes) {
+  QSet<int> copying;
+  for (const AttributeLink& link : m_workspace.attributeLinks)
+    copying.insert(link.source);
+  for (std::size_t number = 0; number < m_workspace.nodes.size(); ++number) {
+    const WorkspaceNode& node = m_workspace.nodes[number];
     checkAttributes(node);
     if (node.isTransformer())
       checkTransformer(node);
     else
-      checkType(node);
+      checkType(node, copying.contains(static_cast<int>(number)));
   }
 }
 

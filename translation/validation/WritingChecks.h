@@ -23,7 +23,7 @@ class WritingChecks {
   void checkParameters();
   void checkParameterName(const GlobalParameters::Parameter& parameter);
   void checkPrefixMacros();
-  void checkType(const WorkspaceNode& node);
+  void checkType(const WorkspaceNode& node, bool isCopying);
   QString refuseScript(const GlobalParameters::Parameter& parameter) const;
   void checkChoices(const GlobalParameters::Parameter& parameter);
   void checkParameter(const GlobalParameters::Parameter& parameter, const QString& value);
