@@ -2,7 +2,7 @@
 #include <platform/qorxcore/Language.h>
 #include <tests/translation/SmallWorkspace.h>
 #include <transform/registry/TransformerMgr.h>
-#include <transform/specialised/ParameterFetcherTransformerCfg.h>
+#include <transform/specialised/attributes/ParameterFetcherTransformerCfg.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/WorkspaceTranslation.h>
 #include <translation/WorkspaceValidation.h>

@@ -1,14 +1,14 @@
 #include <transform/core/TransformerCfg.h>
-#include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
-#include <transform/specialised/ChartGeneratorTransformerCfg.h>
-#include <transform/specialised/ExpressionEvaluatorCfg.h>
-#include <transform/specialised/ParameterFetcherTransformerCfg.h>
-#include <transform/specialised/ReportGeneratorTransformerCfg.h>
-#include <transform/specialised/TesterTransformerCfg.h>
 #include <transform/specialised/TransformerCfgFactory.h>
-#include <transform/specialised/ValueMapperTransformerCfg.h>
-#include <transform/specialised/XMLTemplaterTransformerCfg.h>
-#include <transform/specialised/XMLUpdaterTransformerCfg.h>
+#include <transform/specialised/attributes/AttributeExpressionRemoverTransformerCfg.h>
+#include <transform/specialised/attributes/ParameterFetcherTransformerCfg.h>
+#include <transform/specialised/attributes/ValueMapperTransformerCfg.h>
+#include <transform/specialised/conditions/ExpressionEvaluatorCfg.h>
+#include <transform/specialised/conditions/TesterTransformerCfg.h>
+#include <transform/specialised/templates/ChartGeneratorTransformerCfg.h>
+#include <transform/specialised/templates/ReportGeneratorTransformerCfg.h>
+#include <transform/specialised/templates/XMLTemplaterTransformerCfg.h>
+#include <transform/specialised/templates/XMLUpdaterTransformerCfg.h>
 
 #include <algorithm>
 #include <initializer_list>

@@ -1,10 +1,10 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
 #include <transform/findings/Refusal.h>
-#include <transform/specialised/XMLUpdaterTransformerCfg.h>
-#include <transform/specialised/values/ParameterTable.h>
-#include <transform/specialised/values/SpecialisedValues.h>
-#include <transform/specialised/values/TemplateText.h>
+#include <transform/specialised/shared/ParameterTable.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
+#include <transform/specialised/shared/TemplateText.h>
+#include <transform/specialised/templates/XMLUpdaterTransformerCfg.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 

@@ -2,7 +2,7 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/specialised/SpecialisedCfg.h>
+#include <transform/specialised/shared/SpecialisedCfg.h>
 
 class ORX_EXPORT ExpressionEvaluatorCfg : public SpecialisedCfg<ExpressionEvaluatorCfg> {
  public:

@@ -6,7 +6,7 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/specialised/SpecialisedCfg.h>
+#include <transform/specialised/shared/SpecialisedCfg.h>
 
 class ORX_EXPORT ParameterFetcherTransformerCfg : public SpecialisedCfg<ParameterFetcherTransformerCfg> {
  public:

@@ -1,7 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/findings/Refusal.h>
-#include <transform/specialised/AttributeExpressionRemoverTransformerCfg.h>
-#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/attributes/AttributeExpressionRemoverTransformerCfg.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
 #include <transform/text/MessageNumbers.h>
 
 namespace messages = orx::messages;

@@ -2,8 +2,8 @@
 #include <transform/core/Formula.h>
 #include <transform/core/FormulaChecks.h>
 #include <transform/core/Keywords.h>
-#include <transform/specialised/ExpressionEvaluatorCfg.h>
-#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/conditions/ExpressionEvaluatorCfg.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
 #include <transform/text/TextHelpers.h>
 
 namespace {

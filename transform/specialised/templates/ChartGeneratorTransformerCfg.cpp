@@ -1,7 +1,7 @@
 #include <transform/findings/Refusal.h>
-#include <transform/specialised/ChartGeneratorTransformerCfg.h>
-#include <transform/specialised/values/ParameterTable.h>
-#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/shared/ParameterTable.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
+#include <transform/specialised/templates/ChartGeneratorTransformerCfg.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 

@@ -3,7 +3,7 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/specialised/SpecialisedCfg.h>
+#include <transform/specialised/shared/SpecialisedCfg.h>
 
 class ORX_EXPORT TesterTransformerCfg : public SpecialisedCfg<TesterTransformerCfg> {
  public:

@@ -3,9 +3,9 @@
 #include <transform/core/FormulaChecks.h>
 #include <transform/core/ValueReferences.h>
 #include <transform/findings/Refusal.h>
-#include <transform/specialised/TesterTransformerCfg.h>
-#include <transform/specialised/values/ParameterTable.h>
-#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/conditions/TesterTransformerCfg.h>
+#include <transform/specialised/shared/ParameterTable.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 

@@ -1,6 +1,6 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
-#include <transform/specialised/values/TemplateText.h>
+#include <transform/specialised/shared/TemplateText.h>
 
 #include <QJsonArray>
 #include <QJsonDocument>

@@ -2,10 +2,10 @@
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/findings/Refusal.h>
-#include <transform/specialised/ValueMapperTransformerCfg.h>
-#include <transform/specialised/values/FactoryOption.h>
-#include <transform/specialised/values/ParameterTable.h>
-#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/attributes/ValueMapperTransformerCfg.h>
+#include <transform/specialised/shared/FactoryOption.h>
+#include <transform/specialised/shared/ParameterTable.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 

@@ -4,8 +4,8 @@
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/findings/Refusal.h>
-#include <transform/specialised/values/ParameterTable.h>
-#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/shared/ParameterTable.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 

@@ -2,7 +2,7 @@
 #pragma once
 
 #include <platform/Export.h>
-#include <transform/specialised/SpecialisedCfg.h>
+#include <transform/specialised/shared/SpecialisedCfg.h>
 
 class ORX_EXPORT ChartGeneratorTransformerCfg : public SpecialisedCfg<ChartGeneratorTransformerCfg> {
  public:

@@ -2,8 +2,8 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/WorkspaceParameterDirectory.h>
 #include <transform/findings/Refusal.h>
-#include <transform/specialised/ParameterFetcherTransformerCfg.h>
-#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/attributes/ParameterFetcherTransformerCfg.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageNumbers.h>

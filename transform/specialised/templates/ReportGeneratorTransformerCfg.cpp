@@ -1,7 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
-#include <transform/specialised/ReportGeneratorTransformerCfg.h>
-#include <transform/specialised/values/ParameterTable.h>
-#include <transform/specialised/values/SpecialisedValues.h>
+#include <transform/specialised/shared/ParameterTable.h>
+#include <transform/specialised/shared/SpecialisedValues.h>
+#include <transform/specialised/templates/ReportGeneratorTransformerCfg.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 

@@ -1,6 +1,6 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/specialised/values/FactoryOption.h>
+#include <transform/specialised/shared/FactoryOption.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
