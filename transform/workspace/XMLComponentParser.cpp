@@ -6,6 +6,7 @@
 #include <transform/workspace/XMLComponentParser.h>
 #include <transform/workspace/reading/DecodedInputSource.h>
 #include <transform/workspace/reading/DocumentMessages.h>
+#include <transform/workspace/reading/ElementTree.h>
 #include <transform/workspace/reading/FileLines.h>
 #include <transform/workspace/reading/WorkspaceSplitter.h>
 #include <transform/workspace/reading/XORXDOMParser.h>
@@ -186,7 +187,7 @@ void XMLComponentParser::splitAndParse(WorkspaceSplitter& splitter, QIODevice& i
 }
 
 void XMLComponentParser::forgetDocument() {
-  m_root = nullptr;
+  m_tree.reset();
   *m_elements = ElementTable();
   *m_map = LineMap();
   m_parser->forget();
@@ -257,10 +258,10 @@ void XMLComponentParser::parseGuarded(QIODevice& device, const LineMap& map) {
   }
   if (guard.hasRefused())
     throw placedError(guard.refusal(), map.fileLine(guard.line()), guard.column());
-  m_root = m_parser->getDocument() ? m_parser->getDocument()->getDocumentElement() : nullptr;
   *m_map = map;
   *m_elements = m_parser->takeElements();
   m_elements->setLines(guard.elementLines(), map);
+  m_tree = std::make_unique<ElementTree>(*m_elements);
 }
 
 std::vector<LeftOutContent> XMLComponentParser::getLeftOutContent() const {
@@ -271,7 +272,7 @@ std::vector<LeftOutContent> XMLComponentParser::getLeftOutContent() const {
 }
 
 IXMLComponentParser::Node* XMLComponentParser::getRootNode() const {
-  return m_root;
+  return m_tree ? m_tree->root() : nullptr;
 }
 
 std::vector<IXMLComponentParser::Node*> XMLComponentParser::getChildItems(const QString& name,

@@ -12,6 +12,7 @@
 #include <vector>
 
 class ElementTable;
+class ElementTree;
 class LineMap;
 class QIODevice;
 class WorkspaceSplitter;
@@ -65,7 +66,7 @@ class ORX_EXPORT XMLComponentParser : public virtual IXMLComponentParser {
   void parseGuarded(QIODevice& device, const LineMap& map);
 
   std::unique_ptr<XORXDOMParser> m_parser;
-  Node* m_root = nullptr;
   std::unique_ptr<ElementTable> m_elements;
+  std::unique_ptr<ElementTree> m_tree;  // of the elements of the last parse
   std::unique_ptr<LineMap> m_map;
 };

@@ -17,10 +17,6 @@ namespace {
 const QString kTemporaryName = QStringLiteral("kx-in-XXXXXX");
 constexpr int kRecognisedBytes = 100;
 
-bool isNamed(const ElementTable::Element& element, const Word& name) {
-  return XERCES_CPP_NAMESPACE::XMLString::equals(element.getTagName(), name.text);
-}
-
 }  // namespace
 
 IXMLComponentReader::~IXMLComponentReader() = default;
@@ -122,14 +118,11 @@ void XMLComponentReader::indexDocument(std::size_t index, const QString& name) {
   const ElementTable& elements = getElements();
   Document document;
   document.line = elements.line(index);
-  const auto* const attributes = elements.element(index).getAttributes();
-  for (XMLSize_t i = 0; i < attributes->getLength(); ++i) {
-    const auto* const attribute = attributes->item(i);
-    document.parameters.insert(fromXml(attribute->getNodeName()), fromXml(attribute->getNodeValue()));
-  }
-  elements.eachChild(index, [&](std::size_t child) {
-    document.sections[fromXml(elements.element(child).getTagName())].append(child);
+  elements.eachAttribute(index, [&](const ElementTable::Attribute& attribute) {
+    document.parameters.insert(attribute.name, attribute.value);
   });
+  elements.eachChild(index,
+                     [&](std::size_t child) { document.sections[elements.name(child)].append(child); });
   m_documents.insert(name, document);
 }
 
@@ -147,10 +140,9 @@ void XMLComponentReader::documentParsed() {
   const QVector<std::size_t> holders = main.sections.value(words::kSubdocuments.toQString());
   for (const std::size_t holder : holders) {
     elements.eachChild(holder, [&](std::size_t child) {
-      const ElementTable::Element& element = elements.element(child);
-      if (!isNamed(element, words::kSubdocument))
+      if (!elements.isNamed(child, words::kSubdocument))
         return;
-      const QString name = fromXml(element.getAttribute(words::kName.text));
+      const QString name = elements.attribute(child, words::kName);
       m_subDocuments.append(name);
       if (!m_documents.contains(name))
         indexDocument(child, name);
@@ -159,15 +151,13 @@ void XMLComponentReader::documentParsed() {
 }
 
 DocumentType XMLComponentReader::GetDocumentType() const {
-  const Node* const root = getRootNode();
-  if (!root || root->getNodeType() != Node::ELEMENT_NODE)
+  if (getElements().size() == 0)
     return kUnknownDocument;
-  const auto& element = *static_cast<const ElementTable::Element*>(root);
   for (const auto& [name, type] : {std::make_pair(words::kWorkspace, kWorkspaceDocument),
                                    std::make_pair(words::kDatasource, kDataSourceDocument),
                                    std::make_pair(words::kEtlTool, kToolDocument),
                                    std::make_pair(words::kTransformer, kTransformerDocument)}) {
-    if (isNamed(element, name))
+    if (getElements().isNamed(0, name))
       return type;
   }
   return kUnknownDocument;
@@ -205,7 +195,7 @@ ORXTValSlist<typename Table::Record> XMLComponentReader::readSection(const QStri
   const QVector<std::size_t> parts = found->sections.value(section.toQString());
   for (const std::size_t part : parts) {
     elements.eachChild(part, [&](std::size_t child) {
-      if (isNamed(elements.element(child), Table::element))
+      if (elements.isNamed(child, Table::element))
         records.append(reader.read<Table>(child));
     });
   }

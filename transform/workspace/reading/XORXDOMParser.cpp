@@ -1,7 +1,5 @@
-#include <transform/workspace/reading/CompactAttribute.h>
 #include <transform/workspace/reading/XORXDOMParser.h>
 
-#include <xercesc/dom/DOMElement.hpp>
 #include <xercesc/internal/XMLScanner.hpp>
 #include <xercesc/util/XMLString.hpp>
 #include <xercesc/util/XMLUni.hpp>
@@ -10,7 +8,11 @@ using namespace XERCES_CPP_NAMESPACE;
 
 namespace {
 constexpr std::size_t kLeftOutEntries = 10000;
+
+QStringView viewOf(const XMLCh* text) {
+  return {text, static_cast<qsizetype>(XMLString::stringLen(text))};
 }
+}  // namespace
 
 XORXDOMParser::XORXDOMParser() {
   // The scanner that knows nothing of document types, schemas and entities: the quickest, and nothing that a
@@ -48,19 +50,21 @@ void XORXDOMParser::XMLDecl(const XMLCh* const version, const XMLCh* const encod
   XercesDOMParser::XMLDecl(version, encoding, standalone, actualEncoding);
 }
 
-void XORXDOMParser::startElement(const XMLElementDecl& declaration, const unsigned int uriId,
-                                 const XMLCh* const prefix, const RefVectorOf<XMLAttr>& attributes,
-                                 const XMLSize_t attributeCount, const bool isEmpty, const bool isRoot) {
-  const int depth = m_depth++;
-  // Of an empty element the base also reports the end.
-  XercesDOMParser::startElement(declaration, uriId, prefix, attributes, attributeCount, isEmpty, isRoot);
-  m_elements.append(static_cast<const DOMElement*>(fCurrentNode), depth);
+void XORXDOMParser::startElement(const XMLElementDecl& declaration, const unsigned int, const XMLCh* const,
+                                 const RefVectorOf<XMLAttr>& attributes, const XMLSize_t attributeCount,
+                                 const bool isEmpty, const bool) {
+  m_elements.append(viewOf(declaration.getFullName()), m_depth);
+  for (XMLSize_t i = 0; i < attributeCount; ++i) {
+    const XMLAttr& attribute = *attributes.elementAt(i);
+    m_elements.appendAttribute(viewOf(attribute.getName()), viewOf(attribute.getValue()));
+  }
+  // The end of an empty element is not reported.
+  if (!isEmpty)
+    ++m_depth;
 }
 
-void XORXDOMParser::endElement(const XMLElementDecl& declaration, const unsigned int uriId, const bool isRoot,
-                               const XMLCh* const prefix) {
+void XORXDOMParser::endElement(const XMLElementDecl&, const unsigned int, const bool, const XMLCh* const) {
   --m_depth;
-  XercesDOMParser::endElement(declaration, uriId, isRoot, prefix);
 }
 
 void XORXDOMParser::docCharacters(const XMLCh* const text, const XMLSize_t length, const bool) {
@@ -71,10 +75,6 @@ void XORXDOMParser::docCharacters(const XMLCh* const text, const XMLSize_t lengt
       return;
     }
   }
-}
-
-DOMAttr* XORXDOMParser::createAttr(const XMLCh* name) {
-  return CompactAttribute::create(*fDocument, name);
 }
 
 void XORXDOMParser::ignorableWhitespace(const XMLCh* const, const XMLSize_t, const bool) {}

@@ -1,6 +1,7 @@
-// The DOM parser of workspace documents. It keeps the encoding's name, and for the sake of memory it leaves
-// out of the tree what the vocabulary gives no meaning to (text, comments, processing instructions), noting
-// where such content stood.
+// The parser of workspace documents. It keeps the encoding's name and lists the elements with their
+// attributes; its own tree stays empty, for hardly anybody asks for one (ElementTree makes it of the list).
+// What the vocabulary gives no meaning to (text, comments, processing instructions) is left out; where such
+// content stood is noted.
 #pragma once
 
 #include <transform/workspace/records/ElementTable.h>
@@ -45,8 +46,6 @@ class XORXDOMParser : public XERCES_CPP_NAMESPACE::XercesDOMParser {
                            const bool isCharacterData) override;
   void docComment(const XMLCh* const text) override;
   void docPI(const XMLCh* const target, const XMLCh* const data) override;
-
-  XERCES_CPP_NAMESPACE::DOMAttr* createAttr(const XMLCh* name) override;
 
  private:
   void noteLeftOut(LeftOutContent::Kind kind);

@@ -1,20 +1,12 @@
 #include <transform/workspace/writing/LossCollector.h>
 
-using XERCES_CPP_NAMESPACE::DOMAttr;
-using XERCES_CPP_NAMESPACE::XMLString;
+using Attribute = ElementTable::Attribute;
 
 namespace {
 
-template <class Visitor>
-void eachAttribute(const ElementTable::Element& element, Visitor&& visit) {
-  const auto* const attributes = element.getAttributes();
-  for (XMLSize_t i = 0; i < attributes->getLength(); ++i)
-    visit(*static_cast<const DOMAttr*>(attributes->item(i)));
-}
-
 // Whether the text says something else than its absence would.
 template <class R>
-bool differsFromDefault(const AttributeRule<R>& rule, const XMLCh* text) {
+bool differsFromDefault(const AttributeRule<R>& rule, const QString& text) {
   static const R plain;
   R record;
   RecordReader::readValue(rule, record, text);
@@ -25,17 +17,16 @@ bool differsFromDefault(const AttributeRule<R>& rule, const XMLCh* text) {
 }  // namespace
 
 bool LossCollector::isNamed(Place element, const Word& name) const {
-  return XMLString::equals(m_elements.element(element).getTagName(), name.text);
+  return m_elements.isNamed(element, name);
 }
 
 void LossCollector::report(Kind kind, Place element, const QString& attribute, const QString& value) {
-  m_losses.push_back(
-      {kind, m_elements.line(element), fromXml(m_elements.element(element).getTagName()), attribute, value});
+  m_losses.push_back({kind, m_elements.line(element), m_elements.name(element), attribute, value});
 }
 
 void LossCollector::allAttributes(Place element) {
-  eachAttribute(m_elements.element(element), [&](const DOMAttr& attribute) {
-    report(Kind::UnknownAttribute, element, fromXml(attribute.getName()), fromXml(attribute.getValue()));
+  m_elements.eachAttribute(element, [&](const Attribute& attribute) {
+    report(Kind::UnknownAttribute, element, attribute.name, attribute.value);
   });
 }
 
@@ -120,7 +111,7 @@ void LossCollector::subDocuments(Place holder) {
       report(Kind::UnknownElement, element);
       return;
     }
-    const QString name = fromXml(m_elements.element(element).getAttribute(words::kName.text));
+    const QString name = m_elements.attribute(element, words::kName);
     if (name.isEmpty() || m_subDocuments.contains(name)) {
       report(Kind::SubDocument, element, name);
       return;
@@ -144,30 +135,27 @@ void LossCollector::section(Place holder) {
 template <class Table>
 void LossCollector::record(Place element) {
   using Record = typename Table::Record;
-  const auto& rules = SortedRules<Table>::get();
   std::size_t hint = 0;
   Record whole;
-  eachAttribute(m_elements.element(element), [&](const DOMAttr& attribute) {
-    if (const auto* const rule = rules.find(attribute.getName(), hint))
-      RecordReader::readValue(*rule, whole, attribute.getValue());
+  m_elements.eachAttribute(element, [&](const Attribute& attribute) {
+    if (const auto* const rule = findRule<Table>(attribute.name, hint))
+      RecordReader::readValue(*rule, whole, attribute.value);
   });
   hint = 0;
-  eachAttribute(m_elements.element(element), [&](const DOMAttr& attribute) {
-    const auto* const rule = rules.find(attribute.getName(), hint);
-    const auto lose = [&](Kind kind) {
-      report(kind, element, fromXml(attribute.getName()), fromXml(attribute.getValue()));
-    };
+  m_elements.eachAttribute(element, [&](const Attribute& attribute) {
+    const auto* const rule = findRule<Table>(attribute.name, hint);
+    const auto lose = [&](Kind kind) { report(kind, element, attribute.name, attribute.value); };
     if (!rule) {
       lose(Kind::UnknownAttribute);
       return;
     }
     const auto* const special = std::get_if<SpecialValue<Record>>(&rule->value);
     Record read;
-    if (!RecordReader::readValue(*rule, read, attribute.getValue()))
+    if (!RecordReader::readValue(*rule, read, attribute.value))
       lose(Kind::MalformedValue);
     else if (special && special->write(read) != special->write(whole))
-      report(Kind::ChangedValue, element, fromXml(attribute.getName()), special->write(whole));
-    else if (rule->emission == Emission::Never && differsFromDefault(*rule, attribute.getValue()))
+      report(Kind::ChangedValue, element, attribute.name, special->write(whole));
+    else if (rule->emission == Emission::Never && differsFromDefault(*rule, attribute.value))
       lose(Kind::ReadOnlyAttribute);
   });
   recordChildren<Table>(element);
