@@ -82,6 +82,26 @@ TEST_F(AtomicFiles, AppearsWhenCommittedAndNeverWithout) {
   EXPECT_EQ(entries(), (QStringList{"new", "old"}));
 }
 
+TEST_F(AtomicFiles, LeavesAFileOfTheSameBytesAsItIs) {
+  const QByteArray large(100 * 1000, 'x');
+  const std::pair<QByteArray, bool> cases[] = {
+      {large, true}, {large + 'x', false}, {large.mid(1) + 'y', false}, {"", false}};
+  for (const auto& [written, isKept] : cases) {
+    put(path("old"), large.constData());
+    struct stat before {};
+    struct stat after {};
+    ASSERT_EQ(::stat(path("old").toUtf8().constData(), &before), 0);
+    AtomicFile file(path("old"));
+    ASSERT_TRUE(file.open());
+    file.device().write(written);
+    ASSERT_TRUE(file.commit());
+    ASSERT_EQ(::stat(path("old").toUtf8().constData(), &after), 0);
+    EXPECT_EQ(before.st_ino == after.st_ino, isKept) << written.size();
+    EXPECT_EQ(readAll(path("old")), written);
+  }
+  EXPECT_EQ(entries(), QStringList{"old"});
+}
+
 TEST_F(AtomicFiles, KeepsPermissions) {
   const mode_t umaskBefore = ::umask(027);
   for (const unsigned mode : {0600u, 0644u, 0666u, 0751u}) {

@@ -2,6 +2,7 @@
 #include <transform/files/AtomicFile.h>
 #include <transform/files/output/OutputPlace.h>
 
+#include <QFile>
 #include <QRandomGenerator>
 
 #include <cerrno>
@@ -9,10 +10,12 @@
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
+#include <utility>
 
 namespace {
 
 constexpr int kMostAttempts = 100;
+constexpr qint64 kCompared = 1 << 16;
 
 QByteArray temporaryName() {
   return ".orx-" + QByteArray::number(QRandomGenerator::global()->generate64(), 16) + ".tmp";
@@ -30,6 +33,30 @@ bool copyOwnerAndPermissions(int descriptor, const struct stat& from) {
     [[maybe_unused]] const int kept = ::fchown(descriptor, static_cast<uid_t>(-1), from.st_gid);
   }
   return ::fchmod(descriptor, from.st_mode & 07777) == 0;
+}
+
+// Whether both hold the same bytes. Where that cannot be told they count as different.
+bool haveSameContent(int folder, const QByteArray& name, const QByteArray& otherName) {
+  QFile file;
+  QFile other;
+  for (const auto& [opened, path] : {std::make_pair(&file, &name), std::make_pair(&other, &otherName)}) {
+    const int descriptor = ::openat(folder, path->constData(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
+    if (descriptor < 0 || !opened->open(descriptor, QIODevice::ReadOnly | QIODevice::Unbuffered,
+                                        QFileDevice::AutoCloseHandle)) {
+      return false;
+    }
+  }
+  if (file.size() != other.size()) {
+    return false;
+  }
+  QByteArray bytes;
+  do {
+    bytes = file.read(kCompared);
+    if (bytes != other.read(kCompared)) {
+      return false;
+    }
+  } while (!bytes.isEmpty());
+  return true;
 }
 
 }  // namespace
@@ -106,7 +133,7 @@ bool AtomicFile::commit() {
   if (m_device.firstError() != 0) {
     return fail(m_device.firstError());
   }
-  if (!m_temporaryName.isEmpty()) {
+  if (!m_temporaryName.isEmpty() && !haveSameContent(m_folder, m_temporaryName, m_targetName)) {
     if (::renameat(m_folder, m_temporaryName.constData(), m_folder, m_targetName.constData()) != 0) {
       return fail(errno);
     }

@@ -2,7 +2,9 @@
 //
 // A new file gets the permissions that the umask leaves; one that replaces another gets that one's
 // permissions and, where the system allows it, its owner. A symbolic link stays: the file it points to is
-// replaced. A file that may not be written is refused even when its folder would let it be replaced.
+// replaced. A file that may not be written is refused even when its folder would let it be replaced. A file
+// that holds the same bytes already is left as it is, its time included, so that nothing made of it is made
+// again.
 #pragma once
 
 #include <platform/Export.h>

@@ -4,6 +4,7 @@
 
 #include <QIODevice>
 #include <QStringView>
+#include <QTextCodec>
 
 #include <algorithm>
 
@@ -35,7 +36,9 @@ bool pairDeferredMacros(QString& text) {
 }  // namespace
 
 MFBuffer::MFBuffer() {
-  m_stream.setCodec("utf-8");
+  // Found once: the search by name would cost more than most buffers hold.
+  static QTextCodec* const utf8 = QTextCodec::codecForName("UTF-8");
+  m_stream.setCodec(utf8);
 }
 
 MFBuffer::~MFBuffer() = default;
