@@ -14,6 +14,7 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
   put(folder.filePath("empty.orw"), "");
   put(folder.filePath("cut.orw"), readAll(samples().first()).left(3000));
   put(folder.filePath("kept.mf"), "before");
+  put(folder.filePath("a b#$.orw"), readAll(samples().first()));
   const QString good = samples().first();
   const CommandCase cases[] = {
       {{"--help"}, 0, "Example:", ""},
@@ -26,6 +27,10 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
       {{"generate", good, good}, 2, "", "give -d DIR"},
       {{"generate", good, good, "-d", "out"}, 2, "", "give them separately"},
       {{"generate", good, "-o", "x", "-d", "y"}, 2, "", "excludes"},
+      {{"generate", good, "--depfile", "d.d"}, 2, "", "--output"},
+      {{"generate", "missing.orw", "-o", "x.mf", "--depfile", "d.d"}, 3, "", "missing.orw"},
+      {{"generate", good, "-o", "x.mf", "--depfile", "no/such/d.d"}, 3, "", "no/such/d.d"},
+      {{"generate", "a b#$.orw", "-o", "x$.mf", "--depfile", "d.d"}, 0, "", ""},
       {{"generate", good, "--param", "novalue"}, 2, "", "NAME=VALUE"},
       {{"generate", good, "--param", "NO_SUCH=1"}, 1, "", "NO_SUCH"},
       {{"generate", "missing.orw"}, 3, "", "missing.orw: error: "},
@@ -54,6 +59,9 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
   for (const CommandCase& test : cases)
     expectOutcome(test, folder.path());
   EXPECT_FALSE(QFile::exists(folder.filePath("cut.mf")));
+  const QByteArray dependencies = readAll(folder.filePath("d.d"));
+  EXPECT_TRUE(dependencies.startsWith("x$$.mf: \\\n  a\\ b\\#$$.orw \\\n")) << dependencies.constData();
+  EXPECT_TRUE(dependencies.contains("/resources/transformers/") && dependencies.endsWith(".ort:\n"));
   EXPECT_EQ(readAll(folder.filePath("kept.mf")), QByteArray("before"));
 }
 

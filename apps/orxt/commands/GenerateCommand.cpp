@@ -1,6 +1,8 @@
 #include <apps/orxt/commands/GenerateCommand.h>
 #include <apps/orxt/console/Console.h>
+#include <apps/orxt/console/DependencyFile.h>
 #include <apps/orxt/console/ProcessPool.h>
+#include <apps/orxt/facts/RecordingSource.h>
 #include <transform/files/InputFile.h>
 #include <transform/registry/TransformerMgr.h>
 #include <transform/text/MessageNumbers.h>
@@ -42,10 +44,15 @@ void GenerateCommand::declare(CLI::App& app) {
   CLI::Option* output = app.add_option("-o,--output", m_output,
                                        "Mapping file to write; - is standard output, which is the default")
                             ->type_name("FILE");
-  app.add_option("-d,--directory", m_directory,
-                 "Folder for the mapping files of several workspaces (NAME.mf)")
-      ->type_name("DIR")
-      ->excludes(output);
+  CLI::Option* directory = app.add_option("-d,--directory", m_directory,
+                                          "Folder for the mapping files of several workspaces (NAME.mf)")
+                               ->type_name("DIR")
+                               ->excludes(output);
+  app.add_option("--depfile", m_dependencies,
+                 "File to list in what the mapping file is made from, as make and Ninja read it")
+      ->type_name("FILE")
+      ->needs(output)
+      ->excludes(directory);
   m_parameters.declare(app);
   m_findings.declareRules(app);
   app.add_flag("-q,--quiet", m_quiet, "Errors only");
@@ -107,7 +114,8 @@ ExitStatus GenerateCommand::runJob(const Job& job, const Setting& setting, Trans
   const QString shownName = InputFile::shownName(job.workspace);
   orx::Findings diagnostics(shownName);
   QString error;
-  const TranslationResult result = translateWorkspace({job.workspace, job.output, setting.values}, source,
+  RecordingSource recording(source);
+  const TranslationResult result = translateWorkspace({job.workspace, job.output, setting.values}, recording,
                                                       diagnostics, error, setting.rules);
   for (const orx::Finding& finding : diagnostics.all()) {
     // Hints are for whoever tidies up, and asks for them by validation.
@@ -118,7 +126,22 @@ ExitStatus GenerateCommand::runJob(const Job& job, const Setting& setting, Trans
     console.failFile(shownName, error);
   else if (result == TranslationResult::Unwritable)
     console.fail(error);
+  else if (result == TranslationResult::Done && !writeDependencies(job, recording, console))
+    return kExitFile;
   return exitStatus(result);
+}
+
+bool GenerateCommand::writeDependencies(const Job& job, const RecordingSource& used, Console& console) const {
+  if (m_dependencies.empty())
+    return true;
+  QStringList files = used.files();
+  if (job.workspace != QLatin1String("-"))
+    files.prepend(job.workspace);
+  QString error;
+  if (dependency_file::write(QString::fromStdString(m_dependencies), job.output, files, error))
+    return true;
+  console.fail(error);
+  return false;
 }
 
 ExitStatus GenerateCommand::runInProcesses(const std::vector<Job>& jobs, const Setting& setting,

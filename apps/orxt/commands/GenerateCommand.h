@@ -11,6 +11,7 @@
 #include <string>
 #include <vector>
 
+class RecordingSource;
 class TransformerSource;
 
 class GenerateCommand : public Command {
@@ -35,12 +36,14 @@ class GenerateCommand : public Command {
   bool planJobs(std::vector<Job>& jobs, Console& console) const;
   ExitStatus runJob(const Job& job, const Setting& setting, TransformerSource& source,
                     Console& console) const;
+  bool writeDependencies(const Job& job, const RecordingSource& used, Console& console) const;
   ExitStatus runInProcesses(const std::vector<Job>& jobs, const Setting& setting, TransformerSource& source,
                             Console& console) const;
 
   std::vector<std::string> m_workspaces;
   std::string m_output;
   std::string m_directory;
+  std::string m_dependencies;
   ParameterOptions m_parameters;
   FindingOptions m_findings;
   bool m_quiet = false;
