@@ -102,6 +102,12 @@ const GlobalParameters::Parameter* GlobalParameters::find(const QString& name) c
   return found == m_index.constEnd() ? nullptr : &m_parameters[static_cast<std::size_t>(found.value())];
 }
 
+GUIType GlobalParameters::typeOf(const QString& name) const {
+  const Parameter* parameter = find(name);
+  return parameter && parameter->isPublished ? GUIType::fromGuiLine(parameter->promptLine)
+                                             : GUIType::kNullGuiType;
+}
+
 std::vector<std::vector<const GlobalParameters::Parameter*>> GlobalParameters::circles() const {
   std::vector<std::pair<int, int>> edges;
   int budget = kMaximumReplacements;

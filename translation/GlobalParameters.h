@@ -3,6 +3,7 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <platform/orxparameter/orxparameter.h>
 #include <transform/core/WorkspaceParameterDirectory.h>
 #include <transform/custom/ScriptParameters.h>
 
@@ -44,6 +45,8 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
   const std::vector<Parameter>& all() const { return m_parameters; }
   // Null when there is none.
   const Parameter* find(const QString& name) const;
+  // By its prompt line; the null type without one.
+  GUIType typeOf(const QString& name) const;
   // Groups of parameters whose values lead back to themselves through references.
   std::vector<std::vector<const Parameter*>> circles() const;
 

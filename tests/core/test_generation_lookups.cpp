@@ -285,6 +285,9 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
   const QString members =
       "MULTIPARAMETER " + MemberList::configToken(',', {GUIType::fromGuiLine("GUI TEXT A a"),
                                                         GUIType::fromGuiLine("GUI TEXT B b")});
+  const QString encoded =
+      "MULTIPARAMETER " + MemberList::configToken(',', {GUIType::fromGuiLine("GUI TEXT_ENCODED A a"),
+                                                        GUIType::fromGuiLine("GUI TEXT B b")});
   const QString table =
       "GUI_LINE_TABLE " + MemberList::configToken(';', {GUIType::fromGuiLine("GUI TEXT A a"),
                                                         GUIType::fromGuiLine("GUI TEXT B b")});
@@ -331,7 +334,13 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"G", "TEXT_OR_ATTR", "$(G)@Value(a)"}, "K $(G)", kGrowsWithoutEnd},
       {{"P", members, "A,$(B),B,$(A)"}, "K $(A)", kGrowsWithoutEnd},
       {{"P", members, "A,in $(B),B,OUTPUT"}, "K $(A)", kKeywordInValue},
-      {{"P", members, "A,$(B)@Value(a),B,@Value(b)"}, "K $(A)", kReferenceBreaks},
+      {{"P", members, "A,$(B)@Value(a),B,@Value(b)"}, "K $(A)", kReferenceToCall},
+      {{"P", members, "A,x$(B),B,@Value(b)"}, "K $(A)", kReferenceToCall},
+      {{"P", members, "A,$(B)@Value(a),B,\"b,c\""}, "K $(A)", kReferenceBreaks},
+      {{"P", encoded, "A,x$(B),B,y"}, "K $(A)", 0},
+      {{"P", encoded, "A,x$(B),B,<space>"}, "K $(A)", kReferenceReencoded},
+      {{"P", encoded, "A,x,B,$(A)y"}, "K $(A)", 0},
+      {{"P", encoded, "A,x<space>y,B,$(A)"}, "K $(A)", kReferenceReencoded},
       {{"P", members, "A,$(B)@Value(a),B,b c"}, "K $(A)", 0},
       {{"P", members, "A,x"}, "K $(A)", kMemberLeftOut, {"B"}},
       {{"P", members, "A,x,B"}, "K $(A)", kMemberLeftOut, {"B"}},
@@ -343,7 +352,7 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       // What the listener knows.
       {{"P", "TEXT_OR_ATTR", "$(Gabc)@Value(a)"}, "K $(P)", 0},
       {{"P", "TEXT_OR_ATTR", "$(Ga,b)@Value(a)"}, "K $(P)", kReferenceBreaks},
-      {{"P", "TEXT_OR_ATTR", "$(Ga<space>b)@Value(a)"}, "K $(P)", kReferenceBreaks},
+      {{"P", "TEXT_OR_ATTR", "$(Ga<space>b)@Value(a)"}, "K $(P)", kReferenceReencoded},
       {{"P", "TEXT_OR_ATTR_ENCODED", "$(Ga<space>b)@Value<leftparenthesis>a<rightparenthesis>"}, "K $(P)", 0},
       {{"P", "TEXT_OR_ATTR", "@Value($(Ga\"b))"}, "K $(P)", kReferenceBreaks},
       {{"P", "TEXT", "ORX_CONDITIONAL:1;$(Ga,b)"}, "K $(P)", kReferenceBreaks},

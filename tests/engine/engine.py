@@ -145,7 +145,7 @@ class Run:
         listed = unpack(settings.get("TRANSFORMER_PARAMS", ""))
         self.macros[prefix] = made.name
         for key, value in zip(listed[::2], listed[1::2]):
-            self.macros[made.name + "_" + decode(key)] = decode(value)
+            self.macros[made.name + "_" + decode(key)] = self.macros.expand_early(decode(value))
         back = made.name + "_" + settings.get("LOOPBACK_INPUT_TAG", "")
         count, workers = len(self.factories), self.workers
         for turn in range(2 if "LOOPBACK_INPUT_TAG" in settings else 1):

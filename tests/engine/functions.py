@@ -62,7 +62,7 @@ def operands(text, feature):
         at = found.end()
     result.append(text[at:])
     for part in result:
-        if isinstance(part, str) and re.search(r"[(),\s\"]", part):
+        if isinstance(part, str) and re.search(r"[(),{}\"]", part):
             raise Fault("bare characters in an expression: " + text)
     return [decode(part) if isinstance(part, str) else part for part in result if part != ""]
 

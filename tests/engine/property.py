@@ -148,11 +148,13 @@ class Property:
                     continue
                 parts = getattr(value, "members", {parameter.name: (parameter, value)})
                 for member, (kind, part) in parts.items():
-                    expected = resolve(part.expected, scope, around)
+                    expected = resolve(part.expected, scope, around, node)
                     if isinstance(expected, str) and not values.is_encoded(kind.type):
                         expected = expected.strip(" \t")
                     for key in node.definition.keys_of(member) if expected is not None else []:
                         yield from self.value(run, case, made, key, kind.type, expected, part)
+            if made:
+                yield from self.listed(run, name, node)
             level = made and node.values.get("ORX_PROCESS_COUNT")
             if level and level.expected:
                 expected = resolve(level.expected, scope, around)
@@ -160,6 +162,19 @@ class Property:
                         if each.name == name and each.kind.startswith("TransformFact:")]
                 if came not in ([], [[expected]]):
                     yield ("value", f"{name}: the level {came}", f"not {expected!r} of {level.stored!r}")
+
+    def listed(self, run, name, node):
+        """What workers are told of the parameters: the values as they are stored, references included."""
+        for each in run.factories:
+            listed = unpack("".join(each.values("TRANSFORMER_PARAMS")))
+            if each.name != name or each.values("RUN") != ["STATEMENTS"]:
+                continue
+            given = dict(zip(map(decode, listed[::2]), map(decode, listed[1::2])))
+            stored = {parameter.name: node.values[parameter.name].stored for parameter in node.definition.parameters
+                      if parameter.name in node.values and not values.entries(parameter)}
+            for key, value in stored.items():
+                if len(listed) % 2 or given.get(key) != value and ("$" not in value or key not in given):
+                    yield ("value", f"{name}: {key} listed as {listed[:40]}", f"not {value!r}")
 
     def value(self, run, case, made, key, kind, expected, part):
         stood = made.values(key)
@@ -178,19 +193,27 @@ def excluded(problem):
     return any(check == problem[0] and re.search(pattern, text) for check, pattern in EXCLUDED)
 
 
-def resolve(expected, scope, around):
+def resolve(expected, scope, around, node=None):
     """The text that is to come back, macros of documents replaced; None when nothing is to be compared."""
     if isinstance(expected, tuple) and expected[0] == "table":
-        cells = [resolve(each, scope, around) for each in expected[3]]
+        cells = [resolve(each, scope, around, node) for each in expected[3]]
         return None if None in cells else (*expected[:3], cells)
+    if isinstance(expected, tuple) and expected[0] in ("list", "packed"):
+        items = [resolve(each, scope, around, node) for each in expected[1]]
+        return None if None in items else (
+            "list", items if expected[0] == "list" else unpack(items[0].strip(" \t")))
     if isinstance(expected, tuple) and expected[0] == "formula":
-        text = resolve(expected[1], scope, around)
+        text = resolve(expected[1], scope, around, node)
         return None if text is None else ("formula", text)
     if not isinstance(expected, list):
         return expected
     pieces = []
     for piece in expected:
-        if isinstance(piece, tuple):
+        if isinstance(piece, tuple) and piece[0] == "own":
+            value = node.values.get(piece[1]) if node else None
+            comparable = value is not None and isinstance(value.expected, (str, list))
+            piece = resolve(value.expected, scope, around, node) if comparable else None
+        elif isinstance(piece, tuple):
             value = around[-1][1].values[piece[1]] if around else \
                 next(value for name, _, _, value in scope.parameters if name == piece[1])
             piece = resolve(value.expected, *((around[-1][0], around[:-1]) if around else (scope, around)))
@@ -205,8 +228,8 @@ def back(run, case, kind, expected, stood):
         return "list", [decode(each) if encoded else each for each in unpack(stood)]
     if isinstance(expected, tuple) and expected[0] == "formula":
         given = formula(attributes_in(expected[1], case.feature), True)
-        same = decode(stood) == expected[1] or run.value(stood, case.feature) == shown(given)
-        return expected if same else run.value(stood, case.feature)
+        came = run.value(stood, case.feature)
+        return expected if expected[1] in (decode(stood), decode(came)) or came == shown(given) else came
     if isinstance(expected, tuple):
         _, separator, kinds, cells = expected
         came = [back(run, case, kind, cell, each) for kind, cell, each in

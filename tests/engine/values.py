@@ -89,7 +89,8 @@ def choice(case, parameter, scope):
 def referred(case, scope, kind, given, expected):
     """A reference to a parameter made for it, whose value is `given`."""
     name = f"R{len(scope.parameters)}"
-    value = Value(given, given)
+    kind = case.random.choice([kind, kind, "TEXT_ENCODED"])
+    value = Value(encode(given) if is_encoded(kind) else given, given)
     value.fixed = True
     scope.parameters.append((name, kind, "Prompt", value))
     return Value(f"$({name})", [expected])
@@ -114,6 +115,9 @@ def numeric(case, kind, scope):
         name = scope.referable[0]
         return Value(reference(name, is_encoded(kind)), case.feature.get(name))
     number = rng.choice(NUMBERS[3:])
+    if may_refer(kind) and scope.referable and case.siblings and rng.random() < 0.05:
+        sum_of = f"{reference(scope.referable[0], is_encoded(kind))}+$({rng.choice(case.siblings)})"
+        return Value(sum_of)  # what it gives is not compared; that it can be worked out is
     if rng.random() < 0.05:
         return referred(case, scope, "FLOAT", number, number)
     if rng.random() < 0.05:
@@ -130,8 +134,9 @@ def reference(name, encoded):
 
 def text(case, kind, scope):
     rng, encoded = case.random, is_encoded(kind)
+    mixed = rng.random() < 0.1
     macros = [(name, value) for name, of, _, value in scope.parameters
-              if (is_encoded(of) or of.endswith("_PARM")) == encoded and of != "FLOAT"]
+              if mixed or (is_encoded(of) or of.endswith("_PARM")) == encoded and of != "FLOAT"]
     meaning = case.text("t", kind)
     if "XML" in kind:
         meaning = f"<a>{escape(meaning)}</a>"
@@ -151,8 +156,9 @@ def text(case, kind, scope):
     elif rng.random() < 0.1 and scope.referable and may_refer(kind):
         return conditional(case, kind, scope, [(text, text) for text in
                                                (case.text("yes", "conditional"), case.text("no", "conditional"))])
-    elif case.siblings and rng.random() < 0.02:
-        parts.append((f"$({rng.choice(case.siblings)})", None))
+    if case.siblings and rng.random() < 0.05:
+        parts.append(own(case))
+        rng.shuffle(parts)
     values = [meaning for _, meaning in parts]
     return Value("".join(part for part, _ in parts), None if None in values else values)
 
@@ -162,12 +168,26 @@ def conditional(case, kind, scope, results):
     name = case.random.choice(scope.referable)
     limit = case.random.choice(["0", "99999"])
     (yes, first), (no, second) = results
-    condition = "@Value(" + reference(name, False)[7:-1] + ") > " + limit
-    return Value("ORX_CONDITIONAL:" + ";".join(map(encode, (condition, yes, no))),
+    condition = encode("@Value(" + reference(name, False)[7:-1] + ") > ")
+    if case.siblings and case.random.random() < 0.1:
+        return Value("ORX_CONDITIONAL:" + ";".join([condition + own(case)[0], encode(yes), encode(no)]))
+    condition += encode(limit)
+    return Value("ORX_CONDITIONAL:" + ";".join([condition, encode(yes), encode(no)]),
                  [first if float(case.feature.get(name)) > float(limit) else second])
 
 
+def own(case):
+    """A reference to another parameter of the same transformer, and what it is to give."""
+    name = case.random.choice(case.siblings)
+    return f"$({name})", ("own", name)
+
+
 def expression(case, scope):
+    if scope.referable and case.random.random() < 0.05:
+        name, limit = scope.referable[0], case.random.choice(["0", "99999"])
+        formulas = [f"{reference(name, False)} + {number}" for number in (1, 2)]
+        return Value("ORX_CONDITIONAL:" + ";".join(map(encode, (f"{reference(name, False)} > {limit}", *formulas))),
+                     ("formula", [formulas[limit != "0"]]))
     rng, parts = case.random, ["1 = 2"]
     if scope.referable:
         parts = ["@Value(" + reference(rng.choice(scope.referable), False)[7:-1] + ") = 3"]
@@ -179,6 +199,11 @@ def expression(case, scope):
     elif encoded and rng.random() < 0.3:
         parts += [' or "', ("macro", encoded[0]), '" = "t"']
         stored += encode(' or "') + f"$({encoded[0]})" + encode('" = "t"')
+    if case.siblings and rng.random() < 0.1:
+        token, meaning = own(case)
+        before, behind = rng.choice([(' or "', '" = "t"'), (" or 1 + ", "")])
+        stored += encode(before) + token + encode(behind)
+        parts += [before, meaning, behind]
     return Value(stored, ("formula", parts))
 
 
@@ -186,6 +211,11 @@ def attributes(case, kind, scope):
     new = kind.startswith("NEW")
     known = scope.attributes
     names = [case.text("fresh", kind) if new or not known else case.random.choice(known)]
+    if "LIST" in kind and scope.parameters and case.random.random() < 0.1:
+        name, first = case.random.choice(scope.parameters)[0], known[0] if known else "a"
+        if is_encoded(kind):
+            return Value(f"{encode(first)},$({name})", ("list", [first, [("macro", name)]]))
+        return Value(f"{pack([first])},$({name})", ("packed", [[f"{pack([first])},", ("macro", name)]]))
     if "LIST" in kind:
         names = list(dict.fromkeys(names + case.random.sample(known, min(len(known), case.random.randrange(3)))))
         if is_encoded(kind):

@@ -149,8 +149,9 @@ class Case:
 
     def constant(self, kind, scope):
         """A value of a parameter of a document; what it refers to are the parameters of `scope`."""
+        mixed = self.random.random() < 0.2
         same = [name for name, of, _, _ in scope.parameters
-                if of == kind or kind == "TEXT_ENCODED" and is_encoded(of)] if scope else []
+                if of == kind or kind == "TEXT_ENCODED" and is_encoded(of) or mixed and "TEXT" in kind] if scope else []
         if same and kind != "SCRIPT" and self.random.random() < 0.25:
             name = self.random.choice(same)
             return Value(f"$({name})", [("macro", name)])

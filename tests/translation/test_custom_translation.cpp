@@ -312,20 +312,23 @@ TEST(CustomTranslation, WhatALoopIsHandedIsJudged) {
       {"TEXT", "x", "0", {"unwritable-value L"}, ""},
       {"TEXT", "x", "4 OUTPUT", {"unwritable-value L", "unfit-number L"}, ""},
       {"INSTANCE_MACROS TEXT", "$[Q]", "4", {"unwritable-value L"}, ""},
-      {"INSTANCE_MACROS TEXT", "$(ELSEWHERE)", "4", {}, "P,$(ELSEWHERE)"},
+      {"INSTANCE_MACROS TEXT",
+       "$(ELSEWHERE)",
+       "4",
+       {},
+       "P,<dollarsign><leftparenthesis>ELSEWHERE<rightparenthesis>"},
       {"TEXT_EDIT_TCL_PARM", "return<space>1", "4", {"unwritable-value L"}, ""},
       {"OPTIONAL TEXT_EDIT_TCL_PARM", "<Unused>", "4", {}, "MAX_LOOP_ITERATIONS:4 "},
       {"TEXT", "ORX_CONDITIONAL:1=1;a;b", "4", {"unwritable-value L"}, ""},
       {"TEXT", "@Value(a)", "4", {"unwritable-value L"}, ""},
-      {"TEXT", "$(WORDS)", "4", {}, "P,$(WORDS)"},
-      {"TEXT", "$(LIST)", "4", {"unwritable-value L"}, ""},
-      {"TEXT_ENCODED", "x$(ENCODED)", "4", {"unwritable-value L"}, ""},
+      {"TEXT", "$(WORDS)", "4", {}, "P,<dollarsign><leftparenthesis>WORDS<rightparenthesis>"},
+      {"TEXT_ENCODED", "x$(ENCODED)", "4", {}, "P,x<dollarsign><leftparenthesis>ENCODED<rightparenthesis>"},
+      {"TEXT", "x$(ENCODED)", "4", {"unwritable-value L"}, ""},
       {"TEXT", "a,b;c", "4", {}, "P,a<comma>b<semicolon>c"},
   };
   for (const auto& test : cases) {
     SmallWorkspace workspace;
-    workspace.parameter("GUI TEXT WORDS W", "a b").parameter("GUI TEXT LIST L", "a,b");
-    workspace.parameter("GUI TEXT_ENCODED ENCODED E", "a<space>b");
+    workspace.parameter("GUI TEXT WORDS W", "a b").parameter("GUI TEXT_ENCODED ENCODED E", "a<space>b");
     workspace.transformer(3, kInstance,
                           {"SUB_DOC_NAME", "Looper", "XFORMER_NAME", "L", "P", test.value,
                            "MAX_LOOP_ITERATIONS", test.maximum});

@@ -3,8 +3,10 @@
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/CarriedReferences.h>
 #include <transform/core/ExpressionWriter.h>
+#include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
-#include <transform/core/TransformParamCfg.h>
+#include <transform/core/TransformerCfg.h>
+#include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueReferences.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
@@ -19,17 +21,46 @@ namespace {
 
 using namespace carried_references;
 
-long refuseInExpression(const QString& part, bool isEncoded, const Expand& expand) {
+struct Place {
+  bool isEncoded;     // as the value is stored
+  bool isExpression;  // decoded by the engine, whatever it was before
+};
+
+bool isStoredEncoded(const GUIType& type, const QString& part) {
+  return type.valueIsEncoded() || part.startsWith(kConditionalPrefix);
+}
+
+// Compares what people see of a text and the values that it refers to with what the engine reads.
+long refuseIn(const Place& place, const QString& part, const Known& known) {
+  QString seen;
+  QString stood;
+  int done = 0;
+  const auto addText = [&](int end) {
+    const QString text = part.mid(done, end - done);
+    seen += place.isEncoded ? QORXWwjdDecode(text) : text;
+    stood += place.isExpression && !place.isEncoded ? QORXWwjdEncode(text) : text;
+  };
   for (const MacroReference& reference : macroReferences(part)) {
     if (!reference.isClosed || reference.isInside)
       continue;
+    QString name = reference.name(part);
     QString brought = part.mid(reference.begin, reference.end - reference.begin);
-    if (!expand(brought))
+    if ((reference.hasInner && !known.expand(name)) || !known.expand(brought))
       return messages::kGrowsWithoutEnd;
-    if (!fitsExpression(brought, isEncoded))
+    const Spelling spelling = known.spellingOf(name);
+    if (spelling == Spelling::Call)
+      return messages::kReferenceToCall;
+    if (place.isExpression && !fitsExpression(brought))
       return messages::kReferenceBreaks;
+    addText(reference.begin);
+    const bool isWord = spelling == Spelling::Unknown ? place.isEncoded : spelling == Spelling::Word;
+    seen += isWord ? QORXWwjdDecode(brought) : brought;
+    stood += brought;
+    done = reference.end;
   }
-  return 0;
+  addText(part.size());
+  const bool isDecoded = place.isEncoded || place.isExpression;
+  return seen == (isDecoded ? QORXWwjdDecode(stood) : stood) ? 0 : messages::kReferenceReencoded;
 }
 
 // A function that only a reference brings.
@@ -45,7 +76,7 @@ bool bringsCall(const QString& part, const QString& expanded) {
   return expanded != part && holdsCall(expanded) && !holdsCall(part);
 }
 
-bool keepsCells(const TransformParamCfg& record, const QString& value, const Expand& expand) {
+bool keepsCells(const TransformParamCfg& record, const QString& value, const ExpandReferences& expand) {
   const QChar separator = record.members().separator();
   QStringList cells = QORXSdfStringToList(value, separator);
   QString whole = value;
@@ -53,48 +84,69 @@ bool keepsCells(const TransformParamCfg& record, const QString& value, const Exp
   return ends && QORXSdfStringToList(whole, separator) == cells;
 }
 
+bool isJudged(const QString& stored) {
+  return beginsMacroReference(stored) && MFBuffer::closesDeferredMacros(stored);
+}
+
 }  // namespace
 
 namespace carried_references {
 
-bool fitsExpression(const QString& text, bool isEncoded) {
-  static const QString kActive = QStringLiteral(",()\"{}");
-  const QString known = withoutReferences(text);
-  const bool isActive = std::any_of(known.begin(), known.end(), [](QChar c) { return kActive.contains(c); });
-  return !isActive && !beginsValueReference(known) && (isEncoded || QORXWwjdDecode(known) == known);
+ScopeTypes::~ScopeTypes() = default;
+
+Spelling spellingOf(const GUIType& type) {
+  return type.isNull() ? Spelling::Unknown : type.valueIsEncoded() ? Spelling::Word : Spelling::Plain;
 }
 
-long refuse(const TransformParamCfg& record, const QString& stored, TableForm form, const Expand& expand) {
-  if (!beginsMacroReference(stored) || !MFBuffer::closesDeferredMacros(stored))
+Known knownAround(const TransformerCfg& cfg) {
+  const auto expand = [&cfg](QString& text) {
+    text = MFBuffer::withOrdinaryMacros(text);
+    return !cfg.listener() || cfg.listener()->expandMacros(cfg, text);
+  };
+  const auto* types = dynamic_cast<const ScopeTypes*>(cfg.listener());
+  return {expand, [types](const QString& name) {
+            return types ? spellingOf(types->typeOf(name)) : Spelling::Unknown;
+          }};
+}
+
+bool isReadDecoded(const GUIType& type, const QString& part) {
+  return type.valueIsEncoded() || ExpressionWriter::needsWrapping(type, part);
+}
+
+bool fitsExpression(const QString& text) {
+  static const QString kActive = QStringLiteral(",()\"{}");
+  const QString known = withoutReferences(text);
+  return std::none_of(known.begin(), known.end(), [](QChar c) { return kActive.contains(c); }) &&
+         !beginsValueReference(known);
+}
+
+long refuse(const TransformParamCfg& record, const QString& stored, const QString& written, TableForm form,
+            const Known& known) {
+  if (!isJudged(stored))
     return 0;
   const QString value = MFBuffer::withOrdinaryMacros(stored);
+  // Some classes wrap what is no reference to an attribute.
+  const bool isMadeCall = record.members().members().empty() && written.startsWith(kEvaluateCall);
   long number = 0;
   forEachPart(record, value, [&](const GUIType& type, const QString& part) {
     if (number != 0 || !part.contains(kMacroOpen))
       return;
-    if (ExpressionWriter::needsWrapping(type, part)) {
-      const bool isEncoded = type.valueIsEncoded() || part.startsWith(kConditionalPrefix);
-      number = refuseInExpression(part, isEncoded, expand);
-      return;
-    }
+    const bool isExpression = isMadeCall || ExpressionWriter::needsWrapping(type, part);
+    number = refuseIn({isStoredEncoded(type, part), isExpression}, part, known);
     QString expanded = part;
-    if (!expand(expanded))
-      number = messages::kGrowsWithoutEnd;
-    else if (!type.getType().startsWith(kExpressionType) && bringsCall(part, expanded))
+    if (number == 0 && !isExpression && !type.getType().startsWith(kExpressionType) &&
+        known.expand(expanded) && bringsCall(part, expanded))
       number = messages::kCallInValue;
   });
   if (number != 0 || form == TableForm::ByRows || !record.isTable() || value.startsWith(kConditionalPrefix))
     return number;
-  return keepsCells(record, value, expand) ? 0 : messages::kReferenceBreaks;
+  return keepsCells(record, value, known.expand) ? 0 : messages::kReferenceBreaks;
 }
 
-bool fitsEncodedList(const QString& value, const Expand& expand) {
-  QString meant = value;
-  QString listed = encodeAroundReferences(value);
-  if (!expand(meant) || !expand(listed))
-    return false;
-  const QStringList elements = QORXSdfStringToList(listed, QLatin1Char(','));
-  return listed.isEmpty() || (elements.size() == 1 && QORXWwjdDecode(elements.first()) == meant);
+long refuseInMacro(const GUIType& type, const QString& stored, const Known& known) {
+  return isJudged(stored)
+             ? refuseIn({isStoredEncoded(type, stored), false}, MFBuffer::withOrdinaryMacros(stored), known)
+             : 0;
 }
 
 }  // namespace carried_references

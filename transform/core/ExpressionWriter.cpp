@@ -31,18 +31,16 @@ QString body(const QString& text, bool encoded) {
   return result + literal(done, text.size());
 }
 
-QString conditionalBody(const QString& value) {
-  QString result = kChoose;
-  const QString rest = value.mid(kConditionalPrefix.size());
-  bool isFirst = true;
-  for (const QString& part : rest.split(kPartSeparator)) {
-    if (!isFirst) {
-      result += QLatin1Char(',');
-    }
-    result += body(part, true);
-    isFirst = false;
+// With `resultsAreFormulas`, attributes in the results stay references: whoever evaluates the formula looks
+// them up.
+QString conditionalBody(const QString& value, bool resultsAreFormulas) {
+  QStringList parts = value.mid(kConditionalPrefix.size()).split(kPartSeparator);
+  for (int i = 0; i < parts.size(); ++i) {
+    const bool isResult = i % 2 == 1 || i + 1 == parts.size();
+    parts[i] =
+        isResult && resultsAreFormulas ? reencodeAroundReferences(parts.at(i)) : body(parts.at(i), true);
   }
-  return result + QLatin1Char(')');
+  return kChoose + parts.join(QLatin1Char(',')) + QLatin1Char(')');
 }
 
 QLatin1String expressionType(const QString& type, bool encoded) {
@@ -81,7 +79,8 @@ QString ExpressionWriter::wrap(const QString& value, const QString& name, const 
   }
   result += expressionType(type, encoded);
   result += QLatin1Char(',') + encodeAroundReferences(name) + QLatin1Char(',');
-  result += value.startsWith(kConditionalPrefix) ? conditionalBody(value) : body(value, encoded);
+  result += value.startsWith(kConditionalPrefix) ? conditionalBody(value, type.startsWith(kExpressionType))
+                                                 : body(value, encoded);
   return result + QLatin1Char(')');
 }
 

@@ -3,18 +3,16 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/core/ParameterReferences.h>
 
 #include <QString>
 #include <QStringList>
-
-#include <functional>
 
 class GUIType;
 class TransformParamCfg;
 
 // What of a value of the type is read as a formula, decoded, with the references that `expand` knows carried
 // out. What still holds references to macros is left out: what it says is known when the mapping file runs.
-using ExpandReferences = std::function<void(QString& text)>;
 ORX_EXPORT QStringList formulasIn(const GUIType& type, const QString& value,
                                   const ExpandReferences& expand = nullptr);
 

@@ -19,5 +19,7 @@ inline const QLatin1String kValueListToken("ORX_PARM_VAL_LIST");
 
 // The call that works a value out for each feature.
 inline const QLatin1String kEvaluateCall("@EvaluateExpression(");
+// The call of a procedure that looks a choice up.
+inline const QLatin1String kProcedureCall("@Tcl2(");
 
 inline const QLatin1String kBracketValueMark(" {*} ");

@@ -8,6 +8,10 @@
 
 #include <functional>
 
+// Carries out the references of a text as far as their values are known; the others stay. False when they do
+// not come to an end.
+using ExpandReferences = std::function<bool(QString& text)>;
+
 // Asks for the replacement of each reference, from left to right; one for which `replace` answers false
 // stays. What is put in is not looked at again.
 ORX_EXPORT QString replaceParameterReferences(

@@ -190,7 +190,7 @@ QString single_choices::toStored(const TransformParamCfg& parameter, const QStri
 }
 
 bool single_choices::refersToShownSide(const TransformParamCfg& parameter, const QString& value,
-                                       const Expand& expand) {
+                                       const ExpandReferences& expand) {
   bool isShown = false;
   replaceIn(parameter, value, [&](const Choice& choice) {
     QString known = choice.text;

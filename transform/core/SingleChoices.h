@@ -4,6 +4,7 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <transform/core/ParameterReferences.h>
 
 #include <QString>
 
@@ -33,10 +34,8 @@ ORX_EXPORT QString replaceIn(const GUIType& type, const ChoiceList& choices, con
 // The value with the stored side of each choice.
 ORX_EXPORT QString toStored(const TransformParamCfg& parameter, const QString& value);
 
-// Whether a reference among the choices leads to one as it is shown. `expand` puts the values of macros in
-// the places of references to them; false when that has no end.
-using Expand = std::function<bool(QString& text)>;
+// Whether a reference among the choices leads to one as it is shown.
 ORX_EXPORT bool refersToShownSide(const TransformParamCfg& parameter, const QString& value,
-                                  const Expand& expand);
+                                  const ExpandReferences& expand);
 
 }  // namespace single_choices

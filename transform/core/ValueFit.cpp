@@ -42,7 +42,7 @@ bool isPlain(const GUIType& type, const QString& value) {
   return !(isFunction && type.mayHoldAttributeReference());
 }
 
-QString expanded(const QString& value, const ValueFit::Expand& expand) {
+QString expanded(const QString& value, const ExpandReferences& expand) {
   QString result = value;
   if (expand && refersToMacro(value))
     expand(result);
@@ -115,7 +115,7 @@ bool isOffered(const single_choices::Choice& choice) {
 }
 
 // Collects the choices that are not offered, as a function that replaces nothing.
-single_choices::Replace collecting(std::vector<ValueFit>& misfits, const ValueFit::Expand& expand) {
+single_choices::Replace collecting(std::vector<ValueFit>& misfits, const ExpandReferences& expand) {
   return [&misfits, &expand](const single_choices::Choice& choice) {
     const QString known = choice.refers ? expanded(choice.text, expand) : choice.text;
     if (known != choice.text && !known.startsWith(kConditionalPrefix)) {
@@ -139,7 +139,7 @@ ValueFit ValueFit::of(const GUIType& type, const ChoiceList& choices, const QStr
 }
 
 std::vector<ValueFit> ValueFit::misfitsOf(const TransformParamCfg& parameter, const QString& value,
-                                          const Expand& expand) {
+                                          const ExpandReferences& expand) {
   std::vector<ValueFit> misfits;
   if (parameter.getName() == kProcessCountParameter && value == kNoProcesses)
     return misfits;

@@ -7,11 +7,11 @@
 
 #include <platform/Export.h>
 #include <platform/orxparameter/orxparameter.h>
+#include <transform/core/ParameterReferences.h>
 
 #include <QString>
 #include <QStringList>
 
-#include <functional>
 #include <vector>
 
 class TransformParamCfg;
@@ -34,9 +34,8 @@ struct ORX_EXPORT ValueFit {
   // `choices` are those of the type, with their lookups.
   static ValueFit of(const GUIType& type, const ChoiceList& choices, const QString& value);
   static ValueFit of(const GUIType& type, const QString& value) { return of(type, ChoiceList(type), value); }
-  // Puts the values of parameters in the places of references to them, as far as they are known.
-  using Expand = std::function<void(QString& text)>;
-  // All that does not fit in a parameter with members or columns, or in the value itself.
+  // All that does not fit in a parameter with members or columns, or in the value itself, the references in
+  // it carried out where `expand` is given.
   static std::vector<ValueFit> misfitsOf(const TransformParamCfg& parameter, const QString& value,
-                                         const Expand& expand = nullptr);
+                                         const ExpandReferences& expand = nullptr);
 };

@@ -70,6 +70,9 @@ constexpr long kNoLoopSetting = 370756;
 constexpr long kNoPrintedName = 370757;
 constexpr long kNoHeaderField = 370758;
 constexpr long kReferenceBreaks = 370759;
+constexpr long kReferenceReencoded = 371331;
+constexpr long kReferenceToCall = 371332;
+constexpr long kOwnReferenceApart = 371333;
 
 // Why a script cannot be written.
 constexpr long kScriptTooManyBrackets = 370729;
@@ -260,7 +263,6 @@ constexpr long kConditionInMacro = 370910;
 constexpr long kLoopInProcesses = 370911;
 constexpr long kSameLoopName = 370912;
 constexpr long kAttributeInMacro = 370913;
-constexpr long kReferenceForWorkers = 370914;
 constexpr long kBreaksInside = 370915;
 
 // Checks of definition files.

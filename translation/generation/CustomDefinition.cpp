@@ -1,4 +1,5 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/core/CarriedReferences.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/ParameterReferences.h>
@@ -38,7 +39,7 @@ using orx::Rule;
 
 // Inside a definition the published parameters are macros whose values only the instance knows: whatever
 // refers to them also refers to the prefix macro.
-class CustomDefinition::Listener : public ParameterScopeListener {
+class CustomDefinition::Listener : public ParameterScopeListener, public carried_references::ScopeTypes {
  public:
   Listener(const QString& prefix, const TransformerCfgListener& surroundings)
       : m_prefix(prefix), m_surroundings(surroundings) {}
@@ -49,6 +50,10 @@ class CustomDefinition::Listener : public ParameterScopeListener {
   }
   bool expandMacros(const TransformerCfg& cfg, QString& text) const override {
     return m_surroundings.expandMacros(cfg, text);
+  }
+  GUIType typeOf(const QString& parameter) const override {
+    const auto* types = dynamic_cast<const carried_references::ScopeTypes*>(&m_surroundings);
+    return types ? types->typeOf(parameter) : GUIType::kNullGuiType;
   }
 
  protected:

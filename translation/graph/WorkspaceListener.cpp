@@ -6,6 +6,10 @@ bool WorkspaceListener::isScopeParameter(const QString& name) const {
   return m_parameters.find(name) != nullptr;
 }
 
+GUIType WorkspaceListener::typeOf(const QString& parameter) const {
+  return m_parameters.typeOf(parameter);
+}
+
 bool WorkspaceListener::expandMacros(const TransformerCfg& cfg, QString& text) const {
   if (ParameterScopeListener::expandMacros(cfg, text))
     return true;

@@ -1,11 +1,10 @@
+#include <transform/core/CarriedReferences.h>
 #include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueFit.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/findings/Findings.h>
-#include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
@@ -15,6 +14,7 @@
 #include <translation/GlobalParameters.h>
 #include <translation/validation/FitChecks.h>
 
+using carried_references::knownAround;
 using orx::Rule;
 
 namespace {
@@ -28,14 +28,6 @@ void report(const std::vector<ValueFit>& misfits, const TransformParamCfg& param
     findings.reportParameter(fit.isNumber() ? Rule::UnfitNumber : Rule::UnfitChoice, fit.message(), line,
                              node, parameter.getName(), prompt + QLatin1String(": ") + fit.text());
   }
-}
-
-ValueFit::Expand expanding(const TransformerCfg& cfg) {
-  return [&cfg](QString& text) {
-    text = MFBuffer::withOrdinaryMacros(text);
-    if (cfg.listener())
-      cfg.listener()->expandMacros(cfg, text);
-  };
 }
 
 // Nothing looks these settings up when the mapping file runs, so what they refer to is judged in their place.
@@ -54,7 +46,7 @@ void fit_checks::checkTransformer(const TransformerCfg& cfg, const ParameterLine
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
     const bool isExpanded = references == References::Known && isProcessSetting(name);
     const std::vector<ValueFit> misfits = ValueFit::misfitsOf(
-        *parameter, parameter->getValue(), isExpanded ? expanding(cfg) : ValueFit::Expand());
+        *parameter, parameter->getValue(), isExpanded ? knownAround(cfg).expand : ExpandReferences());
     QString refusal;
     if (!misfits.empty() && cfg.validateParameter(name, refusal))
       report(misfits, *parameter, lines.of(name), title, findings);
@@ -69,7 +61,7 @@ void fit_checks::checkInside(const TransformerCfg& cfg, int line, const QString&
   const TransformerCfg* before = network->attributeOwner();
   network->setAttributeOwner(&cfg);
   for (const TransformerCfg* inner : network->getTransformers()) {
-    const ValueFit::Expand expand = expanding(*inner);
+    const ExpandReferences expand = knownAround(*inner).expand;
     for (const QLatin1String& name : {kProcessCountParameter, kGroupsOrderedParameter}) {
       const TransformParamCfg* parameter = inner->getParameterByMacroName(name);
       if (!parameter || !beginsMacroReference(parameter->getValue()))
@@ -77,10 +69,7 @@ void fit_checks::checkInside(const TransformerCfg& cfg, int line, const QString&
       const QString path = title + QLatin1Char('/') + inner->getIdentifier();
       report(ValueFit::misfitsOf(*parameter, parameter->getValue(), expand), *parameter, line, path,
              findings);
-      if (single_choices::refersToShownSide(*parameter, parameter->getValue(), [&](QString& text) {
-            expand(text);
-            return true;
-          }))
+      if (single_choices::refersToShownSide(*parameter, parameter->getValue(), expand))
         findings.reportUnwritable(line, path, name, TransformResString(orx::messages::kShownSideReferred));
     }
   }

@@ -1,11 +1,10 @@
+#include <transform/core/CarriedReferences.h>
 #include <transform/core/FormulaChecks.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/core/TransformerCfgListener.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/findings/Refusal.h>
-#include <transform/text/MFBuffer.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/workspace/ParameterLines.h>
@@ -103,11 +102,7 @@ bool ValueChecks::standsForReferences(Rule rule) const {
 }
 
 void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names) {
-  const ExpandReferences expand = [&node](QString& value) {
-    value = MFBuffer::withOrdinaryMacros(value);
-    if (node.cfg.listener())
-      node.cfg.listener()->expandMacros(node.cfg, value);
-  };
+  const ExpandReferences expand = carried_references::knownAround(node.cfg).expand;
   for (const QString& parameter : node.cfg.getParameters()) {
     QString text;
     const orx::RefusalListener listener;

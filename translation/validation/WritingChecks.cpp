@@ -1,3 +1,4 @@
+#include <transform/core/CarriedReferences.h>
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/SingleChoices.h>
@@ -92,6 +93,13 @@ void WritingChecks::checkChoices(const GlobalParameters::Parameter& parameter) {
 }
 
 void WritingChecks::checkParameter(const GlobalParameters::Parameter& parameter, const QString& value) {
+  const GlobalParameters& all = m_workspace.parameters;
+  const carried_references::Known known{
+      [&all](QString& text) {
+        text = all.resolve(MFBuffer::withOrdinaryMacros(text));
+        return true;
+      },
+      [&all](const QString& name) { return carried_references::spellingOf(all.typeOf(name)); }};
   const bool isSound = checkText(value, parameter.name, parameter.line, QString());
   long reason = TextPlaces::refuse(TextPlace::MacroName, parameter.name);
   if (reason == 0 && isSound)
@@ -99,6 +107,8 @@ void WritingChecks::checkParameter(const GlobalParameters::Parameter& parameter,
   // It has one value for all features.
   if (reason == 0 && ExpressionWriter::needsWrapping(GUIType::fromGuiLine(parameter.promptLine), value))
     reason = value.startsWith(kConditionalPrefix) ? messages::kConditionInMacro : messages::kAttributeInMacro;
+  if (reason == 0 && isSound && !parameter.isComputed())
+    reason = carried_references::refuseInMacro(GUIType::fromGuiLine(parameter.promptLine), value, known);
   if (reason != 0)
     m_findings.reportUnwritable(parameter.line, QString(), parameter.name, TransformResString(reason));
 }

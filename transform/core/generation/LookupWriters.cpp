@@ -1,3 +1,4 @@
+#include <transform/core/GenerationKeywords.h>
 #include <transform/core/generation/LookupWriters.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/TextHelpers.h>
@@ -120,7 +121,7 @@ QString writeChoiceProcedure(MFBuffer& buffer, const ChoiceList& choices, const 
   buffer.add(QStringLiteral("return $curAttrValue;"));
   buffer.add(QStringLiteral("}"));
   buffer.flush();
-  return QLatin1String("@Tcl2(") + procedure + QLatin1Char(' ') + braced(value) + QLatin1String(" )");
+  return kProcedureCall + procedure + QLatin1Char(' ') + braced(value) + QLatin1String(" )");
 }
 
 }  // namespace lookup_writers

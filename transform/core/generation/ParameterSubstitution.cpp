@@ -98,7 +98,7 @@ void ParameterSubstitution::collect(std::size_t position, MFBuffer& buffer) {
   const auto add = [&](const QString& token, const QString& value, const GUIType* type, bool isListed) {
     const bool isWord = compiled && type && type->valueIsEncoded();
     entry.tokens.push_back(
-        {token, isWord ? TextPlaces::withoutKeyword(value, compiled->keys()) : value, isListed});
+        {token, isWord ? TextPlaces::withoutKeyword(value, compiled->keys()) : value, type, isListed});
   };
   const QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
   if (record.isMultiParameter()) {
@@ -129,16 +129,22 @@ void ParameterSubstitution::collect(std::size_t position, MFBuffer& buffer) {
   add(name, value, &record, name != kIdentifierParameter && WrittenValues::hasValue(record));
 }
 
-QHash<QString, QString> ParameterSubstitution::byToken() const {
-  QHash<QString, QString> values;
+std::vector<ParameterSubstitution::Token> ParameterSubstitution::tokens() const {
+  std::vector<Token> tokens;
   for (const Entry& entry : m_entries) {
-    for (const Token& token : entry.tokens) {
-      if (!values.contains(token.name)) {
-        values.insert(token.name, token.value);
+    tokens.insert(tokens.end(), entry.tokens.begin(), entry.tokens.end());
+    for (const QString& token : entry.removed) {
+      if (!isAround(token)) {
+        tokens.push_back({token, QString(), nullptr, false});
       }
     }
   }
-  return values;
+  return tokens;
+}
+
+// Whether the token, which has no value here, is the reference to a parameter around the transformer.
+bool ParameterSubstitution::isAround(const QString& token) const {
+  return m_cfg.listener() && m_cfg.listener()->isRunTimeValue(m_cfg, kMacroOpen + token + QLatin1Char(')'));
 }
 
 void ParameterSubstitution::putInto(Substitution& lines) const {
@@ -155,6 +161,11 @@ void ParameterSubstitution::putInto(Substitution& lines) const {
   }
   if (m_cfg.listener()) {
     putDeferred(lines);
+  }
+  for (const Token& token : tokens()) {
+    if (!token.type && lines.contains(token.name)) {
+      lines.substitute(token.name, token.value);
+    }
   }
   if (wantsList) {
     lines.substitute(kValueListToken, valueList());
@@ -175,7 +186,12 @@ void ParameterSubstitution::putDeferred(Substitution& lines) const {
   if (deferred.empty()) {
     return;
   }
-  const QHash<QString, QString> byName = byToken();
+  QHash<QString, QString> byName;
+  for (const Token& token : tokens()) {
+    if (!byName.contains(token.name)) {
+      byName.insert(token.name, token.value);
+    }
+  }
   bool isLeft = true;
   for (int round = 0; isLeft && round < kMostRounds; ++round) {
     isLeft = false;

@@ -31,18 +31,20 @@ class ParameterSubstitution {
   // `onlyWritten`, only those are asked for that reach the statements of a template without inserted tokens.
   void collect(MFBuffer& buffer, bool onlyWritten = false);
 
-  // What was collected: of several values of one token the first.
-  QHash<QString, QString> byToken() const;
+  struct Token {
+    QString name;
+    QString value;
+    const GUIType* type;  // null where nothing was given
+    bool isListed;        // in the value list
+  };
+  // What was collected. Where several bear one name, the first counts. One whose lines go away is empty: it
+  // may stand in other values.
+  std::vector<Token> tokens() const;
 
   // All values, and the list of them.
   void putInto(Substitution& lines) const;
 
  private:
-  struct Token {
-    QString name;
-    QString value;
-    bool isListed;  // in the value list
-  };
   struct Entry {
     QStringList removed;  // tokens whose lines go away
     std::vector<Token> tokens;
@@ -52,6 +54,7 @@ class ParameterSubstitution {
   bool isInert(const TransformParamCfg& record) const;
   void collect(std::size_t position, MFBuffer& buffer);
   void putDeferred(Substitution& lines) const;
+  bool isAround(const QString& token) const;
   QString valueList() const;
 
   const TransformerCfg& m_cfg;

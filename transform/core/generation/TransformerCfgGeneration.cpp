@@ -369,9 +369,10 @@ QString TransformerCfg::getTransformerParams() const {
     if (!list.isEmpty()) {
       list += QLatin1Char(',');
     }
-    list += QORXWwjdEncode(name) + QLatin1Char(',') +
-            encodeAroundReferences(
-                stripBasicStringInfo(single_choices::toStored(record, getParameterValue(name))));
+    const QString value = stripBasicStringInfo(single_choices::toStored(record, getParameterValue(name)));
+    list +=
+        QORXWwjdEncode(name) + QLatin1Char(',') +
+        QORXWwjdEncode(MFBuffer::closesDeferredMacros(value) ? MFBuffer::withOrdinaryMacros(value) : value);
   }
   return list;
 }

@@ -2,6 +2,7 @@
 #include <transform/core/CarriedReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/ExpressionWriter.h>
+#include <transform/core/FormulaChecks.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/LookupChecks.h>
@@ -31,8 +32,6 @@ namespace messages = orx::messages;
 namespace {
 
 using namespace lookup_checks;
-
-const QLatin1String kTclCall("@Tcl2(");
 
 // The tokens of members stand for the parts of the value that bear their names, so that a part of another
 // name would be lost, and one that is missing would leave its token empty.
@@ -82,7 +81,11 @@ bool closesDeferredMacros(const ChoiceList& choices, const QStringList& texts) {
 
 MappingFileChecks::MappingFileChecks(const TransformerCfg& cfg, const std::vector<TransformParamCfg>& records,
                                      const OwnTokens* tokens)
-    : m_cfg(cfg), m_records(records), m_tokens(tokens), m_written(cfg, tokens != nullptr) {}
+    : m_cfg(cfg),
+      m_records(records),
+      m_tokens(tokens),
+      m_written(cfg, tokens != nullptr),
+      m_around(carried_references::knownAround(cfg)) {}
 
 QHash<QString, QString> MappingFileChecks::find() const {
   QHash<QString, QString> messages;
@@ -91,10 +94,13 @@ QHash<QString, QString> MappingFileChecks::find() const {
     const QString fault = record.isMultiParameter() && !isUnsetValue(stored)
                               ? faultOfParts(stored, record.members())
                               : QString();
+    QString formula;
     if (!fault.isEmpty()) {
       messages.insert(record.getName(), fault);
     } else if (const long number = refuse(record, stored)) {
       messages.insert(record.getName(), TransformResString(number));
+    } else if (!checkFormulas(record, stored, formula)) {
+      messages.insert(record.getName(), formula);
     }
   }
   return messages;
@@ -113,6 +119,9 @@ long MappingFileChecks::refuse(const TransformParamCfg& record, const QString& s
   }
   NullBuffer buffer;
   QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
+  if (const long number = refuseReferences(record, stored, value)) {
+    return number;
+  }
   // Each member and each cell stands in a place of its own.
   QStringList parts = record.isMultiParameter() || m_written.isWrittenByRows(record)
                           ? QORXSdfStringToList(value, record.members().separator())
@@ -139,18 +148,33 @@ long MappingFileChecks::refuse(const TransformParamCfg& record, const QString& s
       return number;
     }
   }
-  const bool isByRows = m_written.isWrittenByRows(record);
-  const long broken = carried_references::refuse(
-      record, stored,
-      isByRows ? carried_references::TableForm::ByRows : carried_references::TableForm::Packed,
-      [this](QString& text) { return insertTokens(text) && expandMacros(text); });
-  if (broken != 0) {
-    return broken;
-  }
   if (record.isMultiParameter()) {
     return refuseMembers(record, stored, parts);
   }
   return m_written.isToken(record) ? refuseToken(record, stored, value) : 0;
+}
+
+long MappingFileChecks::refuseReferences(const TransformParamCfg& record, const QString& stored,
+                                         const QString& written) const {
+  using namespace carried_references;
+  if (record.getName() == kIdentifierParameter) {
+    return 0;
+  }
+  const Known known{[this](QString& text) { return expand(text); },
+                    [this](const QString& name) {
+                      const Spelling own = m_tokens ? m_tokens->spellingOf(name) : Spelling::Unknown;
+                      return own != Spelling::Unknown ? own : m_around.spellingOf(name);
+                    }};
+  const bool isByRows = m_written.isWrittenByRows(record);
+  return carried_references::refuse(record, stored, written, isByRows ? TableForm::ByRows : TableForm::Packed,
+                                    known);
+}
+
+bool MappingFileChecks::checkFormulas(const TransformParamCfg& record, const QString& stored,
+                                      QString& message) const {
+  QString inserted = stored;
+  return !m_tokens || !m_written.contains(record) || !insertTokens(inserted) || inserted == stored ||
+         ::checkFormulas(record, stored, message, [this](QString& text) { return expand(text); });
 }
 
 long MappingFileChecks::refuseMembers(const TransformParamCfg& record, const QString& stored,
@@ -170,7 +194,7 @@ long MappingFileChecks::refuseToken(const GUIType& type, const QString& stored,
                                     const QString& written) const {
   // Calls that were made for the value are sound, and so is what a class of its own makes of it.
   const bool isMade =
-      written != stored && (typeid(m_cfg) != typeid(TransformerCfg) || written.startsWith(kTclCall));
+      written != stored && (typeid(m_cfg) != typeid(TransformerCfg) || written.startsWith(kProcedureCall));
   if (isMade || ExpressionWriter::needsWrapping(type, stored)) {
     return 0;
   }
@@ -249,8 +273,7 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
 }
 
 bool MappingFileChecks::refersToShownSide(const TransformParamCfg& record, const QString& value) const {
-  return single_choices::refersToShownSide(record, value,
-                                           [this](QString& text) { return expandMacros(text); });
+  return single_choices::refersToShownSide(record, value, [this](QString& text) { return expand(text); });
 }
 
 // These values go into a statement as they are stored, and nothing looks them up.
@@ -260,6 +283,11 @@ long MappingFileChecks::refuseParallelSetting(const TransformParamCfg& record, c
   }
   if (stored.startsWith(kConditionalPrefix) || beginsValueReference(stored)) {
     return messages::kParallelByFeature;
+  }
+  // They stand in a statement of their own, where tokens are not replaced.
+  QString inserted = stored;
+  if (!insertTokens(inserted) || inserted != stored) {
+    return messages::kOwnReferenceApart;
   }
   return refersToShownSide(record, stored) ? messages::kShownSideReferred : 0;
 }
@@ -282,6 +310,5 @@ bool MappingFileChecks::insertTokens(QString& text) const {
 }
 
 bool MappingFileChecks::expandMacros(QString& text) const {
-  text = MFBuffer::withOrdinaryMacros(text);
-  return !m_cfg.listener() || m_cfg.listener()->expandMacros(m_cfg, text);
+  return m_around.expand(text);
 }

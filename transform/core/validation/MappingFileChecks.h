@@ -1,6 +1,7 @@
 // Finds what would make the statements of one instance wrong, before anything is written.
 #pragma once
 
+#include <transform/core/CarriedReferences.h>
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/generation/WrittenValues.h>
 
@@ -32,6 +33,7 @@ class MappingFileChecks {
  private:
   // Message numbers, 0 for nothing to refuse.
   long refuse(const TransformParamCfg& record, const QString& stored) const;
+  long refuseReferences(const TransformParamCfg& record, const QString& stored, const QString& written) const;
   long refuseIdentifier(const QString& value) const;
   long refuseLookup(const TransformParamCfg& record, const QString& value) const;
   long refuseParallelSetting(const TransformParamCfg& record, const QString& stored) const;
@@ -40,14 +42,19 @@ class MappingFileChecks {
   long refuseToken(const GUIType& type, const QString& stored, const QString& written) const;
   long refuseMembers(const TransformParamCfg& record, const QString& stored,
                      const QStringList& written) const;
+  // Formulas into which tokens of the transformer itself bring something; others are judged with the values.
+  bool checkFormulas(const TransformParamCfg& record, const QString& stored, QString& message) const;
   // What tokens of the transformer itself bring; false when that has no end.
   bool insertTokens(QString& text) const;
   // As the engine sees the text when it runs a fragment; false when that has no end.
   bool expandMacros(QString& text) const;
+  // Both.
+  bool expand(QString& text) const { return insertTokens(text) && expandMacros(text); }
   long refuseChoices(const ChoiceList& choices) const;
 
   const TransformerCfg& m_cfg;
   const std::vector<TransformParamCfg>& m_records;
   const OwnTokens* const m_tokens;
   const WrittenValues m_written;
+  const carried_references::Known m_around;
 };

@@ -64,6 +64,28 @@ QString ownReference(const QString& value, const TransformerCfg& instance) {
   return own;
 }
 
+// With `meansOwn`, references may be to the instance's own parameters.
+carried_references::Known knownTo(const TransformerCfg& instance, bool meansOwn) {
+  const carried_references::Known around = carried_references::knownAround(instance);
+  if (!meansOwn)
+    return around;
+  const auto expand = [&instance, around](QString& text) {
+    constexpr int kMostRounds = 8;
+    for (int round = 0; round < kMostRounds && !ownReference(text, instance).isEmpty(); ++round) {
+      text = replaceParameterReferences(text, [&](const QString& name, QString& value) {
+        value = instance.hasParameter(name) ? instance.getParameterValue(name) : QString();
+        return instance.hasParameter(name);
+      });
+    }
+    return around.expand(text);
+  };
+  return {expand, [&instance, around](const QString& name) {
+            return instance.hasParameter(name)
+                       ? carried_references::spellingOf(instance.getParameterGUIType(name))
+                       : around.spellingOf(name);
+          }};
+}
+
 bool isIterationCount(const QString& value) {
   bool isNumber = false;
   return isUnsetValue(value) || value.toInt(&isNumber) > 0 ||
@@ -279,13 +301,7 @@ long CompoundTransformerCfg::refuseApart(const QString& parameter, const GUIType
   const TransformParamCfg* record = getParameterByMacroName(parameter);
   if (record && record->getFlag(kGUITypeInstanceMacros) && !ownReference(stored, *this).isEmpty())
     return messages::kOwnReferenceForWorkers;
-  const auto expand = [this](QString& text) {
-    text = MFBuffer::withOrdinaryMacros(text);
-    return !listener() || listener()->expandMacros(*this, text);
-  };
-  const bool isSound = !beginsMacroReference(stored) || !MFBuffer::closesDeferredMacros(stored) ||
-                       carried_references::fitsEncodedList(stripBasicStringInfo(stored), expand);
-  return isSound ? 0 : messages::kReferenceForWorkers;
+  return 0;
 }
 
 // A Tcl script of the instance, or of one inside at any depth, prints the statement that sets its macro; the
@@ -387,13 +403,15 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   if (stored.startsWith(kConditionalPrefix))
     return messages::kConditionInMacro;
   const TransformParamCfg* record = getParameterByMacroName(parameter);
-  const auto expand = [this](QString& text) { return !listener() || listener()->expandMacros(*this, text); };
-  if (record && single_choices::refersToShownSide(*record, stored, expand))
+  const carried_references::Known known = knownTo(*this, record && record->getFlag(kGUITypeInstanceMacros));
+  if (record && single_choices::refersToShownSide(*record, stored, known.expand))
     return messages::kShownSideReferred;
   const GUIType& type = getParameterGUIType(parameter);
   if (ExpressionWriter::needsWrapping(type, stored) &&
       !(type.getType() == kSetterAttributeType && isParmUsedAsAttributeSetterAttribute(parameter)))
     return messages::kAttributeInMacro;
+  if (const long number = isName ? 0 : carried_references::refuseInMacro(type, stored, known))
+    return number;
   QString expanded = MFBuffer::withOrdinaryMacros(value);
   const bool ends = !listener() || listener()->expandMacros(*this, expanded);
   // The name stands in quotes as it is.

@@ -49,6 +49,11 @@ bool InnerTransformerListener::isScript(const QString& parameter) const {
   return scriptLanguage(m_network.getParameterInfo(parameter)->type) != ScriptLanguage::None;
 }
 
+GUIType InnerTransformerListener::typeOf(const QString& parameter) const {
+  return m_network.hasParameter(parameter) ? m_network.getParameterInfo(parameter)->type
+                                           : GUIType::kNullGuiType;
+}
+
 bool InnerTransformerListener::isScopeParameter(const QString& name) const {
   return m_network.hasParameter(name);
 }

@@ -4,14 +4,17 @@
 // Whoever sets a listener of his own on an inner transformer passes these questions on to this one.
 #pragma once
 
+#include <transform/core/CarriedReferences.h>
 #include <transform/core/ParameterScopeListener.h>
 
 class CompoundTransformerNetwork;
 
-class InnerTransformerListener : public ParameterScopeListener {
+class InnerTransformerListener : public ParameterScopeListener, public carried_references::ScopeTypes {
  public:
   // Not owned; outlives the listener.
   explicit InnerTransformerListener(const CompoundTransformerNetwork& network) : m_network(network) {}
+
+  GUIType typeOf(const QString& parameter) const override;
 
  protected:
   bool isScopeParameter(const QString& name) const override;

@@ -1,4 +1,5 @@
 #include <platform/qorxcore/Lists.h>
+#include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/CarriedReferences.h>
 #include <transform/core/ExpressionWriter.h>
@@ -8,7 +9,6 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
-#include <transform/custom/instance/CustomTransformerStatement.h>
 #include <transform/custom/instance/ParameterPlaces.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MessageNumbers.h>
@@ -20,13 +20,6 @@
 namespace messages = orx::messages;
 
 namespace {
-
-bool fitsList(const QString& value) {
-  return carried_references::fitsEncodedList(QStringLiteral("$(x)"), [&value](QString& text) {
-    text = value;
-    return true;
-  });
-}
 
 bool isOneCell(const QString& value, QChar separator) {
   return value.isEmpty() || QORXSdfStringToList(value, separator) == QStringList(value);
@@ -40,9 +33,7 @@ ParameterPlaces::ParameterPlaces(CompoundTransformerNetwork& network) {
   for (const CompoundTransformerNetwork* nested : networks) {
     Uses& own = uses[nested];
     for (const TransformerCfg* cfg : nested->getTransformers()) {
-      if (isCustomTransformer(cfg))
-        addWorkers(*cfg, *nested, own);
-      else
+      if (!isCustomTransformer(cfg))
         addStatements(*cfg, *nested, own);
     }
     m_hasFragment = m_hasFragment ||
@@ -58,21 +49,45 @@ ParameterPlaces::ParameterPlaces(CompoundTransformerNetwork& network) {
 }
 
 // Notes the use for the parameters of the network that the value refers to; whether that is new.
-bool ParameterPlaces::add(const QString& value, const CompoundTransformerNetwork& network, const Use& use,
-                          Uses& uses) {
-  if (use.places == 0 || !value.contains(QLatin1Char('$')))
+bool ParameterPlaces::add(const QString& value, bool isReadDecoded, const CompoundTransformerNetwork& network,
+                          const Use& use, Uses& uses) {
+  if (!value.contains(QLatin1Char('$')))
     return false;
   bool isNew = false;
   anyParameterReference(MFBuffer::withOrdinaryMacros(value), [&](const QString& name) {
     if (network.hasParameter(name)) {
+      const bool isReencoded = network.getParameterInfo(name)->type.valueIsEncoded() != isReadDecoded;
+      const unsigned places = use.places | (isReencoded ? Reencoded : 0u);
       Use& known = uses[name];
       const QSet<QChar> separators = known.separators + use.separators;
-      isNew = isNew || (known.places | use.places) != known.places || separators != known.separators;
-      known = {known.places | use.places, separators};
+      isNew = isNew || (known.places | places) != known.places || separators != known.separators;
+      known = {known.places | places, separators};
     }
     return false;
   });
   return isNew;
+}
+
+// A part that holds tokens of the transformer's own parameters also brings what these refer to.
+void ParameterPlaces::addPart(const TransformerCfg& cfg, const GUIType& type, const QString& part,
+                              const CompoundTransformerNetwork& network, Use use, Uses& uses) {
+  if (ExpressionWriter::needsWrapping(type, part))
+    use.places |= Expression;
+  const bool isDecoded = carried_references::isReadDecoded(type, part);
+  add(part, isDecoded, network, use, uses);
+  QStringList own{part};
+  QSet<QString> seen;
+  while (!own.isEmpty()) {
+    anyParameterReference(MFBuffer::withOrdinaryMacros(own.takeLast()), [&](const QString& name) {
+      const TransformParamCfg* record = cfg.getParameterByMacroName(name);
+      if (record && !network.hasParameter(name) && !seen.contains(name)) {
+        seen.insert(name);
+        own.append(record->getValue());
+        add(record->getValue(), isDecoded, network, use, uses);
+      }
+      return false;
+    });
+  }
 }
 
 void ParameterPlaces::addStatements(const TransformerCfg& cfg, const CompoundTransformerNetwork& network,
@@ -80,28 +95,18 @@ void ParameterPlaces::addStatements(const TransformerCfg& cfg, const CompoundTra
   for (const QString& parameter : cfg.getParameters()) {
     const TransformParamCfg* record = cfg.getParameterByMacroName(parameter);
     const QString& value = record->getValue();
-    if (!value.contains(QLatin1Char('$')))
+    if (!value.contains(QLatin1Char('$')) || parameter == kIdentifierParameter)
       continue;
+    Use use;
     if (record->choices().hasLookup())
-      add(value, network, {ORX_isListBoxType(*record) ? ListFragment : ChoiceFragment, {}}, uses);
-    forEachPart(*record, value, [&](const GUIType& type, const QString& part) {
-      if (!ExpressionWriter::needsWrapping(type, part))
-        return;
-      const bool isEncoded = type.valueIsEncoded() || part.startsWith(kConditionalPrefix);
-      add(part, network, {isEncoded ? Expression : PlainExpression, {}}, uses);
-    });
+      use.places = ORX_isListBoxType(*record) ? ListFragment : ChoiceFragment;
     // A class of its own writes a table cell by cell.
     if (record->isTable() && typeid(cfg) == typeid(TransformerCfg))
-      add(value, network, {Cell, {record->members().separator()}}, uses);
+      use = {Cell, {record->members().separator()}};
+    forEachPart(*record, value, [&](const GUIType& type, const QString& part) {
+      addPart(cfg, type, part, network, use, uses);
+    });
   }
-}
-
-void ParameterPlaces::addWorkers(const TransformerCfg& cfg, const CompoundTransformerNetwork& network,
-                                 Uses& uses) {
-  if (!isRunApart(*networkOf(&cfg), cfg))
-    return;
-  for (const QString& parameter : cfg.getParameters())
-    add(cfg.getParameterValue(parameter), network, {WorkersList, {}}, uses);
 }
 
 // A parameter of a custom transformer further in has its places there: so have those that its value refers
@@ -111,17 +116,19 @@ bool ParameterPlaces::addFromWithin(const CompoundTransformerNetwork& network, U
   for (const TransformerCfg* cfg : network.getTransformers()) {
     const CompoundTransformerNetwork* inner = networkOf(cfg);
     const Uses within = inner ? uses.value(inner) : Uses();
-    for (auto use = within.cbegin(); use != within.cend(); ++use)
-      isNew = add(cfg->getParameterValue(use.key()), network, use.value(), uses[&network]) || isNew;
+    for (const QString& parameter : inner ? cfg->getParameters() : QStringList()) {
+      isNew = add(cfg->getParameterValue(parameter), cfg->getParameterGUIType(parameter).valueIsEncoded(),
+                  network, within.value(parameter), uses[&network]) ||
+              isNew;
+    }
   }
   return isNew;
 }
 
 bool ParameterPlaces::fits(const Use& use, const QString& value) {
   using carried_references::fitsExpression;
-  return (!(use.places & Expression) || fitsExpression(value, true)) &&
-         (!(use.places & PlainExpression) || fitsExpression(value, false)) &&
-         (!(use.places & WorkersList) || fitsList(value)) &&
+  return (!(use.places & Expression) || fitsExpression(value)) &&
+         (!(use.places & Reencoded) || QORXWwjdDecode(value) == value) &&
          std::all_of(use.separators.begin(), use.separators.end(),
                      [&value](QChar separator) { return isOneCell(value, separator); });
 }
@@ -141,7 +148,7 @@ bool ParameterPlaces::fitsEverywhere(const QString& value) {
   });
   if (isPlain)
     return true;
-  static const Use all{Expression | PlainExpression | WorkersList | Cell,
+  static const Use all{Expression | Reencoded | Cell,
                        {QLatin1Char(','), QLatin1Char(';'), QLatin1Char(' '), QLatin1Char('|')}};
   return lookup_checks::fitsFragment(value) && fits(all, value);
 }

@@ -28,10 +28,9 @@ class ParameterPlaces {
     ChoiceFragment = 1,
     ListFragment = 2,
     Fragment = ChoiceFragment | ListFragment,
-    Expression = 4,       // among word-encoded texts
-    PlainExpression = 8,  // among texts that are encoded when they are written
-    WorkersList = 16,
-    Cell = 32,
+    Expression = 4,
+    Reencoded = 8,  // read as word-encoded though the parameter is not, or the other way round
+    Cell = 16,
   };
   struct Use {
     unsigned places = 0;
@@ -41,10 +40,11 @@ class ParameterPlaces {
   using UsesByNetwork = QHash<const CompoundTransformerNetwork*, Uses>;
 
   static bool fits(const Use& use, const QString& value);
-  static bool add(const QString& value, const CompoundTransformerNetwork& network, const Use& use,
-                  Uses& uses);
+  static bool add(const QString& value, bool isReadDecoded, const CompoundTransformerNetwork& network,
+                  const Use& use, Uses& uses);
+  static void addPart(const TransformerCfg& cfg, const GUIType& type, const QString& part,
+                      const CompoundTransformerNetwork& network, Use use, Uses& uses);
   static void addStatements(const TransformerCfg& cfg, const CompoundTransformerNetwork& network, Uses& uses);
-  static void addWorkers(const TransformerCfg& cfg, const CompoundTransformerNetwork& network, Uses& uses);
   static bool addFromWithin(const CompoundTransformerNetwork& network, UsesByNetwork& uses);
 
   Uses m_uses;
