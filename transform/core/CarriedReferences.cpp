@@ -10,8 +10,8 @@
 #include <transform/core/ValueReferences.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
-#include <transform/text/MappingFileWords.h>
 #include <transform/text/MessageNumbers.h>
+#include <transform/text/TextPlaces.h>
 
 #include <algorithm>
 
@@ -65,15 +65,7 @@ long refuseIn(const Place& place, const QString& part, const Known& known) {
 
 // A function that only a reference brings.
 bool bringsCall(const QString& part, const QString& expanded) {
-  const auto holdsCall = [](const QString& text) {
-    MappingFileWords words(text);
-    for (MappingFileWord word; words.next(word);) {
-      if (word.kind == MappingFileWord::Kind::Call)
-        return true;
-    }
-    return false;
-  };
-  return expanded != part && holdsCall(expanded) && !holdsCall(part);
+  return expanded != part && TextPlaces::holdsCall(expanded) && !TextPlaces::holdsCall(part);
 }
 
 bool keepsCells(const TransformParamCfg& record, const QString& value, const ExpandReferences& expand) {

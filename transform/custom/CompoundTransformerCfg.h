@@ -111,6 +111,7 @@ class ORX_EXPORT CompoundTransformerCfg : public TransformerCfg, public Compound
   long refuseApart(const QString& parameter, const GUIType& type, const QString& stored) const;
   long refuseMacroValue(const QString& parameter, const QString& value,
                         std::optional<ParameterPlaces>& places) const;
+  QString knownValue(const QString& parameter) const;
   long refuseSetting(const QString& parameter) const;
   bool printsMacroNames() const;
   QString macroValue(const QString& parameter, const GUIType& type, const QString& prefixMacro) const;

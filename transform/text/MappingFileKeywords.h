@@ -35,3 +35,4 @@ inline const QLatin1String kIncludeEnd("END_INCLUDE");
 inline const QLatin1String kInputCollectorName(" Input Collector");
 inline const QLatin1String kCollectorName(" Collector");
 inline const QLatin1String kOutputRenamerName(" Output Renamer/Nuker");
+inline const QLatin1String kAttributeCopierName(" Attribute Copier");

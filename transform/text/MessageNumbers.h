@@ -433,6 +433,11 @@ constexpr long kFaultyStatements = 371401;
 constexpr long kFaultyValue = 371402;
 constexpr long kFaultyHeaderLine = 371403;
 
+// What custom transformers and names need.
+constexpr long kStatementNameTaken = 371470;
+constexpr long kFactoryTaken = 371471;
+constexpr long kTakenAlong = 371472;
+
 // Names.
 constexpr long kReferenceInName = 370940;
 constexpr long kShownSideReferred = 371321;

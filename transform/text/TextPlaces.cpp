@@ -106,6 +106,15 @@ long TextPlaces::refusePlainValue(const QString& text, const QSet<QString>& keys
   return closesCalls(text) ? 0 : messages::kOpenInValue;
 }
 
+bool TextPlaces::holdsCall(const QString& text) {
+  MappingFileWords words(text);
+  for (MappingFileWord word; words.next(word);) {
+    if (word.kind == MappingFileWord::Kind::Call)
+      return true;
+  }
+  return false;
+}
+
 long TextPlaces::refuseEncodedValue(const QString& text) {
   if (!isOneLine(text))
     return messages::kBreaksLine;

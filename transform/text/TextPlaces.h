@@ -33,6 +33,8 @@ class ORX_EXPORT TextPlaces {
   // belong to it.
   enum class Calls { Allowed, Refused };
   static long refusePlainValue(const QString& text, const QSet<QString>& keys, Calls calls);
+  // Whether some word of the text is a function call, be it closed or not.
+  static bool holdsCall(const QString& text);
   // A word-encoded value is one word.
   static long refuseEncodedValue(const QString& text);
   // A word-encoded value that is spelt like a keyword, spelt in another way that means the same; any other

@@ -239,7 +239,7 @@ void CustomDefinition::nameFlows(orx::Findings& diagnostics) {
   for (const SubDocNetworkObjXformer* node : m_order) {
     inner.add(node->name(), node->line(), *node->getTransformer());
     for (const QString& taken : names.reserve(*node->getTransformer(), node->name()))
-      diagnostics.report(Rule::TakenName, node->line(), scope + node->name(), {taken});
+      reportTakenFlow(*node->getTransformer(), taken, node->line(), scope + node->name(), diagnostics);
   }
   for (const SubDocNetworkObjXformer* node : m_order) {
     for (const auto& [port, links] : node->consumers()) {
@@ -251,6 +251,8 @@ void CustomDefinition::nameFlows(orx::Findings& diagnostics) {
     }
   }
   for (const SubDocNetworkObj* node : m_network.nodes()) {
+    if (node->kind() == SubDocNetworkObj::Kind::Output || node->kind() == SubDocNetworkObj::Kind::Loop)
+      inner.addFactory(node->name() + kCollectorName, node->line(), node->name());
     if (node->kind() != SubDocNetworkObj::Kind::Transformer)
       inner.addFlow(node->name());
   }

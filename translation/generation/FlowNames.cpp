@@ -1,5 +1,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/findings/Findings.h>
+#include <transform/text/MessageNumbers.h>
 #include <translation/generation/FlowNames.h>
 
 QString outputFlowName(const TransformerCfg& cfg, const QString& identifier, const QString& tag) {
@@ -7,18 +9,32 @@ QString outputFlowName(const TransformerCfg& cfg, const QString& identifier, con
   return isCustomTransformer(&cfg) ? name + QLatin1String("_OUT") : name;
 }
 
+void reportTakenFlow(const TransformerCfg& cfg, const QString& name, int line, const QString& node,
+                     orx::Findings& findings) {
+  findings.reportAs(
+      orx::Rule::TakenName,
+      isCustomTransformer(&cfg) ? orx::messages::kTakenName : orx::messages::kStatementNameTaken, line, node,
+      {name});
+}
+
+QStringList FlowNames::fixedNames(const TransformerCfg& cfg, const QString& identifier) {
+  if (!isCustomTransformer(&cfg))
+    return m_statements.flows(cfg, identifier);
+  QStringList inputs;
+  QStringList names;
+  cfg.getInputTags(inputs);
+  cfg.getOutputTags(names);
+  names = inputs + names;
+  for (QString& name : names)
+    name.prepend(identifier + QLatin1Char('_'));
+  return names;
+}
+
 QStringList FlowNames::reserve(const TransformerCfg& cfg, const QString& identifier) {
   QStringList taken;
-  if (!isCustomTransformer(&cfg))
-    return taken;
-  QStringList inputs;
-  QStringList outputs;
-  cfg.getInputTags(inputs);
-  cfg.getOutputTags(outputs);
-  for (const QString& tag : inputs + outputs) {
-    const QString wanted = identifier + QLatin1Char('_') + tag;
-    if (claim(wanted) != wanted)
-      taken.append(wanted);
+  for (const QString& name : fixedNames(cfg, identifier)) {
+    if (claim(name) != name)
+      taken.append(name);
   }
   return taken;
 }

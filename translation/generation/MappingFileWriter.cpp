@@ -9,6 +9,7 @@
 #include <translation/generation/MappingFileWriter.h>
 #include <translation/generation/RouteStatement.h>
 #include <translation/generation/WorkspaceConnection.h>
+#include <translation/graph/StatementNames.h>
 #include <translation/mappingfile/HarmlessText.h>
 #include <translation/mappingfile/WrittenCheck.h>
 
@@ -51,14 +52,17 @@ bool MappingFileWriter::hasHarmfulNames() const {
   };
   return !std::all_of(m_workspace.nodes.begin(), m_workspace.nodes.end(),
                       [&](const WorkspaceNode& node) {
-                        return isHarmlessText(node.name) && isHarmlessText(node.keyword) &&
-                               areHarmless(node.attributes) &&
+                        return isHarmlessText(node.name) && !StatementNames::isUnusual(node.name) &&
+                               isHarmlessText(node.keyword) && areHarmless(node.attributes) &&
                                std::all_of(node.exposed.begin(), node.exposed.end(), areHarmless);
                       }) ||
          !std::all_of(m_workspace.attributeLinks.begin(), m_workspace.attributeLinks.end(),
                       [&](const AttributeLink& link) {
                         return areHarmless({link.from, link.to});
-                      });
+                      }) ||
+         // Factories of the header may bear the names of ours.
+         std::any_of(m_workspace.headerLines.begin(), m_workspace.headerLines.end(),
+                     [](const QString& line) { return line.contains(kFactoryStatement); });
 }
 
 void MappingFileWriter::writeHeader(MFBuffer& buffer, WrittenCheck* check) const {
@@ -143,8 +147,8 @@ void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer, WrittenCheck* check)
     if (!m_connection.flowBehindCopies(node).isEmpty()) {
       if (check)
         check->begin({WrittenPlace::Kind::Node, place.line, place.name});
-      writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + QLatin1String(" Attribute Copier"),
-                 {flow}, m_connection.flowBehindCopies(node), m_connection.functionsOfType(node));
+      writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + kAttributeCopierName, {flow},
+                 m_connection.flowBehindCopies(node), m_connection.functionsOfType(node));
     }
   }
 }
@@ -161,7 +165,6 @@ void MappingFileWriter::writeWriterRoutes(MFBuffer& buffer, WrittenCheck* check)
       const WorkspaceLink& link = m_workspace.links[at(number)];
       flows.append(m_connection.flowOf(link));
     }
-    writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + kOutputRenamerName, flows,
-               m_connection.flowOfType(node), {});
+    writeRoute(buffer, writerRouteName(place), flows, m_connection.flowOfType(node), {});
   }
 }

@@ -1,5 +1,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/AttributeFlow.h>
+#include <transform/custom/NestedNetworks.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <translation/generation/FlowNames.h>
 #include <translation/generation/RouteStatement.h>
 #include <translation/generation/WorkspaceConnection.h>
@@ -27,6 +29,10 @@ WorkspaceConnection::WorkspaceConnection(Workspace& workspace, orx::Findings& fi
   nameFlows();
   connect();
   pushAttributes();
+}
+
+QString writerRouteName(const WorkspaceNode& writer) {
+  return writer.keyword + QLatin1Char(' ') + writer.name + kOutputRenamerName;
 }
 
 bool WorkspaceConnection::findOrder() {
@@ -74,10 +80,11 @@ void WorkspaceConnection::nameFlows() {
         m_flows[at(node)].insert(QString(), names.claim(m_workspace.nodes[at(node)].name));
     }
   };
-  // What a writer takes keeps the writer's own name, and the inner names of custom transformers are fixed, so
-  // those come first.
+  // The names between the statements of a transformer are fixed. What a writer takes keeps the writer's own
+  // name where it can, and the inner names of custom transformers are fixed, so those come first.
+  reserveFixedNames(names, false);
   claimTypes(WorkspaceNode::Kind::Writer);
-  reserveInnerNames(names, inner);
+  reserveFixedNames(names, true);
   claimTypes(WorkspaceNode::Kind::Reader);
   for (int node = 0; node < count; ++node) {
     const WorkspaceNode& place = m_workspace.nodes[at(node)];
@@ -95,19 +102,32 @@ void WorkspaceConnection::nameFlows() {
     inner.addFlow(m_flows[at(node)].value(QString()));
     inner.addFlow(m_copiedFlows[at(node)]);
   }
-  for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all())
-    inner.addParameter(parameter.name);
+  addMembers(inner);
   inner.report(QString(), m_findings);
 }
 
-void WorkspaceConnection::reserveInnerNames(FlowNames& names, InnerNames& inner) {
+void WorkspaceConnection::reserveFixedNames(FlowNames& names, bool ofCustom) {
   for (const WorkspaceNode& node : m_workspace.nodes) {
-    if (!node.isTransformer())
+    if (!node.isTransformer() || isCustomTransformer(node.cfg.get()) != ofCustom)
       continue;
-    inner.add(node.name, node.line, *node.cfg);
     for (const QString& taken : names.reserve(*node.cfg, node.name))
-      m_findings.report(Rule::TakenName, node.line, node.name, {taken});
+      reportTakenFlow(*node.cfg, taken, node.line, node.name, m_findings);
   }
+}
+
+void WorkspaceConnection::addMembers(InnerNames& inner) {
+  std::vector<bool> isFed(m_workspace.nodes.size());
+  for (const WorkspaceLink& link : m_workspace.links)
+    isFed[at(link.target)] = true;
+  for (std::size_t number = 0; number < m_workspace.nodes.size(); ++number) {
+    const WorkspaceNode& node = m_workspace.nodes[number];
+    if (node.isTransformer())
+      inner.add(node.name, node.line, *node.cfg);
+    else if (node.kind == WorkspaceNode::Kind::Writer && isFed[number])
+      inner.addFactory(writerRouteName(node), node.line, node.name);
+  }
+  for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all())
+    inner.addParameter(parameter.name);
 }
 
 const QString& WorkspaceConnection::flowOf(const WorkspaceLink& link) const {

@@ -14,6 +14,9 @@
 class FlowNames;
 class InnerNames;
 
+// The factory that leads to a writer's feature type.
+QString writerRouteName(const WorkspaceNode& writer);
+
 class WorkspaceConnection {
  public:
   // Changes the transformers of the workspace. Neither is owned.
@@ -35,7 +38,8 @@ class WorkspaceConnection {
  private:
   static std::size_t at(int number) { return static_cast<std::size_t>(number); }
   bool findOrder();
-  void reserveInnerNames(FlowNames& names, InnerNames& inner);
+  void reserveFixedNames(FlowNames& names, bool ofCustom);
+  void addMembers(InnerNames& inner);
   void nameFlows();
   void connect();
   void pushAttributes();

@@ -1,3 +1,4 @@
+#include <platform/qorxcore/qorxcore.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
@@ -7,6 +8,10 @@
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <translation/graph/InnerNames.h>
+
+#include <QSet>
+
+#include <algorithm>
 
 using orx::Rule;
 
@@ -29,27 +34,110 @@ QHash<QString, QString> InnerNames::findReplacedParameters(
 }
 
 void InnerNames::add(const QString& name, int line, const TransformerCfg& cfg) {
-  m_names.append(name);
+  m_members.push_back({name, line, QString(), &cfg});
   CompoundTransformerNetwork* network = networkOf(&cfg);
   if (!network)
     return;
-  for (JoinedNames* names : {&m_nodes, &m_flows, &m_macros})
+  m_hasInsides = true;
+  for (JoinedNames* names : {&m_insides, &m_beginnings, &m_flows, &m_macros})
     names->add(name, line, network);
   for (const QString& port : network->getInputs() + network->getOutputs())
     addFlow(name + QLatin1Char('_') + port);
 }
 
-void InnerNames::report(const QString& scope, orx::Findings& diagnostics) {
-  const auto reportTaken = [&](JoinedNames& inner, const QStringList& names) {
-    for (const QString& name : names) {
+QStringList InnerNames::factoriesOf(const Member& member) {
+  return member.cfg ? m_statements.factories(*member.cfg, member.node)
+                    : QStringList(QORXWwjdDecode(member.factory));
+}
+
+QStringList InnerNames::beginningsOf(const Member& member) {
+  return member.cfg ? m_statements.beginnings(*member.cfg, member.node)
+                    : StatementNames::beginnings(member.factory);
+}
+
+// Those of ordinary transformers differ as the names of the transformers do, unless one of these looks like
+// what is made of names.
+void InnerNames::reportFactories(const QString& scope, orx::Findings& diagnostics) {
+  const bool isAny = std::any_of(m_members.begin(), m_members.end(),
+                                 [](const Member& member) { return StatementNames::isUnusual(member.node); });
+  QHash<QString, QString> owners;
+  const auto report = [&](const Member& member) {
+    for (const QString& factory : factoriesOf(member)) {
+      const auto owner = owners.constFind(factory);
+      if (owner == owners.constEnd()) {
+        owners.insert(factory, member.node);
+        continue;
+      }
+      diagnostics.reportAs(Rule::TakenName, messages::kFactoryTaken, member.line, scope + member.node,
+                           {factory, owner.value()});
+      return;
+    }
+  };
+  for (const Member& member : m_factories)
+    report(member);
+  for (const Member& member : m_members) {
+    if (isAny || isCustomTransformer(member.cfg))
+      report(member);
+  }
+}
+
+void InnerNames::reportBeginnings(const QString& scope, orx::Findings& diagnostics) {
+  std::vector<std::pair<const Member*, QStringList>> found;
+  for (const std::vector<Member>* members : {&m_members, &m_factories}) {
+    for (const Member& member : *members) {
+      const QStringList beginnings = beginningsOf(member);
+      if (!beginnings.isEmpty())
+        found.emplace_back(&member, beginnings);
+    }
+  }
+  if (found.empty())
+    return;
+  QHash<QString, QString> claims;
+  for (const Member& member : m_members) {
+    for (const QString& beginning : StatementNames::claimedBeginnings(*member.cfg, member.node))
+      claims.insert(beginning, member.node);
+  }
+  for (const auto& [member, beginnings] : found) {
+    for (const QString& beginning : beginnings) {
+      if (claims.contains(beginning))
+        diagnostics.reportAs(Rule::TakenName, messages::kTakenAlong, member->line, scope + member->node,
+                             {beginning, claims.value(beginning)});
+    }
+  }
+}
+
+void InnerNames::reportTaken(const QString& scope, orx::Findings& diagnostics) {
+  QStringList factories;
+  QStringList beginnings;
+  for (const std::vector<Member>* members : {&m_members, &m_factories}) {
+    for (const Member& member : *members) {
+      factories += factoriesOf(member);
+      beginnings += beginningsOf(member);
+      if (!member.cfg)
+        continue;
+      beginnings += StatementNames::claimedBeginnings(*member.cfg, member.node);
+      m_flowNames += m_statements.flows(*member.cfg, member.node);
+    }
+  }
+  const auto report = [&](JoinedNames& inner, QStringList& names) {
+    names.removeDuplicates();
+    for (const QString& name : qAsConst(names)) {
       const JoinedNames::Holder holder = inner.findHolder(name);
       if (!holder.name.isEmpty())
         diagnostics.report(Rule::TakenName, holder.line, scope + holder.name, {name});
     }
   };
-  m_flowNames.removeDuplicates();
-  reportTaken(m_nodes, m_names);
-  reportTaken(m_flows, m_flowNames);
+  report(m_insides, factories);
+  report(m_beginnings, beginnings);
+  report(m_flows, m_flowNames);
+}
+
+void InnerNames::report(const QString& scope, orx::Findings& diagnostics) {
+  reportFactories(scope, diagnostics);
+  reportBeginnings(scope, diagnostics);
+  if (!m_hasInsides)
+    return;
+  reportTaken(scope, diagnostics);
   for (const QString& parameter : m_parameters) {
     const JoinedNames::Holder holder = m_macros.findHolder(parameter);
     if (!holder.name.isEmpty())
@@ -57,7 +145,7 @@ void InnerNames::report(const QString& scope, orx::Findings& diagnostics) {
                            {holder.name, parameter});
   }
   QSet<QString> told;
-  for (JoinedNames* names : {&m_nodes, &m_flows}) {
+  for (JoinedNames* names : {&m_insides, &m_beginnings, &m_flows}) {
     for (const JoinedNames::Clash& clash : names->findClashes()) {
       const QString pair = clash.holder.name + QLatin1Char('\n') + clash.other;
       if (told.contains(pair))

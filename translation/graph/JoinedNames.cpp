@@ -1,7 +1,9 @@
+#include <platform/qorxcore/qorxcore.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <translation/generation/FlowNames.h>
 #include <translation/graph/JoinedNames.h>
 
@@ -21,8 +23,13 @@ void eachBeginning(const QString& text, const std::set<int>& lengths, const Call
 }  // namespace
 
 void JoinedNames::add(const QString& name, int line, CompoundTransformerNetwork* network) {
-  m_places.emplace(name, Place{network, line});
-  m_lengths.insert(name.size());
+  const QString key = spelt(name);
+  m_places.emplace(key, Place{network, name, line});
+  m_lengths.insert(key.size());
+}
+
+QString JoinedNames::spelt(const QString& name) const {
+  return m_kind == Kind::Factory || m_kind == Kind::Beginning ? QORXWwjdDecode(name) : name;
 }
 
 JoinedNames::Holder JoinedNames::findHolder(const QString& name) {
@@ -30,7 +37,7 @@ JoinedNames::Holder JoinedNames::findHolder(const QString& name) {
   eachBeginning(name, m_lengths, [&](int length) {
     const auto found = holder.name.isEmpty() ? m_places.find(name.left(length)) : m_places.end();
     if (found != m_places.end() && holds(found->second.network, name.mid(length + 1)))
-      holder = {found->first, found->second.line};
+      holder = {found->second.name, found->second.line};
   });
   return holder;
 }
@@ -46,7 +53,7 @@ std::vector<JoinedNames::Clash> JoinedNames::findClashes() {
       const QString joined =
           meet({found->second.network, otherPlace.network, other.mid(length + 1) + QLatin1Char('_'), before});
       if (!joined.isEmpty())
-        clashes.push_back({{found->first, found->second.line}, other, joined});
+        clashes.push_back({{found->second.name, found->second.line}, otherPlace.name, joined});
     });
   }
   return clashes;
@@ -59,46 +66,76 @@ const JoinedNames::Inside& JoinedNames::inside(CompoundTransformerNetwork* netwo
   return *known;
 }
 
-JoinedNames::Inside JoinedNames::read(CompoundTransformerNetwork& network) const {
+JoinedNames::Inside JoinedNames::read(CompoundTransformerNetwork& network) {
   Inside inside;
   network.forceLoad();
-  // As the definition gives them out: what is fixed comes first.
+  for (const SubDocNetworkObj* node : network.nodes()) {
+    const auto* transformer = dynamic_cast<const SubDocNetworkObjXformer*>(node);
+    if (!transformer) {
+      if (node->kind() != SubDocNetworkObj::Kind::Input)
+        addCollector(node->name() + kCollectorName, inside);
+      continue;
+    }
+    const TransformerCfg& cfg = *transformer->getTransformer();
+    if (CompoundTransformerNetwork* inner = networkOf(&cfg)) {
+      const QString key = spelt(transformer->name());
+      inside.customTransformers.emplace(key, inner);
+      inside.lengths.insert(key.size());
+    }
+    addNames(cfg, transformer->name(), inside);
+  }
+  if (m_kind == Kind::Flow)
+    addFlows(network, inside);
+  return inside;
+}
+
+void JoinedNames::addCollector(const QString& name, Inside& inside) const {
+  if (m_kind == Kind::Factory)
+    inside.names.insert(spelt(name));
+  for (const QString& beginning :
+       m_kind == Kind::Beginning ? StatementNames::beginnings(name) : QStringList())
+    inside.names.insert(beginning);
+}
+
+void JoinedNames::addNames(const TransformerCfg& cfg, const QString& name, Inside& inside) {
+  QStringList names;
+  CompoundTransformerNetwork* inner = networkOf(&cfg);
+  if (m_kind == Kind::Factory)
+    names = m_statements.factories(cfg, name);
+  else if (m_kind == Kind::Beginning)
+    names = StatementNames::claimedBeginnings(cfg, name) + m_statements.beginnings(cfg, name);
+  else if (m_kind == Kind::Macro && inner && !inner->blockedLooping())
+    names = cfg.getParameters();
+  for (QString& parameter : names) {
+    if (m_kind == Kind::Macro)
+      parameter.prepend(name + QLatin1Char('_'));
+  }
+  inside.names.insert(names.begin(), names.end());
+}
+
+// As the definition gives them out: what is fixed comes first.
+void JoinedNames::addFlows(CompoundTransformerNetwork& network, Inside& inside) {
   FlowNames flows;
-  QStringList wanted;
   for (const QString& port : network.getInputs() + network.getOutputs() + network.getLoops())
     flows.claim(port);
   if (!network.getLoops().isEmpty())
     flows.claim(network.getLoopOutput());
-  for (const SubDocNetworkObj* node : network.nodes()) {
-    const auto* transformer = dynamic_cast<const SubDocNetworkObjXformer*>(node);
-    if (!transformer)
-      continue;
-    const QString name = transformer->name();
-    const QString beginning = name + QLatin1Char('_');
-    const TransformerCfg& cfg = *transformer->getTransformer();
-    CompoundTransformerNetwork* inner = networkOf(&cfg);
-    if (inner) {
-      inside.customTransformers.emplace(name, inner);
-      inside.lengths.insert(name.size());
+  const auto eachTransformer = [&](const auto& call) {
+    for (const SubDocNetworkObj* node : network.nodes()) {
+      if (const auto* transformer = dynamic_cast<const SubDocNetworkObjXformer*>(node))
+        call(*transformer, *transformer->getTransformer());
     }
-    if (m_kind == Kind::Node)
-      inside.names.insert(name);
-    if (m_kind == Kind::Macro && inner && !inner->blockedLooping()) {
-      for (const QString& parameter : cfg.getParameters())
-        inside.names.insert(beginning + parameter);
-    }
-    if (m_kind != Kind::Flow)
-      continue;
-    for (const QString& port : inner ? inner->getInputs() + inner->getOutputs() : QStringList())
-      inside.names.insert(flows.claim(beginning + port));
-    for (const auto& [port, links] : transformer->consumers()) {
+  };
+  eachTransformer([&](const SubDocNetworkObjXformer& node, const TransformerCfg& cfg) {
+    for (const QString& name : flows.fixedNames(cfg, node.name()))
+      inside.names.insert(flows.claim(name));
+  });
+  eachTransformer([&](const SubDocNetworkObjXformer& node, const TransformerCfg& cfg) {
+    for (const auto& [port, links] : node.consumers()) {
       if (!links.empty())
-        wanted.append(outputFlowName(cfg, name, port));
+        inside.names.insert(flows.claim(outputFlowName(cfg, node.name(), port)));
     }
-  }
-  for (const QString& flow : qAsConst(wanted))
-    inside.names.insert(flows.claim(flow));
-  return inside;
+  });
 }
 
 bool JoinedNames::holds(CompoundTransformerNetwork* network, const QString& name) {

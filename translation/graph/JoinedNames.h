@@ -2,6 +2,8 @@
 // the node "O" is written as "O_V". So different places can come to one name.
 #pragma once
 
+#include <translation/graph/StatementNames.h>
+
 #include <QHash>
 #include <QSet>
 #include <QString>
@@ -12,12 +14,15 @@
 #include <vector>
 
 class CompoundTransformerNetwork;
+class TransformerCfg;
 
 class JoinedNames {
  public:
-  // The names of nodes; of the features between them, ports of the nodes further in included; of the macros
-  // that nodes inside set for their parameters.
-  enum class Kind { Node, Flow, Macro };
+  // The names of nodes and of the factories that they are made of; what such a name begins with where a
+  // transformer takes factories along by that; the names of the features between them, ports of the nodes
+  // further in included; of the macros that nodes inside set for their parameters. The first two stand
+  // decoded.
+  enum class Kind { Factory, Beginning, Flow, Macro };
 
   struct Holder {
     QString name;  // of the custom transformer's node; empty for none
@@ -47,6 +52,7 @@ class JoinedNames {
   };
   struct Place {
     CompoundTransformerNetwork* network;
+    QString name;
     int line;
   };
   // Whether a name inside `longer` is `ahead` and a name inside `shorter`.
@@ -58,12 +64,17 @@ class JoinedNames {
   };
 
   const Inside& inside(CompoundTransformerNetwork* network);
-  Inside read(CompoundTransformerNetwork& network) const;
+  Inside read(CompoundTransformerNetwork& network);
+  static void addFlows(CompoundTransformerNetwork& network, Inside& inside);
+  void addCollector(const QString& name, Inside& inside) const;
+  void addNames(const TransformerCfg& cfg, const QString& name, Inside& inside);
+  QString spelt(const QString& name) const;
   bool holds(CompoundTransformerNetwork* network, const QString& name);
   // The name that both come to; empty when there is none.
   QString meet(const Meeting& start);
 
   const Kind m_kind;
+  StatementNames m_statements;
   std::map<QString, Place> m_places;
   std::set<int> m_lengths;
   QHash<const CompoundTransformerNetwork*, std::shared_ptr<const Inside>> m_insides;  // read once

@@ -1,9 +1,11 @@
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/ParallelLevels.h>
 #include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/generation/MultiProcessWriter.h>
 #include <transform/text/MFBuffer.h>
+#include <transform/text/MacroText.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
 
@@ -15,6 +17,13 @@ namespace {
 const QLatin1String kNo("NO");
 
 }  // namespace
+
+bool mayBeDivided(const TransformerCfg& cfg) {
+  const ConfiguredDefinition* definition = cfg.definition();
+  return definition && !definition->fields.multiProcess.isEmpty() &&
+         (beginsMacroReference(cfg.getParameterValue(kProcessCountParameter)) ||
+          multi_process_writer::settingsOf(cfg).isEnabled);
+}
 
 namespace multi_process_writer {
 

@@ -407,8 +407,10 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   if (record && single_choices::refersToShownSide(*record, stored, known.expand))
     return messages::kShownSideReferred;
   const GUIType& type = getParameterGUIType(parameter);
-  if (ExpressionWriter::needsWrapping(type, stored) &&
-      !(type.getType() == kSetterAttributeType && isParmUsedAsAttributeSetterAttribute(parameter)))
+  const bool isDestination = ExpressionWriter::needsWrapping(type, stored) &&
+                             type.getType() == kSetterAttributeType &&
+                             isParmUsedAsAttributeSetterAttribute(parameter);
+  if (ExpressionWriter::needsWrapping(type, stored) && !isDestination)
     return messages::kAttributeInMacro;
   if (const long number = isName ? 0 : carried_references::refuseInMacro(type, stored, known))
     return number;
@@ -430,5 +432,35 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   if (isName)
     return places->hasFragment() && !lookup_checks::fitsFragment(expanded) ? messages::kIdentifierInScript
                                                                            : 0;
-  return places->refuse(parameter, expanded);
+  if (const long number = places->refuse(parameter, expanded))
+    return number;
+  const auto expandOwn = [this](QString& text) {
+    text = replaceParameterReferences(text, [this](const QString& name, QString& own) {
+      own = knownValue(name);
+      return hasParameter(name);
+    });
+    return true;
+  };
+  // Of a setter's destination the call is part.
+  return !isDestination && places->bringsCall(parameter, expandOwn) ? messages::kCallInValue : 0;
+}
+
+// What the parameter's macro is known to stand for.
+QString CompoundTransformerCfg::knownValue(const QString& parameter) const {
+  constexpr int kMostRounds = 8;
+  constexpr int kLongest = 1 << 18;
+  const TransformParamCfg* record = getParameterByMacroName(parameter);
+  if (!record)
+    return QString();
+  QString value = MFBuffer::withOrdinaryMacros(macroValue(parameter, *record, QString()));
+  const bool meansOwn = record->getFlag(kGUITypeInstanceMacros);
+  for (int round = 0; meansOwn && round < kMostRounds && value.size() < kLongest; ++round) {
+    value = replaceParameterReferences(value, [this](const QString& name, QString& own) {
+      own = MFBuffer::withOrdinaryMacros(getParameterValue(name));
+      return hasParameter(name);
+    });
+  }
+  if (listener())
+    listener()->expandMacros(*this, value);
+  return value;
 }

@@ -27,7 +27,7 @@ bool isOneCell(const QString& value, QChar separator) {
 
 }  // namespace
 
-ParameterPlaces::ParameterPlaces(CompoundTransformerNetwork& network) {
+ParameterPlaces::ParameterPlaces(CompoundTransformerNetwork& network) : m_words(nestedNetworks(network)) {
   const std::vector<CompoundTransformerNetwork*> networks = nestedNetworks(network);
   UsesByNetwork uses;
   for (const CompoundTransformerNetwork* nested : networks) {
@@ -150,5 +150,5 @@ bool ParameterPlaces::fitsEverywhere(const QString& value) {
     return true;
   static const Use all{Expression | Reencoded | Cell,
                        {QLatin1Char(','), QLatin1Char(';'), QLatin1Char(' '), QLatin1Char('|')}};
-  return lookup_checks::fitsFragment(value) && fits(all, value);
+  return !value.contains(QLatin1Char('@')) && lookup_checks::fitsFragment(value) && fits(all, value);
 }

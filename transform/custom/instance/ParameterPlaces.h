@@ -2,6 +2,8 @@
 // written there once for all instances must carry the values of each.
 #pragma once
 
+#include <transform/custom/instance/WordsInside.h>
+
 #include <QChar>
 #include <QHash>
 #include <QSet>
@@ -20,6 +22,10 @@ class ParameterPlaces {
   // The number of the message that says why a place inside cannot carry the value of the parameter; 0 when
   // all can.
   long refuse(const QString& parameter, const QString& value) const;
+  // Whether the parameter helps to bring a function call into a place inside.
+  bool bringsCall(const QString& parameter, const carried_references::Expand& expand) const {
+    return m_words.bringCall(parameter, expand);
+  }
   // Whether any place at all can carry the value.
   static bool fitsEverywhere(const QString& value);
 
@@ -49,4 +55,5 @@ class ParameterPlaces {
 
   Uses m_uses;
   bool m_hasFragment = false;
+  WordsInside m_words;
 };
