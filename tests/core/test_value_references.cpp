@@ -114,12 +114,23 @@ TEST(ValueReferences, WhatIsNone) {
       {"TEXT_EDIT_PYTHON", "x<space>@Value<leftparenthesis>a<rightparenthesis>", 1, false},
       {"TEXT_EDIT_PYTHON", "@Value<leftparenthesis>a<rightparenthesis>", 1, true},
       {"TEXT_OR_ATTR", "ORX_CONDITIONAL:1;2", 0, true},
+      // An encoded "@" is one of the text unless the type says otherwise; encoded letters are letters
+      // elsewhere.
+      {"TEXT", "x@Value<leftparenthesis>a<rightparenthesis>", 0, false},
+      {"TEXT_OR_ATTR", "<commercialat>Value<leftparenthesis>a<rightparenthesis>", 0, false},
+      {"TEXT_ENCODED", "<commercialat>Value<leftparenthesis>a<rightparenthesis>", 0, false},
+      {"ATTR_LIST_ENCODED", "<commercialat>Value<leftparenthesis>a<rightparenthesis>", 0, false},
+      {"ATTR_ENCODED",
+       "@Value<leftparenthesis><commercialat>Value<leftparenthesis>a<rightparenthesis><rightparenthesis>", 1,
+       true},
+      {"TEXT_OR_ATTR_ENCODED", "<commercialat>Value<leftparenthesis>a<rightparenthesis>", 1, true},
+      {"TEXT_OR_ATTR_ENCODED", "<u0040>Value<leftparenthesis>a<rightparenthesis>", 0, false},
+      {"TEXT_ENCODED", "ORX_CONDITIONAL:1;<commercialat>Value<leftparenthesis>a<rightparenthesis>", 1, true},
   };
   for (const Case& c : cases) {
-    EXPECT_EQ(int(valueReferences(c.value).size()), c.count) << c.value;
-    EXPECT_EQ(ExpressionWriter::needsWrapping(GUIType::fromTransformerTypeString(c.type, "P"), c.value),
-              c.isWrapped)
-        << c.type << ' ' << c.value;
+    const GUIType type = GUIType::fromTransformerTypeString(c.type, "P");
+    EXPECT_EQ(int(valueReferences(type, c.value).size()), c.count) << c.type << ' ' << c.value;
+    EXPECT_EQ(ExpressionWriter::needsWrapping(type, c.value), c.isWrapped) << c.type << ' ' << c.value;
   }
   // Word-encoded inside the name, or a reference to a macro: told apart when written.
   const auto names = valueReferences(

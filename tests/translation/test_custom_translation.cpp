@@ -324,6 +324,7 @@ TEST(CustomTranslation, WhatALoopIsHandedIsJudged) {
       {"TEXT", "$(WORDS)", "4", {}, "P,<dollarsign><leftparenthesis>WORDS<rightparenthesis>"},
       {"TEXT_ENCODED", "x$(ENCODED)", "4", {}, "P,x<dollarsign><leftparenthesis>ENCODED<rightparenthesis>"},
       {"TEXT", "x$(ENCODED)", "4", {"unwritable-value L"}, ""},
+      {"TEXT_EDIT", "x ", "4", {"unwritable-value L"}, ""},
       {"TEXT", "a,b;c", "4", {}, "P,a<comma>b<semicolon>c"},
   };
   for (const auto& test : cases) {

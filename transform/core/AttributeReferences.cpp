@@ -25,9 +25,10 @@ QStringList listedAttributeNames(const GUIType& type, const QString& value) {
   }
   const QStringList pieces =
       namesOneAttribute(type) ? QStringList(value) : QORXSdfStringToList(value, kSeparator);
+  const ReferenceForms forms = referenceForms(type, value);
   QStringList names;
   for (const QString& piece : pieces) {
-    if (piece.isEmpty() || piece.contains(kMacroOpen) || beginsValueReference(piece)) {
+    if (piece.isEmpty() || piece.contains(kMacroOpen) || beginsValueReference(piece, forms)) {
       continue;
     }
     const QString name = piece.startsWith(QLatin1Char('&')) ? piece.mid(1) : piece;
@@ -65,7 +66,10 @@ void AttributeReferences::addValue(const GUIType& type, const QString& value) {
   if (isUnsetValue(value)) {
     return;
   }
-  const std::vector<ValueReference> references = valueReferences(value);
+  // The factories of templates and scripts read the references in them.
+  const bool isText = type.getType().startsWith(kTextEditType);
+  const std::vector<ValueReference> references =
+      valueReferences(value, isText ? ReferenceForms::All : referenceForms(type, value));
   for (const ValueReference& reference : references) {
     // What a reference to a macro brings is only known when the mapping file runs.
     if (!reference.word.contains(kMacroOpen)) {

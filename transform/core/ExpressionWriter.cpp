@@ -17,14 +17,14 @@ const QLatin1String kTextResult("STRING");
 const QLatin1Char kPartSeparator(';');
 
 // Text with its references; everything else word-encoded, whatever it was before.
-QString body(const QString& text, bool encoded) {
+QString body(const QString& text, bool encoded, ReferenceForms forms) {
   const auto literal = [&](int begin, int end) {
     const QString part = text.mid(begin, end - begin);
     return encoded ? reencodeAroundReferences(part) : encodeAroundReferences(part);
   };
   QString result;
   int done = 0;
-  for (const ValueReference& reference : valueReferences(text)) {
+  for (const ValueReference& reference : valueReferences(text, forms)) {
     result += literal(done, reference.begin) + kValueReference + reference.word + QLatin1Char(')');
     done = reference.end;
   }
@@ -37,10 +37,19 @@ QString conditionalBody(const QString& value, bool resultsAreFormulas) {
   QStringList parts = value.mid(kConditionalPrefix.size()).split(kPartSeparator);
   for (int i = 0; i < parts.size(); ++i) {
     const bool isResult = i % 2 == 1 || i + 1 == parts.size();
-    parts[i] =
-        isResult && resultsAreFormulas ? reencodeAroundReferences(parts.at(i)) : body(parts.at(i), true);
+    parts[i] = isResult && resultsAreFormulas ? reencodeAroundReferences(parts.at(i))
+                                              : body(parts.at(i), true, ReferenceForms::All);
   }
   return kChoose + parts.join(QLatin1Char(',')) + QLatin1Char(')');
+}
+
+ReferenceForms formsOf(const QString& type, bool encoded, const QString& value) {
+  if (!encoded)
+    return ReferenceForms::Plain;
+  if (!beginsValueReference(value))
+    return ReferenceForms::All;
+  const GUIType bearer = GUIType::fromTransformerTypeString(type);
+  return bearer.valueIsEncoded() ? referenceForms(bearer, value) : ReferenceForms::All;
 }
 
 QLatin1String expressionType(const QString& type, bool encoded) {
@@ -63,12 +72,13 @@ bool ExpressionWriter::needsWrapping(const GUIType& type, const QString& value) 
   if (value.startsWith(kConditionalPrefix)) {
     return true;
   }
-  if (!beginsValueReference(value) || type.getType().startsWith(kExpressionType)) {
+  const ReferenceForms forms = referenceForms(type, value);
+  if (!beginsValueReference(value, forms) || type.getType().startsWith(kExpressionType)) {
     return false;
   }
   // Bare in a statement, even what only begins like a reference is no text; wrapped it is.
-  return type.mayHoldAttributeReference() || isValueReference(value) ||
-         (!type.isNull() && !type.valueIsEncoded() && !valueReferences(value).empty());
+  return type.mayHoldAttributeReference() || isValueReference(value, forms) ||
+         (!type.isNull() && !type.valueIsEncoded() && !valueReferences(value, forms).empty());
 }
 
 QString ExpressionWriter::wrap(const QString& value, const QString& name, const QString& type,
@@ -80,7 +90,7 @@ QString ExpressionWriter::wrap(const QString& value, const QString& name, const 
   result += expressionType(type, encoded);
   result += QLatin1Char(',') + encodeAroundReferences(name) + QLatin1Char(',');
   result += value.startsWith(kConditionalPrefix) ? conditionalBody(value, type.startsWith(kExpressionType))
-                                                 : body(value, encoded);
+                                                 : body(value, encoded, formsOf(type, encoded, value));
   return result + QLatin1Char(')');
 }
 

@@ -115,7 +115,8 @@ bool Formula::take(int& position, bool wantsOperand, Token& token) const {
   if (c == QLatin1Char('"')) {
     const int end = textEnd(m_text, start);
     // A reference in a text is one all the same where the formula is written.
-    return valueReferences(m_text.mid(start, end - start)).empty() && finish(Kind::Text, end);
+    return valueReferences(m_text.mid(start, end - start), ReferenceForms::Plain).empty() &&
+           finish(Kind::Text, end);
   }
   if (m_text.midRef(start, kValueReference.size()) == kValueReference) {
     const int end = endOfValueReference(m_text, start);

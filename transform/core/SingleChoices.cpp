@@ -23,13 +23,13 @@ const QLatin1String kCheckBoxType("CHECKBOX");
 // means the same in every encoding.
 class References {
  public:
-  explicit References(const QString& text) : m_marked(text) {
+  explicit References(const QString& text, ReferenceForms forms) : m_marked(text) {
     std::vector<std::pair<int, int>> places;
     for (const MacroReference& reference : macroReferences(text)) {
       if (reference.isClosed && !reference.isInside)
         places.emplace_back(reference.begin, reference.end);
     }
-    for (const ValueReference& reference : valueReferences(text))
+    for (const ValueReference& reference : valueReferences(text, forms))
       places.emplace_back(reference.begin, reference.end);
     if (places.empty() || text.contains(kMark))
       return;
@@ -118,7 +118,7 @@ QString inResults(const QString& value,
   for (int i = 0; i < parts.size(); ++i) {
     if (i % 2 == 0 && i + 1 < parts.size())
       continue;
-    const References references(parts.at(i));
+    const References references(parts.at(i), ReferenceForms::All);
     const QString result = QORXWwjdDecode(references.marked());
     const QString replaced = inside(references, result);
     if (replaced != result)
@@ -142,7 +142,7 @@ QString single_choices::replaceIn(const GUIType& type, const ChoiceList& choices
       return inMarked(type, choices, references, text, replace);
     });
   }
-  const References references(value);
+  const References references(value, referenceForms(type, value));
   return references.restored(inMarked(type, choices, references, references.marked(), replace));
 }
 

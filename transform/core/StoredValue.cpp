@@ -2,6 +2,7 @@
 #include <transform/core/Keywords.h>
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformParamCfg.h>
+#include <transform/text/TextPlaces.h>
 
 bool isMemberOf(const TransformParamCfg& record, const QString& name) {
   return record.isMultiParameter() && record.getName() != name;
@@ -32,6 +33,11 @@ QString withAttributeReference(const GUIType& type, const QString& value) {
     return value;
   }
   return kValueReferenceWord + value.mid(1) + kEncodedRightParenthesis;
+}
+
+long refuseEncoding(const GUIType& type, const QString& value) {
+  const bool isWord = type.valueIsEncoded() && !type.getType().startsWith(kExpressionType);
+  return isWord ? TextPlaces::refuseEncodedValue(value) : 0;
 }
 
 bool takesAttributeReference(const GUIType& type) {

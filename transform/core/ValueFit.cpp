@@ -36,7 +36,7 @@ bool refersToMacro(const QString& value) {
 // Whether the value is known as it stands.
 bool isPlain(const GUIType& type, const QString& value) {
   if (isUnsetSetting(value) || value.startsWith(kConditionalPrefix) || refersToMacro(value) ||
-      !valueReferences(value).empty())
+      !valueReferences(type, value).empty())
     return false;
   const bool isFunction = value.startsWith(QLatin1Char('@')) && value.endsWith(QLatin1Char(')'));
   return !(isFunction && type.mayHoldAttributeReference());

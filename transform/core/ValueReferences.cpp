@@ -1,3 +1,4 @@
+#include <platform/orxparameter/orxparameter.h>
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/ValueReferences.h>
@@ -27,7 +28,7 @@ const QLatin1String kRightParenthesis(")");
 const Mark kLeft{kLeftParenthesis, Form::Plain, Mark::Kind::Open};
 const Mark kRight{kRightParenthesis, Form::Plain, Mark::Kind::Close};
 
-const Mark* markAt(const QString& text, int position) {
+const Mark* markAt(const QString& text, int position, ReferenceForms forms) {
   const QChar c = text.at(position);
   if (c == QLatin1Char('('))
     return &kLeft;
@@ -36,7 +37,10 @@ const Mark* markAt(const QString& text, int position) {
   if (c != QLatin1Char('@') && c != QLatin1Char('<'))
     return nullptr;
   for (const Mark& mark : kMarks) {
-    if (text.midRef(position, mark.text.size()) == mark.text)
+    const bool isLetters = forms == ReferenceForms::Plain
+                               ? mark.form == Form::Encoded
+                               : forms == ReferenceForms::BareAt && &mark.text == &kValueReferenceWord;
+    if (!isLetters && text.midRef(position, mark.text.size()) == mark.text)
       return &mark;
   }
   return nullptr;
@@ -64,9 +68,22 @@ int endOfQuotedName(const QString& text, int position, Form form) {
 
 }  // namespace
 
-std::vector<ValueReference> valueReferences(const QString& text) {
+ReferenceForms referenceForms(const GUIType& type, const QString& value) {
+  // The parts of conditions are encoded whatever the type, and so are formulas.
+  if (type.isNull() || value.startsWith(kConditionalPrefix) || type.getType().startsWith(kExpressionType))
+    return ReferenceForms::All;
+  if (!type.valueIsEncoded())
+    return ReferenceForms::Plain;
+  return type.mayHoldAttributeReference() ? ReferenceForms::All : ReferenceForms::BareAt;
+}
+
+std::vector<ValueReference> valueReferences(const GUIType& type, const QString& value) {
+  return valueReferences(value, referenceForms(type, value));
+}
+
+std::vector<ValueReference> valueReferences(const QString& text, ReferenceForms forms) {
   std::vector<ValueReference> references;
-  if (!beginsValueReference(text))
+  if (!beginsValueReference(text, forms))
     return references;
   std::vector<Form> open;
   // The reference that was opened last: an outer one counts no more. Its bracket is the one at this depth.
@@ -74,7 +91,7 @@ std::vector<ValueReference> valueReferences(const QString& text) {
   int begin = -1;
   int nameBegin = 0;
   for (int i = 0; i < text.size(); ++i) {
-    const Mark* mark = markAt(text, i);
+    const Mark* mark = markAt(text, i, forms);
     if (!mark)
       continue;
     const int behind = i + mark->text.size();
@@ -105,14 +122,15 @@ std::vector<ValueReference> valueReferences(const QString& text) {
   return references;
 }
 
-bool isValueReference(const QString& text) {
-  const std::vector<ValueReference> references = valueReferences(text);
+bool isValueReference(const QString& text, ReferenceForms forms) {
+  const std::vector<ValueReference> references = valueReferences(text, forms);
   return references.size() == 1 && references.front().begin == 0 && references.front().end == text.size();
 }
 
-bool beginsValueReference(const QString& text) {
-  return text.contains(kValueReference) || text.contains(kValueReferenceEncoded) ||
-         text.contains(kValueReferenceWord);
+bool beginsValueReference(const QString& text, ReferenceForms forms) {
+  return text.contains(kValueReference) ||
+         (forms != ReferenceForms::Plain && text.contains(kValueReferenceEncoded)) ||
+         (forms == ReferenceForms::All && text.contains(kValueReferenceWord));
 }
 
 int endOfValueReference(const QString& text, int begin) {

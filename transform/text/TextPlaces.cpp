@@ -120,7 +120,9 @@ long TextPlaces::refuseEncodedValue(const QString& text) {
     return messages::kBreaksLine;
   if (!closesDeferredReferences(text))
     return messages::kValueUnclosed;
-  return text.isEmpty() || (isBareWord(text) && closesCalls(text)) ? 0 : messages::kNotEncoded;
+  // A quote inside would be one of the list that the word may stand in.
+  const bool isEncoded = isBareWord(text) && closesCalls(text) && !withoutReferences(text).contains(kQuote);
+  return text.isEmpty() || isEncoded ? 0 : messages::kNotEncoded;
 }
 
 QString TextPlaces::withoutKeyword(const QString& encoded, const QSet<QString>& keys) {

@@ -2,6 +2,7 @@
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/SingleChoices.h>
+#include <transform/core/StoredValue.h>
 #include <transform/core/TokenScanner.h>
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/TransformerCfg.h>
@@ -105,10 +106,15 @@ void WritingChecks::checkParameter(const GlobalParameters::Parameter& parameter,
   if (reason == 0 && isSound)
     reason = TextPlaces::refuse(TextPlace::MacroValue, value);
   // It has one value for all features.
-  if (reason == 0 && ExpressionWriter::needsWrapping(GUIType::fromGuiLine(parameter.promptLine), value))
+  const GUIType type = GUIType::fromGuiLine(parameter.promptLine);
+  if (reason == 0 && ExpressionWriter::needsWrapping(type, value))
     reason = value.startsWith(kConditionalPrefix) ? messages::kConditionInMacro : messages::kAttributeInMacro;
   if (reason == 0 && isSound && !parameter.isComputed())
-    reason = carried_references::refuseInMacro(GUIType::fromGuiLine(parameter.promptLine), value, known);
+    reason = carried_references::refuseInMacro(type, value, known);
+  // The text of a script is taken out of its encoding when it is written.
+  const bool isScript = parameter.isComputed() || value != parameter.currentValue();
+  if (reason == 0 && isSound && !isScript)
+    reason = refuseEncoding(type, value);
   if (reason != 0)
     m_findings.reportUnwritable(parameter.line, QString(), parameter.name, TransformResString(reason));
 }

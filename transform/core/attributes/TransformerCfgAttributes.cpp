@@ -256,7 +256,7 @@ void TransformerCfg::getAttributesByType(const QString& type, QStringList& attri
   attributes.clear();
   const auto add = [&](const GUIType& valueType, const QString& value) {
     if (valueType.getType().startsWith(type)) {
-      const std::vector<ValueReference> references = valueReferences(value);
+      const std::vector<ValueReference> references = valueReferences(valueType, value);
       for (const ValueReference& reference : references) {
         attributes.append(reference.name);
       }

@@ -1,4 +1,5 @@
 #include <platform/qorxcore/Lists.h>
+#include <transform/core/AttributeReferences.h>
 #include <transform/core/CarriedReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/ExpressionWriter.h>
@@ -8,6 +9,7 @@
 #include <transform/core/LookupChecks.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/SingleChoices.h>
+#include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueReferences.h>
@@ -36,9 +38,6 @@ using namespace lookup_checks;
 // The tokens of members stand for the parts of the value that bear their names, so that a part of another
 // name would be lost, and one that is missing would leave its token empty.
 QString faultOfParts(const QString& value, const MemberList& members) {
-  if (value.startsWith(kConditionalPrefix)) {
-    return TransformResString(messages::kConditionForParts);
-  }
   const QStringList parts = QORXSdfStringToList(value, members.separator());
   QSet<QString> given;
   for (int i = 0; i < parts.size(); i += 2) {
@@ -91,9 +90,13 @@ QHash<QString, QString> MappingFileChecks::find() const {
   QHash<QString, QString> messages;
   for (const TransformParamCfg& record : m_records) {
     const QString stored = stripBasicStringInfo(m_cfg.getParameterValue(record.getName()));
-    const QString fault = record.isMultiParameter() && !isUnsetValue(stored)
-                              ? faultOfParts(stored, record.members())
-                              : QString();
+    const bool hasParts = record.isMultiParameter() || record.isTable();
+    QString fault;
+    if (hasParts && stored.startsWith(kConditionalPrefix)) {
+      fault = TransformResString(messages::kConditionForParts);
+    } else if (record.isMultiParameter() && !isUnsetValue(stored)) {
+      fault = faultOfParts(stored, record.members());
+    }
     QString formula;
     if (!fault.isEmpty()) {
       messages.insert(record.getName(), fault);
@@ -151,6 +154,11 @@ long MappingFileChecks::refuse(const TransformParamCfg& record, const QString& s
   if (record.isMultiParameter()) {
     return refuseMembers(record, stored, parts);
   }
+  if (record.isTable()) {
+    if (const long number = refuseCells(record, stored)) {
+      return number;
+    }
+  }
   return m_written.isToken(record) ? refuseToken(record, stored, value) : 0;
 }
 
@@ -190,6 +198,27 @@ long MappingFileChecks::refuseMembers(const TransformParamCfg& record, const QSt
   return 0;
 }
 
+// What a class of its own makes of a table still reads the cells as they are stored.
+long MappingFileChecks::refuseCells(const TransformParamCfg& record, const QString& stored) const {
+  long number = 0;
+  forEachPart(record, stored, [&](const GUIType& type, const QString& cell) {
+    if (number != 0 || ExpressionWriter::needsWrapping(type, cell)) {
+      return;
+    }
+    QString written = cell;
+    if (!insertTokens(written)) {
+      number = messages::kGrowsWithoutEnd;
+    } else if (type.valueIsEncoded()) {
+      number = refuseEncoding(type, written);
+    } else if (TextPlaces::refusePlainValue(written, {}, TextPlaces::Calls::Refused) ==
+               messages::kCallInValue) {
+      // The list puts everything else that a plain value must not hold into quotes.
+      number = messages::kCallInValue;
+    }
+  });
+  return number;
+}
+
 long MappingFileChecks::refuseToken(const GUIType& type, const QString& stored,
                                     const QString& written) const {
   // Calls that were made for the value are sound, and so is what a class of its own makes of it.
@@ -204,7 +233,7 @@ long MappingFileChecks::refuseToken(const GUIType& type, const QString& stored,
   const QSet<QString>& keys = compiled ? compiled->keys() : none;
   const bool isExpression = type.getType().startsWith(kExpressionType);
   if (type.valueIsEncoded() && !isExpression) {
-    return TextPlaces::refuseEncodedValue(written);
+    return refuseEncoding(type, written);
   }
   const bool mayCall = isExpression || type.getType() == kTableType;
   return TextPlaces::refusePlainValue(written, keys,

@@ -46,6 +46,7 @@ class MappingFileChecks {
   bool checkFormulas(const TransformParamCfg& record, const QString& stored, QString& message) const;
   // What tokens of the transformer itself bring; false when that has no end.
   bool insertTokens(QString& text) const;
+  long refuseCells(const TransformParamCfg& record, const QString& stored) const;
   // As the engine sees the text when it runs a fragment; false when that has no end.
   bool expandMacros(QString& text) const;
   // Both.

@@ -5,6 +5,7 @@
 #include <transform/core/ParallelLevels.h>
 #include <transform/core/ParameterReferences.h>
 #include <transform/core/SingleChoices.h>
+#include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueReferences.h>
 #include <transform/custom/CompoundTransformerCfg.h>
@@ -407,12 +408,14 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   if (record && single_choices::refersToShownSide(*record, stored, known.expand))
     return messages::kShownSideReferred;
   const GUIType& type = getParameterGUIType(parameter);
-  const bool isDestination = ExpressionWriter::needsWrapping(type, stored) &&
-                             type.getType() == kSetterAttributeType &&
+  const bool isPerFeature = ExpressionWriter::needsWrapping(type, stored);
+  const bool isDestination = isPerFeature && type.getType() == kSetterAttributeType &&
                              isParmUsedAsAttributeSetterAttribute(parameter);
-  if (ExpressionWriter::needsWrapping(type, stored) && !isDestination)
+  if (isPerFeature && !isDestination)
     return messages::kAttributeInMacro;
   if (const long number = isName ? 0 : carried_references::refuseInMacro(type, stored, known))
+    return number;
+  if (const long number = isPerFeature ? 0 : refuseEncoding(type, value))
     return number;
   QString expanded = MFBuffer::withOrdinaryMacros(value);
   const bool ends = !listener() || listener()->expandMacros(*this, expanded);

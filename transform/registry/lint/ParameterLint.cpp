@@ -164,8 +164,9 @@ void ParameterLint::checkDefault(const LintedParameter& parameter, const GUIType
                                  const QString& value) {
   const bool isUnset = isUnsetSetting(value);
   const bool isMark = value.startsWith(kAttributeMark) && type.mayHoldAttributeReference();
-  const bool isReference = isMark ? withAttributeReference(type, value) != value
-                                  : type.mayHoldAttributeReference() && beginsValueReference(value);
+  const bool isReference =
+      isMark ? withAttributeReference(type, value) != value
+             : type.mayHoldAttributeReference() && beginsValueReference(value, referenceForms(type, value));
   if (isUnset || isReference || hasNoValue(type) || value.contains(kMacroOpen)) {
     return;
   }
