@@ -291,7 +291,7 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
   const QString table =
       "GUI_LINE_TABLE " + MemberList::configToken(';', {GUIType::fromGuiLine("GUI TEXT A a"),
                                                         GUIType::fromGuiLine("GUI TEXT B b")});
-  const QString encoded = QString(table).replace("TEXT", "TEXT_ENCODED");
+
   const Case cases[] = {
       {{"P", "TEXT", "a\nb"}, "K $(P)", kBreaksLine},
       {{"P", "TEXT", "a\nb"}, "K $(Q)", 0},

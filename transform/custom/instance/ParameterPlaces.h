@@ -23,7 +23,7 @@ class ParameterPlaces {
   // all can.
   long refuse(const QString& parameter, const QString& value) const;
   // Whether the parameter helps to bring a function call into a place inside.
-  bool bringsCall(const QString& parameter, const carried_references::Expand& expand) const {
+  bool bringsCall(const QString& parameter, const ExpandReferences& expand) const {
     return m_words.bringCall(parameter, expand);
   }
   // Whether any place at all can carry the value.

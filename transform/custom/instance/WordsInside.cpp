@@ -105,7 +105,7 @@ bool WordsInside::addFromWithin(const CompoundTransformerNetwork& network, Words
   return isNew;
 }
 
-bool WordsInside::bringCall(const QString& parameter, const carried_references::Expand& expand) const {
+bool WordsInside::bringCall(const QString& parameter, const ExpandReferences& expand) const {
   QString value = kMacroOpen + parameter + QLatin1Char(')');
   const QString reference = value;
   if (m_words.areTooMany && expand(value) && value.contains(QLatin1Char('@')))

@@ -2,7 +2,7 @@
 // instance gives them may make a function call of such a word.
 #pragma once
 
-#include <transform/core/CarriedReferences.h>
+#include <transform/core/ParameterReferences.h>
 
 #include <QHash>
 #include <QSet>
@@ -20,7 +20,7 @@ class WordsInside {
 
   // Whether the parameter helps to bring a call into a word. `expand` puts the values of the instance's
   // parameters in the places of references to them.
-  bool bringCall(const QString& parameter, const carried_references::Expand& expand) const;
+  bool bringCall(const QString& parameter, const ExpandReferences& expand) const;
 
  private:
   struct Words {
