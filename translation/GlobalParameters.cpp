@@ -78,6 +78,10 @@ void GlobalParameters::declare(const QString& name, const QString& value, int li
   }
 }
 
+QString GlobalParameters::asStated(const QString& promptLine, const QString& value) const {
+  return resolve(asWritten(withStoredSides(promptLine, value)).trimmed());
+}
+
 bool GlobalParameters::override(const QString& name, const QString& value) {
   if (!m_index.contains(name))
     return false;

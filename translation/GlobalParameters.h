@@ -38,6 +38,8 @@ class ORX_EXPORT GlobalParameters : public WorkspaceParameterDirectory {
   // A value that the header sets is kept.
   void declare(const QString& name, const QString& value, int lineNumber,
                const QString& promptLine = QString());
+  // A value that a document states for a parameter of that prompt line, as it would be read in a header.
+  QString asStated(const QString& promptLine, const QString& value) const;
   // Gives a parameter another value. False when the workspace has no such parameter.
   bool override(const QString& name, const QString& value);
 

@@ -1,5 +1,6 @@
 #include <transform/text/MessageNumbers.h>
 #include <transform/workspace/DocumentCopy.h>
+#include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 #include <translation/WorkspaceDocument.h>
@@ -26,15 +27,16 @@ WorkspaceDocument::Reading WorkspaceDocument::read(orx::Findings& diagnostics, Q
     QString text = exception.getMessage();
     if (m_input.isCopy())
       text.replace(m_input.path(), InputFile::shownName(m_fileName));
-    diagnostics.reportText(Rule::MalformedDocument, exception.line(), QString(), text);
+    diagnostics.reportText(Rule::MalformedDocument, exception.line(), QString(), text, exception.number());
     return Reading::Refused;
   }
 }
 
 WorkspaceDocument::Reading WorkspaceDocument::readOpened(orx::Findings& diagnostics, QString& error,
                                                          Versions versions) {
-  m_form = WorkspaceFile::recognise(m_input.path());
-  m_rawLines = RawLine::find(m_input.path());
+  PlainFile file(m_input.path(), QStringLiteral("kx-in-XXXXXX"));
+  m_form = WorkspaceFile::recognise(file);
+  m_rawLines = RawLine::find(file);
   for (const RawLine& line : m_rawLines) {
     if (line.kind == RawLine::Kind::Conflict)
       diagnostics.report(Rule::ConflictMark, line.line, QString(), {line.text});
@@ -47,11 +49,11 @@ WorkspaceDocument::Reading WorkspaceDocument::readOpened(orx::Findings& diagnost
       diagnostics.reportAs(Rule::NoDocument, messages::kOnlyCustomTransformers, 0, QString());
       return Reading::Refused;
     }
-  } else if (m_form != WorkspaceFile::Form::Unknown) {
-    m_file = WorkspaceFile(m_input.path());
-  }
-  if (m_form != WorkspaceFile::Form::Unknown)
     WorkspaceFile::read(m_reader, m_input.path(), m_headerLines);
+  } else if (m_form != WorkspaceFile::Form::Unknown) {
+    m_reader.ReadOpenedInput(file, m_input.path(), m_form == WorkspaceFile::Form::PlainXml, m_headerLines);
+    m_file = WorkspaceFile(file, m_form, m_headerLines);
+  }
   if (m_reader.GetDocumentType() != kUnknownDocument)
     return Reading::Done;
   diagnostics.report(Rule::NoDocument, 0, QString());

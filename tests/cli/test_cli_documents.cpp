@@ -97,7 +97,8 @@ TEST(DocumentCommands, TellTheFormOfAFileAlike) {
   const QByteArray late = QByteArray(kVersions).replace("Cleaner,1,", "Cleaner,17,");
   const QByteArray wide(reinterpret_cast<const char*>(QString("#! " + xml).utf16()), 2 * (3 + xml.size()));
   const char* const none = "The file holds no workspace document.";
-  const char* const onlyVersions = "The file holds custom transformers and no workspace.";
+  const char* const onlyVersions =
+      "The file begins with definitions of custom transformers, so it is no workspace.";
   const struct {
     QByteArray bytes;
     const char* refusal;  // empty: the file is read

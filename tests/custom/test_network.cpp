@@ -174,7 +174,7 @@ TEST(Network, CarriesAttributesAgainstTheOrderOfACycle) {
   network.doneAdding(true);
   network.setInputAttributes("A", {"a"});
   EXPECT_EQ(network.attributesOf("O"), names("a"));
-  network.nodeByNumber(kLength)->addAttributeCopy(port, "a", "far");
+  network.nodeByNumber(kLength)->addAttributeCopy(port, *network.nodeByNumber(kLength + 1), port, "a", "far");
   EXPECT_EQ(network.attributesOf("O"), names("a,far"));
 }
 

@@ -24,7 +24,7 @@ class Run:
         self.engine, self.macros = engine, Macros()
         self.factories, self.shapes, self.faults, self.unknown = [], [], [], []
         self.workers = {}  # name of a factory of several processes -> the flow inside its workers, what leaves
-        self.flow = flow.Flow({kind: {("", kind)} for _, kind in readers})
+        self.flow = flow.Flow({kind: {flow.origin(("", kind))} for _, kind in readers})
         self.readers, self.writers, self.depth = readers, {}, 0
         engine.tcl.fresh()
         self.read(text, [])
@@ -104,7 +104,7 @@ class Run:
         if keyword == "READER_FEATURE_TYPE":
             if tuple(words[:2]) not in self.readers:
                 raise Fault(f"no reader {words[:2]}")
-            self.flow.types.setdefault(words[2], set()).add(("", words[1]))
+            self.flow.types.setdefault(words[2], set()).add(flow.origin(("", words[1])))
         else:
             self.writers[words[0], words[2]] = words[1]
 
@@ -148,7 +148,9 @@ class Run:
             self.macros[made.name + "_" + decode(key)] = self.macros.expand_early(decode(value))
         back = made.name + "_" + settings.get("LOOPBACK_INPUT_TAG", "")
         count, workers = len(self.factories), self.workers
-        for turn in range(2 if "LOOPBACK_INPUT_TAG" in settings else 1):
+        came, before = None, ()
+        while before != came and ("LOOPBACK_INPUT_TAG" in settings or came is None):
+            before = came
             del self.factories[count:]
             self.workers = dict(workers)
             self.flow = inner = flow.Flow(types)

@@ -92,6 +92,20 @@ def _meta(made, raw, macros):
     return at
 
 
+def origin(place, names=()):
+    """Where features come from, and which of their attributes were others there: name and name there."""
+    return place, frozenset((name, old) for name, old in dict(names).items() if name != old)
+
+
+def copied(came, functions):
+    """An origin behind the functions of an output."""
+    names = dict(came[1])
+    for call in filter(None, (re.fullmatch(r"(?s)@CopyAttribute\((.*)\)", each) for each in functions)):
+        words = [decode(word) for word in call[1].split(",")]
+        names.update({new: names.get(old, old) for new, old in zip(words[::2], words[1::2])})
+    return origin(came[0], names)
+
+
 class Flow:
     """Which outputs of which factories each feature type carries."""
 
@@ -106,6 +120,7 @@ class Flow:
             made.reached.setdefault(port, set()).update(origins)
             reached |= origins
             self.taken.add(kind)
-        for _, kind, _ in made.outputs:
+        for _, kind, functions in made.outputs:
             self.types.setdefault(kind, set()).update(
-                reached if made.kind == "TeeFactory" else {decode(kind)})
+                copied(each, functions)
+                for each in (reached if made.kind == "TeeFactory" else [origin(decode(kind))]))

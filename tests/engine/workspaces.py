@@ -3,6 +3,7 @@ import random
 import re
 from html import escape
 
+from flow import origin
 from functions import Feature
 from values import CONFIG, LOOKUP, MEANS, NUMBERS, Value, is_encoded, level, make, reference
 from words import decode, encode
@@ -52,6 +53,7 @@ class Scope:
 
     def __init__(self, name=""):
         self.name, self.nodes, self.links, self.parameters, self.ports = name, [], [], [], []
+        self.copies = {}  # link -> the attributes that arrive under other names, and how each was called
         self.settings, self.names, self.numbers = {}, set(), 0
         self.attributes, self.referable, self.readers, self.writers = [], [], [], []
         self.loops, self.around = "", None
@@ -203,9 +205,9 @@ class Case:
             sources = [each for each in custom.nodes if each.outputs]
             if sources:
                 source = rng.choice(sources)
-                custom.links.append((source, rng.choice(source.outputs), node, ""))
+                self._link(custom, source, rng.choice(source.outputs), node, "")
                 if source.inputs:
-                    custom.links.append((node, "", source, rng.choice(source.inputs)))
+                    self._link(custom, node, "", source, rng.choice(source.inputs))
 
     def _place(self, scope, custom=None):
         rng = self.random
@@ -244,9 +246,20 @@ class Case:
             giving = [each for each in before if each.outputs]
             for port in node.inputs:
                 for source in rng.sample(giving, min(len(giving), rng.choice([1, 1, 1, 2]))):
-                    scope.links.append((source, rng.choice(source.outputs), node, port))
+                    self._link(scope, source, rng.choice(source.outputs), node, port)
             if node not in ends:
                 before.append(node)
+
+    def _link(self, scope, *link):
+        rng = self.random
+        scope.links += [link] * (2 if rng.random() < 0.01 else 1)
+        known = scope is not self.main or any(link[0] is reader for reader, _ in scope.readers)
+        if known and rng.random() < 0.2:
+            names = list(self.main.attributes)
+            given = rng.sample(names, rng.randint(1, 3))
+            if not any(link[2] is writer for writer, _ in scope.writers) and rng.random() < 0.5:
+                given.append(self.text("copy", "attribute"))
+            scope.copies[link] = {name: rng.choice(names) for name in given}
 
     # --- the document
 
@@ -291,13 +304,20 @@ class Case:
             "SOURCE_PORT_DESC": f"fo {a.outputs.index(out)} {encode(out)}".strip(),
             "TARGET_PORT_DESC": f"fi {b.inputs.index(into)} {encode(into)}".strip()})
             for at, (a, out, b, into) in enumerate(scope.links)]
+        copies = [element("ATTR_LINK", {
+            "IDENTIFIER": "5000", "SOURCE_NODE": str(a.number), "TARGET_NODE": str(b.number),
+            "SOURCE_PORT_DESC": f"ao {a.outputs.index(out)} 0 {encode(old)}",
+            "TARGET_PORT_DESC": f"ai {b.inputs.index(into)} 0 {encode(new)}"})
+            for (a, out, b, into), names in scope.copies.items() for new, old in names.items()
+            if (a, out, b, into) in scope.links]
         ports = [element("SUBDOCUMENT_IO", {"IDENTIFIER": str(node.number), "NAME": node.name, "IS_SOURCE": kind})
                  for node, kind in scope.ports]
         parameters = [element("GLOBAL_PARAMETER", {"GUI_LINE": f"GUI {kind} {name} {CONFIG.get(kind, '')}{prompt}",
                                                    "DEFAULT_VALUE": value.stored})
                       for name, kind, prompt, value in scope.parameters]
         return section("GLOBAL_PARAMETERS", parameters) + section("TRANSFORMERS", nodes) + (
-            section("SUBDOCUMENT_IOS", ports) if ports else "") + section("FEAT_LINKS", links)
+            section("SUBDOCUMENT_IOS", ports) if ports else "") + section("FEAT_LINKS", links) + section(
+                "ATTR_LINKS", copies)
 
     # --- what an engine must find
 
@@ -315,27 +335,30 @@ class Case:
         return walk(self.main, "", [])
 
     def sources(self, scope, around, node, port):
-        """What is to arrive at a port, as the engine names it."""
-        found, pending, seen = set(), [(scope, around, node, port)], set()
+        """What is to arrive at a port, as the engine names it, with the names that attributes had before."""
+        found, pending, seen = set(), [(scope, around, node, port, {})], set()
         while pending:
-            scope, around, node, port = pending.pop()
-            if (key := (*(id(each) for _, each in around), id(node), port)) in seen:
+            scope, around, node, port, later = pending.pop()
+            if (key := (*(id(each) for _, each in around), id(node), port, *sorted(later.items()))) in seen:
                 continue
             seen.add(key)
             for source, out, target, into in scope.links:
                 if target is not node or into != port:
                     continue
+                given = scope.copies.get((source, out, target, into), {})
+                names = {**given, **{new: given.get(old, old) for new, old in later.items()}}
+                names = {new: old for new, old in names.items() if new != old or new in given}
                 prefix = "".join(each.name + "_" for _, each in around)
                 if source.custom:
                     inner = next(each for each, kind in source.custom.ports if each.name == out and kind == "false")
-                    pending.append((source.custom, around + [(scope, source)], inner, ""))
+                    pending.append((source.custom, around + [(scope, source)], inner, "", names))
                 elif source.definition:
-                    found.add(decode(prefix + encode(source.name) + "|" + encode(out)))
+                    found.add(origin(decode(prefix + encode(source.name) + "|" + encode(out)), names))
                 elif any(source is reader for reader, _ in scope.readers):
-                    found.add(("", source.name))
+                    found.add(origin(("", source.name), names))
                 elif any(source is each and kind == "loop" for each, kind in scope.ports):
-                    pending.append((scope, around, source, ""))
+                    pending.append((scope, around, source, "", names))
                 else:
                     outer, instance = around[-1]
-                    pending.append((outer, around[:-1], instance, source.name))
+                    pending.append((outer, around[:-1], instance, source.name, names))
         return found

@@ -36,7 +36,9 @@ class LinkedTranslation : public testing::Test {
     folders.write("extra/unused.txt", "");
     QString error;
     EXPECT_TRUE(VersionStore(folders.path("extra/" + name + ".ort"))
-                    .insert({name, "1", "Mine", "G"}, {"# none"}, document, error))
+                    .insert({name, "1", "Mine", "G"},
+                            {"FACTORY_DEF * TeeFactory FACTORY_NAME C INPUT FEATURE_TYPE a"}, document,
+                            error))
         << error.toStdString();
   }
   void storeBody(const QByteArray& behind, const QByteArray& between = QByteArray()) {

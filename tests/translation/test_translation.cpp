@@ -18,7 +18,7 @@ TEST(Translation, WritesTheStatementsInOrder) {
   workspace.parameter("GUI TEXT Set Prompt", "2").parameter("GUI TEXT Free Prompt", "a b");
   const Outcome outcome = translate(workspace, {{"Free", "c"}});
   EXPECT_EQ(outcome.result, TranslationResult::Done);
-  EXPECT_EQ(outcome.diagnostics, QStringList());
+  EXPECT_EQ(outcome.diagnostics, QStringList("repeated-declaration "));
   const QStringList lines = outcome.text.split('\n', Qt::SkipEmptyParts);
   ASSERT_EQ(lines.size(), 8) << outcome.text.toStdString();
   EXPECT_TRUE(lines.at(0).startsWith("# Written by orxt "));

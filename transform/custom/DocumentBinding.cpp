@@ -6,9 +6,12 @@
 #include <transform/custom/DocumentBinding.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/findings/Refusal.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/TransformerRecords.h>
+
+namespace messages = orx::messages;
 
 using orx::Rule;
 
@@ -36,6 +39,8 @@ bool DocumentBinding::enter(int identifier, const Place& place) {
   const auto earlier = m_places.constFind(identifier);
   if (earlier == m_places.constEnd()) {
     m_places.insert(identifier, place);
+    if (place.gives && !place.port.isEmpty() && !m_givingPorts.contains(place.port))
+      m_givingPorts.insert(place.port, identifier);
     return true;
   }
   m_findings.report(Rule::DuplicateNumber, place.line, place.name,
@@ -131,6 +136,27 @@ void DocumentBinding::configure(const TransformerStruct& record, const QString& 
     m_findings.report(Rule::UnmetDependency, record.line, title, {cfg.getName(), cfg.dependencyMsg()});
 }
 
+GUIType DocumentBinding::promptOf(const GlobalParameterStruct& record) {
+  const GUIType type = GUIType::fromGuiLine(record.guiLine);
+  if (type.getName().isEmpty()) {
+    m_findings.report(Rule::BadPromptLine, record.line, QString(), {record.guiLine});
+    return GUIType();
+  }
+  const auto earlier = m_declared.constFind(type.getName());
+  if (earlier != m_declared.constEnd()) {
+    const bool isEqual = earlier->value == record.defaultValue && earlier->promptLine == record.guiLine;
+    m_findings.report(isEqual ? Rule::RepeatedDeclaration : Rule::ContradictingParameter, record.line,
+                      QString(), {type.getName(), QString::number(earlier->line)});
+  }
+  m_declared.insert(type.getName(), {record.defaultValue, record.guiLine, record.line});
+  // Its type tells how the value is to be written.
+  if (!type.isKnown()) {
+    m_findings.reportAs(Rule::BadPromptLine, messages::kUnknownPromptType, record.line, QString(),
+                        {type.getName(), type.getType()});
+  }
+  return type;
+}
+
 // --- links -------------------------------------------------------------------------------------------------
 
 bool DocumentBinding::findEnds(const LinkStruct& record, const Place*& source, const Place*& target) {
@@ -184,6 +210,25 @@ bool DocumentBinding::readPort(const LinkStruct& record, const Place& place, boo
 }
 
 std::optional<DocumentBinding::Flow> DocumentBinding::flow(const LinkStruct& record) {
+  std::optional<Flow> flow = findFlow(record);
+  if (!flow) {
+    m_leftOut.emplace(record.sourceNode, record.targetNode);
+    return flow;
+  }
+  const auto [at, isNew] =
+      m_flows.try_emplace({record.sourceNode, flow->output, record.targetNode, flow->input});
+  if (isNew) {
+    at->second.number = m_flows.size() - 1;
+    at->second.line = record.line;
+  } else {
+    flow->isRepeated = true;
+    m_findings.report(Rule::IdleLink, record.line, flow->source->name,
+                      {QString::number(record.identifier), QString::number(at->second.line)});
+  }
+  return flow;
+}
+
+std::optional<DocumentBinding::Flow> DocumentBinding::findFlow(const LinkStruct& record) {
   Flow flow;
   if (!findEnds(record, flow.source, flow.target))
     return std::nullopt;
@@ -199,24 +244,50 @@ std::optional<DocumentBinding::Flow> DocumentBinding::flow(const LinkStruct& rec
 
 std::optional<DocumentBinding::AttributeCopy> DocumentBinding::attributeCopy(const LinkStruct& record) {
   AttributeCopy copy;
-  const Place* target = nullptr;
-  if (!findEnds(record, copy.source, target))
+  if (!findEnds(record, copy.source, copy.target))
     return std::nullopt;
-  unsigned port = 0;
+  unsigned output = 0;
+  unsigned input = 0;
   const auto readAttribute = [&](const QString& description, bool wantsOutput, QString& attribute) {
     bool isFeaturePort = false;
     bool isOutput = false;
     unsigned ignored = 0;
     return hasWords(description, 4) &&
-           decodePortDescription(description, isFeaturePort, isOutput, wantsOutput ? port : ignored, ignored,
+           decodePortDescription(description, isFeaturePort, isOutput, wantsOutput ? output : input, ignored,
                                  attribute) &&
            !isFeaturePort && isOutput == wantsOutput && !attribute.isEmpty();
   };
   if (!copy.source->gives || !readAttribute(record.sourcePortDesc, true, copy.from))
     reportPort(record, *copy.source, record.sourcePortDesc);
-  else if (!readAttribute(record.targetPortDesc, false, copy.to))
-    reportPort(record, *target, record.targetPortDesc);
-  else if (copy.from != copy.to && findPort(record, *copy.source, true, port, QString(), copy.output))
+  else if (!copy.target->takes || !readAttribute(record.targetPortDesc, false, copy.to))
+    reportPort(record, *copy.target, record.targetPortDesc);
+  else if (findPort(record, *copy.source, true, output, QString(), copy.output) &&
+           findPort(record, *copy.target, false, input, QString(), copy.input) && takeAttribute(record, copy))
     return copy;
   return std::nullopt;
+}
+
+bool DocumentBinding::takeAttribute(const LinkStruct& record, AttributeCopy& copy) {
+  const QString identifier = QString::number(record.identifier);
+  const auto along = m_flows.find({record.sourceNode, copy.output, record.targetNode, copy.input});
+  if (along == m_flows.end()) {
+    // Where features would go but for a link that is disabled or at fault, that one is enough.
+    if (m_leftOut.count({record.sourceNode, record.targetNode}) == 0)
+      m_findings.reportAs(Rule::IdleLink, messages::kIdleAttributeLink, record.line, copy.source->name,
+                          {identifier, copy.source->name, copy.target->name});
+    return false;
+  }
+  copy.flow = along->second.number;
+  const int source = m_givingPorts.value(copy.source->port, record.sourceNode);
+  const auto [given, isNew] = m_copies[{source, copy.output, record.targetNode, copy.input}].try_emplace(
+      copy.to, Taken{copy.from, record.line});
+  if (isNew)
+    return true;
+  const QString line = QString::number(given->second.line);
+  if (given->second.from == copy.from)
+    m_findings.report(Rule::IdleLink, record.line, copy.source->name, {identifier, line});
+  else
+    m_findings.report(Rule::AttributeLink, record.line, copy.target->name,
+                      {identifier, copy.to, copy.from, line, given->second.from});
+  return false;
 }

@@ -4,20 +4,25 @@
 #pragma once
 
 #include <platform/Export.h>
+#include <platform/orxparameter/GUIType.h>
 #include <transform/custom/TransformerPorts.h>
 #include <transform/findings/Findings.h>
 
 #include <QHash>
 #include <QString>
 
+#include <map>
 #include <memory>
 #include <optional>
+#include <set>
+#include <tuple>
 
 class IXMLComponentReader;
 class TransformerCfg;
 class TransformerCfgListener;
 class TransformerSource;
 class WorkspaceParameterDirectory;
+struct GlobalParameterStruct;
 struct LinkStruct;
 struct TransformerStruct;
 
@@ -41,11 +46,11 @@ class ORX_EXPORT DocumentBinding {
     const Place* target = nullptr;
     QString output;
     QString input;
+    bool isRepeated = false;  // another link has said it
   };
-  // An attribute that leaves an output under another name as well.
-  struct AttributeCopy {
-    const Place* source = nullptr;
-    QString output;
+  // An attribute that goes on along a flow under another name as well.
+  struct AttributeCopy : Flow {
+    std::size_t flow = 0;  // among those that repeat none, in the order in which they were bound
     QString from;
     QString to;
   };
@@ -63,7 +68,10 @@ class ORX_EXPORT DocumentBinding {
   // Null for an unknown number. Stays until the next one is entered.
   const Place* find(int identifier) const;
 
-  // Nothing when the link is left out.
+  // What the prompt line of a parameter says; the null type when it cannot be read.
+  GUIType promptOf(const GlobalParameterStruct& record);
+
+  // Nothing when the link is left out. Those of features come first.
   std::optional<Flow> flow(const LinkStruct& record);
   std::optional<AttributeCopy> attributeCopy(const LinkStruct& record);
 
@@ -76,6 +84,9 @@ class ORX_EXPORT DocumentBinding {
                 const QString& name, QString& tag);
   bool readPort(const LinkStruct& record, const Place& place, bool isOutput, QString& tag);
   void reportPort(const LinkStruct& record, const Place& place, const QString& description);
+  std::optional<Flow> findFlow(const LinkStruct& record);
+  // False when no features flow there, or the attribute is given already.
+  bool takeAttribute(const LinkStruct& record, AttributeCopy& copy);
 
   const IXMLComponentReader& m_reader;
   TransformerSource& m_source;
@@ -84,4 +95,26 @@ class ORX_EXPORT DocumentBinding {
   TransformerCfgListener* m_listener;
   QHash<int, Place> m_places;         // by identifier in the document
   QHash<QString, int> m_linesByName;  // of transformers
+
+  struct Declared {
+    QString value;
+    QString promptLine;
+    int line = 0;
+  };
+  QHash<QString, Declared> m_declared;  // parameters
+
+  struct Taken {
+    QString from;
+    int line = 0;
+  };
+  struct BoundFlow {
+    std::size_t number = 0;
+    int line = 0;
+  };
+  // Source and its port, target and its port.
+  using Ends = std::tuple<int, QString, int, QString>;
+  std::map<Ends, BoundFlow> m_flows;
+  std::map<Ends, std::map<QString, Taken>> m_copies;  // by flow, which an input and a loop point may share
+  QHash<QString, int> m_givingPorts;                  // the first of each name
+  std::set<std::pair<int, int>> m_leftOut;  // nodes that a link leads between which could not be bound
 };

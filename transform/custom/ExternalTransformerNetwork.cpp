@@ -175,7 +175,7 @@ void ExternalTransformerNetwork::loadBody() {
   PlainFile plain(m_fileName, kTemporaryName);
   const VersionInfo version = findVersion(plain.fileName());
   if (version.byteLength < 0)
-    throw WorkspaceLoaderException(TransformResString(messages::kFileChanged, m_fileName));
+    throw WorkspaceLoaderException(messages::kFileChanged, {m_fileName});
   XMLComponentReader reader;
   QStringList headerLines;
   WorkspaceFile::readVersion(reader, plain.fileName(), version, headerLines);

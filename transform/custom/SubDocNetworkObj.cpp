@@ -17,13 +17,17 @@ QString SubDocNetworkObj::name() const {
 
 // --- links -------------------------------------------------------------------------------------------------
 
-void SubDocNetworkObj::addAttributeCopy(const QString& port, const QString& from, const QString& to) {
-  m_copies[port].push_back({from, to});
-  const auto fed = m_consumers.find(port);
-  if (fed == m_consumers.end())
-    return;
-  for (const Link& link : fed->second)
-    link.node->m_knowsSources = false;
+void SubDocNetworkObj::addAttributeCopy(const QString& port, SubDocNetworkObj& target,
+                                        const QString& targetPort, const QString& from, const QString& to) {
+  m_copies[{port, &target, targetPort}].add(from, to);
+  target.m_knowsSources = false;
+}
+
+const AttributeCopies& SubDocNetworkObj::attributeCopies(const QString& port, const SubDocNetworkObj& target,
+                                                         const QString& targetPort) const {
+  static const AttributeCopies none;
+  const auto at = m_copies.empty() ? m_copies.end() : m_copies.find({port, &target, targetPort});
+  return at == m_copies.end() ? none : at->second;
 }
 
 void SubDocNetworkObj::addLink(SubDocNetworkObj& from, const QString& fromPort, SubDocNetworkObj& to,
@@ -34,7 +38,7 @@ void SubDocNetworkObj::addLink(SubDocNetworkObj& from, const QString& fromPort, 
   if (std::next(port) != to.m_feeders.end())
     to.m_knowsSources = false;
   else if (to.m_knowsSources)
-    to.m_sources.append(from.sourceAt(fromPort));
+    to.m_sources.append(from.sourceAt(fromPort, to, toPort));
 }
 
 void SubDocNetworkObj::removeLinks() {
@@ -64,6 +68,11 @@ void SubDocNetworkObj::removeLinks() {
       link.node->m_knowsSources = false;
     }
   }
+  m_copies.clear();
+  for (const auto& [port, links] : feeders) {
+    for (const Link& link : links)
+      link.node->m_copies.erase({link.port, this, port});
+  }
 }
 
 const SubDocNetworkObj::Sources& SubDocNetworkObj::sources() {
@@ -72,7 +81,7 @@ const SubDocNetworkObj::Sources& SubDocNetworkObj::sources() {
     m_sources.clear();
     for (const auto& [port, links] : m_feeders) {
       for (const Link& link : links)
-        m_sources.append(link.node->sourceAt(link.port));
+        m_sources.append(link.node->sourceAt(link.port, *this, port));
     }
   }
   return m_sources;
@@ -80,11 +89,15 @@ const SubDocNetworkObj::Sources& SubDocNetworkObj::sources() {
 
 // --- computing ---------------------------------------------------------------------------------------------
 
-SubDocNetworkObj::Outlet& SubDocNetworkObj::outlet(const QString& port) {
-  if (m_kind != Kind::Transformer && m_copies.count(port) == 0)
+SubDocNetworkObj::Outlet& SubDocNetworkObj::outlet(const LinkEnds& ends) {
+  const QString& port = std::get<0>(ends);
+  const auto copies = m_copies.empty() ? m_copies.end() : m_copies.find(ends);
+  const bool isCopying = copies != m_copies.end();
+  if (m_kind != Kind::Transformer && !isCopying)
     return m_common;
-  PortOutlet& own = m_outlets[port];
+  PortOutlet& own = m_outlets[isCopying ? ends : LinkEnds{port, nullptr, QString()}];
   own.port = port;
+  own.copies = isCopying ? &copies->second : nullptr;
   m_hasOutlets = true;
   return own;
 }
@@ -96,7 +109,13 @@ void SubDocNetworkObj::forgetOutlets() {
 
 void SubDocNetworkObj::fill(Outlet& outlet, MetAttributes& met) {
   outlet.isCurrent = true;
-  outlet.attributes = getAttributes(&outlet == &m_common ? QString() : static_cast<PortOutlet&>(outlet).port);
+  if (&outlet == &m_common) {
+    outlet.attributes = getAttributes(QString());
+  } else {
+    const auto& own = static_cast<const PortOutlet&>(outlet);
+    const AttributeSet attributes = getAttributes(own.port);
+    outlet.attributes = own.copies ? own.copies->applied(attributes) : attributes;
+  }
   noteOrigins(outlet.attributes, met);
 }
 
@@ -137,16 +156,4 @@ AttributeSet SubDocNetworkObj::collect(const Source* begin, const Source* end, M
 AttributeSet SubDocNetworkObj::collect(MetAttributes& met) {
   const Sources& all = sources();
   return collect(all.begin(), all.end(), met);
-}
-
-AttributeSet SubDocNetworkObj::withCopies(const QString& port, const AttributeSet& attributes) const {
-  AttributeSet all = attributes;
-  const auto at = m_copies.find(port);
-  if (at == m_copies.end())
-    return all;
-  for (const AttributeCopy& copy : at->second) {
-    if (all.contains(copy.from))
-      all.add(copy.to);
-  }
-  return all;
 }

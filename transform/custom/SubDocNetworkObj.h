@@ -4,6 +4,7 @@
 
 #include <platform/Export.h>
 #include <transform/core/AttributeSet.h>
+#include <transform/custom/AttributeCopies.h>
 
 #include <QHash>
 #include <QString>
@@ -12,6 +13,7 @@
 
 #include <cstdint>
 #include <map>
+#include <tuple>
 #include <vector>
 
 // What a query for attributes has met so far.
@@ -60,15 +62,11 @@ class ORX_EXPORT SubDocNetworkObj {
   // The nodes that this one feeds, by the port of this node.
   const Ports& consumers() const { return m_consumers; }
 
-  // Where an attribute goes on from this node under a second name.
-  struct AttributeCopy {
-    QString from;
-    QString to;
-  };
-  void addAttributeCopy(const QString& port, const QString& from, const QString& to);
-  const std::map<QString, std::vector<AttributeCopy>>& attributeCopies() const { return m_copies; }
-  // `attributes`, and behind them the copies made at the port.
-  AttributeSet withCopies(const QString& port, const AttributeSet& attributes) const;
+  // Has an attribute go on under a second name along the link from `port` to that port of `target`.
+  void addAttributeCopy(const QString& port, SubDocNetworkObj& target, const QString& targetPort,
+                        const QString& from, const QString& to);
+  const AttributeCopies& attributeCopies(const QString& port, const SubDocNetworkObj& target,
+                                         const QString& targetPort) const;
 
   static void addLink(SubDocNetworkObj& from, const QString& fromPort, SubDocNetworkObj& to,
                       const QString& toPort);
@@ -118,13 +116,18 @@ class ORX_EXPORT SubDocNetworkObj {
   friend class CompoundTransformerNetwork;
   friend class NetworkSorter;
 
-  // Of one port alone.
+  // A port of this node, and where a link leads from there.
+  using LinkEnds = std::tuple<QString, const SubDocNetworkObj*, QString>;
+  // Of one port alone, or of one link that copies attributes.
   struct PortOutlet : Outlet {
     QString port;
+    const AttributeCopies* copies = nullptr;
   };
 
-  Outlet& outlet(const QString& port);
-  Source sourceAt(const QString& port) { return {this, &outlet(port), m_serial}; }
+  Outlet& outlet(const LinkEnds& ends);
+  Source sourceAt(const QString& port, const SubDocNetworkObj& target, const QString& targetPort) {
+    return {this, &outlet({port, &target, targetPort}), m_serial};
+  }
   void fill(Outlet& outlet, MetAttributes& met);
   void forgetOutlets();
 
@@ -138,7 +141,7 @@ class ORX_EXPORT SubDocNetworkObj {
   Sources m_sources;
   bool m_hasOutlets = false;
   int m_number;
-  std::map<QString, PortOutlet> m_outlets;  // of transformers, and where copies are made
+  std::map<LinkEnds, PortOutlet> m_outlets;  // of transformers, and where copies are made
 
   QString m_name;
   int m_line = 0;
@@ -146,7 +149,7 @@ class ORX_EXPORT SubDocNetworkObj {
   bool m_lacksOutputLink = false;
   Ports m_feeders;
   Ports m_consumers;
-  std::map<QString, std::vector<AttributeCopy>> m_copies;
+  std::map<LinkEnds, AttributeCopies> m_copies;
 };
 
 inline void SubDocNetworkObj::beginQuery() {

@@ -16,6 +16,6 @@ void SubDocNetworkObjInput::compute(MetAttributes& met) {
   noteOrigins(leaving(), met);
 }
 
-AttributeSet SubDocNetworkObjInput::getAttributes(const QString& port) const {
-  return isComputed() ? withCopies(port, leaving()) : AttributeSet();
+AttributeSet SubDocNetworkObjInput::getAttributes(const QString&) const {
+  return isComputed() ? leaving() : AttributeSet();
 }

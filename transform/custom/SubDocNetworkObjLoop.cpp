@@ -7,6 +7,6 @@ void SubDocNetworkObjLoop::compute(MetAttributes& met) {
   setLeaving(collect(met));
 }
 
-AttributeSet SubDocNetworkObjLoop::getAttributes(const QString& port) const {
-  return isComputed() ? withCopies(port, leaving()) : AttributeSet();
+AttributeSet SubDocNetworkObjLoop::getAttributes(const QString&) const {
+  return isComputed() ? leaving() : AttributeSet();
 }

@@ -46,7 +46,7 @@ AttributeSet SubDocNetworkObjXformer::getAttributes(const QString& port) const {
     return AttributeSet();
   AttributeSet leaving = attribute_flow::leaving(*m_cfg, port);
   leaving.add(m_exposed.value(port));
-  return withCopies(port, leaving);
+  return leaving;
 }
 
 TransformerCfg* SubDocNetworkObjXformer::getTransformer() const {

@@ -32,6 +32,8 @@ enum class Rule {
   RepeatedDeclaration,
   DanglingLink,
   BadPort,
+  AttributeLink,
+  IdleLink,
   UnknownInput,
   UnknownOutput,
   Cycle,

@@ -438,6 +438,22 @@ constexpr long kStatementNameTaken = 371470;
 constexpr long kFactoryTaken = 371471;
 constexpr long kTakenAlong = 371472;
 
+// Links.
+constexpr long kContradictingLink = 371450;
+constexpr long kRepeatedLink = 371451;
+constexpr long kIdleAttributeLink = 371452;
+constexpr long kLinkedAttributeMissing = 371453;
+constexpr long kLinkedAttributeUnlisted = 371454;
+
+// What documents and the files around them are refused for.
+constexpr long kFileNotOpened = 371455;
+constexpr long kParseErrorAt = 371456;
+constexpr long kParseError = 371457;
+constexpr long kHeaderNotText = 371458;
+constexpr long kUnknownPromptType = 371459;
+constexpr long kEmptyDefinition = 371460;
+constexpr long kTakenByLookup = 371461;
+
 // Names.
 constexpr long kReferenceInName = 370940;
 constexpr long kShownSideReferred = 371321;

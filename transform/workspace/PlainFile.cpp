@@ -1,12 +1,9 @@
 #include <platform/orxutil/Decipher.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
 
 #include <QFileInfo>
-
-QString couldNotOpenMessage(const QString& fileName) {
-  return QStringLiteral("File Error!\nCould not open file: %1").arg(fileName);
-}
 
 PlainFile::PlainFile(const QString& fileName, const QString& copyTemplate) : m_file(fileName) {
   // Without a registered routine no copy can come about, and no temporary file is needed to find that out.
@@ -21,5 +18,5 @@ PlainFile::PlainFile(const QString& fileName, const QString& copyTemplate) : m_f
     }
   }
   if (QFileInfo(m_file.fileName()).isDir() || !m_file.open(QIODevice::ReadOnly | QIODevice::Unbuffered))
-    throw WorkspaceLoaderException(couldNotOpenMessage(fileName));
+    throw WorkspaceLoaderException(orx::messages::kFileNotOpened, {fileName});
 }

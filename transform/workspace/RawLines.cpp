@@ -92,7 +92,11 @@ class Finder {
 
 std::vector<RawLine> RawLine::find(const QString& fileName) {
   PlainFile plain(fileName, QStringLiteral("kx-in-XXXXXX"));
-  FileLines lines(plain.device());
+  return find(plain);
+}
+
+std::vector<RawLine> RawLine::find(PlainFile& file) {
+  FileLines lines(file.rewound());
   Finder finder;
   while (lines.next())
     finder.add(lines);

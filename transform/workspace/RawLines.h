@@ -8,6 +8,8 @@
 
 #include <vector>
 
+class PlainFile;
+
 struct ORX_EXPORT RawLine {
   enum class Kind {
     Conflict,  // "<<<<<<<", "|||||||", "=======" or ">>>>>>>", anywhere in the file
@@ -21,4 +23,5 @@ struct ORX_EXPORT RawLine {
   // In their order. Of plain XML, whose lines bear no mark, only conflicts are found. Throws
   // WorkspaceLoaderException when the file cannot be read.
   static std::vector<RawLine> find(const QString& fileName);
+  static std::vector<RawLine> find(PlainFile& file);
 };

@@ -133,7 +133,7 @@ QByteArray deciphered(const QByteArray& text) {
     return QByteArray();
   TemporaryFile copy(kVersionCopyName);
   if (!copy.open() || copy.write(text) != text.size() || !copy.flush())
-    throw WorkspaceLoaderException(couldNotOpenMessage(copy.fileTemplate()));
+    throw WorkspaceLoaderException(messages::kFileNotOpened, {copy.fileTemplate()});
   PlainFile plain(copy.fileName(), kVersionCopyName);
   return plain.fileName() == copy.fileName() ? QByteArray() : plain.device().readAll();
 }
@@ -160,8 +160,7 @@ VersionStore::Piece VersionStore::read(qint64 offset, qint64 length) const {
   PlainFile plain(m_fileName, kCopyName);
   const QByteArray all = plain.device().readAll();
   if (offset < 0 || length <= 0 || offset > all.size() || length > all.size() - offset) {
-    throw WorkspaceLoaderException(
-        documentText(messages::kNoVersionAtByte, {QString::number(offset), m_fileName}));
+    throw WorkspaceLoaderException(messages::kNoVersionAtByte, {QString::number(offset), m_fileName});
   }
   Piece piece;
   piece.before = all.left(static_cast<int>(offset));
@@ -192,8 +191,7 @@ VersionStore::Piece VersionStore::read(qint64 offset, qint64 length) const {
     piece.document = asComment(piece.document);
   }
   if (piece.document.trimmed().isEmpty()) {
-    throw WorkspaceLoaderException(
-        documentText(messages::kVersionWithoutDocument, {QString::number(offset), m_fileName}));
+    throw WorkspaceLoaderException(messages::kVersionWithoutDocument, {QString::number(offset), m_fileName});
   }
   return piece;
 }

@@ -65,8 +65,7 @@ const QTextCodec* fileCodec(const QByteArray& name) {
 }
 
 WorkspaceLoaderException noWorkspaceFile(const QString& fileName) {
-  return WorkspaceLoaderException(QLatin1String("File Error!\n") +
-                                  documentText(messages::kNoWorkspaceFile, {fileName}));
+  return WorkspaceLoaderException(messages::kNoWorkspaceFile, {fileName});
 }
 
 void readPiece(IXMLComponentReader& reader, const QString& fileName, const VersionInfo& version,
@@ -85,6 +84,10 @@ WorkspaceFile::Form WorkspaceFile::recognise(const QString& fileName) {
   } catch (const WorkspaceLoaderException&) {
     return Form::Unknown;
   }
+}
+
+WorkspaceFile::Form WorkspaceFile::recognise(PlainFile& file) {
+  return formOf(file.rewound());
 }
 
 void WorkspaceFile::read(IXMLComponentReader& reader, const QString& fileName, QStringList& headerLines) {
@@ -123,14 +126,29 @@ WorkspaceFile::WorkspaceFile(const QString& fileName) {
   m_form = formOf(plain.device());
   if (m_form != Form::Workspace && m_form != Form::PlainXml)
     throw noWorkspaceFile(fileName);
-  plain.device().seek(0);
+  takeSurroundings(plain);
+  if (m_hasHeader) {
+    QBuffer xml;
+    xml.open(QIODevice::WriteOnly);
+    WorkspaceSplitter splitter;
+    splitter.split(plain.rewound(), xml, fileName);
+    m_headerLines = splitter.headerLines();
+  }
+}
+
+WorkspaceFile::WorkspaceFile(PlainFile& file, Form form, const QStringList& headerLines)
+    : m_form(form), m_headerLines(headerLines) {
+  takeSurroundings(file);
+}
+
+void WorkspaceFile::takeSurroundings(PlainFile& file) {
   QByteArray declaration;
   const auto addToDeclaration = [&](const FileLines& lines, int prefix) {
     if (declaration.size() < kDeclarationLength)
       declaration.append(lines.data() + prefix, std::min(lines.size() - prefix, kDeclarationLength));
     return declaration.size() < kDeclarationLength;
   };
-  FileLines lines(plain.device());
+  FileLines lines(file.rewound());
   bool hasXml = m_form == Form::PlainXml;
   bool hasHeaderEnded = false;
   bool isFirst = true;
@@ -182,14 +200,6 @@ WorkspaceFile::WorkspaceFile(const QString& fileName) {
     m_encoding = codec ? codec->name() : QByteArray();
     if (m_encoding.isEmpty() || isWide())
       m_encoding = ORXSystemEncodingName();
-  }
-  if (m_hasHeader) {
-    plain.device().seek(0);
-    QBuffer xml;
-    xml.open(QIODevice::WriteOnly);
-    WorkspaceSplitter splitter;
-    splitter.split(plain.device(), xml, fileName);
-    m_headerLines = splitter.headerLines();
   }
 }
 

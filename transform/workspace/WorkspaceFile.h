@@ -15,6 +15,8 @@
 
 #include <functional>
 
+class PlainFile;
+
 class ORX_EXPORT WorkspaceFile {
  public:
   enum class Form {
@@ -26,6 +28,7 @@ class ORX_EXPORT WorkspaceFile {
 
   // By the first line that tells it, however far down it stands.
   static Form recognise(const QString& fileName);
+  static Form recognise(PlainFile& file);
   // Reads a file of any form with the reader's operation for it; of several versions the one with the
   // highest number. Throws WorkspaceLoaderException, also for a file of no known form.
   static void read(IXMLComponentReader& reader, const QString& fileName, QStringList& headerLines);
@@ -38,6 +41,8 @@ class ORX_EXPORT WorkspaceFile {
   // Takes up what surrounds the XML of an existing file, of the forms Workspace and PlainXml. Throws
   // WorkspaceLoaderException.
   explicit WorkspaceFile(const QString& fileName);
+  // Of a file that was opened, recognised, and split, which gave its header lines.
+  WorkspaceFile(PlainFile& file, Form form, const QStringList& headerLines);
 
   Form form() const { return m_form; }
   // The codec's name.
@@ -59,6 +64,7 @@ class ORX_EXPORT WorkspaceFile {
              QString& error) const;
 
  private:
+  void takeSurroundings(PlainFile& file);
   bool isWide() const;
   QByteArray encodedAscii(const QByteArray& ascii) const;
   QByteArray encodedHeader(QString& error) const;

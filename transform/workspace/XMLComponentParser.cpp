@@ -38,21 +38,18 @@ namespace {
 constexpr int kFirstBytes = 1024;
 const char* const kEmbeddedDocument = "#! <?xml version";
 
-QString withSupportSentence(const QString& message) {
-  return message + QLatin1String("\n\n") + documentText(messages::kContactSupport);
+QString supportSentence() {
+  return QLatin1String("\n\n") + documentText(messages::kContactSupport);
 }
 
 WorkspaceLoaderException placedError(const QString& message, int line, int column) {
-  return WorkspaceLoaderException(
-      withSupportSentence(
-          QStringLiteral("General workspace parse error around line %1 and column %2.\nError message is: %3")
-              .arg(QString::number(line), QString::number(column), message)),
-      line, column);
+  return WorkspaceLoaderException(messages::kParseErrorAt,
+                                  {QString::number(line), QString::number(column), message}, line, column,
+                                  supportSentence());
 }
 
 WorkspaceLoaderException generalError(const QString& message) {
-  return WorkspaceLoaderException(withSupportSentence(
-      QStringLiteral("General workspace parse error.\nError message is: '%1'").arg(message)));
+  return WorkspaceLoaderException(messages::kParseError, {message}, 0, 0, supportSentence());
 }
 
 class ThrowingHandler : public ErrorHandler {
@@ -127,11 +124,16 @@ void XMLComponentParser::ReadInput(const QString& fileName) {
   forgetDocument();
   QFile file(fileName);
   if (!file.open(QIODevice::ReadOnly))
-    throw WorkspaceLoaderException(couldNotOpenMessage(fileName));
+    throw WorkspaceLoaderException(messages::kFileNotOpened, {fileName});
+  parseWithMarkup(file, fileName);
+}
+
+void XMLComponentParser::parseWithMarkup(QIODevice& file, const QString& fileName) {
+  forgetDocument();
   if (!firstLineHasMarkup(file))
     return;
   if (!file.seek(0))
-    throw WorkspaceLoaderException(couldNotOpenMessage(fileName));
+    throw WorkspaceLoaderException(messages::kFileNotOpened, {fileName});
   parse(file, LineMap());
 }
 
@@ -152,7 +154,7 @@ void XMLComponentParser::StripAndReadInput(const QString& fileName, int linesToS
   {
     QFile file(fileName);
     if (!file.open(QIODevice::ReadOnly) || !version.open())
-      throw WorkspaceLoaderException(couldNotOpenMessage(fileName));
+      throw WorkspaceLoaderException(messages::kFileNotOpened, {fileName});
     FileLines lines(file);
     bool isFirst = true;
     while (lines.next()) {
@@ -222,6 +224,13 @@ QByteArray XMLComponentParser::captureEncoding(const QByteArray& firstBytes) {
   } catch (const XMLException&) {
   }
   QByteArray name = fromXml(m_parser->getEncodingName()).toLatin1();
+  // A name that the parser does not know is not reported.
+  if (name.isEmpty()) {
+    const char order = utf16ByteOrder(firstBytes);
+    const QTextCodec* const wide =
+        order ? QTextCodec::codecForName(order == 'L' ? "UTF-16LE" : "UTF-16BE") : nullptr;
+    name = declaredEncoding(wide ? wide->toUnicode(firstBytes).toLatin1() : firstBytes);
+  }
   m_parser->forget();
   m_parser->resetDocumentPool();
   return name;

@@ -56,6 +56,8 @@ class ORX_EXPORT XMLComponentParser : public virtual IXMLComponentParser {
   void splitAndParse(WorkspaceSplitter& splitter, QIODevice& input, const QString& fileName,
                      const QString& temporaryName);
   void forgetDocument();
+  // Parses a file of XML alone, if its first line holds any.
+  void parseWithMarkup(QIODevice& file, const QString& fileName);
 
   // Called with each new document, and when the last one is gone.
   virtual void documentParsed();

@@ -1,4 +1,5 @@
 #include <transform/files/TemporaryFile.h>
+#include <transform/text/MessageNumbers.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/VersionStore.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
@@ -55,11 +56,11 @@ QString XMLComponentReader::SplitWorkspace(const QString& fileName, QStringList&
   PlainFile plain(fileName, kTemporaryName);
   TemporaryFile xml(kTemporaryName);
   if (!xml.open())
-    throw WorkspaceLoaderException(couldNotOpenMessage(xml.fileTemplate()));
+    throw WorkspaceLoaderException(orx::messages::kFileNotOpened, {xml.fileTemplate()});
   WorkspaceSplitter splitter;
   splitter.split(plain.device(), xml, fileName);
   if (!xml.flush())
-    throw WorkspaceLoaderException(couldNotOpenMessage(xml.fileName()));
+    throw WorkspaceLoaderException(orx::messages::kFileNotOpened, {xml.fileName()});
   headerLines += splitter.headerLines();
   if (prompts)
     WorkspaceSplitter::collectPrompts(splitter.headerLines(), *prompts);
@@ -83,8 +84,17 @@ void XMLComponentReader::ReadInput(const IORXString& fileName) {
 void XMLComponentReader::ReadInput(const QString& fileName, QStringList& headerLines) {
   forgetDocument();
   PlainFile plain(fileName, kTemporaryName);
+  ReadOpenedInput(plain, fileName, false, headerLines);
+}
+
+void XMLComponentReader::ReadOpenedInput(PlainFile& file, const QString& fileName, bool isXmlAlone,
+                                         QStringList& headerLines) {
+  if (isXmlAlone) {
+    parseWithMarkup(file.rewound(), fileName);
+    return;
+  }
   WorkspaceSplitter splitter;
-  splitAndParse(splitter, plain.device(), fileName, kTemporaryName);
+  splitAndParse(splitter, file.rewound(), fileName, kTemporaryName);
   headerLines += splitter.headerLines();
   m_firstHeaderLine = splitter.firstHeaderLine();
 }

@@ -4,6 +4,7 @@
 #include <transform/workspace/IXMLComponentReader.h>
 #include <transform/workspace/XMLComponentParser.h>
 
+class PlainFile;
 class QIODevice;
 struct Word;
 
@@ -30,6 +31,8 @@ class ORX_EXPORT XMLComponentReader : public XMLComponentParser, public IXMLComp
   void ReadInput(const QString& fileName) override;
   void ReadInput(const IORXString& fileName) override;
   void ReadInput(const QString& fileName, QStringList& headerLines) override;
+  // The same of a file that was opened before, and known to be one of comment lines or of XML alone.
+  void ReadOpenedInput(PlainFile& file, const QString& fileName, bool isXmlAlone, QStringList& headerLines);
   void ReadVersionedInput(const QString& fileName, qint64 offset, qint64 length, bool withHeader,
                           QStringList& headerLines, QByteArray& before, QByteArray& behind) override;
 

@@ -250,11 +250,18 @@ void CustomDefinition::nameFlows(orx::Findings& diagnostics) {
       inner.addFlow(flow);
     }
   }
+  addCopiedFlows(
+      m_network, [this](const auto& node, const auto& port) { return flowAt(node, port); }, m_copied);
+  m_copied.nameRoutes(names);
   for (const SubDocNetworkObj* node : m_network.nodes()) {
     if (node->kind() == SubDocNetworkObj::Kind::Output || node->kind() == SubDocNetworkObj::Kind::Loop)
       inner.addFactory(node->name() + kCollectorName, node->line(), node->name());
     if (node->kind() != SubDocNetworkObj::Kind::Transformer)
       inner.addFlow(node->name());
+    for (const auto& [port, links] : node->consumers()) {
+      for (const CopiedFlows::Route& route : m_copied.routes(flowAt(*node, port)))
+        inner.addFlow(route.flow);
+    }
   }
   for (const QString& parameter : m_network.getParameters())
     inner.addParameter(parameter);
@@ -277,12 +284,21 @@ void CustomDefinition::makePart(const SubDocNetworkObjXformer& node) {
   m_parts.push_back(std::move(part));
 }
 
-QString CustomDefinition::flowFrom(const SubDocNetworkObj& node, const QString& port) const {
-  const auto* transformer = dynamic_cast<const SubDocNetworkObjXformer*>(&node);
-  // What enters by an input, and what a loop point sends back, arrives under the port's inner name.
-  if (!transformer)
-    return innerName(node.name());
-  return innerName(m_flows.value(&node).value(port));
+// What enters by an input, and what a loop point sends back, arrives under the port's inner name.
+QString CustomDefinition::flowAt(const SubDocNetworkObj& node, const QString& port) const {
+  return node.kind() == SubDocNetworkObj::Kind::Transformer ? m_flows.value(&node).value(port) : node.name();
+}
+
+QString CustomDefinition::flowAlong(const SubDocNetworkObj::Link& link, const SubDocNetworkObj& target,
+                                    const QString& port) const {
+  return innerName(m_copied.behind(flowAt(*link.node, link.port), copiesAlong(link, target, port)));
+}
+
+void CustomDefinition::writeCopies(MFBuffer& buffer, const QStringList& flows) const {
+  for (const QString& flow : flows) {
+    for (const CopiedFlows::Route& route : m_copied.routes(flow))
+      ::writeCopies(buffer, innerName(flow), innerName(route.flow), route.function);
+  }
 }
 
 void CustomDefinition::connect(Part& part) const {
@@ -290,7 +306,7 @@ void CustomDefinition::connect(Part& part) const {
     QSet<QString> flows;
     for (const SubDocNetworkObj::Link& link : links) {
       // A loop point may bear the name of an input: both are one flow then.
-      const QString flow = flowFrom(*link.node, link.port);
+      const QString flow = flowAlong(link, *part.node, port);
       if (!flows.contains(flow)) {
         flows.insert(flow);
         part.cfg->addInputFeatureType(port, flow);
@@ -298,14 +314,12 @@ void CustomDefinition::connect(Part& part) const {
     }
   }
   for (const auto& [port, links] : part.node->consumers()) {
-    if (!links.empty())
-      part.cfg->setOutputFeatureType(port, flowFrom(*part.node, port));
-  }
-  for (const auto& [port, copies] : part.node->attributeCopies()) {
-    QStringList functions;
-    for (const SubDocNetworkObj::AttributeCopy& copy : copies)
-      functions.append(copyAttributeFunction(copy.to, copy.from));
-    part.cfg->setOutputTagFuncs(port, functions);
+    if (links.empty())
+      continue;
+    const QString flow = flowAt(*part.node, port);
+    part.cfg->setOutputFeatureType(port, innerName(flow));
+    if (!m_copied.ownFunction(flow).isEmpty())
+      part.cfg->setOutputTagFuncs(port, QStringList(m_copied.ownFunction(flow)));
   }
 }
 
@@ -346,10 +360,13 @@ QByteArray CustomDefinition::makeBody(orx::Findings& diagnostics) {
       counted = text.size();
       return lines;
     };
+    writeCopies(buffer, m_network.getInputs() + m_network.getLoops());
     for (Part& part : m_parts) {
       part.firstLine = nextLine();
       if (!part.cfg->instantiate(buffer, m_network.getName()))
         diagnostics.report(Rule::NotWritten, part.node->line(), title(part), {part.cfg->getName()});
+      for (const auto& [port, links] : part.node->consumers())
+        writeCopies(buffer, {flowAt(*part.node, port)});
     }
     m_portsLine = nextLine();
     // What reaches an output leaves under the port's inner name; what reaches a loop point leaves by the
@@ -361,7 +378,7 @@ QByteArray CustomDefinition::makeBody(orx::Findings& diagnostics) {
       QStringList flows;
       for (const auto& [port, links] : node->feeders()) {
         for (const SubDocNetworkObj::Link& link : links)
-          flows.append(flowFrom(*link.node, link.port));
+          flows.append(flowAlong(link, *node, port));
       }
       if (flows.isEmpty())
         continue;

@@ -6,7 +6,9 @@
 #pragma once
 
 #include <transform/core/TransformerCfgListener.h>
+#include <transform/custom/SubDocNetworkObj.h>
 #include <transform/findings/Findings.h>
+#include <translation/generation/CopiedFlows.h>
 #include <translation/graph/InnerAttributes.h>
 
 #include <QByteArray>
@@ -20,7 +22,6 @@
 class ExternalDocNetwork;
 class MFBuffer;
 class WrittenCheck;
-class SubDocNetworkObj;
 class SubDocNetworkObjXformer;
 class TransformerCfg;
 
@@ -69,8 +70,12 @@ class CustomDefinition {
   void connect(Part& part) const;
   void check(const Part& part, orx::Findings& diagnostics) const;
   QString innerName(const QString& name) const;
-  // The flow that a link's end brings, or takes, at that node and port.
-  QString flowFrom(const SubDocNetworkObj& node, const QString& port) const;
+  // The flow at a port of that node, without the prefix.
+  QString flowAt(const SubDocNetworkObj& node, const QString& port) const;
+  // The flow that a link brings to a port of that node.
+  QString flowAlong(const SubDocNetworkObj::Link& link, const SubDocNetworkObj& target,
+                    const QString& port) const;
+  void writeCopies(MFBuffer& buffer, const QStringList& flows) const;
   QString title(const Part& part) const;
   QByteArray makeBody(orx::Findings& diagnostics);
   // The value of a copy's parameter, its references to published parameters led to the instance's macros.
@@ -83,6 +88,7 @@ class CustomDefinition {
   std::vector<const SubDocNetworkObjXformer*> m_order;
   std::vector<Part> m_parts;
   QHash<const SubDocNetworkObj*, QHash<QString, QString>> m_flows;  // of outputs that are connected, by port
+  CopiedFlows m_copied;
   bool m_isArranged = false;
   QByteArray m_body;
   int m_portsLine = 0;  // in the body, from 0: what leads to the outputs

@@ -93,14 +93,21 @@ bool MappingFileWriter::writeTransformers(MFBuffer& buffer, WrittenCheck* check,
       else
         check->skip();
     }
-    if (node.cfg->instantiate(buffer, m_workspace.fileName))
+    if (node.cfg->instantiate(buffer, m_workspace.fileName)) {
+      writeCopies(buffer, number);
       continue;
+    }
     m_findings.report(Rule::NotWritten, node.line, node.name, {node.name});
     isWritten = false;
   }
   if (check)
     check->skip();
   return isWritten;
+}
+
+void MappingFileWriter::writeCopies(MFBuffer& buffer, int node) const {
+  for (const auto& [flow, route] : m_connection.copiesFrom(node))
+    ::writeCopies(buffer, flow, route.flow, route.function);
 }
 
 void MappingFileWriter::writeParameters(MFBuffer& buffer, WrittenCheck* check) const {
@@ -143,13 +150,11 @@ void MappingFileWriter::writeFeatureTypes(MFBuffer& buffer, WrittenCheck* check)
   // Factories stand behind all types.
   for (int node = 0; node < static_cast<int>(m_workspace.nodes.size()); ++node) {
     const WorkspaceNode& place = m_workspace.nodes[at(node)];
-    const QString flow = m_connection.flowOfType(node);
-    if (!m_connection.flowBehindCopies(node).isEmpty()) {
-      if (check)
-        check->begin({WrittenPlace::Kind::Node, place.line, place.name});
-      writeRoute(buffer, place.keyword + QLatin1Char(' ') + place.name + kAttributeCopierName, {flow},
-                 m_connection.flowBehindCopies(node), m_connection.functionsOfType(node));
-    }
+    if (place.kind != WorkspaceNode::Kind::Reader)
+      continue;
+    if (check)
+      check->begin({WrittenPlace::Kind::Node, place.line, place.name});
+    writeCopies(buffer, node);
   }
 }
 

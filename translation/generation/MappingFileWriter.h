@@ -22,6 +22,7 @@ class MappingFileWriter {
 
  private:
   void writeHeader(MFBuffer& buffer, WrittenCheck* check) const;
+  void writeCopies(MFBuffer& buffer, int node) const;
   void writeParameters(MFBuffer& buffer, WrittenCheck* check) const;
   void writeFeatureTypes(MFBuffer& buffer, WrittenCheck* check) const;
   bool writeTransformers(MFBuffer& buffer, WrittenCheck* check, bool judgesAll);

@@ -1,4 +1,5 @@
 #include <platform/qorxcore/qorxcore.h>
+#include <transform/custom/AttributeCopies.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/TextHelpers.h>
@@ -23,6 +24,15 @@ void writeRoute(MFBuffer& buffer, const QString& factoryName, const QStringList&
   buffer.flush();
 }
 
-QString copyAttributeFunction(const QString& to, const QString& from) {
-  return QStringLiteral("@CopyAttribute(%1,%2)").arg(QORXWwjdEncode(to), QORXWwjdEncode(from));
+QString copyAttributesFunction(const AttributeCopies& copies) {
+  QStringList arguments;
+  for (const auto& [to, from] : copies.sources())
+    arguments << QORXWwjdEncode(to) << QORXWwjdEncode(from);
+  return arguments.isEmpty()
+             ? QString()
+             : QLatin1String("@CopyAttribute(") + arguments.join(QLatin1Char(',')) + QLatin1Char(')');
+}
+
+void writeCopies(MFBuffer& buffer, const QString& from, const QString& to, const QString& function) {
+  writeRoute(buffer, to + QLatin1String(" Attribute Copier"), {from}, to, {function});
 }

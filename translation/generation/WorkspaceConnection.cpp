@@ -3,7 +3,6 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/text/MappingFileKeywords.h>
 #include <translation/generation/FlowNames.h>
-#include <translation/generation/RouteStatement.h>
 #include <translation/generation/WorkspaceConnection.h>
 #include <translation/graph/FlowOrder.h>
 #include <translation/graph/InnerNames.h>
@@ -19,9 +18,6 @@ WorkspaceConnection::WorkspaceConnection(Workspace& workspace, orx::Findings& fi
     : m_workspace(workspace),
       m_findings(findings),
       m_flows(workspace.nodes.size()),
-      m_functions(workspace.nodes.size()),
-      m_copies(workspace.nodes.size()),
-      m_copiedFlows(workspace.nodes.size()),
       m_incoming(workspace.nodes.size()),
       m_isConnected(findOrder()) {
   if (!m_isConnected)
@@ -56,17 +52,6 @@ bool WorkspaceConnection::findOrder() {
 }
 
 void WorkspaceConnection::nameFlows() {
-  std::vector<QHash<QString, QSet<QString>>> copied(m_workspace.nodes.size());
-  for (const AttributeLink& link : m_workspace.attributeLinks) {
-    const QString function = copyAttributeFunction(link.to, link.from);
-    QSet<QString>& known = copied[at(link.source)][link.output];
-    if (known.contains(function))
-      continue;
-    known.insert(function);
-    m_functions[at(link.source)][link.output].append(function);
-    m_copies[at(link.source)][link.output].append(link.to);
-  }
-
   std::vector<QSet<QString>> connected(m_workspace.nodes.size());
   for (const WorkspaceLink& link : m_workspace.links)
     connected[at(link.source)].insert(link.output);
@@ -88,9 +73,7 @@ void WorkspaceConnection::nameFlows() {
   claimTypes(WorkspaceNode::Kind::Reader);
   for (int node = 0; node < count; ++node) {
     const WorkspaceNode& place = m_workspace.nodes[at(node)];
-    if (place.kind == WorkspaceNode::Kind::Reader && m_functions[at(node)].contains(QString())) {
-      m_copiedFlows[at(node)] = names.claim(m_flows[at(node)].value(QString()));
-    } else if (place.isTransformer()) {
+    if (place.isTransformer()) {
       QStringList tags;
       place.cfg->getOutputTags(tags);
       for (const QString& tag : tags) {
@@ -100,8 +83,12 @@ void WorkspaceConnection::nameFlows() {
       }
     }
     inner.addFlow(m_flows[at(node)].value(QString()));
-    inner.addFlow(m_copiedFlows[at(node)]);
   }
+  for (const WorkspaceLink& link : m_workspace.links)
+    m_copied.add(flowBeforeCopies(link), m_workspace.nodes[at(link.source)].isTransformer(), link.copies);
+  m_copied.nameRoutes(names);
+  for (const WorkspaceLink& link : m_workspace.links)
+    inner.addFlow(flowOf(link));
   addMembers(inner);
   inner.report(QString(), m_findings);
 }
@@ -130,12 +117,20 @@ void WorkspaceConnection::addMembers(InnerNames& inner) {
     inner.addParameter(parameter.name);
 }
 
-const QString& WorkspaceConnection::flowOf(const WorkspaceLink& link) const {
-  static const QString none;
-  if (!m_copiedFlows[at(link.source)].isEmpty())
-    return m_copiedFlows[at(link.source)];
-  const auto flow = m_flows[at(link.source)].constFind(link.output);
-  return flow == m_flows[at(link.source)].constEnd() ? none : flow.value();
+QString WorkspaceConnection::flowOf(const WorkspaceLink& link) const {
+  return m_copied.behind(flowBeforeCopies(link), link.copies);
+}
+
+std::vector<std::pair<QString, CopiedFlows::Route>> WorkspaceConnection::copiesFrom(int node) const {
+  QStringList tags = m_flows[at(node)].keys();
+  tags.sort();
+  std::vector<std::pair<QString, CopiedFlows::Route>> all;
+  for (const QString& tag : qAsConst(tags)) {
+    const QString flow = m_flows[at(node)].value(tag);
+    for (const CopiedFlows::Route& route : m_copied.routes(flow))
+      all.emplace_back(flow, route);
+  }
+  return all;
 }
 
 void WorkspaceConnection::connect() {
@@ -152,7 +147,8 @@ void WorkspaceConnection::connect() {
     const auto rank = [&](int number) {
       constexpr int last = std::numeric_limits<int>::max();
       const WorkspaceLink& link = m_workspace.links[at(number)];
-      const int byOrder = ranks.isEmpty() ? last : ranks.value(link.input).value(flowOf(link), last);
+      const int byOrder =
+          ranks.isEmpty() ? last : ranks.value(link.input).value(flowBeforeCopies(link), last);
       return std::make_pair(byOrder, link.executionIndex < 0 ? last : link.executionIndex);
     };
     std::stable_sort(m_incoming[target].begin(), m_incoming[target].end(),
@@ -163,10 +159,12 @@ void WorkspaceConnection::connect() {
       const WorkspaceLink& link = m_workspace.links[at(number)];
       node.cfg->addInputFeatureType(link.input, flowOf(link));
     }
-    for (auto flow = m_flows[target].cbegin(); flow != m_flows[target].cend(); ++flow)
+    for (auto flow = m_flows[target].cbegin(); flow != m_flows[target].cend(); ++flow) {
       node.cfg->setOutputFeatureType(flow.key(), flow.value());
-    for (auto functions = m_functions[target].cbegin(); functions != m_functions[target].cend(); ++functions)
-      node.cfg->setOutputTagFuncs(functions.key(), functions.value());
+      const QString function = m_copied.ownFunction(flow.value());
+      if (!function.isEmpty())
+        node.cfg->setOutputTagFuncs(flow.key(), QStringList(function));
+    }
   }
 }
 
@@ -178,19 +176,14 @@ void WorkspaceConnection::pushAttributes() {
     const auto found = known.constFind(link.output);
     if (found != known.constEnd())
       return found.value();
-    const WorkspaceNode& source = m_workspace.nodes[at(link.source)];
-    AttributeSet attributes = source.isTransformer() ? attribute_flow::leaving(*source.cfg, link.output)
-                                                     : AttributeSet(source.attributes);
-    attributes.add(source.exposed.value(link.output));
-    attributes.add(m_copies[at(link.source)].value(link.output));
-    return known.insert(link.output, attributes).value();
+    return known.insert(link.output, m_workspace.nodes[at(link.source)].leaving(link.output)).value();
   };
 
   for (const int target : m_order) {
     QHash<QString, AttributeSet> arriving;
     for (const int number : m_incoming[at(target)]) {
       const WorkspaceLink& link = m_workspace.links[at(number)];
-      arriving[link.input].add(attributesOf(link));
+      arriving[link.input].add(link.copies.applied(attributesOf(link)));
     }
     attribute_flow::enter(*m_workspace.nodes[at(target)].cfg, arriving);
   }

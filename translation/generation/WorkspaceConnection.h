@@ -3,12 +3,14 @@
 #pragma once
 
 #include <transform/findings/Findings.h>
+#include <translation/generation/CopiedFlows.h>
 #include <translation/graph/Workspace.h>
 
 #include <QHash>
 #include <QString>
 #include <QStringList>
 
+#include <utility>
 #include <vector>
 
 class FlowNames;
@@ -28,12 +30,11 @@ class WorkspaceConnection {
   const std::vector<int>& order() const { return m_order; }
   // The links that lead to a node, in the order of the sources.
   const std::vector<int>& incoming(int node) const { return m_incoming[at(node)]; }
-  // The flow of a feature type, and, of a reader with copied attributes, the one behind the copies.
   QString flowOfType(int node) const { return m_flows[at(node)].value(QString()); }
-  const QString& flowBehindCopies(int node) const { return m_copiedFlows[at(node)]; }
-  QStringList functionsOfType(int node) const { return m_functions[at(node)].value(QString()); }
-  // The flow that leaves a link's source through its port.
-  const QString& flowOf(const WorkspaceLink& link) const;
+  // The flow under which a link's features arrive.
+  QString flowOf(const WorkspaceLink& link) const;
+  // From the flows of a node on, the first of a pair, to those behind copied attributes.
+  std::vector<std::pair<QString, CopiedFlows::Route>> copiesFrom(int node) const;
 
  private:
   static std::size_t at(int number) { return static_cast<std::size_t>(number); }
@@ -43,14 +44,15 @@ class WorkspaceConnection {
   void nameFlows();
   void connect();
   void pushAttributes();
+  QString flowBeforeCopies(const WorkspaceLink& link) const {
+    return m_flows[at(link.source)].value(link.output);
+  }
 
   Workspace& m_workspace;
   orx::Findings& m_findings;
   std::vector<int> m_order;
-  std::vector<QHash<QString, QString>> m_flows;          // per node: output tag to flow; "" for feature types
-  std::vector<QHash<QString, QStringList>> m_functions;  // per node: output tag to output functions
-  std::vector<QHash<QString, QStringList>> m_copies;  // per node: output tag to attributes that functions add
-  std::vector<QString> m_copiedFlows;
+  std::vector<QHash<QString, QString>> m_flows;  // per node: output tag to flow; "" for feature types
+  CopiedFlows m_copied;
   std::vector<std::vector<int>> m_incoming;
   bool m_isConnected;
 };

@@ -59,7 +59,8 @@ InnerAttributes::ByPort InnerAttributes::collect(const SubDocNetworkObj& node) {
   for (const auto& [port, links] : node.feeders()) {
     AttributeSet& attributes = collected[port];
     for (const SubDocNetworkObj::Link& link : links)
-      attributes.add(leaving(*link.node, link.port));
+      attributes.add(
+          link.node->attributeCopies(link.port, node, port).applied(leaving(*link.node, link.port)));
   }
   return collected;
 }
@@ -78,5 +79,5 @@ const AttributeSet& InnerAttributes::leaving(const SubDocNetworkObj& node, const
     attributes = m_entering.value(node.name());
     attributes.add(m_returning.value(node.name()));
   }
-  return *m_leaving.insert(key, node.withCopies(port, attributes));
+  return *m_leaving.insert(key, attributes);
 }

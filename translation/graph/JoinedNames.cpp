@@ -4,6 +4,8 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/MappingFileKeywords.h>
+
+#include <translation/generation/CopiedFlows.h>
 #include <translation/generation/FlowNames.h>
 #include <translation/graph/JoinedNames.h>
 
@@ -130,12 +132,26 @@ void JoinedNames::addFlows(CompoundTransformerNetwork& network, Inside& inside) 
     for (const QString& name : flows.fixedNames(cfg, node.name()))
       inside.names.insert(flows.claim(name));
   });
+  QHash<const SubDocNetworkObj*, QHash<QString, QString>> named;
   eachTransformer([&](const SubDocNetworkObjXformer& node, const TransformerCfg& cfg) {
     for (const auto& [port, links] : node.consumers()) {
       if (!links.empty())
-        inside.names.insert(flows.claim(outputFlowName(cfg, node.name(), port)));
+        named[&node].insert(port,
+                            *inside.names.insert(flows.claim(outputFlowName(cfg, node.name(), port))).first);
     }
   });
+  const auto flowAt = [&](const SubDocNetworkObj& node, const QString& port) {
+    return node.kind() == SubDocNetworkObj::Kind::Transformer ? named.value(&node).value(port) : node.name();
+  };
+  CopiedFlows copied;
+  addCopiedFlows(network, flowAt, copied);
+  copied.nameRoutes(flows);
+  for (const SubDocNetworkObj* node : network.nodes()) {
+    for (const auto& [port, links] : node->consumers()) {
+      for (const CopiedFlows::Route& route : copied.routes(flowAt(*node, port)))
+        inside.names.insert(route.flow);
+    }
+  }
 }
 
 bool JoinedNames::holds(CompoundTransformerNetwork* network, const QString& name) {

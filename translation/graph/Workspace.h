@@ -4,6 +4,7 @@
 // each in document order.
 #pragma once
 
+#include <transform/custom/AttributeCopies.h>
 #include <transform/workspace/ParameterLines.h>
 #include <translation/GlobalParameters.h>
 #include <translation/graph/WorkspaceListener.h>
@@ -31,6 +32,7 @@ struct WorkspaceNode {
   // Feature types.
   QString keyword;  // of the dataset
   QStringList attributes;
+  bool hasFixedAttributes = false;  // a writer's, which takes no others
 
   // Transformers.
   std::unique_ptr<TransformerCfg> cfg;
@@ -44,6 +46,8 @@ struct WorkspaceNode {
   bool lacksOutputLink = false;
 
   bool isTransformer() const { return kind == Kind::Transformer; }
+  // The attributes that leave an output, in so far as it is known what arrives.
+  AttributeSet leaving(const QString& output) const;
 };
 
 struct WorkspaceLink {
@@ -53,14 +57,16 @@ struct WorkspaceLink {
   QString input;
   int executionIndex = -1;
   int line = 0;
+  AttributeCopies copies;
 };
 
-// An attribute of an output that goes on under another name.
+// An attribute that goes on along a link, mostly under another name.
 struct AttributeLink {
-  int source = -1;
-  QString output;
+  std::size_t link = 0;
   QString from;
   QString to;
+  int identifier = -1;
+  int line = 0;
 };
 
 class Workspace {

@@ -63,19 +63,16 @@ void WorkspaceBuilder::addGlobalParameters(const IXMLComponentReader& reader) {
     statement.clear();
   }
   parameters.readHeaderLine(statement, lineNumber - 1);
-  QHash<QString, int> linesByName;
   for (const GlobalParameterStruct& record : reader.GetGlobalParameterList(QString())) {
-    const QString name = GUIType::fromGuiLine(record.guiLine).getName();
-    if (name.isEmpty()) {
-      m_diagnostics.report(Rule::BadPromptLine, record.line, QString(), {record.guiLine});
+    const QString name = m_binding->promptOf(record).getName();
+    if (name.isEmpty())
       continue;
-    }
-    const auto earlier = linesByName.constFind(name);
-    if (earlier != linesByName.constEnd())
-      m_diagnostics.report(Rule::RepeatedDeclaration, record.line, QString(),
-                           {name, QString::number(*earlier)});
-    linesByName.insert(name, record.line);
     parameters.declare(name, record.defaultValue, record.line, record.guiLine);
+    const GlobalParameters::Parameter& known = *parameters.find(name);
+    if (known.setInHeader && known.language == ScriptLanguage::None &&
+        known.value != parameters.asStated(record.guiLine, record.defaultValue))
+      m_diagnostics.reportAs(Rule::RepeatedDeclaration, messages::kContradictingParameter, record.line,
+                             QString(), {name, QString::number(known.line)});
   }
   QStringList names = m_parameterValues.keys();
   names.sort();
@@ -123,6 +120,7 @@ void WorkspaceBuilder::addFeatureType(const FeatureTypeStruct& record) {
   node.keyword = record.keyword;
   for (const FeatAttributeStruct& attribute : record.attributes)
     node.attributes.append(attribute.attrName);
+  node.hasFixedAttributes = !record.isSource && !record.attributes.isEmpty() && !record.dynamicSchema;
   DocumentBinding::Place place;
   place.node = static_cast<int>(m_workspace->nodes.size());
   place.line = record.line;
@@ -181,8 +179,10 @@ WorkspaceNode* WorkspaceBuilder::nodeAt(int identifier) {
 
 void WorkspaceBuilder::addLink(const LinkStruct& record) {
   if (const auto flow = m_binding->flow(record)) {
+    if (flow->isRepeated)
+      return;
     m_workspace->links.push_back({flow->source->node, flow->target->node, flow->output, flow->input,
-                                  record.executionIdx, record.line});
+                                  record.executionIdx, record.line, AttributeCopies()});
     return;
   }
   if (WorkspaceNode* const source = nodeAt(record.sourceNode))
@@ -192,6 +192,10 @@ void WorkspaceBuilder::addLink(const LinkStruct& record) {
 }
 
 void WorkspaceBuilder::addAttributeLink(const LinkStruct& record) {
-  if (const auto copy = m_binding->attributeCopy(record))
-    m_workspace->attributeLinks.push_back({copy->source->node, copy->output, copy->from, copy->to});
+  const auto copy = m_binding->attributeCopy(record);
+  if (!copy)
+    return;
+  m_workspace->attributeLinks.push_back({copy->flow, copy->from, copy->to, record.identifier, record.line});
+  if (copy->from != copy->to)
+    m_workspace->links[copy->flow].copies.add(copy->from, copy->to);
 }

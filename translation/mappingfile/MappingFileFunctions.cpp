@@ -112,19 +112,24 @@ void MappingFileFunctions::checkCall(const QStringRef& name, int begin, int end)
     if (m_text.midRef(inside, end - 1 - inside).trimmed().isEmpty())
       reportCall(begin, end, "@Value(ATTRIBUTE)");
   } else if (name == kCopyAttribute) {
-    if (hasTwoArguments(inside, end - 1))
+    if (hasPairs(inside, end - 1))
       checkEncodedList(inside, end - 1);
     else
-      reportCall(begin, end, "@CopyAttribute(NEW,OLD)");
+      reportCall(begin, end, "@CopyAttribute(NEW,OLD,NEW,OLD...)");
   } else if (!checkExpression(inside, end - 1)) {
     reportCall(begin, end, kExpressionForm);
   }
 }
 
-// Whether two arguments stand there, none of them empty.
-bool MappingFileFunctions::hasTwoArguments(int begin, int end) const {
-  const int comma = find(QLatin1Char(','), begin, end);
-  return comma > begin && comma + 1 < end && find(QLatin1Char(','), comma + 1, end) < 0;
+// Whether pairs of arguments stand there, none of them empty.
+bool MappingFileFunctions::hasPairs(int begin, int end) const {
+  int count = 0;
+  for (int comma = begin; comma >= 0; begin = comma + 1, ++count) {
+    comma = find(QLatin1Char(','), begin, end);
+    if ((comma < 0 ? end : comma) == begin)
+      return false;
+  }
+  return count % 2 == 0;
 }
 
 // [FDIV,]TYPE,NAME,BODY

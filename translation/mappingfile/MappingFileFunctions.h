@@ -27,7 +27,7 @@ class MappingFileFunctions {
  private:
   void checkCalls(int begin, int end);
   void checkCall(const QStringRef& name, int begin, int end);
-  bool hasTwoArguments(int begin, int end) const;
+  bool hasPairs(int begin, int end) const;
   bool checkExpression(int begin, int end);
   bool checkExpressionText(int begin, int end);
   void checkCharacterNames(int begin, int end);

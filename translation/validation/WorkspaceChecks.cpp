@@ -1,3 +1,4 @@
+#include <platform/orxutil/Decipher.h>
 #include <transform/core/TransformParamCfg.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerDefinition.h>
@@ -101,6 +102,25 @@ void WorkspaceChecks::checkTransformers(const Workspace& workspace, bool isConne
     fit_checks::checkInside(*node.cfg, node.line, node.name, m_diagnostics);
     checkAge(*node.cfg, node.line, node.name, m_diagnostics);
   }
+  if (isConnected)
+    checkAttributeLinks(workspace, flow);
+}
+
+void WorkspaceChecks::checkAttributeLinks(const Workspace& workspace, const FlowChecks& flow) {
+  for (const AttributeLink& link : workspace.attributeLinks) {
+    const WorkspaceLink& along = workspace.links[link.link];
+    const WorkspaceNode& source = workspace.nodes[static_cast<std::size_t>(along.source)];
+    const WorkspaceNode& target = workspace.nodes[static_cast<std::size_t>(along.target)];
+    const auto report = [&](long message, const WorkspaceNode& node, const QString& name) {
+      m_diagnostics.reportAs(Rule::MissingAttribute, message, link.line, node.name,
+                             {QString::number(link.identifier), name});
+    };
+    if ((!source.isTransformer() || flow.knowsWhatArrives(along.source)) &&
+        !source.leaving(along.output).holds(link.from))
+      report(messages::kLinkedAttributeMissing, source, link.from);
+    if (target.hasFixedAttributes && !AttributeSet(target.attributes).holds(link.to))
+      report(messages::kLinkedAttributeUnlisted, target, link.to);
+  }
 }
 
 void WorkspaceChecks::checkInside(const ExternalDocNetwork& network, const Workspace& workspace,
@@ -144,11 +164,28 @@ void WorkspaceChecks::checkLinked(const ExternalTransformerNetwork& linked, cons
   for (const orx::Finding& finding : found.all())
     m_diagnostics.add(finding);
   // An engine runs the statements of the file, not its document; several versions may stand in one.
+  const QStringList& statements = linked.definitionLines();
+  const bool saysNothing = std::all_of(statements.begin(), statements.end(), [](const QString& line) {
+    return line.trimmed().isEmpty() || line.startsWith(QLatin1Char('#'));
+  });
+  const bool doesSomething =
+      std::any_of(linked.nodes().begin(), linked.nodes().end(),
+                  [](const SubDocNetworkObj* node) { return !node->feeders().empty(); });
+  // What is enciphered is read by engines that can decipher it.
+  const bool isPlain = !ORW_hasDecipherRoutine();
+  if (isPlain && saysNothing && doesSomething) {
+    orx::Findings inFile(linked.getFileName());
+    inFile.reportAs(Rule::CustomTransformerFault, messages::kEmptyDefinition, linked.getStartLine(),
+                    linked.getName(), {linked.getName(), QString::number(linked.getVersion())});
+    m_diagnostics.add(inFile.all().front());
+  }
   if (m_lintedFiles.contains(linked.getFileName()))
     return;
   m_lintedFiles.insert(linked.getFileName());
-  for (const orx::Finding& finding :
-       lintMappingFile(linked.getFileName(), linked.getFileName(), {}).findings) {
+  for (orx::Finding finding : lintMappingFile(linked.getFileName(), linked.getFileName(), {}).findings) {
+    // No engine knows such a line, and here nobody else reads it.
+    if (isPlain && finding.rule == Rule::UnknownStatement)
+      finding.rule = Rule::CustomTransformerFault;
     if (m_settings.severity(finding.rule) == orx::Severity::Error)
       m_diagnostics.add(finding);
   }

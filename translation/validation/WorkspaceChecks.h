@@ -12,6 +12,7 @@
 
 class ExternalDocNetwork;
 class ExternalTransformerNetwork;
+class FlowChecks;
 class GUIType;
 class GlobalParameters;
 class IXMLComponentReader;
@@ -38,6 +39,7 @@ class WorkspaceChecks {
  private:
   void checkBuild();
   void checkTransformers(const Workspace& workspace, bool isConnected);
+  void checkAttributeLinks(const Workspace& workspace, const FlowChecks& flow);
   void checkParameters(Workspace& workspace);
   // Where findings about one file go, and the checks that report there.
   struct Place {

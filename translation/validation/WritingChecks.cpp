@@ -9,6 +9,7 @@
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/ExternalTransformerNetwork.h>
 #include <transform/custom/NestedNetworks.h>
+#include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/findings/Refusal.h>
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/text/GlobalMacros.h>
@@ -19,6 +20,7 @@
 #include <transform/text/TextHelpers.h>
 #include <transform/text/TextPlaces.h>
 #include <translation/graph/InnerNames.h>
+#include <translation/graph/InstanceIdentity.h>
 #include <translation/validation/WritingChecks.h>
 
 #include <algorithm>
@@ -126,6 +128,33 @@ void WritingChecks::checkParameterName(const GlobalParameters::Parameter& parame
                         {parameter.name});
 }
 
+// The macro that holds a choice which was looked up begins with the identity of its node.
+void WritingChecks::checkLookupMacros() {
+  struct Owner {
+    const TransformerCfg* cfg;
+    QString title;
+  };
+  QHash<QString, Owner> owners;
+  for (const WorkspaceNode& node : m_workspace.nodes) {
+    if (node.isTransformer())
+      owners.insert(node.cfg->getBaseGuid(), {node.cfg.get(), node.name});
+  }
+  for (const ExternalDocNetwork* network : m_workspace.customTransformers()) {
+    for (const SubDocNetworkObj* object : network->nodes()) {
+      if (const auto* node = dynamic_cast<const SubDocNetworkObjXformer*>(object))
+        owners.insert(instanceStem({network->getName()}, node->number(), node->name()),
+                      {node->getTransformer(), network->getName() + QLatin1Char('/') + node->name()});
+    }
+  }
+  const int length = owners.isEmpty() ? 0 : owners.constBegin().key().size();
+  for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
+    const auto owner = owners.constFind(parameter.name.left(length));
+    if (owner != owners.constEnd() && owner->cfg->getParameterByMacroName(parameter.name.mid(length)))
+      m_findings.reportAs(Rule::TakenName, messages::kTakenByLookup, parameter.line, QString(),
+                          {parameter.name, owner->title});
+  }
+}
+
 void WritingChecks::checkPrefixMacros() {
   std::vector<const CompoundTransformerNetwork*> networks;
   for (const ExternalDocNetwork* network : m_workspace.customTransformers())
@@ -141,13 +170,13 @@ void WritingChecks::checkPrefixMacros() {
   }
 }
 
-void WritingChecks::checkType(const WorkspaceNode& node, bool isCopying) {
+void WritingChecks::checkType(const WorkspaceNode& node) {
   checkWord(node.name, node.line, node.name);
   checkWord(node.keyword, node.line, node.name);
-  // A reader's flows may be named apart; what stands before a writer, or copies attributes, bears one name.
-  if (node.kind == WorkspaceNode::Kind::Reader && !isCopying)
+  // A reader's flows are named apart; what stands before a writer bears its name.
+  if (node.kind == WorkspaceNode::Kind::Reader)
     return;
-  const auto type = qMakePair(static_cast<int>(node.kind), qMakePair(node.keyword, node.name));
+  const auto type = qMakePair(node.keyword, node.name);
   if (m_types.contains(type))
     m_findings.reportAs(Rule::TakenName, messages::kTypeTwice, node.line, node.name,
                         {node.name, node.keyword});
@@ -156,6 +185,7 @@ void WritingChecks::checkType(const WorkspaceNode& node, bool isCopying) {
 
 void WritingChecks::checkParameters() {
   checkPrefixMacros();
+  checkLookupMacros();
   for (const GlobalParameters::Parameter& parameter : m_workspace.parameters.all()) {
     checkParameterName(parameter);
     if (parameter.isPublished)
@@ -181,16 +211,16 @@ void WritingChecks::checkParameters() {
 
 void WritingChecks::check() {
   checkParameters();
-  QSet<int> copying;
   for (const AttributeLink& link : m_workspace.attributeLinks)
-    copying.insert(link.source);
+    checkNoReference(link.to, link.line,
+                     m_workspace.nodes[static_cast<std::size_t>(m_workspace.links[link.link].target)].name);
   for (std::size_t number = 0; number < m_workspace.nodes.size(); ++number) {
     const WorkspaceNode& node = m_workspace.nodes[number];
     checkAttributes(node);
     if (node.isTransformer())
       checkTransformer(node);
     else
-      checkType(node, copying.contains(static_cast<int>(number)));
+      checkType(node);
   }
 }
 
@@ -213,6 +243,10 @@ void WritingChecks::checkTransformer(const WorkspaceNode& node) {
     m_checked.insert(custom->getNetwork());
     nestingFault = findPrefixFault(*custom->getNetwork());
   }
+  const QString levelFault = nestingFault.isEmpty() ? m_levels.refuse(*node.cfg) : QString();
+  if (!levelFault.isEmpty())
+    m_findings.reportText(Rule::UnwritableValue, node.line, node.name, levelFault,
+                          messages::kNoParallelLevel);
   if (!nestingFault.isEmpty())
     m_findings.reportText(Rule::Nesting, node.line, node.name, nestingFault, nesting.refusal().message);
   for (const QString& fault : custom ? custom->findUnwritablePorts() : QStringList())

@@ -4,6 +4,7 @@
 
 #include <transform/findings/Findings.h>
 #include <translation/graph/Workspace.h>
+#include <translation/validation/InnerLevels.h>
 
 #include <QSet>
 #include <QString>
@@ -23,7 +24,8 @@ class WritingChecks {
   void checkParameters();
   void checkParameterName(const GlobalParameters::Parameter& parameter);
   void checkPrefixMacros();
-  void checkType(const WorkspaceNode& node, bool isCopying);
+  void checkLookupMacros();
+  void checkType(const WorkspaceNode& node);
   QString refuseScript(const GlobalParameters::Parameter& parameter) const;
   void checkChoices(const GlobalParameters::Parameter& parameter);
   void checkParameter(const GlobalParameters::Parameter& parameter, const QString& value);
@@ -36,7 +38,8 @@ class WritingChecks {
 
   const Workspace& m_workspace;
   orx::Findings& m_findings;
+  InnerLevels m_levels;
   QSet<const CompoundTransformerNetwork*> m_checked;
-  QSet<QPair<int, QPair<QString, QString>>> m_types;  // kind, keyword and name of those that were checked
-  QSet<const ConfiguredDefinition*> m_sound;          // whose template needs no second look
+  QSet<QPair<QString, QString>> m_types;      // keyword and name of the writers that were checked
+  QSet<const ConfiguredDefinition*> m_sound;  // whose template needs no second look
 };

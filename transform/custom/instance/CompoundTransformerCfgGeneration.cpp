@@ -10,6 +10,7 @@
 #include <transform/core/ValueReferences.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
+#include <transform/custom/FlowGraph.h>
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/ScriptParameters.h>
 #include <transform/custom/instance/CustomTransformerStatement.h>
@@ -85,6 +86,35 @@ carried_references::Known knownTo(const TransformerCfg& instance, bool meansOwn)
                        ? carried_references::spellingOf(instance.getParameterGUIType(name))
                        : around.spellingOf(name);
           }};
+}
+
+// Those of an instance that mean each other, so that an engine would never have done with them.
+QStringList parametersInCircles(const TransformerCfg& instance) {
+  const QStringList names = instance.getParameters();
+  QHash<QString, int> numbers;
+  for (const QString& name : names)
+    numbers.insert(name, numbers.size());
+  std::vector<std::pair<int, int>> edges;
+  std::vector<int> roots;
+  for (const QString& name : names) {
+    const TransformParamCfg* record = instance.getParameterByMacroName(name);
+    if (!record || !record->getFlag(kGUITypeInstanceMacros))
+      continue;
+    roots.push_back(numbers.value(name));
+    anyParameterReference(MFBuffer::withOrdinaryMacros(instance.getParameterValue(name)),
+                          [&](const QString& other) {
+                            const auto number = numbers.constFind(other);
+                            if (number != numbers.constEnd())
+                              edges.emplace_back(numbers.value(name), number.value());
+                            return false;
+                          });
+  }
+  QStringList found;
+  FlowGraph(static_cast<std::size_t>(names.size()), edges).walk(roots, [&](const FlowGraph::Group& group) {
+    for (const int* at = group.begin; group.isCycle && at != group.end; ++at)
+      found.append(names.at(*at));
+  });
+  return found;
 }
 
 bool isIterationCount(const QString& value) {
@@ -284,6 +314,10 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
     if (!message.isEmpty())
       messages.insert(parameter, message);
     before.insert(parameter);
+  }
+  for (const QString& parameter : parametersInCircles(*this)) {
+    if (!messages.contains(parameter))
+      messages.insert(parameter, TransformResString(messages::kGrowsWithoutEnd));
   }
   return messages;
 }

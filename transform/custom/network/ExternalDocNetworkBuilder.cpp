@@ -107,7 +107,8 @@ void ExternalDocNetwork::Builder::addTransformer(const TransformerStruct& record
 
 void ExternalDocNetwork::Builder::addLink(const LinkStruct& record) {
   if (const auto flow = m_binding.flow(record)) {
-    m_network.addLink(record.sourceNode, flow->output, record.targetNode, flow->input);
+    if (!flow->isRepeated)
+      m_network.addLink(record.sourceNode, flow->output, record.targetNode, flow->input);
     return;
   }
   if (SubDocNetworkObj* source = m_network.nodeByNumber(record.sourceNode))
@@ -117,8 +118,12 @@ void ExternalDocNetwork::Builder::addLink(const LinkStruct& record) {
 }
 
 void ExternalDocNetwork::Builder::addAttributeLink(const LinkStruct& record) {
-  if (const auto copy = m_binding.attributeCopy(record))
-    m_network.nodeByNumber(record.sourceNode)->addAttributeCopy(copy->output, copy->from, copy->to);
+  const auto copy = m_binding.attributeCopy(record);
+  if (copy && copy->from != copy->to) {
+    m_network.nodeByNumber(record.sourceNode)
+        ->addAttributeCopy(copy->output, *m_network.nodeByNumber(record.targetNode), copy->input, copy->from,
+                           copy->to);
+  }
 }
 
 // Features come back at the first loop point alone, and only where the whole is repeated.
@@ -151,11 +156,9 @@ void ExternalDocNetwork::Builder::checkLoops() {
 
 void ExternalDocNetwork::Builder::addParameters() {
   for (const GlobalParameterStruct& record : m_reader.GetGlobalParameterList(m_document)) {
-    const GUIType type = GUIType::fromGuiLine(record.guiLine);
-    if (type.getName().isEmpty()) {
-      m_findings.report(Rule::BadPromptLine, record.line, QString(), {record.guiLine});
+    const GUIType type = m_binding.promptOf(record);
+    if (type.isNull())
       continue;
-    }
     m_network.addPublishedParameter(type, type.getName());
     m_network.addPublishedParameter(type.getName(), record.defaultValue);
   }

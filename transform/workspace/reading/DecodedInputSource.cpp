@@ -14,12 +14,6 @@ using XERCES_CPP_NAMESPACE::XMLUni;
 constexpr int kChunk = 64 * 1024;
 constexpr ushort kByteOrderMark = 0xfeff;
 
-// Codecs that can hold every character; only these may produce U+FFFD from bytes that really mean it.
-bool isUnicodeCodec(const QTextCodec& codec) {
-  const QByteArray name = codec.name().toUpper();
-  return name.startsWith("UTF-") || name.startsWith("GB18030") || name.startsWith("ISO-10646");
-}
-
 class DecodedStream : public BinInputStream {
  public:
   DecodedStream(QIODevice& device, const QTextCodec& codec, DocumentGuard& guard)
@@ -81,6 +75,11 @@ class DecodedStream : public BinInputStream {
 };
 
 }  // namespace
+
+bool isUnicodeCodec(const QTextCodec& codec) {
+  const QByteArray name = codec.name().toUpper();
+  return name.startsWith("UTF-") || name.startsWith("GB18030") || name.startsWith("ISO-10646");
+}
 
 DecodedInputSource::DecodedInputSource(QIODevice& device, const QTextCodec& codec, DocumentGuard& guard)
     : m_device(device), m_codec(codec), m_guard(guard) {

@@ -32,3 +32,6 @@ QTextCodec* documentCodec(const QByteArray& firstBytes, const QByteArray& declar
 
 // 'L' or 'B' for bytes of UTF-16 in that byte order, 0 for all else.
 char utf16ByteOrder(const QByteArray& firstBytes);
+
+// Whether it can hold every character; only such a codec may produce U+FFFD from bytes that really mean it.
+bool isUnicodeCodec(const QTextCodec& codec);

@@ -3,13 +3,15 @@
 #include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/reading/DecodedInputSource.h>
 #include <transform/workspace/reading/DocumentLimits.h>
-#include <transform/workspace/reading/DocumentMessages.h>
 #include <transform/workspace/reading/FileLines.h>
 #include <transform/workspace/reading/WorkspaceSplitter.h>
 
 #include <QRegularExpression>
 #include <QTextCodec>
+
+#include <algorithm>
 
 namespace messages = orx::messages;
 
@@ -22,17 +24,21 @@ namespace {
 constexpr int kDeclarationLength = 1024;
 
 [[noreturn]] void fail(long message, const QString& fileName) {
-  throw WorkspaceLoaderException(documentText(message, {fileName}));
+  throw WorkspaceLoaderException(message, {fileName});
+}
+
+// False when the bytes are no text in that encoding.
+bool decode(const QTextCodec& codec, const QByteArray& line, QString& text) {
+  QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
+  text = codec.toUnicode(line.constData(), line.size(), &state);
+  return state.invalidChars == 0 && state.remainingChars == 0 &&
+         (isUnicodeCodec(codec) || !text.contains(QChar::ReplacementCharacter));
 }
 
 bool isValid(const QTextCodec& codec, const QList<QByteArray>& lines) {
-  for (const QByteArray& line : lines) {
-    QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
-    codec.toUnicode(line.constData(), line.size(), &state);
-    if (state.invalidChars > 0 || state.remainingChars > 0)
-      return false;
-  }
-  return true;
+  QString text;
+  return std::all_of(lines.begin(), lines.end(),
+                     [&](const QByteArray& line) { return decode(codec, line, text); });
 }
 
 }  // namespace
@@ -113,9 +119,8 @@ void WorkspaceSplitter::readHeader(FileLines& lines) {
     }
     QByteArray& line = m_rawHeader.last();
     if (line.size() / lines.unitSize() > limits::kValueLength) {
-      throw WorkspaceLoaderException(
-          documentText(messages::kHeaderLineTooLong, {QString::number(limits::kValueLength)}),
-          m_firstLine + lines.lineNumber() - 1);
+      throw WorkspaceLoaderException(messages::kHeaderLineTooLong, {QString::number(limits::kValueLength)},
+                                     m_firstLine + lines.lineNumber() - 1);
     }
     if (lines.endsLine()) {
       if (line.endsWith(lineEnd))
@@ -138,8 +143,12 @@ void WorkspaceSplitter::decodeHeader(const FileLines& lines) {
     }
   }
   for (const QByteArray& line : qAsConst(m_rawHeader)) {
-    QTextCodec::ConverterState state(QTextCodec::IgnoreHeader);
-    m_headerLines.append(codec->toUnicode(line.constData(), line.size(), &state));
+    QString text;
+    if (!decode(*codec, line, text)) {
+      throw WorkspaceLoaderException(messages::kHeaderNotText, {QString::fromLatin1(codec->name())},
+                                     m_firstHeaderLine + m_headerLines.size());
+    }
+    m_headerLines.append(text);
   }
   m_rawHeader.clear();
 }
