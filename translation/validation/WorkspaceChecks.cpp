@@ -184,7 +184,7 @@ void WorkspaceChecks::checkLinked(const ExternalTransformerNetwork& linked, cons
   m_lintedFiles.insert(linked.getFileName());
   for (orx::Finding finding : lintMappingFile(linked.getFileName(), linked.getFileName(), {}).findings) {
     // No engine knows such a line, and here nobody else reads it.
-    if (isPlain && finding.rule == Rule::UnknownStatement)
+    if (isPlain && (finding.rule == Rule::UnknownStatement || finding.rule == Rule::MisspeltStatement))
       finding.rule = Rule::CustomTransformerFault;
     if (m_settings.severity(finding.rule) == orx::Severity::Error)
       m_diagnostics.add(finding);
