@@ -76,7 +76,7 @@ int main(int argc, char** argv) {
   try {
     return runCommandLine(argc, argv);
   } catch (const std::exception& error) {
-    Console().fail(QString::fromLocal8Bit(error.what()));
+    Console().fail(messages::kUnexpectedEnd, {QString::fromLocal8Bit(error.what())});
     return kExitFile;
   }
 }

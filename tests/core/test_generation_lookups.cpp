@@ -350,6 +350,13 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", members, "A,x,B,y,A,x"}, "K $(A)", kPartTwice, {"A"}},
       {{"P", members, "A,x,B,y,ORX_CONTROLLER_QUERY_FILE,z"}, "K $(A)", 0},
       {{"P", members, "ORX_CONDITIONAL:1;A<comma>x<comma>B<comma>y"}, "K $(A)", kConditionForParts},
+      {{"P", members, "A,<Unused>,B,y"}, "K $(A)", kPartNeeded, {"a"}},
+      {{"P", table, "a;b;c"}, "K $(P)", kRowBreaksOff, {"2", "a", "a, b"}},
+      {{"P", table, "a;b;c;<Unused>"}, "K $(P)", kCellNeeded, {"2", "b"}},
+      {{"P", table, "ORX_CONDITIONAL:1;a<semicolon>b;c"}, "K $(P)", kRowBreaksOff, {"1", "a", "a, b"}},
+      {{"P", "TEXT", "<Unused>", "Prompt"}, "K", kValueNeeded},
+      {{"P", "OMITTABLE TEXT", "<Unused>", "Prompt"}, "K $(P)", 0},
+      {{"P", "OPTIONAL TEXT", "<Unused>"}, "K $(P)", 0},
       // What the listener knows.
       {{"P", "TEXT_OR_ATTR", "$(Gabc)@Value(a)"}, "K $(P)", 0},
       {{"P", "TEXT_OR_ATTR", "$(Ga,b)@Value(a)"}, "K $(P)", kReferenceBreaks},
@@ -361,7 +368,7 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", "TEXT", "$(Ga,b)"}, "K $(P)", 0},
       {{"P", "TEXT", "$(G@Value[a])"}, "K $(P)", 0},
       {{"P", table, "$(Ga,b);x"}, "K $(P)", 0},
-      {{"P", table, "$(Ga;b);x"}, "K $(P)", kReferenceBreaks},
+      {{"P", table, "$(Ga;b);x"}, "K $(P)", kRowBreaksOff, {"2", "a", "a, b"}},
       {{"P", table, "$(G\"b);x"}, "K $(P)", kReferenceBreaks},
       // Each cell is a value of its own.
       {{"P", table, "x;5\" y"}, "K $(P)", 0},

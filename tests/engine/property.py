@@ -103,6 +103,8 @@ class Property:
             return [("judgement", "refused but written" if errors else "passed but not written", errors[:1])]
         if not output:
             return []
+        if case.broken():
+            return [("judgement", "written though broken", case.broken()[0])]
         run = self.read(case, output)
         found = [("lint", each, "") for each in linted]
         found += [("engine", each, "") for each in run.complaints(case.feature)]
@@ -236,7 +238,7 @@ def back(run, case, kind, expected, stood):
                 zip(itertools.cycle(kinds), cells, unpack(stood, separator))]
         # A class of its own empties the cells that mean nothing in their row.
         return "table", separator, kinds, [cell if each in ("", ("list", [])) else each
-                                           for each, cell in zip(came, cells)]
+                                           for each, cell in itertools.zip_longest(came, cells, fillvalue="missing")]
     came = run.value(stood, case.feature)
     if "LISTBOX" in kind:
         return pack(unpack(came, " "), " ")

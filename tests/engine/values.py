@@ -19,9 +19,10 @@ LEVELS = {"No Parallelism": "NO_PARALLELISM", "Minimal": "MINIMAL", "Extreme": "
 class Value:
     """A stored value, and what it is to come back as: None where nothing is to be compared."""
 
-    def __init__(self, stored, expected=None):
+    def __init__(self, stored, expected=None, broken=False):
         self.stored, self.expected = stored, expected
         self.fixed = False  # whether instances keep it
+        self.broken = broken  # whether nothing may be written with it
 
 
 def is_encoded(kind):
@@ -47,7 +48,9 @@ def make(case, parameter, scope):
     if kind in PASSIVE or not kind:
         return None
     if "OPTIONAL" in parameter.flags and parameter.name != "LABEL" and rng.random() < 0.3:
-        return Value("", "")
+        return unset(parameter) if rng.random() < 0.1 else Value("", "")
+    if rng.random() < 0.003:
+        return unset(parameter)
     if kind == "GUI_LINE_TABLE":
         return table(case, parameter, scope)
     if kind == "MULTIPARAMETER":
@@ -137,11 +140,7 @@ def text(case, kind, scope):
     mixed = rng.random() < 0.1
     macros = [(name, value) for name, of, _, value in scope.parameters
               if mixed or (is_encoded(of) or of.endswith("_PARM")) == encoded and of != "FLOAT"]
-    meaning = case.text("t", kind)
-    if "XML" in kind:
-        meaning = f"<a>{escape(meaning)}</a>"
-    elif "JSON" in kind:
-        meaning = json.dumps(meaning)
+    meaning = shaped(kind, case.text("t", kind))
     stored = encode(meaning) if encoded else meaning
     expected = None if not encoded and any(mark in meaning for mark in MEANS) else meaning
     parts = [(stored, expected)]
@@ -153,14 +152,24 @@ def text(case, kind, scope):
     elif macros and rng.random() < 0.4:
         name, value = rng.choice(macros)
         parts.append((f"$({name})", ("macro", name)))
-    elif rng.random() < 0.1 and scope.referable and may_refer(kind):
-        return conditional(case, kind, scope, [(text, text) for text in
-                                               (case.text("yes", "conditional"), case.text("no", "conditional"))])
+    elif rng.random() < 0.1 and scope.referable and (may_refer(kind) or shaped(kind, "") != ""):
+        results = [shaped(kind, case.text(plain, "conditional")) for plain in ("yes", "no")]
+        broken = shaped(kind, "") != "" and rng.random() < 0.2
+        if broken:
+            results[rng.randrange(2)] = "<a>{"
+        value = conditional(case, kind, scope, [(text, text) for text in results])
+        value.broken = broken
+        return value
     if case.siblings and rng.random() < 0.05:
         parts.append(own(case))
         rng.shuffle(parts)
     values = [meaning for _, meaning in parts]
     return Value("".join(part for part, _ in parts), None if None in values else values)
+
+
+def shaped(kind, text):
+    """The text as one that is well formed in the language of the type."""
+    return f"<a>{escape(text)}</a>" if "XML" in kind else json.dumps(text) if "JSON" in kind else text
 
 
 def conditional(case, kind, scope, results):
@@ -244,18 +253,33 @@ def members(parameter):
     return decode(separator), found
 
 
+def unset(parameter):
+    return Value("<Unused>", "", not {"OPTIONAL", "OMITTABLE"} & set(parameter.flags))
+
+
 def table(case, parameter, scope):
+    """Now and then one that breaks off in a row, or a condition between two tables."""
     separator, columns = members(parameter)
-    rows = case.random.randint(1, 2)
+    rows, odd = case.random.randint(1, 2), case.random.random()
     cells = [make(case, column, scope) or Value("", "") for column in columns * rows]
-    expected = [cell.expected for cell in cells]
-    return Value(pack([cell.stored for cell in cells], separator),
-                 None if None in expected else ("table", separator, [c.type for c in columns], expected))
+    broken, expected = any(cell.broken for cell in cells), [cell.expected for cell in cells]
+    cut = case.random.randint(1, len(columns) - 1) if odd < 0.05 else 0
+    stored = pack([cell.stored for cell in cells[:len(cells) - cut]], separator)
+    if odd > 0.97 and scope.referable:
+        whole = [pack(["word"] * (len(columns) + more), separator) for more in (0, case.random.randrange(2))]
+        return Value(conditional(case, parameter.type, scope, [(each, each) for each in whole]).stored, None,
+                     any(len(unpack(each, separator)) > len(columns) for each in whole))
+    return Value(stored, None if None in expected or cut else ("table", separator, [c.type for c in columns], expected),
+                 broken or cut > 0)
 
 
 def multi(case, parameter, scope):
+    """Now and then one that lacks a part."""
     separator, parts = members(parameter)
     values = [make(case, part, scope) for part in parts]
-    made = Value(pack([each for part, value in zip(parts, values) for each in (part.name, value.stored)], separator))
+    listed = [each for part, value in zip(parts, values) for each in (part.name, value.stored)]
+    cut = case.random.randint(1, 2) if case.random.random() < 0.05 else 0
+    made = Value(pack(listed[:len(listed) - cut], separator), None,
+                 any(value.broken for value in values) or (cut > 0 and "OPTIONAL" not in parts[-1].flags))
     made.members = dict(zip((part.name for part in parts), zip(parts, values)))
     return made

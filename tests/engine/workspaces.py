@@ -24,6 +24,10 @@ HEADERS = [
     "INCLUDE TCL\nputs {MACRO H 1}\nEND_INCLUDE", "INCLUDE TCL\nset x {\nEND_INCLUDE", "END_INCLUDE", "# TRANSFORMER_END",
     "# TRANSFORMER_BEGIN X,1", "FACTORY_DEF *", 'FACTORY_DEF * TeeFactory FACTORY_NAME "x INPUT FEATURE_TYPE a', "MACRO H \\",
     "Tcl2 proc h {} {return 1}", "Tcl2 proc h {} {", "MACRO H $(H)", "MACRO P0 $(H)", "INCLUDE_CUSTOM_TRANSFORMER_VER Nope:1"]
+# Tcl scripts that give "v1" of any word, or a value with a line break.
+TCL = ["set x [list %s]\nreturn v1"] * 6 + [
+    'set x "%s\\n"\nreturn [string range "v1" 0 end]', 'set x "\\n"\nset x v1\nset y %s\nset x',
+    '# |\nreturn "%s\\nv1"', '# |\nset x {%s}\nappend x "\\r"\n$x', '# |\nset x [join [list %s v1] \\n]\nreturn $x']
 # Not drawn while it is being mended: where a text stands, and which texts, as patterns.
 KNOWN = [
     (".*_ENCODED", "^@Value"),
@@ -165,8 +169,8 @@ class Case:
         if kind == "SCRIPT":
             text, python = self.text("t", "script"), self.random.random() < 0.5
             code = (f"x = {text!r}\n# {text.splitlines()[0] if text.split() else ''}\nreturn 'v1'" if python else
-                    "set x [list %s]\nreturn v1" % encode(text))
-            value = Value(encode(code), "v1")
+                    self.random.choice(TCL) % encode(text))
+            value = Value(encode(code), "v1", not python and "|" in code)
             value.kind = "TEXT_EDIT_PYTHON_PARM" if python else "TEXT_EDIT_TCL_PARM"
             return value
         if scope and scope.referable and self.random.random() < 0.01:
@@ -318,6 +322,14 @@ class Case:
         return section("GLOBAL_PARAMETERS", parameters) + section("TRANSFORMERS", nodes) + (
             section("SUBDOCUMENT_IOS", ports) if ports else "") + section("FEAT_LINKS", links) + section(
                 "ATTR_LINKS", copies)
+
+    def broken(self):
+        """What must not be written."""
+        scopes = [self.main]
+        for scope in scopes:
+            scopes += [node.custom for node in scope.nodes if node.custom and node.custom not in scopes]
+        values = [value for scope in scopes for node in scope.nodes for value in node.values.values()]
+        return [each.stored for each in values + [value for *_, value in self.main.parameters] if each.broken]
 
     # --- what an engine must find
 

@@ -96,6 +96,10 @@ TEST(ParameterFetcher, TheListIsWrittenValidatedAndAddsAttributes) {
                         {3, "$(P),$(Q)", "$(P),$(Q)", "$(P),$(Q)", "P),$(Q"},
                         {3, "WORKSPACE_NAME", "WORKSPACE_NAME", "", "WORKSPACE_NAME"},
                         {3, "", "", "", ""},
+                        {2, ",$(P)", "$(P)", "", "P"},
+                        {2, "$(P),", "$(P)", "", "P"},
+                        {3, " $(P)  $(R) ", "{$(P)} {$(R)}", "", "P, R"},
+                        {2, ",", "", "", ""},
                         {3, "<Unused>", "<Unused>", "", ""},
                         {1, "A,B", "\"A\",\"B\"", "", ""}}) {
     SCOPED_TRACE(std::to_string(c.version) + " " + c.value);

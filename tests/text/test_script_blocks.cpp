@@ -116,6 +116,7 @@ const ValueCase kTclValues[] = {
     {"$ORX_MacroValues($ORX_MacroValues(A))", "indirect", "indirect inner"},
     {"set k A\n[expr {$ORX_MacroValues($k) eq {}}]$ORX_MacroValues($k)", "0outer", "0inner"},
     {"$ORX_MacroValues(HOSTILE)", kMacros["HOSTILE"], {}},
+    {"set x \"a\\nb\"\nset n [string length $x]\nset x [llength [split $x \"\\n\"]]\n$x/$n", "2/3", {}},
 };
 
 const RefusalCase kTclRefusals[] = {
@@ -137,6 +138,9 @@ const RefusalCase kTclRefusals[] = {
     {"expr {1 + 2}", 370738, 1, "3"},
     {"set x 5; format 7", 370738, 1, "7"},
     {"${ORX_MacroValues(A)}", 370739, 1, "inner", true},
+    {"return \"a\\nb\"", 371346, 1, nullptr},
+    {"set y [list x \\r]\n$y", 371346, 2, nullptr},
+    {"append x [join {a b} \\n]\nif {1} {\n  return $x\n}\n$x", 371346, 3, nullptr},
 };
 
 using Generator = void (*)(const QString&, const QString&, const QString&, QStringList&);

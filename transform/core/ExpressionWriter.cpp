@@ -120,7 +120,11 @@ QString ExpressionWriter::wrapCells(const QString& value, const QString& name,
   std::size_t column = 0;
   for (QString& cell : cells) {
     const GUIType& type = types[column];
-    if (needsWrapping(type, cell)) {
+    if (cell == kUnusedValue) {
+      // A cell that has no value is empty; this text would be one.
+      cell.clear();
+      changed = true;
+    } else if (needsWrapping(type, cell)) {
       cell = wrap(cell, name + QLatin1Char('.') + type.getName(), type.getType(), type.valueIsEncoded());
       changed = true;
     }

@@ -40,6 +40,20 @@ long refuseEncoding(const GUIType& type, const QString& value) {
   return isWord ? TextPlaces::refuseEncodedValue(value) : 0;
 }
 
+QStringList possibleValues(const QString& value) {
+  if (!value.startsWith(kConditionalPrefix)) {
+    return QStringList(value);
+  }
+  const QStringList parts = value.mid(kConditionalPrefix.size()).split(QLatin1Char(';'));
+  QStringList results;
+  for (int i = 0; i < parts.size(); ++i) {
+    if (i % 2 == 1 || i + 1 == parts.size()) {
+      results.append(parts.at(i));
+    }
+  }
+  return results;
+}
+
 bool takesAttributeReference(const GUIType& type) {
   return type.mayHoldAttributeReference() || type.getType().startsWith(kExpressionType);
 }

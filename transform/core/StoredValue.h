@@ -4,6 +4,7 @@
 #include <platform/Export.h>
 
 #include <QString>
+#include <QStringList>
 
 class GUIType;
 class TransformParamCfg;
@@ -22,6 +23,9 @@ QString withAttributeReference(const GUIType& type, const QString& value);
 // stands: as a value, a member, a cell, the value of a macro; 0 when it is one, and for any other type.
 // Expressions are judged as such.
 ORX_EXPORT long refuseEncoding(const GUIType& type, const QString& value);
+
+// The results of a conditional value, word-encoded as they stand; any other value by itself.
+QStringList possibleValues(const QString& value);
 
 // Whether a value of the type may be an attribute reference or hold some.
 bool takesAttributeReference(const GUIType& type);

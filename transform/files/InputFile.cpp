@@ -40,11 +40,11 @@ bool InputFile::open() {
                           ? file.open(STDIN_FILENO, QIODevice::ReadOnly | QIODevice::Unbuffered)
                           : file.open(QIODevice::ReadOnly | QIODevice::Unbuffered);
   if (!isOpen)
-    return fail(file.errorString());
+    return fail(TransformResString(messages::kCannotBeRead, file.errorString()));
   if (isStandardInput(m_fileName) || !QFileInfo(m_fileName).isFile())
     return copy(file);
   char first;
-  return file.read(&first, 1) >= 0 || fail(file.errorString());
+  return file.read(&first, 1) >= 0 || fail(TransformResString(messages::kCannotBeRead, file.errorString()));
 }
 
 bool InputFile::copy(QFile& stream) {
@@ -56,7 +56,7 @@ bool InputFile::copy(QFile& stream) {
   for (;;) {
     const qint64 count = stream.read(piece.data(), piece.size());
     if (count < 0)
-      return fail(stream.errorString());
+      return fail(TransformResString(messages::kCannotBeRead, stream.errorString()));
     if (count == 0)
       break;
     total += count;

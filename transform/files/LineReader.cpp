@@ -21,7 +21,7 @@ bool LineReader::open() {
   m_line.reserve(kChunk);  // kept from line to line
   const QIODevice::OpenMode mode = QIODevice::ReadOnly | QIODevice::Unbuffered;
   const bool opened = m_fileName == QLatin1String("-") ? m_file.open(STDIN_FILENO, mode) : m_file.open(mode);
-  return opened || fail(m_file.errorString());
+  return opened || fail(TransformResString(messages::kCannotBeRead, m_file.errorString()));
 }
 
 bool LineReader::next() {
@@ -64,7 +64,7 @@ bool LineReader::fill() {
   m_chunk.resize(kChunk);
   const qint64 read = m_file.read(m_chunk.data(), kChunk);
   m_chunk.resize(static_cast<int>(std::max<qint64>(read, 0)));
-  return read > 0 || (read < 0 && fail(m_file.errorString()));
+  return read > 0 || (read < 0 && fail(TransformResString(messages::kCannotBeRead, m_file.errorString())));
 }
 
 bool LineReader::fail(const QString& reason) {

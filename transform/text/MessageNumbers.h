@@ -381,10 +381,53 @@ constexpr long kListNamesAll = 371130;
 constexpr long kThereAre = 371131;
 constexpr long kDidYouMean = 371132;
 constexpr long kCustomMark = 371133;
+constexpr long kUnexpectedEnd = 371134;
 constexpr long kStreamClosed = 371142;
 constexpr long kNoTemporaryCopy = 371143;
 constexpr long kStreamTooLarge = 371144;
 constexpr long kLineTooLong = 371145;
+constexpr long kCannotBeRead = 371146;
+constexpr long kNotWritable = 371147;
+
+// What documents hold.
+constexpr long kInfoInComments = 371180;
+constexpr long kInfoNewestVersion = 371181;
+constexpr long kInfoPlainXml = 371182;
+constexpr long kInfoDocument = 371183;
+constexpr long kInfoReader = 371184;
+constexpr long kInfoWriter = 371185;
+constexpr long kInfoDisabled = 371186;
+constexpr long kInfoDisabledCount = 371187;
+constexpr long kInfoLine = 371188;
+constexpr long kInfoAttributes = 371189;
+constexpr long kInfoVersion = 371190;
+constexpr long kInfoVersionNumbers = 371191;
+constexpr long kInfoService = 371192;
+constexpr long kInfoRepository = 371193;
+constexpr long kInfoItem = 371194;
+constexpr long kInfoServer = 371195;
+constexpr long kInfoNoPrompt = 371196;
+constexpr long kInfoCustom = 371197;
+constexpr long kInfoOfFeatures = 371198;
+constexpr long kInfoOfAttributes = 371199;
+constexpr long kInfoOnLink = 371200;
+constexpr long kInfoInput = 371201;
+constexpr long kInfoOutput = 371202;
+constexpr long kInfoLoop = 371203;
+constexpr long kInfoNotPublished = 371204;
+constexpr long kInfoCustomTitle = 371205;
+constexpr long kInfoCustomTitleVersion = 371206;
+constexpr long kInfoVersions = 371207;
+constexpr long kInfoDatasets = 371208;
+constexpr long kInfoFeatureTypes = 371209;
+constexpr long kInfoParameters = 371210;
+constexpr long kInfoTransformers = 371211;
+constexpr long kInfoLinks = 371212;
+constexpr long kInfoComments = 371213;
+constexpr long kInfoBookmarks = 371214;
+constexpr long kInfoBreakpoints = 371215;
+constexpr long kInfoConstants = 371216;
+constexpr long kInfoPorts = 371217;
 
 // Workspace documents and files of versions.
 constexpr long kFileNotRead = 371150;
@@ -466,5 +509,13 @@ constexpr long kMemberLeftOut = 371327;
 constexpr long kNoSuchPart = 371328;
 constexpr long kPartTwice = 371329;
 constexpr long kConditionForParts = 371330;
+constexpr long kValueNeeded = 371340;
+constexpr long kPartNeeded = 371341;
+constexpr long kCellNeeded = 371342;
+constexpr long kRowBreaksOff = 371343;
+constexpr long kConditionForRows = 371344;
+constexpr long kConditionInTemplate = 371345;
+constexpr long kResultBreaksLine = 371346;
+constexpr long kOwnReferenceInRow = 371347;
 
 }  // namespace orx::messages

@@ -2,6 +2,7 @@
 #include <transform/text/MessageNumbers.h>
 #include <transform/workspace/PlainFile.h>
 #include <transform/workspace/WorkspaceLoaderException.h>
+#include <transform/workspace/reading/DocumentMessages.h>
 
 #include <QFileInfo>
 

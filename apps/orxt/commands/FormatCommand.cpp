@@ -47,6 +47,7 @@ void FormatCommand::declare(CLI::App& app) {
       ->excludes(inPlace)
       ->excludes(output);
   app.add_flag("--drop", m_drop, "Write also when something of the document would be lost");
+  m_language.declareLanguage(app);
   app.footer(
       app.get_footer() +
       "Header lines, line ends, encoding and all lines around the document are kept. What the\n"
@@ -143,6 +144,6 @@ ExitStatus FormatCommand::write(const QByteArray& bytes, const QString& outputFi
     if (output.commit())
       return kExitDone;
   }
-  console.fail(output.errorString());
+  console.fail(messages::kNotWritable, {output.errorString()});
   return kExitFile;
 }

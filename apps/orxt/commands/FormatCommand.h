@@ -1,6 +1,7 @@
 #pragma once
 
 #include <apps/orxt/console/Command.h>
+#include <apps/orxt/console/DefinitionOptions.h>
 
 #include <QByteArray>
 #include <QString>
@@ -30,4 +31,5 @@ class FormatCommand : public Command {
   bool m_inPlace = false;
   bool m_check = false;
   bool m_drop = false;
+  DefinitionOptions m_language;
 };

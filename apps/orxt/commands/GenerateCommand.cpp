@@ -125,7 +125,7 @@ ExitStatus GenerateCommand::runJob(const Job& job, const Setting& setting, Trans
   if (result == TranslationResult::Unreadable)
     console.failFile(shownName, error);
   else if (result == TranslationResult::Unwritable)
-    console.fail(error);
+    console.fail(messages::kNotWritable, {error});
   else if (result == TranslationResult::Done && !writeDependencies(job, recording, console))
     return kExitFile;
   return exitStatus(result);

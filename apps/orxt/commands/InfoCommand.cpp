@@ -27,6 +27,7 @@ void InfoCommand::declare(CLI::App& app) {
       ->type_name("WORKSPACE")
       ->required();
   app.add_flag("--json", m_json, "As JSON: a list with one entry for each file that could be read");
+  m_language.declareLanguage(app);
 }
 
 ExitStatus InfoCommand::run(Console& console) {

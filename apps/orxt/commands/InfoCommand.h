@@ -1,6 +1,7 @@
 #pragma once
 
 #include <apps/orxt/console/Command.h>
+#include <apps/orxt/console/DefinitionOptions.h>
 
 #include <QJsonArray>
 #include <QString>
@@ -19,4 +20,5 @@ class InfoCommand : public Command {
 
   std::vector<std::string> m_workspaces;
   bool m_json = false;
+  DefinitionOptions m_language;
 };

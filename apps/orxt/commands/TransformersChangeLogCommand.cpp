@@ -87,6 +87,6 @@ ExitStatus TransformersChangeLogCommand::run(Console& console) {
     if (output.commit())
       return kExitDone;
   }
-  console.fail(output.errorString());
+  console.fail(messages::kNotWritable, {output.errorString()});
   return kExitFile;
 }

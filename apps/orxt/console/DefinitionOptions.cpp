@@ -37,6 +37,10 @@ void DefinitionOptions::declare(CLI::App& app) {
       ->expected(1)
       ->allow_extra_args(false)
       ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+  declareLanguage(app);
+}
+
+void DefinitionOptions::declareLanguage(CLI::App& app) {
   app.add_option("--lang", m_language, "Language of texts, such as en, de or fr")
       ->type_name("LANG")
       ->check([](const std::string& language) { return refuseLanguage(QString::fromStdString(language)); })

@@ -14,6 +14,8 @@ class TransformerMgr;
 class DefinitionOptions {
  public:
   void declare(CLI::App& app);
+  // Of a command that loads no definitions.
+  void declareLanguage(CLI::App& app);
   // Sets folders, loads the registry once and says on the console what could not be loaded.
   TransformerMgr& load(Console& console) const;
   // The same for those who look at the catalogue itself: also says what was refused, and when it is empty.

@@ -3,9 +3,13 @@
 #include <apps/orxt/facts/DocumentFacts.h>
 #include <apps/orxt/facts/InfoJson.h>
 #include <apps/orxt/facts/InfoText.h>
+#include <transform/text/MessageNumbers.h>
+#include <transform/text/MessageStrings.h>
 #include <translation/WorkspaceDocument.h>
 
 #include <algorithm>
+
+namespace messages = orx::messages;
 
 namespace {
 
@@ -17,12 +21,16 @@ constexpr int kLongestName = 200;
 
 const QString kTitle = QStringLiteral("TITLE");
 
-QString counted(int count, const char* one, const char* many) {
-  return QString::number(count) + QLatin1Char(' ') + QLatin1String(count == 1 ? one : many);
+QString label(long number, int count) {
+  return TransformResString(number, QString::number(count));
 }
 
 QString disabledMark(bool enabled) {
-  return enabled ? QString() : QStringLiteral("disabled");
+  return enabled ? QString() : TransformResString(messages::kInfoDisabled);
+}
+
+QString disabledCount(int count) {
+  return count > 0 ? label(messages::kInfoDisabledCount, count) : QString();
 }
 
 QString joined(QStringList parts) {
@@ -31,14 +39,15 @@ QString joined(QStringList parts) {
 }
 
 QString roleWord(bool isSource) {
-  return isSource ? QStringLiteral("reader") : QStringLiteral("writer");
+  return TransformResString(isSource ? messages::kInfoReader : messages::kInfoWriter);
 }
 
 QString versionList(const std::set<int>& versions) {
   QStringList numbers;
   for (const int version : versions)
     numbers << QString::number(version);
-  return QLatin1String(versions.size() == 1 ? "version " : "versions ") + numbers.join(QLatin1String(", "));
+  return TransformResString(versions.size() == 1 ? messages::kInfoVersion : messages::kInfoVersionNumbers,
+                            numbers.join(QLatin1String(", ")));
 }
 
 }  // namespace
@@ -57,30 +66,30 @@ QString InfoText::text(const QString& fileName) {
   return m_text;
 }
 
-void InfoText::paragraph(const QString& title, std::size_t count, const QString& body) {
+void InfoText::paragraph(long title, std::size_t count, const QString& body) {
   if (count > 0)
-    m_text += QStringLiteral("\n%1 (%2)\n").arg(title).arg(count) + body;
+    m_text += QStringLiteral("\n%1 (%2)\n").arg(TransformResString(title)).arg(count) + body;
 }
 
 void InfoText::head(const QString& fileName) {
   QString form;
   switch (m_document.form()) {
     case WorkspaceFile::Form::Workspace:
-      form = QStringLiteral("in comment lines, %1, %2")
-                 .arg(QString::fromLatin1(m_document.encoding()),
-                      counted(m_document.headerLines().size(), "header line", "header lines"));
+      form = TransformResString(
+          messages::kInfoInComments,
+          {QString::fromLatin1(m_document.encoding()), QString::number(m_document.headerLines().size())});
       break;
     case WorkspaceFile::Form::Versioned:
-      form = QStringLiteral("the newest of %1")
-                 .arg(counted(m_document.versions().size(), "stored version", "stored versions"));
+      form = label(messages::kInfoNewestVersion, m_document.versions().size());
       break;
     case WorkspaceFile::Form::PlainXml:
     case WorkspaceFile::Form::Unknown:
-      form = QStringLiteral("plain XML, %1").arg(QString::fromLatin1(m_document.encoding()));
+      form = TransformResString(messages::kInfoPlainXml, QString::fromLatin1(m_document.encoding()));
       break;
   }
-  m_text += QStringLiteral("%1\n  %2 document, %3\n")
-                .arg(onOneLine(fileName, kLongestText), documentTypeName(m_document), form);
+  m_text += onOneLine(fileName, kLongestText) + QLatin1String("\n  ") +
+            TransformResString(messages::kInfoDocument, {documentTypeName(m_document), form}) +
+            QLatin1Char('\n');
 }
 
 void InfoText::attributes(const QHash<QString, QString>& attributes) {
@@ -107,9 +116,9 @@ void InfoText::versions() {
   TextTable table(kIndent);
   for (const VersionInfo& info : m_document.versions()) {
     table.addRow({QStringLiteral("%1 %2").arg(info.name).arg(info.version), info.category, info.guid,
-                  QStringLiteral("line %1").arg(info.startLine + 1)});
+                  label(messages::kInfoLine, info.startLine + 1)});
   }
-  paragraph(QStringLiteral("Versions"), static_cast<std::size_t>(m_document.versions().size()), table.text());
+  paragraph(messages::kInfoVersions, static_cast<std::size_t>(m_document.versions().size()), table.text());
 }
 
 void InfoText::datasets() {
@@ -119,7 +128,7 @@ void InfoText::datasets() {
     table.addRow({roleWord(record.isSource), record.keyword, record.format, record.name, record.dataset,
                   disabledMark(record.enabled)});
   }
-  paragraph(QStringLiteral("Datasets"), records.size(), table.text());
+  paragraph(messages::kInfoDatasets, records.size(), table.text());
 }
 
 void InfoText::featureTypes() {
@@ -128,23 +137,23 @@ void InfoText::featureTypes() {
   for (const FeatureTypeStruct& record : records) {
     table.addRow({roleWord(record.isSource), record.keyword,
                   record.featureTypeName.isEmpty() ? record.nodeName : record.featureTypeName,
-                  counted(record.attributes.size(), "attribute", "attributes"),
-                  disabledMark(record.enabled)});
+                  label(messages::kInfoAttributes, record.attributes.size()), disabledMark(record.enabled)});
   }
-  paragraph(QStringLiteral("Feature types"), records.size(), table.text());
+  paragraph(messages::kInfoFeatureTypes, records.size(), table.text());
 }
 
 void InfoText::server() {
   const ServerParameterStruct server = m_document.reader().GetServerParameters();
   TextTable table(kIndent);
   for (const ServiceStruct& service : server.services)
-    table.addRow({QStringLiteral("service"), service.name});
+    table.addRow({TransformResString(messages::kInfoService), service.name});
   for (const ServerNameStruct& repository : server.repositories)
-    table.addRow({QStringLiteral("repository"), repository.name});
+    table.addRow({TransformResString(messages::kInfoRepository), repository.name});
   for (const ServerNameStruct& item : server.items)
-    table.addRow({QStringLiteral("item"), item.name});
+    table.addRow({TransformResString(messages::kInfoItem), item.name});
   if (!table.isEmpty())
-    m_text += QLatin1String("\nServer\n") + table.text();
+    m_text +=
+        QLatin1Char('\n') + TransformResString(messages::kInfoServer) + QLatin1Char('\n') + table.text();
 }
 
 void InfoText::sections(const QString& document) {
@@ -161,11 +170,11 @@ void InfoText::parameters(const QString& document) {
     const ParameterFacts facts = describe(record);
     const QString shown = facts.shown.isEmpty() ? QStringLiteral("-") : facts.shown;
     if (facts.name.isEmpty())
-      table.addRow({QStringLiteral("?"), QStringLiteral("no prompt line"), shown, record.guiLine});
+      table.addRow({QStringLiteral("?"), TransformResString(messages::kInfoNoPrompt), shown, record.guiLine});
     else
       table.addRow({facts.name, facts.type, shown, facts.prompt});
   }
-  paragraph(QStringLiteral("Global parameters"), records.size(), table.text());
+  paragraph(messages::kInfoParameters, records.size(), table.text());
 }
 
 void InfoText::transformers(const QString& document) {
@@ -174,14 +183,14 @@ void InfoText::transformers(const QString& document) {
   int total = 0;
   for (const TransformerCount& entry : countTransformers(m_document.reader(), document)) {
     total += entry.count;
-    const QString disabled =
-        entry.disabled > 0 ? QStringLiteral("%1 disabled").arg(entry.disabled) : QString();
-    const QString type =
-        entry.subDocument.isEmpty() ? entry.type : QStringLiteral("custom: %1").arg(entry.subDocument);
+    const QString disabled = disabledCount(entry.disabled);
+    const QString type = entry.subDocument.isEmpty()
+                             ? entry.type
+                             : TransformResString(messages::kInfoCustom, entry.subDocument);
     table.addRow({QString::number(entry.count), type,
                   entry.subDocument.isEmpty() ? joined({versionList(entry.versions), disabled}) : disabled});
   }
-  paragraph(QStringLiteral("Transformers"), static_cast<std::size_t>(total), table.text());
+  paragraph(messages::kInfoTransformers, static_cast<std::size_t>(total), table.text());
 }
 
 void InfoText::links(const QString& document) {
@@ -193,12 +202,12 @@ void InfoText::links(const QString& document) {
   TextTable table(kIndent);
   table.alignRight(0);
   if (!featureLinks.isEmpty()) {
-    table.addRow({QString::number(featureLinks.size()), QStringLiteral("of features"),
-                  disabled > 0 ? QStringLiteral("%1 disabled").arg(disabled) : QString()});
+    table.addRow({QString::number(featureLinks.size()), TransformResString(messages::kInfoOfFeatures),
+                  disabledCount(disabled)});
   }
   if (attributeLinks > 0)
-    table.addRow({QString::number(attributeLinks), QStringLiteral("of attributes")});
-  paragraph(QStringLiteral("Links"), featureLinks.size() + attributeLinks, table.text());
+    table.addRow({QString::number(attributeLinks), TransformResString(messages::kInfoOfAttributes)});
+  paragraph(messages::kInfoLinks, featureLinks.size() + attributeLinks, table.text());
 }
 
 void InfoText::notes(const QString& document) {
@@ -207,25 +216,25 @@ void InfoText::notes(const QString& document) {
   TextTable commentTable(kIndent);
   for (const CommentStruct& record : comments)
     commentTable.addRow({record.commentValue});
-  paragraph(QStringLiteral("Comments"), comments.size(), commentTable.text());
+  paragraph(messages::kInfoComments, comments.size(), commentTable.text());
 
   const auto bookmarks = reader.GetBookmarkList(document);
   TextTable bookmarkTable(kIndent);
   for (const BookmarkStruct& record : bookmarks)
     bookmarkTable.addRow({record.name, record.description});
-  paragraph(QStringLiteral("Bookmarks"), bookmarks.size(), bookmarkTable.text());
+  paragraph(messages::kInfoBookmarks, bookmarks.size(), bookmarkTable.text());
 
   const auto breakpoints = reader.GetBreakpointList(document);
   TextTable breakpointTable(kIndent);
   for (const BreakpointStruct& record : breakpoints) {
     breakpointTable.addRow(
-        {record.name, QStringLiteral("on link %1").arg(record.featLink), disabledMark(record.enabled)});
+        {record.name, label(messages::kInfoOnLink, record.featLink), disabledMark(record.enabled)});
   }
-  paragraph(QStringLiteral("Breakpoints"), breakpoints.size(), breakpointTable.text());
+  paragraph(messages::kInfoBreakpoints, breakpoints.size(), breakpointTable.text());
 
   const std::size_t constants =
       reader.GetConstantList(document).size() + reader.GetConstantList(document, true).size();
-  paragraph(QStringLiteral("Constants"), constants, QString());
+  paragraph(messages::kInfoConstants, constants, QString());
 }
 
 void InfoText::subDocument(const QString& name) {
@@ -233,20 +242,22 @@ void InfoText::subDocument(const QString& name) {
   QHash<QString, QString> parameters = reader.GetSubDocParms(name);
   parameters.remove(QStringLiteral("NAME"));
   const QString version = parameters.take(QStringLiteral("VERSION"));
-  QString title = QStringLiteral("Custom transformer %1").arg(onOneLine(name, kLongestName));
-  if (!version.isEmpty())
-    title += QStringLiteral(", version %1").arg(onOneLine(version, kLongestName));
+  const QString shownName = onOneLine(name, kLongestName);
+  const QString title = version.isEmpty() ? TransformResString(messages::kInfoCustomTitle, shownName)
+                                          : TransformResString(messages::kInfoCustomTitleVersion,
+                                                               {shownName, onOneLine(version, kLongestName)});
   m_text += QStringLiteral("\n\n%1\n%2\n").arg(title, QString(title.size(), QLatin1Char('=')));
   attributes(parameters);
 
   const auto ports = reader.GetSubDocumentIOList(name);
   TextTable table(kIndent);
   for (const SubDocumentIOStruct& port : ports) {
-    const QString kind = port.isSource == SubDocumentIOKind::Input    ? QStringLiteral("input")
-                         : port.isSource == SubDocumentIOKind::Output ? QStringLiteral("output")
-                                                                      : QStringLiteral("loop");
-    table.addRow({kind, port.name, port.published ? QString() : QStringLiteral("not published")});
+    const long kind = port.isSource == SubDocumentIOKind::Input    ? messages::kInfoInput
+                      : port.isSource == SubDocumentIOKind::Output ? messages::kInfoOutput
+                                                                   : messages::kInfoLoop;
+    table.addRow({TransformResString(kind), port.name,
+                  port.published ? QString() : TransformResString(messages::kInfoNotPublished)});
   }
-  paragraph(QStringLiteral("Ports"), ports.size(), table.text());
+  paragraph(messages::kInfoPorts, ports.size(), table.text());
   sections(name);
 }

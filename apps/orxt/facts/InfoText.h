@@ -29,7 +29,7 @@ class InfoText {
   void subDocument(const QString& name);
 
   // A paragraph with a title and, behind it, how many there are; nothing when there are none.
-  void paragraph(const QString& title, std::size_t count, const QString& body);
+  void paragraph(long title, std::size_t count, const QString& body);
 
   const WorkspaceDocument& m_document;
   QString m_text;

@@ -13,6 +13,7 @@
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueReferences.h>
+#include <transform/core/ValueShape.h>
 #include <transform/core/definition/CompiledTemplate.h>
 #include <transform/core/generation/LookupDecision.h>
 #include <transform/core/generation/LookupWriters.h>
@@ -35,35 +36,6 @@ namespace {
 
 using namespace lookup_checks;
 
-// The tokens of members stand for the parts of the value that bear their names, so that a part of another
-// name would be lost, and one that is missing would leave its token empty.
-QString faultOfParts(const QString& value, const MemberList& members) {
-  const QStringList parts = QORXSdfStringToList(value, members.separator());
-  QSet<QString> given;
-  for (int i = 0; i < parts.size(); i += 2) {
-    const QString& name = parts.at(i);
-    if (!members.find(name) && name != kControllerQueryFile) {
-      QStringList known;
-      for (const GUIType& member : members.members()) {
-        known << member.getName();
-      }
-      return TransformResString(messages::kNoSuchPart, {name, known.join(QLatin1String(", "))});
-    }
-    if (given.contains(name)) {
-      return TransformResString(messages::kPartTwice, name);
-    }
-    if (i + 1 < parts.size()) {
-      given.insert(name);
-    }
-  }
-  for (const GUIType& member : members.members()) {
-    const QString& name = member.getName();
-    if (!member.getFlag(kGUITypeOptional) && name != kControllerQueryFile && !given.contains(name)) {
-      return TransformResString(messages::kMemberLeftOut, name);
-    }
-  }
-  return QString();
-}
 
 }  // namespace
 
@@ -90,13 +62,7 @@ QHash<QString, QString> MappingFileChecks::find() const {
   QHash<QString, QString> messages;
   for (const TransformParamCfg& record : m_records) {
     const QString stored = stripBasicStringInfo(m_cfg.getParameterValue(record.getName()));
-    const bool hasParts = record.isMultiParameter() || record.isTable();
-    QString fault;
-    if (hasParts && stored.startsWith(kConditionalPrefix)) {
-      fault = TransformResString(messages::kConditionForParts);
-    } else if (record.isMultiParameter() && !isUnsetValue(stored)) {
-      fault = faultOfParts(stored, record.members());
-    }
+    const QString fault = value_shape::fault(record, stored);
     QString formula;
     if (!fault.isEmpty()) {
       messages.insert(record.getName(), fault);
@@ -111,6 +77,10 @@ QHash<QString, QString> MappingFileChecks::find() const {
 
 long MappingFileChecks::refuse(const TransformParamCfg& record, const QString& stored) const {
   const QString& name = record.getName();
+  // A class of its own reads the rows; a condition hides them.
+  if (record.isTable() && typeid(m_cfg) != typeid(TransformerCfg) && stored.startsWith(kConditionalPrefix)) {
+    return messages::kConditionForRows;
+  }
   if (const long number = refuseParallelSetting(record, stored)) {
     return number;
   }
@@ -119,6 +89,15 @@ long MappingFileChecks::refuse(const TransformParamCfg& record, const QString& s
   }
   if (!m_written.contains(record)) {
     return 0;
+  }
+  // Rows are written behind the template, in which alone the tokens of the transformer are replaced.
+  const auto isOwn = [this](const QString& token) {
+    return m_cfg.hasParameter(token) &&
+           !(m_cfg.listener() &&
+             m_cfg.listener()->isRunTimeValue(m_cfg, kMacroOpen + token + QLatin1Char(')')));
+  };
+  if (m_written.isWrittenByRows(record) && anyParameterReference(stored, isOwn)) {
+    return messages::kOwnReferenceInRow;
   }
   NullBuffer buffer;
   QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);

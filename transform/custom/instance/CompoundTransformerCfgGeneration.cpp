@@ -8,6 +8,7 @@
 #include <transform/core/StoredValue.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueReferences.h>
+#include <transform/core/ValueShape.h>
 #include <transform/custom/CompoundTransformerCfg.h>
 #include <transform/custom/CompoundTransformerNetwork.h>
 #include <transform/custom/FlowGraph.h>
@@ -283,13 +284,14 @@ QHash<QString, QString> CompoundTransformerCfg::findUnwritableParameters() const
     const GUIType& type = getParameterGUIType(parameter);
     const QString stored = getParameterValue(parameter);
     const ScriptLanguage language = scriptLanguage(type);
-    QString message;
+    const TransformParamCfg* record = getParameterByMacroName(parameter);
+    QString message = record ? value_shape::fault(*record, stored) : QString();
     QStringList lines;
-    if (language == ScriptLanguage::None) {
+    if (message.isEmpty() && language == ScriptLanguage::None) {
       lines.append(macroValue(parameter, type, prefix));
       if (lines.first().contains(QLatin1Char('\n')) || lines.first().contains(QLatin1Char('\r')))
         message = TransformResString(messages::kLineBreak, parameter);
-    } else if (!isUnsetValue(stored)) {
+    } else if (message.isEmpty() && !isUnsetValue(stored)) {
       const bool isPython = language == ScriptLanguage::Python;
       if (isPython ? canWritePythonParameter(prefix, parameter, stored, message)
                    : canWriteTclParameter(prefix, parameter, stored, message))

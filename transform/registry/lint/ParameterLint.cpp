@@ -2,8 +2,10 @@
 #include <platform/qorxcore/qorxcore.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/StoredValue.h>
+#include <transform/core/TransformParamCfg.h>
 #include <transform/core/ValueFit.h>
 #include <transform/core/ValueReferences.h>
+#include <transform/core/ValueShape.h>
 #include <transform/registry/lint/ParameterLint.h>
 #include <transform/registry/loading/DefinitionKeywords.h>
 #include <transform/text/MessageNumbers.h>
@@ -138,6 +140,10 @@ void ParameterLint::checkGroup(const LintedParameter& parameter) {
 void ParameterLint::checkDefault(const LintedParameter& parameter) {
   const MemberList members(parameter.type);
   if (parameter.type.getType() == kTableType && !members.members().empty()) {
+    const QString fault = value_shape::fault(TransformParamCfg(parameter.type), parameter.defaultValue);
+    if (!isUnsetValue(parameter.defaultValue) && !fault.isEmpty()) {
+      add(Rule::BadDefault, messages::kDefaultUnfit, parameter.defaultLine, {parameter.name, fault});
+    }
     const QStringList cells = QORXSdfStringToList(parameter.defaultValue, members.separator());
     for (int i = 0; i < cells.size(); ++i) {
       checkDefault(parameter, members.members()[static_cast<std::size_t>(i) % members.members().size()],

@@ -1,11 +1,12 @@
 #include <transform/scripts/ScriptBlocks.h>
 #include <transform/scripts/blocks/ScriptRefusal.h>
+#include <transform/scripts/blocks/TclCommand.h>
+#include <transform/scripts/blocks/TclLineBreaks.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/TextHelpers.h>
 
 #include <QByteArray>
 #include <QSet>
-#include <tcl.h>
 
 #include <algorithm>
 
@@ -16,58 +17,14 @@ namespace {
 // What is put in front of the line that gives the value.
 constexpr int kReturnSize = sizeof("return ") - 1;
 
-// One command of a script, parsed by the Tcl library. The script outlives it.
-class TclCommand {
- public:
-  TclCommand(const char* script, int size) {
-    static const bool kInitialised = (Tcl_FindExecutable(nullptr), true);
-    (void)kInitialised;
-    m_isComplete = Tcl_ParseCommand(nullptr, script, size, 0, &m_parse) == TCL_OK;
-  }
-  ~TclCommand() {
-    if (m_isComplete) {
-      Tcl_FreeParse(&m_parse);
-    }
-  }
-  TclCommand(const TclCommand&) = delete;
-  TclCommand& operator=(const TclCommand&) = delete;
-
-  bool isComplete() const { return m_isComplete; }
-  // Where the parser stopped over a fault.
-  const char* fault() const { return m_parse.term; }
-  const char* begin() const { return m_parse.commandStart; }
-  const char* end() const { return m_parse.commandStart + m_parse.commandSize; }
-  int wordCount() const { return m_parse.numWords; }
-
-  QVector<Tcl_Token> words() const {
-    QVector<Tcl_Token> words;
-    words.reserve(m_parse.numWords);
-    for (int i = 0; i < m_parse.numTokens; i += m_parse.tokenPtr[i].numComponents + 1) {
-      words.append(m_parse.tokenPtr[i]);
-    }
-    return words;
-  }
-
- private:
-  Tcl_Parse m_parse;
-  bool m_isComplete;
-};
-
-QByteArray wordText(const Tcl_Token& word) {
-  return QByteArray(word.start, word.size);
-}
-
-bool isBracedWord(const Tcl_Token& word) {
-  return word.type == TCL_TOKEN_SIMPLE_WORD && word.size >= 2 && *word.start == '{';
-}
-
 // Lines of a text lose the blanks around them and get empty lines between them when they are written. Answers
 // where the first line of such a text ends, or null.
 const char* findTextOfSeveralLines(const TclCommand& command) {
   static const QSet<QByteArray> kTakeData = {"append", "lappend", "list", "return", "set"};
-  const QVector<Tcl_Token> words = command.words();
-  const bool takesData = kTakeData.contains(wordText(words.first()));
-  for (const Tcl_Token& word : words) {
+  const QVector<const Tcl_Token*> words = command.words();
+  const bool takesData = kTakeData.contains(wordText(*words.first()));
+  for (const Tcl_Token* each : words) {
+    const Tcl_Token& word = *each;
     const char* const end = word.start + word.size;
     const char* const lineEnd = std::find(word.start, end, '\n');
     if (lineEnd != end && (*word.start == '"' || (takesData && isBracedWord(word)))) {
@@ -86,7 +43,7 @@ bool endsInReturn(const char* script, const char* end) {
       return false;
     }
     if (command.wordCount() > 0) {
-      last = wordText(command.words().first());
+      last = wordText(*command.words().first());
     }
     script = command.end();
   }
@@ -97,13 +54,13 @@ bool endsInReturn(const char* script, const char* end) {
 // returned before it.
 bool isHarmlessInside(const TclCommand& command, const char* inserted) {
   static const QSet<QByteArray> kTakeScripts = {"if", "while", "for", "foreach"};
-  const QVector<Tcl_Token> words = command.words();
-  if (!kTakeScripts.contains(wordText(words.first()))) {
+  const QVector<const Tcl_Token*> words = command.words();
+  if (!kTakeScripts.contains(wordText(*words.first()))) {
     return false;
   }
-  return std::any_of(words.begin(), words.end(), [inserted](const Tcl_Token& word) {
-    return isBracedWord(word) && inserted + kReturnSize == word.start + word.size - 1 &&
-           inserted > word.start && endsInReturn(word.start + 1, inserted);
+  return std::any_of(words.begin(), words.end(), [inserted](const Tcl_Token* word) {
+    return isBracedWord(*word) && inserted + kReturnSize == word->start + word->size - 1 &&
+           inserted > word->start && endsInReturn(word->start + 1, inserted);
   });
 }
 
@@ -144,7 +101,12 @@ class TclBody {
     if (const ScriptRefusal refusal = refuseEscape()) {
       return refusal;
     }
-    return forEachCommand([this](const TclCommand& command) { return refuseCommand(command); });
+    if (const ScriptRefusal refusal =
+            forEachCommand([this](const TclCommand& command) { return refuseCommand(command); })) {
+      return refusal;
+    }
+    const char* const lineBreak = findResultWithLineBreak(m_text);
+    return lineBreak ? ScriptRefusal{messages::kResultBreaksLine, lineOf(lineBreak)} : ScriptRefusal();
   }
 
  private:

@@ -1,4 +1,5 @@
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/StoredValue.h>
 #include <transform/findings/Refusal.h>
 #include <transform/specialised/attributes/AttributeExpressionRemoverTransformerCfg.h>
 #include <transform/specialised/shared/SpecialisedValues.h>
@@ -25,7 +26,7 @@ bool AttributeExpressionRemoverTransformerCfg::parmValueAffectsOutputAttrs(const
 
 bool AttributeExpressionRemoverTransformerCfg::findExpression(QRegularExpression& expression) const {
   const QString value = getParameterValue(kExpression, UnpackLevel::Resolved);
-  if (isUnsetValue(value) || refersToMacros(value)) {
+  if (isUnsetValue(value) || isOpenValue(value)) {
     return false;
   }
   const bool ignoresCase = getParameterValue(kIgnoreCase, UnpackLevel::Resolved) == kYes;
@@ -43,11 +44,15 @@ bool AttributeExpressionRemoverTransformerCfg::validateParameter(const QString& 
   if (!TransformerCfg::validateParameter(parameter, message)) {
     return false;
   }
-  QRegularExpression expression;
-  if (parameter != kExpression || !findExpression(expression) || expression.isValid()) {
-    return true;
+  const QString value =
+      parameter == kExpression ? getParameterValue(kExpression, UnpackLevel::Resolved) : QString();
+  for (const QString& possible : possibleValues(value)) {
+    const QString pattern = QORXWwjdDecode(possible);
+    if (!isUnsetValue(possible) && !isOpenValue(possible) && !QRegularExpression(pattern).isValid()) {
+      return orx::refuse(message, messages::kBadPattern, {pattern});
+    }
   }
-  return orx::refuse(message, messages::kBadPattern, {expression.pattern()});
+  return true;
 }
 
 bool AttributeExpressionRemoverTransformerCfg::isRemoved(const QString& attribute) const {

@@ -134,7 +134,6 @@ QString ParameterFetcherTransformerCfg::getParameterValueForMappingFile(const QS
   const char open = usesBraces ? '{' : '"';
   const char close = usesBraces ? '}' : '"';
   const bool isSingle = list.size() < 2;
-  bool isChanged = !isSingle;
   for (QString& entry : list) {
     if (isWrapped(entry, open, close)) {
       continue;
@@ -142,13 +141,14 @@ QString ParameterFetcherTransformerCfg::getParameterValueForMappingFile(const QS
     if (isWrappedMacroReference(entry)) {
       // In what another version wraps its entries.
       entry = entry.mid(1, entry.size() - 2);
-      isChanged = true;
     }
     if (!isSingle) {
       entry = QLatin1Char(open) + entry + QLatin1Char(close);
     }
   }
-  return textForMappingFile(isChanged ? list.join(attrListSeparator()) : stored, name, parameter, buffer);
+  // Without the empty pieces: they would be entries of their own beside a single one.
+  const QString written = isUnsetValue(stored) ? stored : list.join(attrListSeparator());
+  return textForMappingFile(written, name, parameter, buffer);
 }
 
 QStringList ParameterFetcherTransformerCfg::fetchedAttributes() const {

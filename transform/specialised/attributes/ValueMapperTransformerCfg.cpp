@@ -67,7 +67,7 @@ bool ValueMapperTransformerCfg::validateParameter(const QString& parameter, QStr
   for (int row = 0; row < mapping.rowCount(); ++row) {
     const QString cell = mapping.cell(row, lookedUp);
     const QString value = QORXWwjdDecode(cell);
-    if (beginsValueReference(cell)) {
+    if (beginsValueReference(cell) || cell.startsWith(kConditionalPrefix)) {
       return orx::refuse(message, messages::kDiffersByFeature, {mapping.prompt(lookedUp)});
     }
     if (known.contains(value)) {

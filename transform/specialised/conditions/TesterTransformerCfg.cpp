@@ -1,6 +1,7 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Formula.h>
 #include <transform/core/FormulaChecks.h>
+#include <transform/core/StoredValue.h>
 #include <transform/core/ValueReferences.h>
 #include <transform/findings/Refusal.h>
 #include <transform/specialised/conditions/TesterTransformerCfg.h>
@@ -131,12 +132,14 @@ bool TesterTransformerCfg::validateTests(QString& message) const {
     if (!comparison) {
       return orx::refuse(message, messages::kUnknownComparison, {QString::number(row + 1), name});
     }
-    if (comparison->takesRight && right.isEmpty()) {
+    if (comparison->takesRight && isUnsetValue(right)) {
       return tests.refuseMissing(message, kRight);
     }
-    const QString pattern = QORXWwjdDecode(right);
-    if (comparison->name == kMatches && !isOpenValue(right) && !QRegularExpression(pattern).isValid()) {
-      return orx::refuse(message, messages::kBadPattern, {pattern});
+    for (const QString& possible : comparison->name == kMatches ? possibleValues(right) : QStringList()) {
+      const QString pattern = QORXWwjdDecode(possible);
+      if (!isOpenValue(possible) && !QRegularExpression(pattern).isValid()) {
+        return orx::refuse(message, messages::kBadPattern, {pattern});
+      }
     }
   }
   return true;

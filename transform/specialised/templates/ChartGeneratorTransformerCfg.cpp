@@ -1,3 +1,5 @@
+#include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/StoredValue.h>
 #include <transform/findings/Refusal.h>
 #include <transform/specialised/shared/ParameterTable.h>
 #include <transform/specialised/shared/SpecialisedValues.h>
@@ -54,15 +56,24 @@ bool ChartGeneratorTransformerCfg::validateParameter(const QString& parameter, Q
   if (parameter == kSeries) {
     return validateSeries(message);
   }
+  return (parameter != kWidth && parameter != kHeight) || validateSize(parameter, message);
+}
+
+bool ChartGeneratorTransformerCfg::validateSize(const QString& parameter, QString& message) const {
   const QString value = getParameterValue(parameter, UnpackLevel::Resolved);
-  bool isNumber = false;
-  const int size = value.toInt(&isNumber);
-  if ((parameter != kWidth && parameter != kHeight) || isOpenValue(value) || isUnsetValue(value) ||
-      (isNumber && size >= kSmallestSize && size <= kLargestSize)) {
-    return true;
+  const bool isConditional = value.startsWith(kConditionalPrefix);
+  for (const QString& possible : possibleValues(value)) {
+    const QString text = isConditional ? QORXWwjdDecode(possible) : possible;
+    bool isNumber = false;
+    const int size = text.toInt(&isNumber);
+    // The results of conditions are formulas.
+    const bool isKnown = isNumber || (!isConditional && !isOpenValue(text) && !isUnsetValue(text));
+    if (isKnown && (!isNumber || size < kSmallestSize || size > kLargestSize)) {
+      return orx::refuse(message, messages::kOutOfRange,
+                         {text, QString::number(kSmallestSize), QString::number(kLargestSize)});
+    }
   }
-  return orx::refuse(message, messages::kOutOfRange,
-                     {value, QString::number(kSmallestSize), QString::number(kLargestSize)});
+  return true;
 }
 
 bool ChartGeneratorTransformerCfg::validateSeries(QString& message) const {
@@ -71,7 +82,7 @@ bool ChartGeneratorTransformerCfg::validateSeries(QString& message) const {
   QSet<QString> labels;
   for (int row = 0; row < series.rowCount(); ++row) {
     for (const int column : {kPosition, kValue}) {
-      if (series.cell(row, column).isEmpty() && (column == kValue || needsPositions)) {
+      if (isUnsetValue(series.cell(row, column)) && (column == kValue || needsPositions)) {
         return series.refuseMissing(message, row, column);
       }
     }
@@ -79,7 +90,7 @@ bool ChartGeneratorTransformerCfg::validateSeries(QString& message) const {
     if (labels.contains(label)) {
       return ParameterTable::refuseRow(message, row, messages::kLabelTwice);
     }
-    if (!label.isEmpty()) {
+    if (!isUnsetValue(label)) {
       labels.insert(label);
     }
   }
@@ -101,7 +112,7 @@ QString ChartGeneratorTransformerCfg::getParameterValueForMappingFile(const QStr
   const bool withPositions = usesPositions(UnpackLevel::Stored);
   series.clearUnused([&](int, int column) { return column != kPosition || withPositions; });
   for (int row = 0; row < series.rowCount(); ++row) {
-    if (series.cell(row, kLabel).isEmpty()) {
+    if (isUnsetValue(series.cell(row, kLabel))) {
       series.setCell(row, kLabel, series.cell(row, kValue));
     }
   }

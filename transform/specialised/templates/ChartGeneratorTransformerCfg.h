@@ -21,4 +21,5 @@ class ORX_EXPORT ChartGeneratorTransformerCfg : public SpecialisedCfg<ChartGener
   // A histogram counts values wherever they stand.
   bool usesPositions(UnpackLevel level) const;
   bool validateSeries(QString& message) const;
+  bool validateSize(const QString& parameter, QString& message) const;
 };

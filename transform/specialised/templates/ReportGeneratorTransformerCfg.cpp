@@ -1,4 +1,5 @@
 #include <platform/qorxcore/WordEncoding.h>
+#include <transform/core/StoredValue.h>
 #include <transform/specialised/shared/ParameterTable.h>
 #include <transform/specialised/shared/SpecialisedValues.h>
 #include <transform/specialised/templates/ReportGeneratorTransformerCfg.h>
@@ -78,13 +79,15 @@ bool ReportGeneratorTransformerCfg::validateParts(QString& message) const {
     const QString content = parts.cell(row, kContent);
     for (const auto& [column, use] :
          {std::make_pair(kContent, part->content), std::make_pair(kAttributes, part->attributes)}) {
-      if (use == Use::Required && parts.cell(row, column).isEmpty()) {
+      if (use == Use::Required && isUnsetValue(parts.cell(row, column))) {
         return parts.refuseMissing(message, row, column);
       }
     }
-    const QString address = QORXWwjdDecode(content);
-    if (part->isAddress && !isOpenValue(content) && !QUrl(address, QUrl::StrictMode).isValid()) {
-      return ParameterTable::refuseRow(message, row, messages::kNoAddress, {address});
+    for (const QString& possible : part->isAddress ? possibleValues(content) : QStringList()) {
+      const QString address = QORXWwjdDecode(possible);
+      if (!isOpenValue(possible) && !QUrl(address, QUrl::StrictMode).isValid()) {
+        return ParameterTable::refuseRow(message, row, messages::kNoAddress, {address});
+      }
     }
   }
   return true;

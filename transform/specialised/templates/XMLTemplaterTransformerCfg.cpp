@@ -1,5 +1,6 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/StoredValue.h>
 #include <transform/findings/Refusal.h>
 #include <transform/specialised/shared/FactoryOption.h>
 #include <transform/specialised/shared/ParameterTable.h>
@@ -90,22 +91,24 @@ bool XMLTemplaterTransformerCfg::validateParameter(const QString& parameter, QSt
 
 bool XMLTemplaterTransformerCfg::validateRoot(QString& message) const {
   const QString value = getParameterValue(kRootTemplate, UnpackLevel::Resolved);
-  if (isUnsetValue(value) || value.startsWith(kConditionalPrefix)) {
+  if (isUnsetValue(value)) {
     return true;
-  }
-  const TemplateText text(value, TemplateText::languageOf(m_isJson));
-  int line = 0;
-  if (!text.isWellFormed(TemplateText::Extent::Document, line)) {
-    return orx::refuse(message, messages::kNotWellFormed, {QString::number(line)});
   }
   QSet<QString> known;
   const ParameterTable templates(*this, kSubTemplates, kColumns, UnpackLevel::Resolved);
   for (int row = 0; row < templates.rowCount(); ++row) {
     known.insert(QORXWwjdDecode(templates.cell(row, kName)));
   }
-  for (const QString& name : text.insertedTemplates()) {
-    if (!known.contains(name)) {
-      return orx::refuse(message, messages::kNoSubTemplate, {name});
+  for (const QString& possible : possibleValues(value)) {
+    const TemplateText text(possible, TemplateText::languageOf(m_isJson));
+    int line = 0;
+    if (!text.isWellFormed(TemplateText::Extent::Document, line)) {
+      return orx::refuse(message, messages::kNotWellFormed, {QString::number(line)});
+    }
+    for (const QString& name : text.insertedTemplates()) {
+      if (!known.contains(name)) {
+        return orx::refuse(message, messages::kNoSubTemplate, {name});
+      }
     }
   }
   return true;
@@ -126,8 +129,11 @@ bool XMLTemplaterTransformerCfg::validateSubTemplates(QString& message) const {
     if (known.contains(name)) {
       return orx::refuse(message, messages::kInputNameTwice, {name});
     }
-    if (templates.cell(row, kTemplate).isEmpty()) {
+    if (isUnsetValue(templates.cell(row, kTemplate))) {
       return templates.refuseMissing(message, kTemplate);
+    }
+    if (templates.cell(row, kTemplate).startsWith(kConditionalPrefix)) {
+      return ParameterTable::refuseRow(message, row, messages::kConditionInTemplate);
     }
     known.insert(name);
     names.append(name);

@@ -1,5 +1,6 @@
 #include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/StoredValue.h>
 #include <transform/findings/Refusal.h>
 #include <transform/specialised/shared/ParameterTable.h>
 #include <transform/specialised/shared/SpecialisedValues.h>
@@ -75,35 +76,41 @@ bool XMLUpdaterTransformerCfg::validateParameter(const QString& parameter, QStri
 }
 
 bool XMLUpdaterTransformerCfg::validateDocument(QString& message) const {
-  const QString value = getParameterValue(kDocument, UnpackLevel::Resolved);
-  int line = 0;
-  if (isUnsetValue(value) || isOpenValue(value) ||
-      TemplateText(value, TemplateText::languageOf(m_isJson))
-          .isWellFormed(TemplateText::Extent::Document, line)) {
-    return true;
+  for (const QString& value : possibleValues(getParameterValue(kDocument, UnpackLevel::Resolved))) {
+    int line = 0;
+    if (!isUnsetValue(value) && !isOpenValue(value) &&
+        !TemplateText(value, TemplateText::languageOf(m_isJson))
+             .isWellFormed(TemplateText::Extent::Document, line)) {
+      return orx::refuse(message, messages::kNotWellFormed, {QString::number(line)});
+    }
   }
-  return orx::refuse(message, messages::kNotWellFormed, {QString::number(line)});
+  return true;
 }
 
 bool XMLUpdaterTransformerCfg::validateUpdates(QString& message) const {
   const ParameterTable updates(*this, kUpdates, kColumns, UnpackLevel::Resolved);
   for (int row = 0; row < updates.rowCount(); ++row) {
-    const QString path = updates.cell(row, kPath);
-    if (!isOpenValue(path) && !isPath(fromRoot(path, m_isJson), m_isJson)) {
-      return ParameterTable::refuseRow(message, row, messages::kBadPath, {QORXWwjdDecode(path)});
+    for (const QString& path : possibleValues(updates.cell(row, kPath))) {
+      if (!isOpenValue(path) && !isPath(fromRoot(path, m_isJson), m_isJson)) {
+        return ParameterTable::refuseRow(message, row, messages::kBadPath, {QORXWwjdDecode(path)});
+      }
     }
     if (updates.cell(row, kAction) == kRemove) {
       continue;
     }
     const QString value = updates.cell(row, kValue);
-    if (value.isEmpty()) {
+    if (isUnsetValue(value)) {
       return updates.refuseMissing(message, row, kValue);
     }
-    int line = 0;
-    if (updates.cell(row, kKind) != kTextKind && !value.startsWith(kConditionalPrefix) &&
-        !TemplateText(value, TemplateText::languageOf(m_isJson))
-             .isWellFormed(TemplateText::Extent::Fragment, line)) {
-      return ParameterTable::refuseRow(message, row, messages::kNotWellFormed, {QString::number(line)});
+    if (updates.cell(row, kKind) == kTextKind) {
+      continue;
+    }
+    for (const QString& part : possibleValues(value)) {
+      int line = 0;
+      if (!TemplateText(part, TemplateText::languageOf(m_isJson))
+               .isWellFormed(TemplateText::Extent::Fragment, line)) {
+        return ParameterTable::refuseRow(message, row, messages::kNotWellFormed, {QString::number(line)});
+      }
     }
   }
   return true;
