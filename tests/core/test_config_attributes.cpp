@@ -92,15 +92,8 @@ TEST(ConfigAttributes, References) {
     const char* value;
     const char* names;  // separated by "|"
   } cases[] = {
-      {"TEXT_OR_ATTR", "@Value(a)", "a"},
-      {"TEXT_OR_ATTR", "x@Value(b)+@Value(a)@Value(b)", "b|a"},
-      {"TEXT_OR_ATTR", "@Value(a (b))", "a (b)"},
-      {"TEXT_OR_ATTR", "@Value(a(b) end", ""},
-      {"TEXT_OR_ATTR", "@Value(open", ""},
       {"TEXT_OR_ATTR", "@Value()", ""},
       {"TEXT_OR_ATTR", "@value(a)", ""},
-      {"TEXT_OR_ATTR", "@Value(\"a b\")", "a b"},
-      {"TEXT_OR_ATTR", "@Value(x@Value(y))", "y"},
       {"TEXT_OR_ATTR", "@Value($(P))", ""},
       {"TEXT_OR_ATTR_ENCODED", "@Value<leftparenthesis>a<space>b<rightparenthesis>", "a b"},
       {"EXPRESSION_ENCODED",

@@ -2,9 +2,7 @@
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/definition/CompiledTemplate.h>
 #include <transform/core/generation/OrderedSubstitution.h>
-#include <transform/core/generation/WrittenValues.h>
 
-#include <QRegularExpression>
 #include <gtest/gtest.h>
 
 #include <random>
@@ -220,39 +218,6 @@ TEST(Tokens, PortsComeBeforeValues) {
   configure(cfg, {{}, {}, {{"A", "TEXT", "$(B)"}, {"B", "TEXT", "b"}}, {"$(A) $(B)"}});
   EXPECT_EQ(statementsOf(cfg), QStringList("b b"));
   EXPECT_TRUE(cfg.log.startsWith("<>") && cfg.log.count('<') == 1) << cfg.log.toStdString();
-}
-
-TEST(Tokens, ValuesThatAreNotNeededNeverShow) {
-  const QStringList tokens{"$(A)", "$(C)", "$(XFORMER_NAME)", "$(ORX_UUID)", "$(XFORMER_NAME_ENCODED)", "x "};
-  std::mt19937 random(23);
-  int unwritten = 0;
-  for (int round = 0; round < 500; ++round) {
-    QStringList lines{round % 10 ? "F" : "F $(ORX_PARM_VAL_LIST)"};
-    for (unsigned i = random() % 5; i > 0; --i)
-      lines << "K " + replaceOne(tokens, random);
-    TestDefinition definition{{}, {}, {}, lines, false, round % 2 ? "G" : ""};
-    definition.parameters = {{"A", "TEXT", "a"},
-                             {"B", "GROUP A", "b"},
-                             {"C", "CHOICE k%l", "k", "C", {"k,stored"}},
-                             {"G", "ATTR_LIST", "g"},
-                             {"XFORMER_NAME", "TEXT", "n"}};
-    const auto written = [&] {
-      QStringList statements = statementsOf(*makeCfg(definition));
-      // The list for the workers holds every value.
-      return statements.replaceInStrings(QRegularExpression("TRANSFORMER_PARAMS:\\S*"), QString());
-    };
-    const QStringList before = written();
-    const auto cfg = makeCfg(definition);
-    const WrittenValues needed(*cfg, false);
-    for (TestParameter& parameter : definition.parameters) {
-      if (needed.contains(*cfg->getParameterByMacroName(parameter.name)))
-        continue;
-      ++unwritten;
-      parameter.value = "changed";
-      EXPECT_EQ(written(), before) << parameter.name.toStdString() << lines.join('|').toStdString();
-    }
-  }
-  EXPECT_GT(unwritten, 500);
 }
 
 }  // namespace

