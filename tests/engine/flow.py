@@ -5,7 +5,7 @@ from collections import namedtuple
 from words import Fault, decode, split, unquote
 
 SETTINGS = {"PARALLELISM": "NO_PARALLELISM|MINIMAL|MODERATE|AGGRESSIVE|EXTREME", "PROCESS_SETTING": "Yes|No",
-            "MAX_LOOP_ITERATIONS": "[0-9]+", "RUN": "STATEMENTS|DEFINITION"}
+            "MAX_LOOP_ITERATIONS": "[0-9]*", "RUN": "STATEMENTS|DEFINITION"}
 Input = namedtuple("Input", "port type filter")
 Output = namedtuple("Output", "port type functions")
 
