@@ -188,7 +188,7 @@ def conditional(case, kind, scope, results):
 def own(case):
     """A reference to another parameter of the same transformer, and what it is to give."""
     name = case.random.choice(case.siblings)
-    return f"$({name})", ("own", name)
+    return (f"$[{name}]", None) if case.random.random() < 0.05 else (f"$({name})", ("own", name))
 
 
 def expression(case, scope):

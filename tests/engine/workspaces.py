@@ -30,7 +30,7 @@ TCL = ["set x [list %s]\nreturn v1"] * 6 + [
     '# |\nreturn "%s\\nv1"', '# |\nset x {%s}\nappend x "\\r"\n$x', '# |\nset x [join [list %s v1] \\n]\nreturn $x']
 # Not drawn while it is being mended: where a text stands, and which texts, as patterns.
 KNOWN = [
-    (".*_ENCODED", "^@Value"),
+    (".*_ENCODED|TEXT_EDIT.*", "^@Value"),
 ]
 
 

@@ -5,6 +5,7 @@
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
 #include <transform/core/TransformerCfgListener.h>
 #include <transform/core/ValueReferences.h>
@@ -99,6 +100,30 @@ Known knownAround(const TransformerCfg& cfg) {
   return {expand, [types](const QString& name) {
             return types ? spellingOf(types->typeOf(name)) : Spelling::Unknown;
           }};
+}
+
+Known knownWithin(const TransformerCfg& cfg) {
+  constexpr int kMostRounds = 8;
+  const Known around = knownAround(cfg);
+  const auto isOwn = [&cfg](const QString& name) { return cfg.getParameterByMacroName(name) != nullptr; };
+  const auto expand = [&cfg, around, isOwn](QString& text) {
+    for (int round = 0; round < kMostRounds && anyParameterReference(text, isOwn); ++round) {
+      text = replaceParameterReferences(text, [&](const QString& name, QString& value) {
+        const TransformParamCfg* record = cfg.getParameterByMacroName(name);
+        if (record && !record->isUnset())
+          value = single_choices::toStored(*record, record->getValue());
+        return record != nullptr;
+      });
+    }
+    return around.expand(text);
+  };
+  return {expand, [&cfg, around, isOwn](const QString& name) {
+            return isOwn(name) ? spellingOf(*cfg.getParameterByMacroName(name)) : around.spellingOf(name);
+          }};
+}
+
+bool isAround(const TransformerCfg& cfg, const QString& parameter) {
+  return cfg.listener() && cfg.listener()->isRunTimeValue(cfg, kMacroOpen + parameter + QLatin1Char(')'));
 }
 
 bool isReadDecoded(const GUIType& type, const QString& part) {

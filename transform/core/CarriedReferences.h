@@ -41,6 +41,11 @@ class ORX_EXPORT ScopeTypes {
 // By the listener of the transformer. Its own parameters are not looked at.
 ORX_EXPORT Known knownAround(const TransformerCfg& cfg);
 
+// With its own ones, which come first.
+ORX_EXPORT Known knownWithin(const TransformerCfg& cfg);
+// Whether a parameter of that name stands around the transformer, whose reference is left to the engine.
+ORX_EXPORT bool isAround(const TransformerCfg& cfg, const QString& parameter);
+
 // How a table reaches its statement: as one packed text, or cell by cell.
 enum class TableForm { Packed, ByRows };
 

@@ -516,6 +516,5 @@ constexpr long kRowBreaksOff = 371343;
 constexpr long kConditionForRows = 371344;
 constexpr long kConditionInTemplate = 371345;
 constexpr long kResultBreaksLine = 371346;
-constexpr long kOwnReferenceInRow = 371347;
 
 }  // namespace orx::messages

@@ -102,7 +102,10 @@ bool ValueChecks::standsForReferences(Rule rule) const {
 }
 
 void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const QStringList& names) {
-  const ExpandReferences expand = carried_references::knownAround(node.cfg).expand;
+  // Tokens of custom transformers are macros of what stands around them.
+  const ExpandReferences expand = (isCustomTransformer(&node.cfg) ? carried_references::knownAround(node.cfg)
+                                                                  : carried_references::knownWithin(node.cfg))
+                                      .expand;
   for (const QString& parameter : node.cfg.getParameters()) {
     QString text;
     const orx::RefusalListener listener;

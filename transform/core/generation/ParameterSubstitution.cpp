@@ -1,4 +1,5 @@
 #include <platform/qorxcore/Lists.h>
+#include <transform/core/CarriedReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
@@ -134,17 +135,12 @@ std::vector<ParameterSubstitution::Token> ParameterSubstitution::tokens() const 
   for (const Entry& entry : m_entries) {
     tokens.insert(tokens.end(), entry.tokens.begin(), entry.tokens.end());
     for (const QString& token : entry.removed) {
-      if (!isAround(token)) {
+      if (!carried_references::isAround(m_cfg, token)) {
         tokens.push_back({token, QString(), nullptr, false});
       }
     }
   }
   return tokens;
-}
-
-// Whether the token, which has no value here, is the reference to a parameter around the transformer.
-bool ParameterSubstitution::isAround(const QString& token) const {
-  return m_cfg.listener() && m_cfg.listener()->isRunTimeValue(m_cfg, kMacroOpen + token + QLatin1Char(')'));
 }
 
 void ParameterSubstitution::putInto(Substitution& lines) const {

@@ -54,7 +54,6 @@ class ParameterSubstitution {
   bool isInert(const TransformParamCfg& record) const;
   void collect(std::size_t position, MFBuffer& buffer);
   void putDeferred(Substitution& lines) const;
-  bool isAround(const QString& token) const;
   QString valueList() const;
 
   const TransformerCfg& m_cfg;

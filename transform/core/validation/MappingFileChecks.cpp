@@ -3,7 +3,6 @@
 #include <transform/core/CarriedReferences.h>
 #include <transform/core/ConfiguredDefinition.h>
 #include <transform/core/ExpressionWriter.h>
-#include <transform/core/FormulaChecks.h>
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/LookupChecks.h>
@@ -63,13 +62,10 @@ QHash<QString, QString> MappingFileChecks::find() const {
   for (const TransformParamCfg& record : m_records) {
     const QString stored = stripBasicStringInfo(m_cfg.getParameterValue(record.getName()));
     const QString fault = value_shape::fault(record, stored);
-    QString formula;
     if (!fault.isEmpty()) {
       messages.insert(record.getName(), fault);
     } else if (const long number = refuse(record, stored)) {
       messages.insert(record.getName(), TransformResString(number));
-    } else if (!checkFormulas(record, stored, formula)) {
-      messages.insert(record.getName(), formula);
     }
   }
   return messages;
@@ -89,15 +85,6 @@ long MappingFileChecks::refuse(const TransformParamCfg& record, const QString& s
   }
   if (!m_written.contains(record)) {
     return 0;
-  }
-  // Rows are written behind the template, in which alone the tokens of the transformer are replaced.
-  const auto isOwn = [this](const QString& token) {
-    return m_cfg.hasParameter(token) &&
-           !(m_cfg.listener() &&
-             m_cfg.listener()->isRunTimeValue(m_cfg, kMacroOpen + token + QLatin1Char(')')));
-  };
-  if (m_written.isWrittenByRows(record) && anyParameterReference(stored, isOwn)) {
-    return messages::kOwnReferenceInRow;
   }
   NullBuffer buffer;
   QString value = m_cfg.getParameterValueForMappingFile(name, &record, buffer);
@@ -153,15 +140,11 @@ long MappingFileChecks::refuseReferences(const TransformParamCfg& record, const 
                       return own != Spelling::Unknown ? own : m_around.spellingOf(name);
                     }};
   const bool isByRows = m_written.isWrittenByRows(record);
+  if ((isByRows && holdsTokens(stored)) || defersOwn(stored)) {
+    return messages::kOwnReferenceApart;
+  }
   return carried_references::refuse(record, stored, written, isByRows ? TableForm::ByRows : TableForm::Packed,
                                     known);
-}
-
-bool MappingFileChecks::checkFormulas(const TransformParamCfg& record, const QString& stored,
-                                      QString& message) const {
-  QString inserted = stored;
-  return !m_tokens || !m_written.contains(record) || !insertTokens(inserted) || inserted == stored ||
-         ::checkFormulas(record, stored, message, [this](QString& text) { return expand(text); });
 }
 
 long MappingFileChecks::refuseMembers(const TransformParamCfg& record, const QString& stored,
@@ -251,11 +234,9 @@ long MappingFileChecks::refuseLookup(const TransformParamCfg& record, const QStr
                    record.getFlag(kGUITypeOptional)};
   if (kind == LookupKind::RunTime) {
     // The fragment stands ahead of the lines that tokens are substituted in: there they are macros.
-    const bool isLoose =
-        m_tokens && anyParameterReference(value, [this](const QString& name) {
-          return m_cfg.hasParameter(name) &&
-                 !m_cfg.listener()->isRunTimeValue(m_cfg, kMacroOpen + name + QLatin1Char(')'));
-        });
+    const bool isLoose = m_tokens && anyParameterReference(value, [this](const QString& name) {
+                           return m_cfg.hasParameter(name) && !carried_references::isAround(m_cfg, name);
+                         });
     if (isLoose) {
       return messages::kValueInScript;
     }
@@ -284,7 +265,8 @@ bool MappingFileChecks::refersToShownSide(const TransformParamCfg& record, const
   return single_choices::refersToShownSide(record, value, [this](QString& text) { return expand(text); });
 }
 
-// These values go into a statement as they are stored, and nothing looks them up.
+// These values go into a statement of their own as they are stored. Nothing looks them up, and no tokens are
+// replaced.
 long MappingFileChecks::refuseParallelSetting(const TransformParamCfg& record, const QString& stored) const {
   if (!m_written.isMultiProcessSetting(record) || !multi_process_writer::settingsOf(m_cfg).isEnabled) {
     return 0;
@@ -292,9 +274,7 @@ long MappingFileChecks::refuseParallelSetting(const TransformParamCfg& record, c
   if (stored.startsWith(kConditionalPrefix) || beginsValueReference(stored)) {
     return messages::kParallelByFeature;
   }
-  // They stand in a statement of their own, where tokens are not replaced.
-  QString inserted = stored;
-  if (!insertTokens(inserted) || inserted != stored) {
+  if (holdsTokens(stored)) {
     return messages::kOwnReferenceApart;
   }
   return refersToShownSide(record, stored) ? messages::kShownSideReferred : 0;
@@ -311,6 +291,20 @@ long MappingFileChecks::refuseChoices(const ChoiceList& choices) const {
     }
   }
   return 0;
+}
+
+bool MappingFileChecks::holdsTokens(const QString& text) const {
+  QString inserted = text;
+  return !insertTokens(inserted) || inserted != text;
+}
+
+// Deferred references become ordinary ones when tokens have been replaced.
+bool MappingFileChecks::defersOwn(const QString& stored) const {
+  const std::vector<MacroReference> references = macroReferences(stored);
+  return std::any_of(references.begin(), references.end(), [&](const MacroReference& reference) {
+    return reference.isDeferred && reference.isClosed && m_cfg.hasParameter(reference.name(stored)) &&
+           !carried_references::isAround(m_cfg, reference.name(stored));
+  });
 }
 
 bool MappingFileChecks::insertTokens(QString& text) const {

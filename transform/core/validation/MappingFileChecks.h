@@ -42,9 +42,10 @@ class MappingFileChecks {
   long refuseToken(const GUIType& type, const QString& stored, const QString& written) const;
   long refuseMembers(const TransformParamCfg& record, const QString& stored,
                      const QStringList& written) const;
-  // Formulas into which tokens of the transformer itself bring something; others are judged with the values.
-  bool checkFormulas(const TransformParamCfg& record, const QString& stored, QString& message) const;
-  // What tokens of the transformer itself bring; false when that has no end.
+  // Whether tokens of the transformer itself stand in the text.
+  bool holdsTokens(const QString& text) const;
+  bool defersOwn(const QString& stored) const;
+  // What the tokens bring; false when that has no end.
   bool insertTokens(QString& text) const;
   long refuseCells(const TransformParamCfg& record, const QString& stored) const;
   // As the engine sees the text when it runs a fragment; false when that has no end.

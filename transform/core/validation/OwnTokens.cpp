@@ -1,8 +1,9 @@
 #include <transform/core/GenerationKeywords.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/ParameterReferences.h>
+#include <transform/core/SingleChoices.h>
 #include <transform/core/TransformerCfg.h>
-#include <transform/core/TransformerCfgListener.h>
+#include <transform/core/generation/LookupDecision.h>
 #include <transform/core/generation/ParameterSubstitution.h>
 #include <transform/core/validation/OwnTokens.h>
 
@@ -13,6 +14,16 @@ using carried_references::Spelling;
 constexpr int kDeepest = 64;
 constexpr int kLargest = 1 << 18;
 
+// The value of a token; where a fragment looks it up when the mapping file runs, what it will find.
+QString lookedUp(const TransformerCfg& cfg, const ParameterSubstitution::Token& token) {
+  const TransformParamCfg* record = cfg.getParameterByMacroName(token.name);
+  QString stored = record ? record->getValue() : QString();
+  const bool isLookedUp = record && lookupKind(cfg, *record, stored) == LookupKind::RunTime;
+  return isLookedUp && carried_references::knownAround(cfg).expand(stored)
+             ? single_choices::toStored(*record, stored)
+             : token.value;
+}
+
 }  // namespace
 
 OwnTokens::OwnTokens(const TransformerCfg& cfg, const ParameterSubstitution& values) : m_cfg(cfg) {
@@ -22,14 +33,13 @@ OwnTokens::OwnTokens(const TransformerCfg& cfg, const ParameterSubstitution& val
     const bool isCall = token.value.startsWith(kEvaluateCall) || token.value.startsWith(kProcedureCall) ||
                         (token.name == kIdentifierParameter && token.value.startsWith(QLatin1Char('"')));
     const Spelling own = token.type ? carried_references::spellingOf(*token.type) : Spelling::Plain;
-    m_values.insert(token.name, {token.value, isCall ? Spelling::Call : own});
+    m_values.insert(token.name, {lookedUp(cfg, token), isCall ? Spelling::Call : own});
   }
 }
 
 // The value that is its own token refers to the parameter of that name around the transformer.
 bool OwnTokens::leadsAround(const QString& token, const QString& value) const {
-  const TransformerCfgListener* listener = m_cfg.listener();
-  return value == kMacroOpen + token + QLatin1Char(')') && listener && listener->isRunTimeValue(m_cfg, value);
+  return value == kMacroOpen + token + QLatin1Char(')') && carried_references::isAround(m_cfg, token);
 }
 
 Spelling OwnTokens::spellingOf(const QString& token) const {

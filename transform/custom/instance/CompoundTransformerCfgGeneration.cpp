@@ -67,28 +67,6 @@ QString ownReference(const QString& value, const TransformerCfg& instance) {
   return own;
 }
 
-// With `meansOwn`, references may be to the instance's own parameters.
-carried_references::Known knownTo(const TransformerCfg& instance, bool meansOwn) {
-  const carried_references::Known around = carried_references::knownAround(instance);
-  if (!meansOwn)
-    return around;
-  const auto expand = [&instance, around](QString& text) {
-    constexpr int kMostRounds = 8;
-    for (int round = 0; round < kMostRounds && !ownReference(text, instance).isEmpty(); ++round) {
-      text = replaceParameterReferences(text, [&](const QString& name, QString& value) {
-        value = instance.hasParameter(name) ? instance.getParameterValue(name) : QString();
-        return instance.hasParameter(name);
-      });
-    }
-    return around.expand(text);
-  };
-  return {expand, [&instance, around](const QString& name) {
-            return instance.hasParameter(name)
-                       ? carried_references::spellingOf(instance.getParameterGUIType(name))
-                       : around.spellingOf(name);
-          }};
-}
-
 // Those of an instance that mean each other, so that an engine would never have done with them.
 QStringList parametersInCircles(const TransformerCfg& instance) {
   const QStringList names = instance.getParameters();
@@ -440,7 +418,9 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   if (stored.startsWith(kConditionalPrefix))
     return messages::kConditionInMacro;
   const TransformParamCfg* record = getParameterByMacroName(parameter);
-  const carried_references::Known known = knownTo(*this, record && record->getFlag(kGUITypeInstanceMacros));
+  const bool meansOwn = record && record->getFlag(kGUITypeInstanceMacros);
+  const carried_references::Known known =
+      meansOwn ? carried_references::knownWithin(*this) : carried_references::knownAround(*this);
   if (record && single_choices::refersToShownSide(*record, stored, known.expand))
     return messages::kShownSideReferred;
   const GUIType& type = getParameterGUIType(parameter);
