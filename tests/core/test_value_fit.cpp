@@ -31,7 +31,8 @@ TEST(ValueFit, OnlyPlainValuesAreJudged) {
        Misfit::WholeNumber},
       {"INTEGER_OR_ATTR", "@Value(n)|@Abs(1)", "n|&n", Misfit::WholeNumber},
       {"FLOAT_OR_ATTR", "1|-.5|1e-3|2.|$(X)", "&n|1,5|inf|nan|1e999|1 2|n", Misfit::Number},
-      {"RANGE_SLIDER -1%2.5%1", "-1|2.5|0", "-1.01|3", Misfit::Range},
+      {"RANGE_SLIDER -1%2.5%1", "-1|2.5|0|ORX_CONDITIONAL:9;2;9;1<plussign>1",
+       "-1.01|3|ORX_CONDITIONAL:1;3;2", Misfit::Range},
       {"RANGE_SLIDER", "1e9", "many", Misfit::Number},
       {"TEXT", "x|1", "", Misfit::None},
   };
@@ -52,6 +53,7 @@ TEST(ValueFit, PartsAreJudgedByTheirOwnTypes) {
     const char* type;
     const char* value;
     const char* misfits;
+    const char* known = "";  // what references lead to
   } cases[] = {
       {"GUI_LINE_TABLE "
        "<semicolon>,GUI<space>CHOICE<space>A<space>x<percentsign>y<space>First,GUI<space>INT<space>B<space>"
@@ -59,11 +61,19 @@ TEST(ValueFit, PartsAreJudgedByTheirOwnTypes) {
        "x;1;z;two;y", "First=z Second=two"},
       {"MULTIPARAMETER <semicolon>,GUI<space>INT<space>A<space>First", "A;1.5;B;x", "First=1.5"},
       {"MULTIPARAMETER <semicolon>,GUI<space>INT<space>A<space>First", "ORX_CONDITIONAL:A;1.5", ""},
+      {"MULTIPARAMETER "
+       "<semicolon>,GUI<space>INT<space>A<space>First,GUI<space>OPTIONAL<space>INT<space>B<space>S",
+       "A;$(R);B;$(R)", "First=$(R)"},
+      {"MULTIPARAMETER <semicolon>,GUI<space>INT<space>A<space>First", "A;1.$(R)", "First=1.5", "5"},
+      {"MULTIPARAMETER <semicolon>,GUI<space>TEXT<space>A<space>First", "A;$(R)x", ""},
+      {"GUI_LINE_TABLE <semicolon>,GUI<space>CHOICE<space>A<space>x<percentsign>y<space>First", "x;$(R)",
+       "First=z", "z"},
   };
   for (const auto& c : cases) {
     const TransformParamCfg parameter(GUIType::fromTransformerTypeString(c.type, "P"));
     QStringList found;
-    for (const ValueFit& fit : ValueFit::misfitsOf(parameter, c.value))
+    for (const ValueFit& fit :
+         ValueFit::misfitsOf(parameter, c.value, [&](QString& text) { text.replace("$(R)", c.known); }))
       found.append(fit.prompt + '=' + fit.value);
     EXPECT_EQ(found.join(' '), c.misfits) << c.value;
   }

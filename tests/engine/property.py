@@ -106,6 +106,9 @@ class Property:
         if case.broken():
             return [("judgement", "written though broken", case.broken()[0])]
         run = self.read(case, output)
+        unfit = [value.stored for _, node, _, _ in case.instances() for value in node.values.values() if value.unfit]
+        if unfit:
+            return [("judgement", "unfit but written", unfit)]
         found = [("lint", each, "") for each in linted]
         found += [("engine", each, "") for each in run.complaints(case.feature)]
         found += [*self.flows(case, run), *self.values(case, run)]

@@ -1,5 +1,6 @@
 """Values for parameters of every type, and what each is to come back as."""
 import json
+import re
 from html import escape
 
 from catalogue import Parameter
@@ -23,10 +24,23 @@ class Value:
         self.stored, self.expected = stored, expected
         self.fixed = False  # whether instances keep it
         self.broken = broken  # whether nothing may be written with it
+        self.unfit = False  # whether it has to be refused
 
 
 def is_encoded(kind):
     return kind.endswith("_ENCODED") or kind.startswith("TEXT_EDIT")
+
+
+def encoded_text(case, text, kind):
+    """The stored form and what it means; now and then nobody encoded it, which is refused or read as it stands."""
+    if case.random.random() < 0.05:
+        return text, None if any(mark in text for mark in ("$(", "$[", "@Value")) else decode(text)
+    return as_text(text) if may_refer(kind) else encode(text), text
+
+
+def as_text(text):
+    """Where a wholly encoded reference is one, the same letters are spelt with a number."""
+    return encode(text).replace("<commercialat>Value<leftparenthesis>", "<u0040>Value<leftparenthesis>")
 
 
 def may_refer(kind):
@@ -55,6 +69,10 @@ def make(case, parameter, scope):
         return table(case, parameter, scope)
     if kind == "MULTIPARAMETER":
         return multi(case, parameter, scope)
+    if rng.random() < 0.01 and not scope.name and kind != "CHECKBOX":
+        value = referred(case, scope, "OPTIONAL TEXT", "", "")
+        value.expected, value.unfit = None, "OPTIONAL" not in parameter.flags
+        return value
     if "CHOICE" in kind or "LISTBOX" in kind or kind == "CHECKBOX":
         return choice(case, parameter, scope)
     if kind.startswith(("INT", "FLOAT", "RANGE")):
@@ -124,8 +142,14 @@ def numeric(case, kind, scope):
     if rng.random() < 0.05:
         return referred(case, scope, "FLOAT", number, number)
     if rng.random() < 0.05:
-        return referred(case, scope, "TEXT", given := case.text(number, "referred number"), given)
+        value = referred(case, scope, "TEXT", given := case.text(number, "referred number"), given)
+        value.unfit = not scope.name and not any(mark in given for mark in ("$", "<Unused>")) and not number_in(given)
+        return value
     return Value(number, number)
+
+
+def number_in(text):
+    return re.fullmatch(r"[-+]?(\d+\.?\d*|\.\d+)(e[-+]?\d+)?", text.strip(), re.ASCII | re.IGNORECASE)
 
 
 def reference(name, encoded):
@@ -141,8 +165,8 @@ def text(case, kind, scope):
     macros = [(name, value) for name, of, _, value in scope.parameters
               if mixed or (is_encoded(of) or of.endswith("_PARM")) == encoded and of != "FLOAT"]
     meaning = shaped(kind, case.text("t", kind))
-    stored = encode(meaning) if encoded else meaning
-    expected = None if not encoded and any(mark in meaning for mark in MEANS) else meaning
+    stored, meant = encoded_text(case, meaning, kind) if encoded else (meaning, meaning)
+    expected = None if not encoded and any(mark in meaning for mark in MEANS) else meant
     parts = [(stored, expected)]
     if may_refer(kind) and scope.referable and rng.random() < 0.3:
         name = rng.choice(scope.referable)
@@ -179,9 +203,9 @@ def conditional(case, kind, scope, results):
     (yes, first), (no, second) = results
     condition = encode("@Value(" + reference(name, False)[7:-1] + ") > ")
     if case.siblings and case.random.random() < 0.1:
-        return Value("ORX_CONDITIONAL:" + ";".join([condition + own(case)[0], encode(yes), encode(no)]))
+        return Value("ORX_CONDITIONAL:" + ";".join([condition + own(case)[0], as_text(yes), as_text(no)]))
     condition += encode(limit)
-    return Value("ORX_CONDITIONAL:" + ";".join([condition, encode(yes), encode(no)]),
+    return Value("ORX_CONDITIONAL:" + ";".join([condition, as_text(yes), as_text(no)]),
                  [first if float(case.feature.get(name)) > float(limit) else second])
 
 

@@ -5,7 +5,7 @@ from html import escape
 
 from flow import origin
 from functions import Feature
-from values import CONFIG, LOOKUP, MEANS, NUMBERS, Value, is_encoded, level, make, reference
+from values import CONFIG, LOOKUP, MEANS, NUMBERS, Value, encoded_text, is_encoded, level, make, reference
 from words import decode, encode
 
 HOSTILE = [
@@ -28,10 +28,6 @@ HEADERS = [
 TCL = ["set x [list %s]\nreturn v1"] * 6 + [
     'set x "%s\\n"\nreturn [string range "v1" 0 end]', 'set x "\\n"\nset x v1\nset y %s\nset x',
     '# |\nreturn "%s\\nv1"', '# |\nset x {%s}\nappend x "\\r"\n$x', '# |\nset x [join [list %s v1] \\n]\nreturn $x']
-# Not drawn while it is being mended: where a text stands, and which texts, as patterns.
-KNOWN = [
-    (".*_ENCODED|TEXT_EDIT.*", "^@Value"),
-]
 
 
 def element(name, attributes, inner=""):
@@ -94,8 +90,7 @@ class Case:
         """A text: mostly harmless. Each draw has a number, so that single ones can be left out."""
         hostile, at = self.random.random() < self.rate, self.random.randrange(len(HOSTILE))
         self.drawn += 1
-        if not hostile or self.drawn in self.skipped or any(
-                re.match(known, where) and re.search(pattern, HOSTILE[at]) for known, pattern in KNOWN):
+        if not hostile or self.drawn in self.skipped:
             return plain
         self.used.append((self.drawn, where, HOSTILE[at]))
         return f"h{at}" if self.tame else HOSTILE[at]
@@ -147,7 +142,7 @@ class Case:
     def _parameter(self, scope, at):
         rng = self.random
         scripts = ["SCRIPT", "TEXT_ENCODED"] if not scope.loops else []
-        kind = rng.choice(["TEXT_ENCODED", "TEXT", "FLOAT", "LOOKUP_CHOICE", *scripts])
+        kind = rng.choice(["TEXT_ENCODED", "TEXT_EDIT", "PASSWORD_ENCODED", "TEXT", "FLOAT", "LOOKUP_CHOICE", *scripts])
         prompt = self.text("Prompt", "prompt")
         value = self.constant(kind, None if scope.name else scope)
         kind = value.kind if kind == "SCRIPT" else kind
@@ -177,8 +172,8 @@ class Case:
             name = self.random.choice(scope.referable)
             return Value(reference(name, kind == "TEXT_ENCODED"), self.feature.get(name))
         text = self.text("t", kind)
-        if kind == "TEXT_ENCODED":
-            return Value(encode(text), text)
+        if is_encoded(kind):
+            return Value(*encoded_text(self, text, kind))
         return Value(text, None if any(mark in text for mark in MEANS) else text.strip(" \t"))
 
     def _port(self, scope, plain, kind):

@@ -174,7 +174,7 @@ TEST(MacroText, ReferencesAreFoundAsAnEngineExpandsThem) {
     QString deferred = text;
     deferred.replace("$(", "$[").replace(')', ']');
     const QString closed = withoutReferences(text);
-    if (!text.contains(']') && !text.contains("$()")) {
+    if (!text.contains(']')) {
       EXPECT_EQ(closesDeferredReferences(deferred), !closed.contains("$(")) << text.toStdString();
     }
   }

@@ -1,6 +1,8 @@
 #include <tests/support/QtPrinters.h>
 #include <tests/translation/TranslatedWorkspace.h>
 
+#include <QRegularExpression>
+
 namespace {
 
 SmallWorkspace copyBetween() {
@@ -105,6 +107,11 @@ TEST(Translation, AttributeLinksCopyAttributes) {
   EXPECT_FALSE(text.contains("(id,id)"));
 }
 
+// Not every text that a lookup can carry is one of the choices.
+QStringList unwritable(const Outcome& outcome) {
+  return outcome.diagnostics.filter(QRegularExpression("^(cycle|unwritable)"));
+}
+
 TEST(Translation, MacrosInLookupsAreJudgedByTheirValues) {
   const struct {
     QString value;        // of the choice
@@ -133,20 +140,19 @@ TEST(Translation, MacrosInLookupsAreJudgedByTheirValues) {
     for (int i = 0; i < test.globals.size(); i += 2)
       workspace.parameter("GUI TEXT " + test.globals.at(i) + " Prompt", test.globals.at(i + 1));
     workspace.transformer(7, "Pick", {"XFORMER_NAME", "P", "MODE", test.value});
-    const Outcome outcome = translate(workspace);
     const QStringList expected =
         test.isRound ? QStringList{"cycle ", "unwritable-value P"} : QStringList("unwritable-value P");
-    EXPECT_EQ(outcome.diagnostics, test.isFine ? QStringList() : expected)
+    EXPECT_EQ(unwritable(translate(workspace)), test.isFine ? QStringList() : expected)
         << test.value.toStdString() << ' ' << test.globals.join(' ').left(40).toStdString();
   }
   // A value that the header or the call gives counts.
   SmallWorkspace workspace = copyBetween();
   workspace.header("MACRO A {").transformer(7, "Pick", {"XFORMER_NAME", "P", "MODE", "$(A)"});
-  EXPECT_EQ(translate(workspace).diagnostics, QStringList("unwritable-value P"));
+  EXPECT_EQ(unwritable(translate(workspace)), QStringList("unwritable-value P"));
   EXPECT_EQ(translate(workspace, {{"A", "Fast"}}).diagnostics, QStringList());
   SmallWorkspace continued = copyBetween();
   continued.header("MACRO A x\\").header("{").transformer(7, "Pick", {"XFORMER_NAME", "P", "MODE", "$(A)"});
-  EXPECT_EQ(translate(continued).diagnostics, QStringList("unwritable-value P"));
+  EXPECT_EQ(unwritable(translate(continued)), QStringList("unwritable-value P"));
 }
 
 TEST(Translation, LookupsInsideCustomTransformersAreJudgedByTheInstances) {
@@ -175,7 +181,7 @@ TEST(Translation, LookupsInsideCustomTransformersAreJudgedByTheInstances) {
                           {"SUB_DOC_NAME", "Cleaner", "XFORMER_NAME", test.identifier, "LIMIT", test.value});
     workspace.beginCustom("Cleaner", {"CATEGORY", "Mine"}).parameter("GUI TEXT LIMIT Limit", "Fast");
     workspace.transformer(3, test.type, {"XFORMER_NAME", "P", "MODE", test.inner}).endCustom();
-    EXPECT_EQ(translate(workspace).diagnostics, test.diagnostics) << test.inner << ' ' << test.value;
+    EXPECT_EQ(unwritable(translate(workspace)), test.diagnostics) << test.inner << ' ' << test.value;
   }
 }
 

@@ -77,10 +77,43 @@ int operatorSize(const QString& text, int position) {
   return found == std::end(operators) ? 0 : found->size();
 }
 
+QString quoted(const QString& piece) {
+  return piece.size() > kLongestQuote ? piece.left(kLongestQuote) + QChar(0x2026) : piece;
+}
+
+// A text, which stands in quotes, that does not read as a number.
+bool isNoNumber(const Formula::Token& token) {
+  bool isNumber = false;
+  token.text.mid(1, token.text.size() - 2).toDouble(&isNumber);
+  return token.kind == Formula::Kind::Text && !isNumber;
+}
+
+bool calculates(const Formula::Token& token) {
+  static const QString kSigns = QStringLiteral("+-*/%");
+  return (token.kind == Formula::Kind::Operator || token.kind == Formula::Kind::Sign) &&
+         kSigns.contains(token.text);
+}
+
+// What stands on both sides of an operand, brackets around it alone aside; null for nothing.
+std::pair<const Formula::Token*, const Formula::Token*> aroundBrackets(
+    const std::vector<Formula::Token>& tokens, std::size_t operand) {
+  std::size_t before = operand;
+  std::size_t behind = operand + 1;
+  while (before > 0 && behind < tokens.size() && tokens[before - 1].kind == Formula::Kind::Open &&
+         tokens[behind].kind == Formula::Kind::Close) {
+    --before;
+    ++behind;
+  }
+  return {before > 0 ? &tokens[before - 1] : nullptr, behind < tokens.size() ? &tokens[behind] : nullptr};
+}
+
 }  // namespace
 
 Formula::Formula(const QString& text) : m_text(text) {
   parse();
+  if (isValid()) {
+    judgeOperands();
+  }
 }
 
 bool Formula::take(int& position, bool wantsOperand, Token& token) const {
@@ -120,7 +153,10 @@ bool Formula::take(int& position, bool wantsOperand, Token& token) const {
   }
   if (m_text.midRef(start, kValueReference.size()) == kValueReference) {
     const int end = endOfValueReference(m_text, start);
-    return end != start + kValueReference.size() + 1 && finish(Kind::Attribute, end);
+    // Where one stands inside, the outer one is no reference.
+    return end != start + kValueReference.size() + 1 &&
+           isValueReference(m_text.mid(start, end - start), ReferenceForms::Plain) &&
+           finish(Kind::Attribute, end);
   }
   if (isDigit(c) || c == QLatin1Char('.')) {
     return finish(Kind::Number, numberEnd(m_text, start));
@@ -182,13 +218,51 @@ void Formula::parse() {
   }
 }
 
+void Formula::judgeOperands() {
+  for (std::size_t i = 0; i < m_tokens.size(); ++i) {
+    const Token& token = m_tokens[i];
+    const bool dividesByNothing =
+        token.kind == Kind::Number && token.text.toDouble() == 0 && i > 0 &&
+        (m_tokens[i - 1].text == QLatin1String("/") || m_tokens[i - 1].text == QLatin1String("%"));
+    if (!dividesByNothing && !isNoNumber(token)) {
+      continue;
+    }
+    const auto [left, right] = aroundBrackets(m_tokens, i);
+    const bool isOperand = (left && calculates(*left)) || (right && calculates(*right));
+    if (dividesByNothing || isOperand) {
+      m_fault = token.position;
+      m_noNumber = token.text;
+      return;
+    }
+  }
+}
+
+bool Formula::refuseNumber(QString& message, const QString& piece) const {
+  return orx::refuse(message, messages::kNeverNumber, {quoted(piece)});
+}
+
+bool Formula::mayGiveNumber(QString& message) const {
+  for (std::size_t i = 0; i < m_tokens.size(); ++i) {
+    if (!isNoNumber(m_tokens[i])) {
+      continue;
+    }
+    const auto [left, right] = aroundBrackets(m_tokens, i);
+    if (!left && !right) {
+      return refuseNumber(message, m_tokens[i].text);
+    }
+  }
+  return true;
+}
+
 bool Formula::refuse(QString& message) const {
+  if (!m_noNumber.isEmpty()) {
+    return refuseNumber(message, m_noNumber);
+  }
   const QString rest = m_text.mid(m_fault);
   if (rest.isEmpty()) {
     return orx::refuse(message, messages::kIncomplete);
   }
-  return orx::refuse(message, messages::kNotUnderstood,
-                     {rest.size() > kLongestQuote ? rest.left(kLongestQuote) + QChar(0x2026) : rest});
+  return orx::refuse(message, messages::kNotUnderstood, {quoted(rest)});
 }
 
 QString Formula::withOwnOperators(const QString& text) {

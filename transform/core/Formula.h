@@ -28,6 +28,8 @@ class Formula {
 
   // Tells the user about the fault; always false.
   bool refuse(QString& message) const;
+  // Where a number is wanted: false, and told to the user, when it is a text alone that does not read as one.
+  bool mayGiveNumber(QString& message) const;
 
   // The text with "==", "<>", "&&", "||" and "!" as the operators that formulas have for them. Texts and
   // attributes stay as they are.
@@ -36,8 +38,12 @@ class Formula {
  private:
   bool take(int& position, bool wantsOperand, Token& token) const;
   void parse();
+  // What makes every calculation fail: a text among its operands, a division by 0.
+  void judgeOperands();
+  bool refuseNumber(QString& message, const QString& piece) const;
 
   QString m_text;
   std::vector<Token> m_tokens;
   int m_fault = -1;
+  QString m_noNumber;  // the piece at the fault, when it spoils every calculation
 };

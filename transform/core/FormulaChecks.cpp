@@ -11,27 +11,35 @@ namespace {
 
 const QLatin1Char kPartSeparator(';');
 
-void add(QStringList& formulas, QString text, bool isEncoded, bool isCondition,
+enum class Role { Expression, Condition, Number, NumberOfCondition };
+
+struct FormulaText {
+  QString text;
+  Role role;
+};
+
+void add(std::vector<FormulaText>& formulas, QString text, bool isEncoded, Role role,
          const ExpandReferences& expand) {
   if (expand && beginsMacroReference(text)) {
     expand(text);
   }
   const QString decoded = isEncoded ? QORXWwjdDecode(text) : text;
-  const bool isUnset = decoded.trimmed().isEmpty() || text == kUnusedValue || decoded == kUnusedValue;
-  if ((isCondition || !isUnset) && !decoded.contains(kMacroOpen) && !decoded.contains(kDeferredOpen)) {
-    formulas.append(decoded);
+  // In a condition a part without a value is an empty one.
+  const bool isPart = role == Role::Condition || role == Role::NumberOfCondition;
+  const bool isUnset = decoded.trimmed().isEmpty() || (!isPart && decoded == kUnusedValue);
+  if ((role == Role::Condition || !isUnset) && !decoded.contains(kMacroOpen) &&
+      !decoded.contains(kDeferredOpen)) {
+    formulas.push_back({decoded, role});
   }
 }
 
-}  // namespace
-
-QStringList formulasIn(const GUIType& type, const QString& value, const ExpandReferences& expand) {
+std::vector<FormulaText> textsIn(const GUIType& type, const QString& value, const ExpandReferences& expand) {
   const bool isExpression = type.getType().startsWith(kExpressionType);
   const bool isComputed = isExpression || ExpressionWriter::isComputed(type);
-  QStringList formulas;
+  std::vector<FormulaText> formulas;
   if (!value.startsWith(kConditionalPrefix)) {
     if (isExpression || (isComputed && ExpressionWriter::needsWrapping(type, value))) {
-      add(formulas, value, type.valueIsEncoded(), false, expand);
+      add(formulas, value, type.valueIsEncoded(), isExpression ? Role::Expression : Role::Number, expand);
     }
     return formulas;
   }
@@ -39,8 +47,19 @@ QStringList formulasIn(const GUIType& type, const QString& value, const ExpandRe
   for (int i = 0; i < parts.size(); ++i) {
     const bool isResult = i % 2 == 1 || i + 1 == parts.size();
     if (isComputed || !isResult) {
-      add(formulas, parts.at(i), true, !isResult, expand);
+      const Role result = isExpression ? Role::Expression : Role::NumberOfCondition;
+      add(formulas, parts.at(i), true, isResult ? result : Role::Condition, expand);
     }
+  }
+  return formulas;
+}
+
+}  // namespace
+
+QStringList formulasIn(const GUIType& type, const QString& value, const ExpandReferences& expand) {
+  QStringList formulas;
+  for (const FormulaText& formula : textsIn(type, value, expand)) {
+    formulas.append(formula.text);
   }
   return formulas;
 }
@@ -49,10 +68,14 @@ bool checkFormulas(const TransformParamCfg& parameter, const QString& value, QSt
                    const ExpandReferences& expand) {
   bool isSound = true;
   forEachPart(parameter, value, [&](const GUIType& type, const QString& part) {
-    const QStringList formulas = isSound ? formulasIn(type, part, expand) : QStringList();
-    for (const QString& text : formulas) {
+    if (!isSound) {
+      return;
+    }
+    for (const auto& [text, role] : textsIn(type, part, expand)) {
       const Formula formula(text);
-      isSound = isSound && (formula.isValid() || formula.refuse(message));
+      const bool isNumber = role == Role::Number || role == Role::NumberOfCondition;
+      isSound = isSound && (formula.isValid() || formula.refuse(message)) &&
+                (!isNumber || formula.mayGiveNumber(message));
     }
   });
   return isSound;

@@ -1,3 +1,4 @@
+#include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/AttributeReferences.h>
 #include <transform/core/Keywords.h>
 #include <transform/core/SingleChoices.h>
@@ -25,6 +26,7 @@ const QLatin1String kFloatTypes("FLOAT");
 const QLatin1String kSliderTypes("RANGE_SLIDER");
 // What also turns parallelism off.
 const QLatin1String kNoProcesses("NO");
+const QLatin1Char kPartSeparator(';');
 
 // What begins like a reference and is none stands for itself.
 bool refersToMacro(const QString& value) {
@@ -91,6 +93,32 @@ ValueFit numberFit(const GUIType& type, const QString& value) {
                                                              : ValueFit();
 }
 
+// The results of a condition are formulas; those that are numbers as they stand are known.
+ValueFit resultsFit(const GUIType& type, const QString& value, const ExpandReferences& expand) {
+  if (!type.getType().startsWith(kSliderTypes))
+    return ValueFit();
+  const QStringList parts = value.mid(kConditionalPrefix.size()).split(kPartSeparator);
+  for (int i = 0; i < parts.size(); ++i) {
+    const bool isResult = i % 2 == 1 || i + 1 == parts.size();
+    const QString result = isResult ? QORXWwjdDecode(expanded(parts.at(i), expand)) : QString();
+    double number = 0;
+    const ValueFit fit = readNumber(result, number) ? numberFit(type, result) : ValueFit();
+    if (!fit.fits())
+      return fit;
+  }
+  return ValueFit();
+}
+
+ValueFit partFit(const GUIType& type, const QString& stored, const ExpandReferences& expand) {
+  if (stored.startsWith(kConditionalPrefix))
+    return resultsFit(type, stored, expand);
+  const QString part = expanded(stored, expand);
+  const bool isNeeded = !type.getFlag(kGUITypeOptional) && !type.getDescription().isEmpty();
+  if (part.isEmpty() && !stored.isEmpty() && isNeeded)
+    return misfitOf(ValueFit::Misfit::Nothing, stored);
+  return isPlain(type, part) ? numberFit(type, part) : ValueFit();
+}
+
 QStringList offeredBy(const single_choices::Choice& choice) {
   QStringList offered;
   if (choice.type.getType() == kCheckBoxType) {
@@ -135,7 +163,7 @@ ValueFit ValueFit::of(const GUIType& type, const ChoiceList& choices, const QStr
   single_choices::replaceIn(type, choices, value, collecting(misfits, nullptr));
   if (!misfits.empty())
     return misfits.front();
-  return isPlain(type, value) ? numberFit(type, value) : ValueFit();
+  return partFit(type, value, nullptr);
 }
 
 std::vector<ValueFit> ValueFit::misfitsOf(const TransformParamCfg& parameter, const QString& value,
@@ -146,8 +174,7 @@ std::vector<ValueFit> ValueFit::misfitsOf(const TransformParamCfg& parameter, co
   single_choices::replaceIn(parameter, value, collecting(misfits, expand));
   const bool isComposite = !parameter.members().members().empty();
   forEachPart(parameter, value, [&](const GUIType& type, const QString& stored) {
-    const QString part = expanded(stored, expand);
-    const ValueFit fit = isPlain(type, part) ? numberFit(type, part) : ValueFit();
+    const ValueFit fit = partFit(type, stored, expand);
     if (!fit.fits()) {
       misfits.push_back(fit);
       misfits.back().prompt = type.getDescription();
@@ -170,8 +197,16 @@ long ValueFit::message() const {
       return messages::kNoWholeNumber;
     case Misfit::Range:
       return messages::kUnfitRange;
+    case Misfit::Nothing:
+      return messages::kRefersToNothing;
   }
   return 0;
+}
+
+orx::Rule ValueFit::rule() const {
+  if (misfit == Misfit::Nothing)
+    return orx::Rule::MissingValue;
+  return misfit == Misfit::Choice ? orx::Rule::UnfitChoice : orx::Rule::UnfitNumber;
 }
 
 QString ValueFit::text() const {

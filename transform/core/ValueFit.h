@@ -1,13 +1,15 @@
 // Whether a value is one that its type offers: an entry of a choice or list box, one of the two values of a
-// check box, a number within the range of a slider.
+// check box, a number within the range of a slider; where one is needed, none that a reference makes empty.
 //
 // An unset value, one that refers to an attribute or to a parameter that is not known, and one that is a
-// function, is told only when it is used. Of a condition the results that are choices are judged.
+// function, is told only when it is used. Of a condition the results are judged that are choices, or numbers
+// as they stand.
 #pragma once
 
 #include <platform/Export.h>
 #include <platform/orxparameter/orxparameter.h>
 #include <transform/core/ParameterReferences.h>
+#include <transform/findings/Rules.h>
 
 #include <QString>
 #include <QStringList>
@@ -18,7 +20,7 @@ class TransformParamCfg;
 
 struct ORX_EXPORT ValueFit {
   // The first says that nothing is wrong.
-  enum class Misfit { None, Choice, Number, WholeNumber, Range };
+  enum class Misfit { None, Choice, Number, WholeNumber, Range, Nothing };
 
   Misfit misfit = Misfit::None;
   QString prompt;       // of the member or column; empty when the parameter itself is meant
@@ -26,7 +28,7 @@ struct ORX_EXPORT ValueFit {
   QStringList offered;  // the choices as they are shown, or the two ends of the range
 
   bool fits() const { return misfit == Misfit::None; }
-  bool isNumber() const { return misfit != Misfit::Choice; }
+  orx::Rule rule() const;
   // What is wrong: its number in orx::messages, and its text in the current language.
   long message() const;
   QString text() const;

@@ -77,8 +77,12 @@ std::vector<MacroReference> macroReferences(const QString& text) {
         inner->isInside = true;
       }
       found.push_back({closed.begin, i + 1, true, closed.isDeferred, false, closed.hasInner});
-    } else if (closes) {
+    } else if (closes &&
+               std::none_of(open.begin(), open.end(), [](const Open& each) { return each.isDeferred; })) {
       open.clear();
+    } else if (closes) {
+      // Brackets that are written as others are no text any more.
+      cutOff(i);
     } else if (!open.empty() && (endsName(c) || i - open.front().begin > kLongestReference)) {
       cutOff(i);
     }

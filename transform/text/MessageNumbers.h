@@ -458,6 +458,8 @@ constexpr long kNameNotEncoded = 371174;
 constexpr long kOutOfMemory = 371175;
 
 // Values and documents.
+constexpr long kRefersToNothing = 371303;
+constexpr long kNeverNumber = 371304;
 constexpr long kUnfitChoice = 371310;
 constexpr long kUnfitNumber = 371311;
 constexpr long kNoWholeNumber = 371312;
@@ -513,7 +515,6 @@ constexpr long kValueNeeded = 371340;
 constexpr long kPartNeeded = 371341;
 constexpr long kCellNeeded = 371342;
 constexpr long kRowBreaksOff = 371343;
-constexpr long kConditionForRows = 371344;
 constexpr long kConditionInTemplate = 371345;
 constexpr long kResultBreaksLine = 371346;
 

@@ -25,14 +25,9 @@ void report(const std::vector<ValueFit>& misfits, const TransformParamCfg& param
     QString prompt = fit.prompt.isEmpty() ? parameter.getDescription() : fit.prompt;
     if (prompt.isEmpty())
       prompt = parameter.getName();
-    findings.reportParameter(fit.isNumber() ? Rule::UnfitNumber : Rule::UnfitChoice, fit.message(), line,
-                             node, parameter.getName(), prompt + QLatin1String(": ") + fit.text());
+    findings.reportParameter(fit.rule(), fit.message(), line, node, parameter.getName(),
+                             prompt + QLatin1String(": ") + fit.text());
   }
-}
-
-// Nothing looks these settings up when the mapping file runs, so what they refer to is judged in their place.
-bool isProcessSetting(const QString& name) {
-  return name == kProcessCountParameter || name == kGroupsOrderedParameter;
 }
 
 }  // namespace
@@ -44,7 +39,7 @@ void fit_checks::checkTransformer(const TransformerCfg& cfg, const ParameterLine
     if (name == kProcessCountDisplayParameter)
       continue;
     const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
-    const bool isExpanded = references == References::Known && isProcessSetting(name);
+    const bool isExpanded = references == References::Known;
     const std::vector<ValueFit> misfits = ValueFit::misfitsOf(
         *parameter, parameter->getValue(), isExpanded ? knownAround(cfg).expand : ExpandReferences());
     QString refusal;
@@ -62,14 +57,16 @@ void fit_checks::checkInside(const TransformerCfg& cfg, int line, const QString&
   network->setAttributeOwner(&cfg);
   for (const TransformerCfg* inner : network->getTransformers()) {
     const ExpandReferences expand = knownAround(*inner).expand;
-    for (const QLatin1String& name : {kProcessCountParameter, kGroupsOrderedParameter}) {
+    for (const QString& name : inner->getParameters()) {
       const TransformParamCfg* parameter = inner->getParameterByMacroName(name);
-      if (!parameter || !beginsMacroReference(parameter->getValue()))
+      if (name == kProcessCountDisplayParameter || !beginsMacroReference(parameter->getValue()))
         continue;
       const QString path = title + QLatin1Char('/') + inner->getIdentifier();
       report(ValueFit::misfitsOf(*parameter, parameter->getValue(), expand), *parameter, line, path,
              findings);
-      if (single_choices::refersToShownSide(*parameter, parameter->getValue(), expand))
+      // Nothing looks the settings of several processes up when the mapping file runs.
+      const bool isSetting = name == kProcessCountParameter || name == kGroupsOrderedParameter;
+      if (isSetting && single_choices::refersToShownSide(*parameter, parameter->getValue(), expand))
         findings.reportUnwritable(line, path, name, TransformResString(orx::messages::kShownSideReferred));
     }
   }

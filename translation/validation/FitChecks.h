@@ -19,7 +19,7 @@ namespace fit_checks {
 enum class References { Known, Open };
 void checkTransformer(const TransformerCfg& cfg, const ParameterLines& lines, const QString& title,
                       orx::Findings& findings, References references);
-// What the values of an instance of a custom transformer make of the settings of parallel processing inside;
+// What the values of an instance of a custom transformer make of the values inside that refer to them;
 // nothing for another transformer. All is told of the instance.
 void checkInside(const TransformerCfg& cfg, int line, const QString& title, orx::Findings& findings);
 // The global parameters of the workspace and those of its custom transformers, by their prompt lines.

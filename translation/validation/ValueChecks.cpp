@@ -109,13 +109,20 @@ void ValueChecks::reportRefusals(const Node& node, LooseReferences& loose, const
   for (const QString& parameter : node.cfg.getParameters()) {
     QString text;
     const orx::RefusalListener listener;
-    if (node.cfg.validateParameter(parameter, text) &&
-        checkFormulas(*node.cfg.getParameterByMacroName(parameter), node.cfg.getParameterValue(parameter),
-                      text, expand))
-      continue;
+    const bool isValid = node.cfg.validateParameter(parameter, text);
     orx::Refusal refusal = listener.refusal();
-    if (!node.isUsedHere && (refusal.rule == Rule::MissingFile || refusal.rule == Rule::UnknownConnection))
+    // What is on this machine says nothing of the formulas in the value.
+    const bool isOfMachine =
+        !isValid && (refusal.rule == Rule::MissingFile || refusal.rule == Rule::UnknownConnection);
+    QString formulaText;
+    if ((isValid || isOfMachine) &&
+        !checkFormulas(*node.cfg.getParameterByMacroName(parameter), node.cfg.getParameterValue(parameter),
+                       formulaText, expand)) {
+      text = formulaText;
+      refusal = listener.refusal();
+    } else if (isValid || (isOfMachine && !node.isUsedHere)) {
       continue;
+    }
     if (refusal.rule == Rule::MissingAttribute) {
       if (!node.knowsWhatArrives)
         continue;

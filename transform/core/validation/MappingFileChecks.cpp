@@ -27,7 +27,6 @@
 #include <transform/text/TextPlaces.h>
 
 #include <algorithm>
-#include <typeinfo>
 
 namespace messages = orx::messages;
 
@@ -73,10 +72,6 @@ QHash<QString, QString> MappingFileChecks::find() const {
 
 long MappingFileChecks::refuse(const TransformParamCfg& record, const QString& stored) const {
   const QString& name = record.getName();
-  // A class of its own reads the rows; a condition hides them.
-  if (record.isTable() && typeid(m_cfg) != typeid(TransformerCfg) && stored.startsWith(kConditionalPrefix)) {
-    return messages::kConditionForRows;
-  }
   if (const long number = refuseParallelSetting(record, stored)) {
     return number;
   }
