@@ -5,13 +5,17 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocumentLibrary.h>
 #include <transform/findings/Refusal.h>
+#include <transform/findings/RuleSettings.h>
 #include <transform/workspace/DocumentCopy.h>
 #include <transform/workspace/TransformerRecords.h>
 #include <translation/CustomExtraction.h>
 #include <translation/generation/CustomDefinitions.h>
+#include <translation/generation/PreparedWorkspace.h>
 #include <translation/graph/NetworkDiagnostics.h>
 #include <translation/graph/ReferencedNames.h>
+#include <translation/graph/WorkspaceBuilder.h>
 #include <translation/graph/WorkspaceListener.h>
+#include <translation/validation/WorkspaceChecks.h>
 
 #include <QBuffer>
 #include <QSet>
@@ -39,7 +43,7 @@ QString yesOrNo(bool isSet) {
 
 CustomExtraction::CustomExtraction(const IXMLComponentReader& reader, const QStringList& headerLines,
                                    TransformerSource& source)
-    : m_reader(reader), m_source(source) {
+    : m_reader(reader), m_headerLines(headerLines), m_source(source) {
   for (const QString& line : headerLines)
     m_global.readHeaderLine(line, 0);
   for (const GlobalParameterStruct& record : reader.GetGlobalParameterList(QString()))
@@ -53,9 +57,36 @@ QStringList CustomExtraction::names() const {
   return names;
 }
 
+// As for the workspace that embeds it, which is refused for the same reasons.
+bool CustomExtraction::judge(orx::Findings& diagnostics) {
+  orx::Findings found(diagnostics.file());
+  WorkspaceBuilder builder(m_source, found);
+  builder.includeUnused();
+  const std::unique_ptr<Workspace> workspace = builder.build(m_reader, diagnostics.file(), m_headerLines);
+  const PreparedWorkspace prepared(*workspace, found);
+  const orx::RuleSettings settings;
+  WorkspaceChecks(m_reader, m_headerLines, m_source, settings, found)
+      .check(*workspace, prepared.isConnected());
+  bool isSound = true;
+  for (const orx::Finding& finding : found.all()) {
+    const QString part = finding.node.section(QLatin1Char('/'), 0, 0);
+    // A node of the main document may bear the name.
+    const bool isInside = m_parts.contains(part) && (finding.line == 0 || part != finding.node ||
+                                                     finding.line >= m_reader.GetDocumentLine(part));
+    if (finding.file != diagnostics.file() || !isInside ||
+        settings.severity(finding.rule) != orx::Severity::Error)
+      continue;
+    diagnostics.add(finding);
+    isSound = false;
+  }
+  return isSound;
+}
+
 bool CustomExtraction::prepare(const QString& name, int version, orx::Findings& diagnostics) {
   findParts(name);
   findWorkspaceParameters();
+  if (!judge(diagnostics))
+    return false;
   SubDocumentLibrary library(m_reader, &m_source);
   ExternalDocNetwork* network = library.network(name);
   if (!network || !makeDefinition(library, diagnostics))
@@ -166,11 +197,13 @@ bool CustomExtraction::makeDocument(const QString& name, int version, orx::Findi
   writer.addTransformer(QString(), instance);
   for (const QString& part : m_parts) {
     copySections(m_reader, part, writer);
-    if (part == name) {
-      QHash<QString, QString> settings = m_reader.GetSubDocParms(part);
+    QHash<QString, QString> settings = m_reader.GetSubDocParms(part);
+    if (part == name)
       settings.insert(kVersion, QString::number(version));
-      writer.setMiscParms(part, settings);
-    }
+    // It is this build that saves it.
+    if (settings.contains(kLastSaveBuild))
+      settings.insert(kLastSaveBuild, QString::number(TransformerCfg::kThisBuild));
+    writer.setMiscParms(part, settings);
   }
   writer.writeDocument();
   writer.stream().flush();

@@ -40,6 +40,7 @@ class ORX_EXPORT CustomExtraction {
   const QStringList& workspaceParameters() const { return m_workspaceParameters; }
 
  private:
+  bool judge(orx::Findings& diagnostics);
   void findParts(const QString& name);
   void findWorkspaceParameters();
   bool makeDefinition(SubDocumentLibrary& library, orx::Findings& diagnostics);
@@ -47,6 +48,7 @@ class ORX_EXPORT CustomExtraction {
   bool makeDocument(const QString& name, int version, orx::Findings& diagnostics);
 
   const IXMLComponentReader& m_reader;
+  const QStringList m_headerLines;
   TransformerSource& m_source;
   QStringList m_fields;
   QStringList m_definition;

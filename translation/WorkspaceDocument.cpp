@@ -40,6 +40,12 @@ WorkspaceDocument::Reading WorkspaceDocument::readOpened(orx::Findings& diagnost
   for (const RawLine& line : m_rawLines) {
     if (line.kind == RawLine::Kind::Conflict)
       diagnostics.report(Rule::ConflictMark, line.line, QString(), {line.text});
+    else if (m_form != WorkspaceFile::Form::Workspace)
+      continue;
+    else if (line.kind == RawLine::Kind::OpenHeader)
+      diagnostics.reportAs(Rule::MalformedDocument, messages::kOpenHeader, line.line, QString());
+    else if (line.kind == RawLine::Kind::Behind)
+      diagnostics.reportAs(Rule::StrayLine, messages::kBehindHeader, line.line, QString(), {line.text});
   }
   if (m_form == WorkspaceFile::Form::Versioned) {
     m_versions = VersionStore(m_input.path()).versions(error);

@@ -35,6 +35,6 @@ def definition(blocks, name, version):
     """The text of a definition among the blocks, and the blocks inside it; None when it is not there."""
     for block in blocks:
         fields = [field.strip() for field in block.header.split(",")]
-        if fields[0] == name and (fields[1] if fields[1:] and fields[1] != "0" else "1") == version:
+        if fields[0] == name and (int(fields[1] or 0) or 1 if fields[1:] else 1) == int(version):
             return "\n".join(block.lines)
     return None

@@ -16,7 +16,11 @@ HOSTILE = [
     "OUTPUT", "FEATURE_TYPE", "1 OUTPUT X", "a OUTPUT x FEATURE_TYPE y", "FACTORY_DEF * TeeFactory", "MACRO HIT 1",
     'INCLUDE [ puts "MACRO HIT 1" ]', "line\nbreak", "\r", "<space>", "<", ">", "é", "日本", "😀", "\u00a0", "\u3000",
     "x" * 300, "END_INCLUDE", "# TRANSFORMER_END", "a|b", "a_OUTPUT", "%1", "&amp;", "0", "YES", "a:b", "\\n", "\\t",
-    "]]>", "a/b", "a.b{0}", "<Unused>", "$(P0)", "$[P0]", "$($(P1))", "$(VALUE)", '"$(P0)","$(P1)"', "1e5", "1;2", "-"]
+    "]]>", "a/b", "a.b{0}", "<Unused>", "$(P0)", "$[P0]", "$($(P1))", "$(VALUE)", '"$(P0)","$(P1)"', "1e5", "1;2", "-",
+    "@Count(x)", "b @Count(x)"]
+# What statements make of the names of other nodes.
+LIKENESSES = ["%s|x", "%s|OUTPUT", "%s|OUTPUT_Router", "%s_OUTPUT", "%s_OUT0", "%s IN0 Input Collector",
+              "OUT %s Output Renamer/Nuker", "OUT0 Collector"]
 # Whole lines of headers, good and bad.
 HEADERS = [
     "MACRO H one", "DEFAULT_MACRO H $(P0)", "MACRO H", "MACRO", "GUI TEXT H Prompt", "# a comment", "INCLUDE [ puts {MACRO H 2} ]",
@@ -70,7 +74,7 @@ class Case:
         self.random, self.tame, self.skipped, self.seed = random.Random(seed), tame, set(skipped), seed
         self.catalogue, self.feature, self.customs, self.used = catalogue, Feature(), [], []
         self.rate = self.random.choice([0.02, 0.05, 0.15])
-        self.drawn = 0
+        self.drawn, self.given = 0, []
         self.main = Scope()
         self.siblings = []
         self._fill(self.main, 0)
@@ -97,6 +101,14 @@ class Case:
 
     def name(self, scope, plain, where):
         text = self.text(plain, where)
+        alike = self.random.random() < self.rate and where not in ("attribute", "custom")
+        mould, at = self.random.choice(LIKENESSES), self.random.randrange(len(self.given) + 1)
+        self.drawn += 1
+        if alike and at < len(self.given) and self.drawn not in self.skipped:
+            like = mould.replace("%s", self.given[at])
+            self.used.append((self.drawn, where, like))
+            text = f"like{self.drawn}" if self.tame else like
+        self.given.append(text)
         if text in scope.names:
             text += str(len(scope.names))
         scope.names.add(text)

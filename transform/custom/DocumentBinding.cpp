@@ -66,12 +66,28 @@ std::unique_ptr<TransformerCfg> DocumentBinding::enter(const TransformerStruct& 
       // It may have come out shorter than the record's name; it is what the statements hold.
       place.name = cfg->getIdentifier();
       place.ports = TransformerPorts(record, *cfg);
+      checkOutputs(record, place, *cfg);
     }
     takeName(place.name, record.line);
   }
   place.isLeftOut = !cfg;
   place.cfg = cfg.get();
   return enter(record.identifier, place) ? std::move(cfg) : nullptr;
+}
+
+void DocumentBinding::checkOutputs(const TransformerStruct& record, const Place& place,
+                                   const TransformerCfg& cfg) {
+  const CompoundTransformerNetwork* inner = networkOf(&cfg);
+  if (inner && !inner->isBodyLoaded())
+    return;
+  QStringList tags;
+  cfg.getOutputTags(tags);
+  for (const OutputFeatStruct& output : record.outputFeats) {
+    if (!output.name.isEmpty() && place.ports.output(0, output.name).isNull()) {
+      m_findings.reportAs(Rule::UnknownElement, orx::messages::kOutputNotThere, record.line, place.name,
+                          {nameWithFile(cfg), output.name, tags.join(QLatin1String(", "))});
+    }
+  }
 }
 
 void DocumentBinding::takeName(const QString& name, int line) {
@@ -92,6 +108,12 @@ std::unique_ptr<TransformerCfg> DocumentBinding::make(const TransformerStruct& r
   QString refusal;
   const orx::RefusalListener listener;
   std::unique_ptr<TransformerCfg> cfg = m_source.makeTransformer(type, record.version, &refusal);
+  const QString version = QString::number(record.version);
+  if (cfg && isCustom && record.version != 0 && record.version != cfg->getVersion()) {
+    m_findings.report(Rule::UnknownVersion, record.line, title,
+                      {type, version, QString::number(cfg->getVersion())});
+    return nullptr;
+  }
   if (cfg)
     return cfg;
   if (!refusal.isEmpty()) {
@@ -100,7 +122,6 @@ std::unique_ptr<TransformerCfg> DocumentBinding::make(const TransformerStruct& r
                           refusal, isNesting ? listener.refusal().message : 0);
     return nullptr;
   }
-  const QString version = QString::number(record.version);
   if (const auto newest = m_source.makeTransformer(type, TransformerSource::kNewestVersion)) {
     m_findings.report(Rule::UnknownVersion, record.line, title,
                       {type, version, QString::number(newest->getVersion())});
@@ -182,8 +203,12 @@ bool DocumentBinding::findPort(const LinkStruct& record, const Place& place, boo
   tag = !place.cfg ? place.port
         : isOutput ? place.ports.output(number, name)
                    : place.ports.input(number, name);
+  // Feature types and the ports of custom transformers are their own only port.
+  const bool isOnly = number == 0 && (name.isEmpty() || name == place.name || name == place.port);
+  if (!place.cfg && !isOnly)
+    reportPort(record, place, isOutput ? record.sourcePortDesc : record.targetPortDesc);
   if (!place.cfg || !tag.isNull())
-    return true;
+    return place.cfg || isOnly;
   // Left where it is, with its ports, because it stands too deep: the nesting is what will be refused.
   const CompoundTransformerNetwork* inner = networkOf(place.cfg);
   if (inner && !inner->isBodyLoaded())

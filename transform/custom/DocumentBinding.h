@@ -78,6 +78,7 @@ class ORX_EXPORT DocumentBinding {
  private:
   std::unique_ptr<TransformerCfg> make(const TransformerStruct& record, const QString& title);
   void configure(const TransformerStruct& record, const QString& title, TransformerCfg& cfg);
+  void checkOutputs(const TransformerStruct& record, const Place& place, const TransformerCfg& cfg);
   void takeName(const QString& name, int line);
   bool findEnds(const LinkStruct& record, const Place*& source, const Place*& target);
   bool findPort(const LinkStruct& record, const Place& place, bool isOutput, unsigned number,

@@ -54,6 +54,17 @@ QString bodyName(const IXMLComponentReader& reader, const QString& name) {
   return documents.size() == 1 ? documents.first() : QString();
 }
 
+// Whose body the document says that it holds, when that is another custom transformer; else empty.
+QString otherBody(const IXMLComponentReader& reader, const QString& body, const QString& name) {
+  if (body.isEmpty() || body != name)
+    return body;
+  QStringList named;
+  for (const TransformerStruct& record : reader.GetTransformerList(QString()))
+    named.append(subDocumentName(record));
+  named.removeAll(QString());
+  return named.contains(name) ? QString() : named.value(0);
+}
+
 }  // namespace
 
 ExternalTransformerNetwork::ExternalTransformerNetwork(const QString& fileName, int version,
@@ -180,7 +191,13 @@ void ExternalTransformerNetwork::loadBody() {
   QStringList headerLines;
   WorkspaceFile::readVersion(reader, plain.fileName(), version, headerLines);
   m_library = std::make_unique<SubDocumentLibrary>(reader, m_manager);
-  m_library->build(*this, bodyName(reader, getName()));
+  const QString body = bodyName(reader, getName());
+  m_library->build(*this, body);
+  const QString other = otherBody(reader, body, getName());
+  if (!other.isEmpty()) {
+    addProblem(orx::Rule::CustomTransformerFault, messages::kBodyOfOther, reader.GetDocumentLine(body),
+               QString(), TransformResString(messages::kBodyOfOther, {getName(), other}));
+  }
   m_library->forgetReader();
   for (const ExternalDocNetwork* inner : m_library->networks()) {
     for (const orx::Finding& problem : inner->problems())

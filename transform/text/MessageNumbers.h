@@ -482,6 +482,16 @@ constexpr long kFaultyHeaderLine = 371403;
 constexpr long kStatementNameTaken = 371470;
 constexpr long kFactoryTaken = 371471;
 constexpr long kTakenAlong = 371472;
+constexpr long kBadVersion = 371473;
+constexpr long kFieldCannotHold = 371474;
+constexpr long kBodyOfOther = 371475;
+constexpr long kNoProcessSetting = 371476;
+constexpr long kOutputNotThere = 371477;
+constexpr long kPortsInMain = 371478;
+constexpr long kIncludedInHeader = 371479;
+constexpr long kSubDocumentOfNewerBuild = 371480;
+constexpr long kOpenHeader = 371481;
+constexpr long kBehindHeader = 371482;
 
 // Links.
 constexpr long kContradictingLink = 371450;

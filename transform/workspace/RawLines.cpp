@@ -44,11 +44,14 @@ class Finder {
       m_found.push_back({RawLine::Kind::Conflict, lines.lineNumber(), textOf(lines)});
       return;
     }
-    if (m_hasHeader)
+    if (m_headerLine > 0) {
+      addBehind(lines);
       return;
-    m_hasHeader = lines.matchComment(WorkspaceSplitter::kStartHeader) > 0;
-    if (m_hasHeader)
+    }
+    if (lines.matchComment(WorkspaceSplitter::kStartHeader) > 0) {
+      m_headerLine = lines.lineNumber();
       return;
+    }
     if (lines.matchComment("") > 0) {
       m_found.insert(m_found.end(), m_waiting.begin(), m_waiting.end());
       m_waiting.clear();
@@ -61,12 +64,24 @@ class Finder {
   }
 
   std::vector<RawLine> inOrder() {
+    if (m_headerLine > 0 && !m_isHeaderClosed)
+      m_found.push_back({RawLine::Kind::OpenHeader, m_headerLine, QString()});
     std::stable_sort(m_found.begin(), m_found.end(),
                      [](const RawLine& left, const RawLine& right) { return left.line < right.line; });
     return std::move(m_found);
   }
 
  private:
+  // An engine's statements may stand there, but no document.
+  void addBehind(const FileLines& lines) {
+    if (!m_isHeaderClosed) {
+      m_isHeaderClosed = lines.matchComment(WorkspaceSplitter::kEndHeader) > 0;
+    } else if (!m_hasBehind && lines.matchComment("") > 0 && !textOf(lines).isEmpty()) {
+      m_hasBehind = true;
+      m_found.push_back({RawLine::Kind::Behind, lines.lineNumber(), textOf(lines)});
+    }
+  }
+
   // A line of "=" may be an ornament, but not between the others.
   bool isConflict(const FileLines& lines) {
     static constexpr std::array<const char*, 2> kInner = {"|||||||", "======="};
@@ -85,7 +100,9 @@ class Finder {
   std::vector<RawLine> m_waiting;  // raw lines behind which no XML has come yet
   bool m_isOpen = false;
   bool m_hasXml = false;
-  bool m_hasHeader = false;
+  int m_headerLine = 0;
+  bool m_isHeaderClosed = false;
+  bool m_hasBehind = false;
 };
 
 }  // namespace

@@ -12,8 +12,10 @@ class PlainFile;
 
 struct ORX_EXPORT RawLine {
   enum class Kind {
-    Conflict,  // "<<<<<<<", "|||||||", "=======" or ">>>>>>>", anywhere in the file
-    Stray,     // not blank; written again it would stand behind the XML
+    Conflict,    // "<<<<<<<", "|||||||", "=======" or ">>>>>>>", anywhere in the file
+    Stray,       // not blank; written again it would stand behind the XML
+    OpenHeader,  // begins a header that does not end
+    Behind,      // marked like XML, but behind the header; the first of them
   };
 
   Kind kind;

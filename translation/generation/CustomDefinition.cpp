@@ -97,6 +97,8 @@ bool CustomDefinition::arrange(orx::Findings& diagnostics) {
   const QString nameFault = findNameFault(m_network.getName());
   if (!nameFault.isEmpty())
     diagnostics.reportText(Rule::CustomTransformerFault, 0, m_network.getName(), nameFault);
+  checkField(QLatin1String("CATEGORY"), m_network.getCategory(), diagnostics);
+  checkField(QLatin1String("GUID"), m_network.getGUID(), diagnostics);
   m_isArranged = nameFault.isEmpty() && order(diagnostics);
   if (!m_isArranged)
     return false;
@@ -106,6 +108,14 @@ bool CustomDefinition::arrange(orx::Findings& diagnostics) {
   for (Part& part : m_parts)
     connect(part);
   return true;
+}
+
+void CustomDefinition::checkField(QLatin1String field, const QString& value,
+                                  orx::Findings& diagnostics) const {
+  if (TextPlaces::refuse(TextPlace::HeaderField, value.trimmed()) != 0) {
+    diagnostics.reportAs(Rule::CustomTransformerFault, messages::kFieldCannotHold, 0, m_network.getName(),
+                         {field, value.simplified()});
+  }
 }
 
 bool CustomDefinition::namesAttributes() const {
@@ -161,10 +171,8 @@ QStringList CustomDefinition::lines() const {
 }
 
 QStringList CustomDefinition::headerFields() const {
-  // Commas separate the fields; a category may list several.
-  const QString category = m_network.getCategory().replace(QLatin1Char(','), QLatin1Char(' ')).simplified();
-  const QString guid = m_network.getGUID().replace(QLatin1Char(','), QLatin1Char(' ')).simplified();
-  return {m_network.getName(), QString::number(m_network.getVersion()), category, guid};
+  return {m_network.getName(), QString::number(m_network.getVersion()), m_network.getCategory().trimmed(),
+          m_network.getGUID().trimmed()};
 }
 
 QByteArray CustomDefinition::block() const {

@@ -64,6 +64,7 @@ class CustomDefinition {
     int firstLine = 0;  // in the body, from 0
   };
 
+  void checkField(QLatin1String field, const QString& value, orx::Findings& diagnostics) const;
   bool order(orx::Findings& diagnostics);
   void nameFlows(orx::Findings& diagnostics);
   void makePart(const SubDocNetworkObjXformer& node);

@@ -32,6 +32,11 @@ QStringList FlowNames::fixedNames(const TransformerCfg& cfg, const QString& iden
 
 QStringList FlowNames::reserve(const TransformerCfg& cfg, const QString& identifier) {
   QStringList taken;
+  // Two nodes of one name are told as that.
+  const bool isKnown = m_reserved.contains(identifier);
+  m_reserved.insert(identifier);
+  if (isKnown && !isCustomTransformer(&cfg))
+    return taken;
   for (const QString& name : fixedNames(cfg, identifier)) {
     if (claim(name) != name)
       taken.append(name);

@@ -5,6 +5,7 @@
 #include <translation/graph/StatementNames.h>
 
 #include <QHash>
+#include <QSet>
 #include <QString>
 #include <QStringList>
 
@@ -34,5 +35,6 @@ class FlowNames {
 
  private:
   StatementNames m_statements;
+  QSet<QString> m_reserved;          // identifiers
   QHash<QString, int> m_lastSuffix;  // every name given out, with the last suffix tried behind it
 };

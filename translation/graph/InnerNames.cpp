@@ -106,30 +106,31 @@ void InnerNames::reportBeginnings(const QString& scope, orx::Findings& diagnosti
   }
 }
 
+// Of several names of one node the first is told.
 void InnerNames::reportTaken(const QString& scope, orx::Findings& diagnostics) {
-  QStringList factories;
-  QStringList beginnings;
-  for (const std::vector<Member>* members : {&m_members, &m_factories}) {
-    for (const Member& member : *members) {
-      factories += factoriesOf(member);
-      beginnings += beginningsOf(member);
-      if (!member.cfg)
-        continue;
-      beginnings += StatementNames::claimedBeginnings(*member.cfg, member.node);
-      m_flowNames += m_statements.flows(*member.cfg, member.node);
-    }
-  }
-  const auto report = [&](JoinedNames& inner, QStringList& names) {
-    names.removeDuplicates();
-    for (const QString& name : qAsConst(names)) {
+  const auto isTaken = [&](JoinedNames& inner, const QStringList& names) {
+    return std::any_of(names.begin(), names.end(), [&](const QString& name) {
       const JoinedNames::Holder holder = inner.findHolder(name);
       if (!holder.name.isEmpty())
         diagnostics.report(Rule::TakenName, holder.line, scope + holder.name, {name});
-    }
+      return !holder.name.isEmpty();
+    });
   };
-  report(m_insides, factories);
-  report(m_beginnings, beginnings);
-  report(m_flows, m_flowNames);
+  for (const std::vector<Member>* members : {&m_members, &m_factories}) {
+    for (const Member& member : *members) {
+      QStringList beginnings = beginningsOf(member);
+      QStringList flows;
+      if (member.cfg) {
+        beginnings += StatementNames::claimedBeginnings(*member.cfg, member.node);
+        flows = m_statements.flows(*member.cfg, member.node);
+      }
+      if (!isTaken(m_insides, factoriesOf(member)) && !isTaken(m_beginnings, beginnings))
+        isTaken(m_flows, flows);
+    }
+  }
+  m_flowNames.removeDuplicates();
+  for (const QString& flow : qAsConst(m_flowNames))
+    isTaken(m_flows, QStringList(flow));
 }
 
 void InnerNames::report(const QString& scope, orx::Findings& diagnostics) {

@@ -39,6 +39,8 @@ std::unique_ptr<Workspace> WorkspaceBuilder::build(const IXMLComponentReader& re
     addLink(record);
   for (const LinkStruct& record : reader.GetAttributeLinkList(mainDocument))
     addAttributeLink(record);
+  for (const SubDocumentIOStruct& port : reader.GetSubDocumentIOList(mainDocument))
+    m_diagnostics.reportAs(Rule::UnknownElement, messages::kPortsInMain, port.line, QString(), {port.name});
   reportRepeatedNames(reader);
   m_workspace->usedCustomTransformers = m_workspace->customTransformers().size();
   if (m_includesUnused)

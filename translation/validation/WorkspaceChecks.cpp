@@ -29,6 +29,7 @@ using orx::Severity;
 namespace {
 
 const QLatin1String kPasswordType("PASSWORD");
+const QString kLastSaveBuild = QStringLiteral("LAST_SAVE_BUILD");
 
 }  // namespace
 
@@ -51,7 +52,7 @@ void WorkspaceChecks::check(Workspace& workspace, bool isConnected) {
 }
 
 void WorkspaceChecks::checkBuild() {
-  const QString build = m_reader.GetMiscParm(QStringLiteral("LAST_SAVE_BUILD"));
+  const QString build = m_reader.GetMiscParm(kLastSaveBuild);
   if (build.toInt() > TransformerCfg::kThisBuild)
     m_diagnostics.report(Rule::NewerBuild, m_reader.GetDocumentLine(QString()), QString(),
                          {build, QString::number(TransformerCfg::kThisBuild)});
@@ -130,6 +131,7 @@ void WorkspaceChecks::checkInside(const ExternalDocNetwork& network, const Works
   const auto knows = [&](const QString& name) {
     return network.hasParameter(name) || isKnown(workspace.parameters, name);
   };
+  checkBuild(network, place.diagnostics);
   for (const SubDocNetworkObj* object : network.nodes()) {
     const auto* node = dynamic_cast<const SubDocNetworkObjXformer*>(object);
     if (!node)
@@ -143,10 +145,35 @@ void WorkspaceChecks::checkInside(const ExternalDocNetwork& network, const Works
   }
 }
 
+void WorkspaceChecks::checkBuild(const ExternalDocNetwork& network, orx::Findings& diagnostics) {
+  const QString build = network.getProperties().value(kLastSaveBuild);
+  if (build.toInt() > TransformerCfg::kThisBuild)
+    diagnostics.reportAs(Rule::NewerBuild, messages::kSubDocumentOfNewerBuild, 0, network.getName(),
+                         {network.getName(), build, QString::number(TransformerCfg::kThisBuild)});
+}
+
+// The parameters of an embedded one are judged with the document's, by their lines.
+void WorkspaceChecks::checkDefaults(const ExternalTransformerNetwork& linked, const Workspace& workspace,
+                                    Place place) {
+  for (const QString& parameter : linked.getParameters()) {
+    const CompoundTransformerParm& info = *linked.getParameterInfo(parameter);
+    if (scriptLanguage(info.type) != ScriptLanguage::None)
+      continue;
+    for (const QString& name : ReferencedNames::inValue(info.defaultValue)) {
+      const bool isOwn = info.type.getFlag(kGUITypeInstanceMacros) && linked.hasParameter(name);
+      if (!isOwn && !isKnown(workspace.parameters, name))
+        place.diagnostics.reportParameter(
+            Rule::UnknownReference, messages::kUnknownReference, 0, linked.getName(), parameter,
+            parameter + QLatin1String(": ") + place.values.referenceText(name, m_parameterNames));
+    }
+  }
+}
+
 // Also those that its file embeds; the ones that it links have their own turn.
 void WorkspaceChecks::checkLinked(const ExternalTransformerNetwork& linked, const Workspace& workspace) {
   orx::Findings found(linked.getFileName());
   ValueChecks values(found, m_settings);
+  checkDefaults(linked, workspace, {found, values});
   QSet<const CompoundTransformerNetwork*> seen{&linked};
   std::vector<const ExternalDocNetwork*> open{&linked};
   while (!open.empty()) {
@@ -276,8 +303,15 @@ void WorkspaceChecks::checkParameterValue(const Workspace& workspace, const Glob
   const GlobalParameters::Parameter* known =
       document.isEmpty() ? workspace.parameters.find(type.getName()) : nullptr;
   const QString& value = known && known->isOverridden ? known->overridingValue : parameter.defaultValue;
+  const bool meansOwn = !document.isEmpty() && type.getFlag(kGUITypeInstanceMacros);
+  const auto isOwn = [&](const QString& name) {
+    const auto& all = m_reader.GetGlobalParameterList(document);
+    return std::any_of(all.begin(), all.end(), [&](const GlobalParameterStruct& other) {
+      return GUIType::fromGuiLine(other.guiLine).getName() == name;
+    });
+  };
   for (const QString& name : ReferencedNames::inValue(value)) {
-    if (!isKnown(workspace.parameters, name))
+    if (!isKnown(workspace.parameters, name) && !(meansOwn && isOwn(name)))
       m_diagnostics.reportParameter(
           Rule::UnknownReference, messages::kUnknownReference, parameter.line, document, type.getName(),
           type.getName() + QLatin1String(": ") + m_values.referenceText(name, m_parameterNames));

@@ -47,6 +47,8 @@ class WorkspaceChecks {
     ValueChecks& values;
   };
   void checkInside(const ExternalDocNetwork& network, const Workspace& workspace, Place place);
+  static void checkBuild(const ExternalDocNetwork& network, orx::Findings& diagnostics);
+  void checkDefaults(const ExternalTransformerNetwork& linked, const Workspace& workspace, Place place);
   void checkLinked(const ExternalTransformerNetwork& linked, const Workspace& workspace);
   void checkAge(const TransformerCfg& cfg, int line, const QString& title, orx::Findings& diagnostics);
   void checkParameterValues(const Workspace& workspace);

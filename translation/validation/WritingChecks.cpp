@@ -15,6 +15,7 @@
 #include <transform/text/GlobalMacros.h>
 #include <transform/text/MFBuffer.h>
 #include <transform/text/MacroText.h>
+#include <transform/text/MappingFileKeywords.h>
 #include <transform/text/MessageNumbers.h>
 #include <transform/text/MessageStrings.h>
 #include <transform/text/TextHelpers.h>
@@ -195,6 +196,8 @@ void WritingChecks::checkParameters() {
       m_findings.reportUnwritable(parameter.line, QString(), parameter.name, script);
     if (!parameter.setInHeader)
       checkParameter(parameter, parameter.value);
+    else if (!MFBuffer::closesDeferredMacros(parameter.value))
+      m_findings.report(Rule::UnclosedReference, parameter.line, QString(), {parameter.name});
     if (parameter.isOverridden)
       checkParameter(parameter, parameter.overridingValue);
   }
@@ -209,7 +212,26 @@ void WritingChecks::checkParameters() {
   }
 }
 
+// An instance sets the prefix macro before it includes its definition.
+void WritingChecks::checkHeader() {
+  QSet<QString> embedded;
+  for (const ExternalDocNetwork* network : m_workspace.customTransformers())
+    embedded.insert(network->getName());
+  int number = m_workspace.firstHeaderLine;
+  for (const QString& line : m_workspace.headerLines) {
+    const QString statement = line.trimmed();
+    if (statement.startsWith(kIncludeCustomStatement + QLatin1Char(' '))) {
+      QString name = statement.mid(kIncludeCustomStatement.size() + 1).trimmed();
+      name.truncate(qMax(name.lastIndexOf(QLatin1Char(':')), 0));
+      if (embedded.contains(name) && !m_workspace.parameters.find(makePrefixMacro(name)))
+        m_findings.reportAs(Rule::UnwritableValue, messages::kIncludedInHeader, number, QString(), {name});
+    }
+    ++number;
+  }
+}
+
 void WritingChecks::check() {
+  checkHeader();
   checkParameters();
   for (const AttributeLink& link : m_workspace.attributeLinks)
     checkNoReference(link.to, link.line,

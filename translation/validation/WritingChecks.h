@@ -21,6 +21,7 @@ class WritingChecks {
   void check();
 
  private:
+  void checkHeader();
   void checkParameters();
   void checkParameterName(const GlobalParameters::Parameter& parameter);
   void checkPrefixMacros();

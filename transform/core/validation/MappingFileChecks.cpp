@@ -27,6 +27,7 @@
 #include <transform/text/TextPlaces.h>
 
 #include <algorithm>
+#include <typeinfo>
 
 namespace messages = orx::messages;
 

@@ -96,6 +96,10 @@ QStringList parametersInCircles(const TransformerCfg& instance) {
   return found;
 }
 
+bool isYesOrNo(const QString& value) {
+  return value == QLatin1String("Yes") || value == QLatin1String("No");
+}
+
 bool isIterationCount(const QString& value) {
   bool isNumber = false;
   return isUnsetValue(value) || value.toInt(&isNumber) > 0 ||
@@ -371,10 +375,17 @@ QString CompoundTransformerCfg::refuseParallel() const {
   if (listener())
     listener()->expandMacros(*this, level);
   const bool isOpen = listener() && listener()->isRunTimeValue(*this, level);
-  if (level.isEmpty() || isOpen || parallelLevels().contains(level))
-    return QString();
-  return TransformResString(messages::kNoParallelLevel, {level, m_network->getParallelSettings().parallelism,
-                                                         parallelLevels().join(QLatin1String(", "))});
+  const ParallelSettings given = m_network->getParallelSettings();
+  if (!level.isEmpty() && !isOpen && !parallelLevels().contains(level))
+    return TransformResString(messages::kNoParallelLevel,
+                              {level, given.parallelism, parallelLevels().join(QLatin1String(", "))});
+  QString ordered = MFBuffer::withOrdinaryMacros(settings.processSetting);
+  if (listener())
+    listener()->expandMacros(*this, ordered);
+  const bool isKnown = !settings.isEnabled() || (listener() && listener()->isRunTimeValue(*this, ordered)) ||
+                       isUnsetValue(ordered) || isYesOrNo(ordered);
+  return isKnown ? QString()
+                 : TransformResString(messages::kNoProcessSetting, {ordered, given.processSetting});
 }
 
 QStringList CompoundTransformerCfg::findUnwritablePorts() const {

@@ -9,8 +9,8 @@
 
 namespace {
 
-// A reference to a parameter of the instance gives its value, the stored side of a choice; a parameter
-// without a value is no setting.
+// A reference to a parameter of the instance gives its value, the stored side of a choice, as plain text; a
+// parameter without a value is no setting.
 QString resolve(const QString& setting, const TransformerCfg& instance) {
   if (!isParameterReference(setting))
     return setting;
@@ -19,7 +19,9 @@ QString resolve(const QString& setting, const TransformerCfg& instance) {
   if (!record)
     return setting;
   const QString value = record->choices().toStored(instance.getParameterValue(name));
-  return isUnsetValue(value) ? QString() : value;
+  if (isUnsetValue(value))
+    return QString();
+  return record->valueIsEncoded() ? QORXWwjdDecode(value) : value;
 }
 
 QString resolveGroupBy(const QString& groupBy, const TransformerCfg& instance) {

@@ -27,7 +27,14 @@ void ExternalDocNetwork::Builder::build() {
   m_network.clearNodes();
   m_network.clearProblems();
   m_network.m_transformerNames.clear();
-  m_network.takeSettings(m_reader.GetSubDocParms(m_document));
+  const QHash<QString, QString> settings = m_reader.GetSubDocParms(m_document);
+  m_network.takeSettings(settings);
+  const auto version = settings.constFind(QStringLiteral("VERSION"));
+  bool isNumber = true;
+  if (version != settings.constEnd() && (version->toInt(&isNumber) < 0 || !isNumber)) {
+    m_findings.reportAs(Rule::CustomTransformerFault, messages::kBadVersion,
+                        m_reader.GetDocumentLine(m_document), QString(), {m_network.getName(), *version});
+  }
   addPorts();
   for (const TransformerStruct& record : m_reader.GetTransformerList(m_document))
     addTransformer(record);
