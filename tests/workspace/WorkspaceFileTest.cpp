@@ -199,7 +199,8 @@ TEST(VersionStore, OpeningLinesAndPlacesThatAreOff) {
 TEST(RawLines, StrayLinesAndMarksOfMerges) {
   // `found`: line and, for a conflict, "!"
   const std::tuple<QByteArray, const char*> cases[] = {
-      {"note\n#! <W/>\n\nmore\n#! START_HEADER\nMACRO A 1\n=======\n#! END_HEADER\n#! x\nbehind\n#! y\n", "9"},
+      {"note\n#! <W/>\n\nmore\n#! START_HEADER\nMACRO A 1\n=======\n#! END_HEADER\n#! x\nbehind\n#! y\n",
+       "9"},
       {"#! <W\n\n#!\n  two \n#!A='1'\n#! />\n", "4 5"},
       {"#! <W\n<<<<<<< a\n#! A='1'\n|||||||\r\n=======\n#! A='2'\n>>>>>>> b\n#! />\n=======\n",
        "2! 4! 5! 7!"},

@@ -4,7 +4,6 @@
 #include <transform/custom/NestedNetworks.h>
 #include <transform/custom/SubDocNetworkObjXformer.h>
 #include <transform/text/MappingFileKeywords.h>
-
 #include <translation/generation/CopiedFlows.h>
 #include <translation/generation/FlowNames.h>
 #include <translation/graph/JoinedNames.h>

@@ -35,7 +35,6 @@ namespace {
 
 using namespace lookup_checks;
 
-
 }  // namespace
 
 namespace mapping_file_checks {
