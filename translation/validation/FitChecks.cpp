@@ -14,10 +14,16 @@
 #include <translation/GlobalParameters.h>
 #include <translation/validation/FitChecks.h>
 
+#include <algorithm>
+#include <vector>
+
 using carried_references::knownAround;
 using orx::Rule;
 
 namespace {
+
+// Instances inside one another can be more than anyone could wait for.
+constexpr int kMostInstancesInside = 1000;
 
 void report(const std::vector<ValueFit>& misfits, const TransformParamCfg& parameter, int line,
             const QString& node, orx::Findings& findings) {
@@ -27,6 +33,22 @@ void report(const std::vector<ValueFit>& misfits, const TransformParamCfg& param
       prompt = parameter.getName();
     findings.reportParameter(fit.rule(), fit.message(), line, node, parameter.getName(),
                              prompt + QLatin1String(": ") + fit.text());
+  }
+}
+
+// What the references in the values lead to from where the transformer stands now.
+void checkReferring(const TransformerCfg& cfg, int line, const QString& title, orx::Findings& findings) {
+  const ExpandReferences expand = knownAround(cfg).expand;
+  for (const QString& name : cfg.getParameters()) {
+    const TransformParamCfg* parameter = cfg.getParameterByMacroName(name);
+    const QString& value = parameter->getValue();
+    if (name == kProcessCountDisplayParameter || !beginsMacroReference(value))
+      continue;
+    report(ValueFit::misfitsOf(*parameter, value, expand), *parameter, line, title, findings);
+    // Nothing looks the settings of several processes up when the mapping file runs.
+    const bool isSetting = name == kProcessCountParameter || name == kGroupsOrderedParameter;
+    if (isSetting && single_choices::refersToShownSide(*parameter, value, expand))
+      findings.reportUnwritable(line, title, name, TransformResString(orx::messages::kShownSideReferred));
   }
 }
 
@@ -50,27 +72,38 @@ void fit_checks::checkTransformer(const TransformerCfg& cfg, const ParameterLine
 
 void fit_checks::checkInside(const TransformerCfg& cfg, int line, const QString& title,
                              orx::Findings& findings) {
-  CompoundTransformerNetwork* network = networkOf(&cfg);
-  if (!network)
-    return;
-  const TransformerCfg* before = network->attributeOwner();
-  network->setAttributeOwner(&cfg);
-  for (const TransformerCfg* inner : network->getTransformers()) {
-    const ExpandReferences expand = knownAround(*inner).expand;
-    for (const QString& name : inner->getParameters()) {
-      const TransformParamCfg* parameter = inner->getParameterByMacroName(name);
-      if (name == kProcessCountDisplayParameter || !beginsMacroReference(parameter->getValue()))
-        continue;
-      const QString path = title + QLatin1Char('/') + inner->getIdentifier();
-      report(ValueFit::misfitsOf(*parameter, parameter->getValue(), expand), *parameter, line, path,
-             findings);
-      // Nothing looks the settings of several processes up when the mapping file runs.
-      const bool isSetting = name == kProcessCountParameter || name == kGroupsOrderedParameter;
-      if (isSetting && single_choices::refersToShownSide(*parameter, parameter->getValue(), expand))
-        findings.reportUnwritable(line, path, name, TransformResString(orx::messages::kShownSideReferred));
+  // The way from the instance inwards; its networks ask whom they stand in for.
+  struct Step {
+    CompoundTransformerNetwork* network;
+    const TransformerCfg* before;
+    QString title;
+    std::vector<const TransformerCfg*> left;
+  };
+  std::vector<Step> way;
+  int budget = kMostInstancesInside;
+  const auto enter = [&](const TransformerCfg& instance, const QString& name) {
+    CompoundTransformerNetwork* network = networkOf(&instance);
+    if (!network || --budget < 0)
+      return;
+    way.push_back({network, network->attributeOwner(), name, {}});
+    network->setAttributeOwner(&instance);
+    for (const TransformerCfg* inner : network->getTransformers())
+      way.back().left.push_back(inner);
+    std::reverse(way.back().left.begin(), way.back().left.end());
+  };
+  enter(cfg, title);
+  while (!way.empty()) {
+    if (way.back().left.empty()) {
+      way.back().network->setAttributeOwner(way.back().before);
+      way.pop_back();
+      continue;
     }
+    const TransformerCfg& inner = *way.back().left.back();
+    way.back().left.pop_back();
+    const QString path = way.back().title + QLatin1Char('/') + inner.getIdentifier();
+    checkReferring(inner, line, path, findings);
+    enter(inner, path);
   }
-  network->setAttributeOwner(before);
 }
 
 void fit_checks::checkParameters(const IXMLComponentReader& reader, const GlobalParameters& parameters,
