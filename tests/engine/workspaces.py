@@ -19,7 +19,7 @@ HOSTILE = [
     "]]>", "a/b", "a.b{0}", "<Unused>", "$(P0)", "$[P0]", "$($(P1))", "$(VALUE)", '"$(P0)","$(P1)"', "1e5", "1;2", "-",
     "@Count(x)", "b @Count(x)"]
 # What statements make of the names of other nodes.
-LIKENESSES = ["%s|x", "%s|OUTPUT", "%s|OUTPUT_Router", "%s_OUTPUT", "%s_OUT0", "%s IN0 Input Collector",
+LIKENESSES = ["%s|x", "%s|TAG", "%s|TAG", "%s|TAG_Router", "%s_TAG", "%s_OUT0", "%s IN0 Input Collector",
               "OUT %s Output Renamer/Nuker", "OUT0 Collector"]
 # Whole lines of headers, good and bad.
 HEADERS = [
@@ -75,6 +75,7 @@ class Case:
         self.catalogue, self.feature, self.customs, self.used = catalogue, Feature(), [], []
         self.rate = self.random.choice([0.02, 0.05, 0.15])
         self.drawn, self.given = 0, []
+        self.tags = sorted(tag for each in catalogue for tag in each.outputs)
         self.main = Scope()
         self.siblings = []
         self._fill(self.main, 0)
@@ -102,10 +103,11 @@ class Case:
     def name(self, scope, plain, where):
         text = self.text(plain, where)
         alike = self.random.random() < self.rate and where not in ("attribute", "custom")
-        mould, at = self.random.choice(LIKENESSES), self.random.randrange(len(self.given) + 1)
+        mould, tag = self.random.choice(LIKENESSES), self.random.choice(self.tags)
+        other = self.random.choice(["writer0", "Node 3", "Node 4", "Node 5", *self.given])
         self.drawn += 1
-        if alike and at < len(self.given) and self.drawn not in self.skipped:
-            like = mould.replace("%s", self.given[at])
+        if alike and self.drawn not in self.skipped:
+            like = mould.replace("%s", encode(other) if "|" in mould else other).replace("TAG", tag)
             self.used.append((self.drawn, where, like))
             text = f"like{self.drawn}" if self.tame else like
         self.given.append(text)
