@@ -291,7 +291,7 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
   const QString table =
       "GUI_LINE_TABLE " + MemberList::configToken(';', {GUIType::fromGuiLine("GUI TEXT A a"),
                                                         GUIType::fromGuiLine("GUI TEXT B b")});
-
+  const QString encodedTable = QString(table).replace("TEXT", "TEXT_ENCODED");
   const Case cases[] = {
       {{"P", "TEXT", "a\nb"}, "K $(P)", kBreaksLine},
       {{"P", "TEXT", "a\nb"}, "K $(Q)", 0},
@@ -374,11 +374,11 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", table, "x;5\" y"}, "K $(P)", 0},
       {{"P", table, "x;@Tcl2(exit)"}, "K $(P)", kCallInValue},
       {{"P", table, "ORX_CONDITIONAL:1;x<semicolon>y"}, "K $(P)", kConditionForParts},
-      {{"P", encoded, "a<space>b;@Value<leftparenthesis>a<rightparenthesis>"}, "K $(P)", 0},
-      {{"P", encoded, "x;a b"}, "K $(P)", kNotEncoded},
-      {{"P", encoded, " x;y"}, "K $(P)", kNotEncoded},
-      {{"P", encoded, "x;a\"b"}, "K $(P)", kNotEncoded},
-      {{"P", encoded, "@EvaluateExpression(STRING,a,b);y"}, "K $(P)", kNotEncoded},
+      {{"P", encodedTable, "a<space>b;@Value<leftparenthesis>a<rightparenthesis>"}, "K $(P)", 0},
+      {{"P", encodedTable, "x;a b"}, "K $(P)", kNotEncoded},
+      {{"P", encodedTable, " x;y"}, "K $(P)", kNotEncoded},
+      {{"P", encodedTable, "x;a\"b"}, "K $(P)", kNotEncoded},
+      {{"P", encodedTable, "@EvaluateExpression(STRING,a,b);y"}, "K $(P)", kNotEncoded},
   };
   RunTimeListener listener;
   for (const Case& c : cases) {

@@ -72,8 +72,10 @@ TEST(ValueFit, PartsAreJudgedByTheirOwnTypes) {
   for (const auto& c : cases) {
     const TransformParamCfg parameter(GUIType::fromTransformerTypeString(c.type, "P"));
     QStringList found;
-    for (const ValueFit& fit :
-         ValueFit::misfitsOf(parameter, c.value, [&](QString& text) { text.replace("$(R)", c.known); }))
+    for (const ValueFit& fit : ValueFit::misfitsOf(parameter, c.value, [&](QString& text) {
+           text.replace("$(R)", c.known);
+           return true;
+         }))
       found.append(fit.prompt + '=' + fit.value);
     EXPECT_EQ(found.join(' '), c.misfits) << c.value;
   }
