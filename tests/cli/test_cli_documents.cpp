@@ -59,7 +59,7 @@ TEST(DocumentCommands, EndWithTheStatusThatFits) {
       {{"format", "-i", "-"}, 2, "", "in place"},
       {{"info", "missing.orw"}, 3, "", "missing.orw: error: cannot be read: "},
       {{"info", "--lang", "de", "missing.orw"}, 3, "", "missing.orw: error: lässt sich nicht lesen: "},
-      {{"info", "--lang", "de", "cut.orw"}, 1, "", "Der Arbeitsbereich lässt sich um Zeile "},
+      {{"info", "--lang", "de", "cut.orw"}, 1, "", "Lesen des Arbeitsbereichs bei Zeile 112 "},
       {{"info", "--lang", "de", "small.orw"}, 0, "Eigener Transformer Inner, Version 4", ""},
       {{"info", "."}, 3, "", ".: error: "},
       {{"info", "empty.orw"}, 1, "", "empty.orw: error: "},

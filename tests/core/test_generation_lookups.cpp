@@ -353,7 +353,6 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", members, "A,<Unused>,B,y"}, "K $(A)", kPartNeeded, {"a"}},
       {{"P", table, "a;b;c"}, "K $(P)", kRowBreaksOff, {"2", "a", "a, b"}},
       {{"P", table, "a;b;c;<Unused>"}, "K $(P)", kCellNeeded, {"2", "b"}},
-      {{"P", table, "ORX_CONDITIONAL:1;a<semicolon>b;c"}, "K $(P)", kRowBreaksOff, {"1", "a", "a, b"}},
       {{"P", "TEXT", "<Unused>", "Prompt"}, "K", kValueNeeded},
       {{"P", "OMITTABLE TEXT", "<Unused>", "Prompt"}, "K $(P)", 0},
       {{"P", "OPTIONAL TEXT", "<Unused>"}, "K $(P)", 0},
