@@ -298,6 +298,7 @@ TEST(Lookups, FaultsAreFoundBeforeWriting) {
       {{"P", "TEXT", "a\nb"}, "K $(ORX_PARM_VAL_LIST)", kBreaksLine},
       {{"P", "TEXT_ENCODED", "a\\nb"}, "K $(P)", kBreaksLine},  // the escape becomes a line feed
       {{"P", "TEXT_ENCODED", "a<u000a>b"}, "K $(P)", 0},
+      {{"P", "TEXT_ENCODED", "a\\\\$(G)"}, "K $(P)", kNotEncoded},
       {{"P", "TEXT", "a\\"}, "K $(P)", kEndsInBackslash},
       {{"P", "TEXT", "a\\"}, "K $(P) x", 0},
       {{"P", "TEXT", "$[x"}, "K $(P)", kValueUnclosed},

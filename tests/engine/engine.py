@@ -24,8 +24,9 @@ class Run:
         self.engine, self.macros = engine, Macros()
         self.factories, self.shapes, self.faults, self.unknown = [], [], [], []
         self.workers = {}  # name of a factory of several processes -> the flow inside its workers, what leaves
-        self.flow = flow.Flow({kind: {flow.origin(("", kind))} for _, kind in readers})
-        self.readers, self.writers, self.depth = readers, {}, 0
+        self.entering = {reader: reader[1] for reader in readers}  # the flow that each type of a reader enters as
+        self.flow, self.writers, self.depth = flow.Flow({}), {}, 0
+        self.enter()
         engine.tcl.fresh()
         self.read(text, [])
 
@@ -102,11 +103,17 @@ class Run:
         if len(words) != 3:
             raise Fault(f"{keyword} has {len(words)} words")
         if keyword == "READER_FEATURE_TYPE":
-            if tuple(words[:2]) not in self.readers:
+            if tuple(words[:2]) not in self.entering:
                 raise Fault(f"no reader {words[:2]}")
-            self.flow.types.setdefault(words[2], set()).add(flow.origin(("", words[1])))
+            self.entering[tuple(words[:2])] = words[2]
+            self.enter()
         else:
             self.writers[words[0], words[2]] = words[1]
+
+    def enter(self):
+        self.flow.types = {}
+        for (_, kind), entered in self.entering.items():
+            self.flow.types.setdefault(entered, set()).add(flow.origin(("", kind)))
 
     def option(self, rest):
         words = split(rest)

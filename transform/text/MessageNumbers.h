@@ -492,6 +492,7 @@ constexpr long kIncludedInHeader = 371479;
 constexpr long kSubDocumentOfNewerBuild = 371480;
 constexpr long kOpenHeader = 371481;
 constexpr long kBehindHeader = 371482;
+constexpr long kNameReadsEncoded = 371483;
 
 // Links.
 constexpr long kContradictingLink = 371450;

@@ -190,7 +190,9 @@ long MappingFileChecks::refuseToken(const GUIType& type, const QString& stored,
   const QSet<QString>& keys = compiled ? compiled->keys() : none;
   const bool isExpression = type.getType().startsWith(kExpressionType);
   if (type.valueIsEncoded() && !isExpression) {
-    return refuseEncoding(type, written);
+    // What would be read as an escape is no word, and beside a reference nobody else finds it.
+    const bool hasEscapes = type.getType() == kTextEncodedType && encodeUserString(stored) != stored;
+    return hasEscapes ? messages::kNotEncoded : refuseEncoding(type, written);
   }
   const bool mayCall = isExpression || type.getType() == kTableType;
   return TextPlaces::refusePlainValue(written, keys,

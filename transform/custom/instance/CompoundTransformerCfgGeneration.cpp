@@ -1,4 +1,5 @@
 // What an instance of a custom transformer writes into the mapping file.
+#include <platform/qorxcore/WordEncoding.h>
 #include <transform/core/CarriedReferences.h>
 #include <transform/core/ExpressionWriter.h>
 #include <transform/core/LookupChecks.h>
@@ -449,6 +450,9 @@ long CompoundTransformerCfg::refuseMacroValue(const QString& parameter, const QS
   // The name stands in quotes as it is.
   if (isName && TextPlaces::refuse(TextPlace::QuotedName, expanded) != 0)
     return messages::kIdentifierInScript;
+  // Inside it begins the names of statements, where it is decoded in some and not in others.
+  if (isName && QORXWwjdDecode(expanded) != expanded)
+    return messages::kNameReadsEncoded;
   if (isName && TextPlaces::refuse(TextPlace::PrintedName, expanded) != 0 && printsMacroNames())
     return messages::kNoPrintedName;
   if (const long number = refuseSetting(parameter))
