@@ -94,7 +94,7 @@ def tcl_word(text):
 
 def run_python(lines, macros):
     """The macros that the block sets: its lines are the body of a function."""
-    body = "def block(ORX_MacroValues):\n" + "".join("  " + line + "\n" for line in lines)
+    body = "def block(ORX_MacroValues):\n" + "".join("  " + line + "\n" for line in [*lines, "pass"])
     space = {}
     try:
         exec(compile(body, "INCLUDE PYTHON", "exec"), space)
