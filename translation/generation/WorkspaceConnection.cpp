@@ -84,13 +84,30 @@ void WorkspaceConnection::nameFlows() {
     }
     inner.addFlow(m_flows[at(node)].value(QString()));
   }
-  for (const WorkspaceLink& link : m_workspace.links)
-    m_copied.add(flowBeforeCopies(link), m_workspace.nodes[at(link.source)].isTransformer(), link.copies);
-  m_copied.nameRoutes(names);
-  for (const WorkspaceLink& link : m_workspace.links)
-    inner.addFlow(flowOf(link));
+  nameCopies(names, inner);
   addMembers(inner);
   inner.report(QString(), m_findings);
+}
+
+// Only flows that some link copies on are looked at: in most workspaces there is none.
+void WorkspaceConnection::nameCopies(FlowNames& names, InnerNames& inner) {
+  QSet<QString> copied;
+  for (const WorkspaceLink& link : m_workspace.links) {
+    if (!link.copies.isEmpty())
+      copied.insert(flowBeforeCopies(link));
+  }
+  if (copied.isEmpty())
+    return;
+  for (const WorkspaceLink& link : m_workspace.links) {
+    const QString flow = flowBeforeCopies(link);
+    if (copied.contains(flow))
+      m_copied.add(flow, m_workspace.nodes[at(link.source)].isTransformer(), link.copies);
+  }
+  m_copied.nameRoutes(names);
+  for (const WorkspaceLink& link : m_workspace.links) {
+    if (!link.copies.isEmpty())
+      inner.addFlow(flowOf(link));
+  }
 }
 
 void WorkspaceConnection::reserveFixedNames(FlowNames& names, bool ofCustom) {

@@ -42,6 +42,7 @@ class WorkspaceConnection {
   void reserveFixedNames(FlowNames& names, bool ofCustom);
   void addMembers(InnerNames& inner);
   void nameFlows();
+  void nameCopies(FlowNames& names, InnerNames& inner);
   void connect();
   void pushAttributes();
   QString flowBeforeCopies(const WorkspaceLink& link) const {
