@@ -28,6 +28,8 @@ TEST(CommandLine, EndsWithTheStatusThatFits) {
       {{"generate", good, good, "-d", "out"}, 2, "", "give them separately"},
       {{"generate", good, "-o", "x", "-d", "y"}, 2, "", "excludes"},
       {{"generate", good, "--depfile", "d.d"}, 2, "", "--output"},
+      {{"generate", "cut.orw", "-o", "x.mf", "--depfile", "./cut.orw"}, 2, "", "--depfile"},
+      {{"generate", good, "-o", "x.mf", "--depfile", "x.mf"}, 2, "", "--depfile"},
       {{"generate", "missing.orw", "-o", "x.mf", "--depfile", "d.d"}, 3, "", "missing.orw"},
       {{"generate", good, "-o", "x.mf", "--depfile", "no/such/d.d"}, 3, "", "no/such/d.d"},
       {{"generate", "a b#$.orw", "-o", "x$.mf", "--depfile", "d.d"}, 0, "", ""},

@@ -71,7 +71,7 @@ bool GenerateCommand::planJobs(std::vector<Job>& jobs, Console& console) const {
     }
     jobs.push_back({QString::fromStdString(m_workspaces.front()),
                     m_output.empty() ? QStringLiteral("-") : QString::fromStdString(m_output)});
-    return true;
+    return keepsDependenciesApart(jobs.front(), console);
   }
   const QString directory = QString::fromStdString(m_directory);
   QHash<QString, QString> claimed;
@@ -86,6 +86,20 @@ bool GenerateCommand::planJobs(std::vector<Job>& jobs, Console& console) const {
     }
     claimed.insert(output, workspace);
     jobs.push_back({workspace, output});
+  }
+  return true;
+}
+
+bool GenerateCommand::keepsDependenciesApart(const Job& job, Console& console) const {
+  const QFileInfo dependencies(QString::fromStdString(m_dependencies));
+  for (const QString& other : {job.workspace, job.output}) {
+    const QFileInfo file(other);
+    const bool isSame = file.exists() ? file.canonicalFilePath() == dependencies.canonicalFilePath()
+                                      : file.absoluteFilePath() == dependencies.absoluteFilePath();
+    if (m_dependencies.empty() || !isSame)
+      continue;
+    console.fail(messages::kSameOutput, {QStringLiteral("--depfile"), other, dependencies.filePath()});
+    return false;
   }
   return true;
 }

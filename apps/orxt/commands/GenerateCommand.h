@@ -34,6 +34,7 @@ class GenerateCommand : public Command {
 
   // False, with the reason on the console, when the options do not go together.
   bool planJobs(std::vector<Job>& jobs, Console& console) const;
+  bool keepsDependenciesApart(const Job& job, Console& console) const;
   ExitStatus runJob(const Job& job, const Setting& setting, TransformerSource& source,
                     Console& console) const;
   bool writeDependencies(const Job& job, const RecordingSource& used, Console& console) const;

@@ -6,14 +6,14 @@ namespace dependency_file {
 
 namespace {
 
-// A blank, and the backslashes before it, get a backslash; so does "#". A dollar sign is doubled.
+// A blank, and the backslashes before it, get a backslash; so do "#" and ":". A dollar sign is doubled.
 QString escaped(const QString& name) {
   QString text;
   int backslashes = 0;
   for (const QChar unit : name) {
     if (unit == QLatin1Char(' '))
       text += QString(backslashes + 1, QLatin1Char('\\'));
-    else if (unit == QLatin1Char('#'))
+    else if (unit == QLatin1Char('#') || unit == QLatin1Char(':'))
       text += QLatin1Char('\\');
     else if (unit == QLatin1Char('$'))
       text += QLatin1Char('$');
